@@ -1,0 +1,14 @@
+LOCAL_PATH := $(call my-dir)
+
+include $(CLEAR_VARS)
+LOCAL_MODULE    := omacp
+LOCAL_SRC_FILES := $(patsubst $(LOCAL_PATH)/%,%,$(sort $(wildcard $(LOCAL_PATH)/src/ClientProv/*.cpp)))
+LOCAL_CPPFLAGS  := -std=c++20 -fno-exceptions -fno-rtti -fno-threadsafe-statics -nostdinc++ \
+                   -fvisibility=hidden -fno-semantic-interposition -fstack-protector-strong \
+                   -Wall -Wextra -Wconversion -Wshadow
+LOCAL_LDFLAGS   := -Wl,-Bsymbolic
+# Devices with 64 bits may have pages of 16 KiB.
+ifneq (,$(filter arm64-v8a x86_64,$(TARGET_ARCH_ABI)))
+LOCAL_LDFLAGS   += -Wl,-z,max-page-size=16384
+endif
+include $(BUILD_SHARED_LIBRARY)
