@@ -1,0 +1,110 @@
+// The decoder's entry: the WBXML header, the document type, and the way from bytes to a context.
+#include "qvsClientProvWbxmlDecoder.h"
+#include "qvsTokens.h"
+#include "qvsstring.h"
+#include "qvstrace.h"
+
+using namespace qvs;
+
+namespace {
+
+constexpr char kDocumentType[] = "-//WAPFORUM//DTD PROV 1.0//EN";
+
+// Reads the header and tells whether it announces a provisioning document.
+qvsResult checkDocumentType(qvsWbxmlDecoder *decoder)
+{
+    uint8_t version = 0;
+    uint32_t publicId = 0;
+    uint32_t charset = 0;
+    // kept[header-ignored]: a header that ends early is judged by what was read of it.
+    (void)qvsClientProvWbxmlDecoderWbxmlHeader(decoder, &version, &publicId, &charset);
+    // kept[public-id-index]: a document type given by text is the text that the string table begins
+    // with, whatever index was given.
+    const bool known =
+        publicId == wbxml::kProvisioning || (publicId == 0 && decoder->pStringTable &&
+                                             qvsStrcmp(decoder->pStringTable, kDocumentType) == 0);
+    if (!known) {
+        trace("ERROR : qvsClientProvWbxmlDecoder Difference Ver!!\n");
+        return QVS_ERROR_WBXML_DOCUMENT_TYPE;
+    }
+    return QVS_OK;
+}
+
+qvsResult decode(qvsWbxmlDecoder *decoder, qvsWapDoc **document)
+{
+    if (!decoder || smlBufferGetDataSize(decoder->ptBuffer) == 0) {
+        return QVS_ERROR_BAD_ARGUMENT;
+    }
+    if (qvsResult result = checkDocumentType(decoder)) {
+        return result;
+    }
+    return qvsClientProvWbxmlDecoderWbxmlBody(decoder, document);
+}
+
+// The document of a body; null with its failure traced.
+qvsResult readDocument(const uint8_t *data, uint32_t length, qvsWapDoc **document)
+{
+    qvsWbxmlDecoder *decoder = nullptr;
+    qvsResult result = qvsClientProvWbxmlInitDecoder(&decoder, data, length);
+    if (result != QVS_OK) {
+        trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlInitDecoder[0x%x]\n",
+              result);
+        return result;
+    }
+    result = qvsClientProvWbxmlDecoder(decoder, document);
+    if (result != QVS_OK) {
+        trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlDecoder[0x%x]\n", result);
+    }
+    (void)qvsClientProvWbxmlDeleteDecoder(decoder);
+    return result;
+}
+
+} // namespace
+
+qvsResult qvsClientProvWbxmlDecoderWbxmlHeader(qvsWbxmlDecoder *decoder, uint8_t *version,
+                                               uint32_t *publicId, uint32_t *charset)
+{
+    if (!qvsClientProvWbxmlDecoderBufferReadByte(decoder, version)) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    if (!qvsClientProvWbxmlDecoderBufferReadUint32(decoder, publicId)) {
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    uint32_t index = 0;
+    if (*publicId == 0 && !qvsClientProvWbxmlDecoderBufferReadUint32(decoder, &index)) {
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    if (!qvsClientProvWbxmlDecoderBufferReadUint32(decoder, charset)) {
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    // kept[table-failure-ignored]: a table that could not be read is known by its length alone.
+    decoder->nStrSize = static_cast<uint32_t>(
+        qvsClientProvWbxmlDecoderMakeStrTable(decoder, &decoder->pStringTable));
+    return QVS_OK;
+}
+
+qvsResult qvsClientProvWbxmlDecoder(qvsWbxmlDecoder *decoder, qvsWapDoc **document)
+{
+    const qvsResult result = decode(decoder, document);
+    traceError(result);
+    return result;
+}
+
+qvsClientProvCtx *qvsClinetProvWbxmlDecoderMain(const uint8_t *data, uint32_t length)
+{
+    qvsWapDoc *document = nullptr;
+    qvsClientProvCtx *context = nullptr;
+    if (readDocument(data, length, &document) == QVS_OK) {
+        context = qvsClientProvCtxMakeContext(document);
+        if (context) {
+            trace("Success");
+        } else {
+            trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvCtxMakeContext[0x%x]\n", 0);
+        }
+    }
+    (void)qvsClientProvWbxmlDeleteWapDoc(document);
+    if (!context) {
+        qvsClientProvCtxDelectContext(nullptr);
+    }
+    return context;
+}

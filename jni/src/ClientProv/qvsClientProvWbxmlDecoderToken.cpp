@@ -1,0 +1,309 @@
+// The tokens of a body: elements, attributes, code pages, values in any encoding, and what is
+// skipped. Global tokens are those of WBXML 1.x.
+#include "qvsClientProvWbxmlDecoder.h"
+#include "qvsText.h"
+#include "qvsTokens.h"
+#include "qvstrace.h"
+
+using namespace qvs;
+
+namespace {
+
+constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
+
+// The byte in front of the one read last; 0 in front of the first.
+uint8_t byteBefore(const qvsWbxmlDecoder *decoder)
+{
+    const smlBuffer *buffer = decoder->ptBuffer;
+    return buffer->pHead - buffer->pStorage >= 2 ? buffer->pHead[-2] : 0;
+}
+
+// A token that stands for no text: as a text of that one byte, or skipped with what follows.
+qvsResult unknownValue(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
+{
+    if (token < 0x80) {
+        trace("WARNING!!!!!!!! Not Support Type Numberic nTag=[%x]", byteBefore(decoder));
+        stepBack(decoder);
+        return qvsClientProvWbxmlDecoderSkipElement(decoder);
+    }
+    char *block = static_cast<char *>(qvsMemAlloc_debug(2, kModule, __LINE__));
+    if (!block) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    block[0] = static_cast<char>(token);
+    block[1] = '\0';
+    // kept[unknown-token-replaces]: the token takes the place of a text that was there, which
+    // stays allocated.
+    text->data = block;
+    text->length = 1;
+    text->capacity = 2;
+    return QVS_OK;
+}
+
+qvsResult readValue(qvsWbxmlDecoder *decoder, Text *text)
+{
+    uint8_t token = 0;
+    if (!takeByte(decoder, &token)) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    if (wbxml::isString(token)) {
+        return getString(decoder, text) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+    }
+    if (token == wbxml::kOpaque) {
+        uint32_t length = 0;
+        return getStrExtension(decoder, token, text, &length) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+    }
+    if (getParamTokenVal(decoder, token, text) == QVS_OK) {
+        return QVS_OK;
+    }
+    return unknownValue(decoder, token, text);
+}
+
+// Skips one value of any encoding.
+qvsResult skipValue(qvsWbxmlDecoder *decoder)
+{
+    stepBack(decoder);
+    Text scratch;
+    return content(decoder, &scratch);
+}
+
+} // namespace
+
+bool qvs::getString(qvsWbxmlDecoder *decoder, Text *text)
+{
+    stepBack(decoder);
+    for (;;) {
+        uint8_t token = 0;
+        if (!takeByte(decoder, &token)) {
+            return false;
+        }
+        bool joined = false;
+        switch (token) {
+        case wbxml::kStrI:
+            joined = getStr(decoder, text);
+            break;
+        case wbxml::kStrT:
+            joined = getStrTable(decoder, text);
+            break;
+        case wbxml::kEnd:
+        case attr::kValue:
+            stepBack(decoder);
+            return true;
+        default:
+            joined = getParamTokenVal(decoder, token, text) == QVS_OK;
+            break;
+        }
+        if (!joined) {
+            return false;
+        }
+    }
+}
+
+qvsResult qvs::content(qvsWbxmlDecoder *decoder, Text *text)
+{
+    qvsResult result = readValue(decoder, text);
+    if (decoder && decoder->bTextLimit) {
+        result = QVS_ERROR_NO_MEMORY;
+    }
+    trace("qvsClientProvWbxmlDecoderContent Error:%d", static_cast<int>(result));
+    return result;
+}
+
+qvsResult qvsClientProvWbxmlDecoderReadElement(qvsWbxmlDecoder *decoder, uint8_t *tag)
+{
+    uint8_t byte = 0;
+    if (!takeByte(decoder, &byte)) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    decoder->nHasContent = (byte & wbxml::kHasContent) ? 1 : 0;
+    decoder->nHasAttr = (byte & wbxml::kHasAttr) ? 1 : 0;
+    *tag = byte & wbxml::kTagMask;
+    return QVS_OK;
+}
+
+qvsResult qvsClientProvWbxmlDecoderCurElement(qvsWbxmlDecoder *decoder, uint8_t *tag)
+{
+    uint8_t byte = 0;
+    if (!peekByte(decoder, &byte)) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    *tag = byte & wbxml::kTagMask;
+    return QVS_OK;
+}
+
+qvsResult qvsClientProvWbxmlDecoderCurElementNotAND(qvsWbxmlDecoder *decoder, uint8_t *byte)
+{
+    return peekByte(decoder, byte) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+}
+
+qvsResult qvsClientProvWbxmlDecoderCheckElement(qvsWbxmlDecoder *decoder, uint8_t tag)
+{
+    if (!decoder) {
+        trace("[Error] [qvsClientProvWbxmlDecoderCheckElement] ptWbxmlDecoder NULL");
+        return QVS_ERROR_FAILED;
+    }
+    uint8_t read = 0;
+    if (qvsResult result = qvsClientProvWbxmlDecoderReadElement(decoder, &read)) {
+        return result;
+    }
+    if (read != tag) {
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    uint8_t next = 0;
+    if (!decoder->nHasContent && peekByte(decoder, &next) &&
+        (next & wbxml::kTagMask) == wbxml::kEnd) {
+        (void)takeByte(decoder, &next);
+    }
+    return QVS_OK;
+}
+
+qvsResult qvsClientProvWbxmlDecoderElement(qvsWbxmlDecoder *decoder, uint8_t tag, char **text)
+{
+    if (qvsResult result = qvsClientProvWbxmlDecoderCheckElement(decoder, tag)) {
+        return result;
+    }
+    if (!decoder->nHasContent) {
+        return QVS_OK;
+    }
+    if (qvsResult result = qvsClientProvWbxmlDecoderContent(decoder, text)) {
+        return result;
+    }
+    uint8_t end = 0;
+    const bool ended = takeByte(decoder, &end) && end == wbxml::kEnd;
+    return ended ? QVS_OK : QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+}
+
+qvsResult qvsClientProvWbxmlDecoderReadAttr(qvsWbxmlDecoder *decoder, uint8_t *byte)
+{
+    return takeByte(decoder, byte) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+}
+
+qvsResult qvsClientProvWbxmlDecoderCurAttr(qvsWbxmlDecoder *decoder, uint8_t *byte)
+{
+    return peekByte(decoder, byte) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+}
+
+qvsResult qvsClientProvWbxmlDecoderCheckAttr(qvsWbxmlDecoder *decoder, uint8_t token)
+{
+    uint8_t read = 0;
+    if (qvsResult result = qvsClientProvWbxmlDecoderReadAttr(decoder, &read)) {
+        return result;
+    }
+    if (read != token) {
+        trace("nId:%x, nTemp:%x", token, read);
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    return QVS_OK;
+}
+
+qvsResult qvsClientProvWbxmlDecoderCheckAttrVersion(qvsWbxmlDecoder *decoder)
+{
+    uint8_t read = 0;
+    if (qvsResult result = qvsClientProvWbxmlDecoderReadAttr(decoder, &read)) {
+        return result;
+    }
+    if (read != attr::kVersion && read != attr::kVersion10) {
+        trace("[Error] [qvsClientProvWbxmlDecoderCheckAttrVersion] nId [0x%x]", read);
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    return QVS_OK;
+}
+
+qvsResult qvsClientProvWbxmlDecoderAttributeWapDocVersion(qvsWbxmlDecoder *decoder)
+{
+    if (qvsResult result = qvsClientProvWbxmlDecoderCheckAttrVersion(decoder)) {
+        return result;
+    }
+    uint8_t next = 0;
+    if (qvsResult result = qvsClientProvWbxmlDecoderCurElement(decoder, &next)) {
+        return result;
+    }
+    if (next != wbxml::kEnd && next != wbxml::kStrI) {
+        trace("Tag Code = QVS_ERROR_WBXML_UNKNOWN_ELEMENT");
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    // kept[version-skip-ignored]: attributes that do not end are noticed by whoever reads next.
+    (void)qvsClientProvWbxmlDecoderSkipAttribute(decoder);
+    return QVS_OK;
+}
+
+qvsResult qvsClientProvWbxmlDecoderSkipAttribute(qvsWbxmlDecoder *decoder)
+{
+    uint8_t token = 0;
+    while (takeByte(decoder, &token)) {
+        if (token == wbxml::kEnd || token == wbxml::kLiteral || token == wbxml::kExtI0) {
+            return QVS_OK;
+        }
+    }
+    return QVS_ERROR_WBXML_NO_DATA;
+}
+
+qvsResult qvsClientProvWbxmlDecoderCheckCodePage(qvsWbxmlDecoder *decoder)
+{
+    // kept[page-masked]: both bytes are read as element tokens: the first is not verified, the page
+    // is masked, and the flags of the decoder become those of the page byte.
+    uint8_t page = 0;
+    if (qvsClientProvWbxmlDecoderReadElement(decoder, &page) != QVS_OK ||
+        qvsClientProvWbxmlDecoderReadElement(decoder, &page) != QVS_OK) {
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    switch (page) {
+    case 0:
+        trace("QVS_WBXML_TAG_SWITCH_PAGE0");
+        break;
+    case 1:
+        trace("QVS_WBXML_TAG_SWITCH_PAGE1");
+        break;
+    default:
+        trace("ERROR::QVS_CODE_PAGE_UNKNOWN");
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    decoder->nCodePage = page;
+    return QVS_OK;
+}
+
+qvsResult qvsClientProvWbxmlDecoderContent(qvsWbxmlDecoder *decoder, char **text)
+{
+    Text built(*text);
+    const qvsResult result = content(decoder, &built);
+    *text = built.take();
+    return result;
+}
+
+uint32_t qvsClientProvWbxmlDecoderGetString(qvsWbxmlDecoder *decoder, char **text)
+{
+    Text built(*text);
+    const bool read = getString(decoder, &built);
+    *text = built.take();
+    return read ? 1 : 0;
+}
+
+qvsResult qvsClientProvWbxmlDecoderSkipElement(qvsWbxmlDecoder *decoder)
+{
+    // kept[skip-counts-tokens]: every token that is no string and no END counts as one level, tags,
+    // attribute starts and value tokens alike; an END outside them counts below zero.
+    int64_t depth = 0;
+    for (;;) {
+        uint8_t token = 0;
+        if (!takeByte(decoder, &token)) {
+            trace("qvsClientProvWbxmlDecoderSkipElement Error Code:%d",
+                  static_cast<int>(QVS_ERROR_WBXML_NO_DATA));
+            return QVS_ERROR_WBXML_NO_DATA;
+        }
+        if (token == wbxml::kSwitchPage) {
+            (void)takeByte(decoder, &token);
+        } else if (token == wbxml::kEnd) {
+            --depth;
+            if (depth == 0) {
+                stepBack(decoder); // kept[skip-end-left]: the closing END is left for the caller.
+                return QVS_OK;
+            }
+        } else if (wbxml::isString(token) || token == wbxml::kOpaque) {
+            if (qvsResult result = skipValue(decoder)) {
+                return result;
+            }
+        } else {
+            ++depth;
+        }
+    }
+}
