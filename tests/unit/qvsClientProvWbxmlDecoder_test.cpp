@@ -1,0 +1,252 @@
+// The decoder's entry: WBXML header, document type, and the way from bytes to a context.
+#include "blocks.h"
+#include "decoding.h"
+#include "message.h"
+#include "traces.h"
+
+using decoding::Bytes;
+using decoding::Decoder;
+
+namespace {
+
+constexpr char kType[] = "-//WAPFORUM//DTD PROV 1.0//EN";
+
+class Header : public blocks::BlockTest {};
+class Decode : public blocks::BlockTest {};
+class DecoderMain : public blocks::BlockTest {};
+
+struct HeaderItems {
+    qvsResult result = 0;
+    uint8_t version = 0;
+    uint32_t publicId = 0;
+    uint32_t charset = 0;
+};
+
+HeaderItems readHeader(qvsWbxmlDecoder *decoder)
+{
+    HeaderItems items;
+    items.result = qvsClientProvWbxmlDecoderWbxmlHeader(decoder, &items.version, &items.publicId,
+                                                        &items.charset);
+    return items;
+}
+
+// The result of a whole decode of `bytes`.
+qvsResult decode(const Bytes &bytes)
+{
+    Decoder decoder(bytes);
+    qvsWapDoc *document = nullptr;
+    const qvsResult result = qvsClientProvWbxmlDecoder(decoder, &document);
+    EXPECT_TRUE(result == QVS_OK || !document);
+    (void)qvsClientProvWbxmlDeleteWapDoc(document);
+    return result;
+}
+
+// A header whose document type is given by the string table `table`, and an empty document.
+Bytes typedByTable(const std::string &table, uint8_t index = 0)
+{
+    Bytes bytes = {0x03, 0x00, index, 0x6A, static_cast<uint8_t>(table.size())};
+    bytes.insert(bytes.end(), table.begin(), table.end());
+    bytes.insert(bytes.end(), {0x45, 0x01});
+    return bytes;
+}
+
+qvsClientProvCtx *decodeMain(const Bytes &bytes)
+{
+    return qvsClinetProvWbxmlDecoderMain(bytes.data(), static_cast<uint32_t>(bytes.size()));
+}
+
+} // namespace
+
+TEST_F(Header, ReadsItsItemsInOrder)
+{
+    Decoder decoder({0x02, 0x0B, 0x6A, 0x02, 'a', 'b', 0x45});
+    const HeaderItems items = readHeader(decoder);
+    EXPECT_EQ(items.result, QVS_OK);
+    EXPECT_EQ(items.version, 2);
+    EXPECT_EQ(items.publicId, 11U);
+    EXPECT_EQ(items.charset, 0x6AU);
+    EXPECT_EQ(decoder->nStrSize, 2U);
+    EXPECT_STREQ(decoder->pStringTable, "ab");
+    EXPECT_EQ(decoder.position(), 6U);
+}
+
+TEST_F(Header, ReadsAnIndexBehindPublicIdentifierZeroAlone)
+{
+    Decoder decoder({0x03, 0x00, 0x85, 0x05, 0x6A, 0x00});
+    const HeaderItems items = readHeader(decoder);
+    EXPECT_EQ(items.result, QVS_OK);
+    EXPECT_EQ(items.publicId, 0U);
+    EXPECT_EQ(items.charset, 0x6AU);
+    EXPECT_EQ(decoder->nStrSize, 0U);
+    ASSERT_NE(decoder->pStringTable, nullptr);
+    EXPECT_EQ(decoder->pStringTable[0], 0);
+    EXPECT_EQ(decoder->pStringTable[1], 0);
+}
+
+TEST_F(Header, EndsWhereAnItemCannotBeRead)
+{
+    const struct {
+        Bytes bytes;
+        qvsResult result;
+        uint32_t publicId;
+    } cases[] = {
+        {{}, 4103, 0},
+        {{0x03}, 4101, 0},
+        {{0x03, 0x80, 0x80, 0x80, 0x80, 0x80}, 4101, 0},
+        {{0x03, 0x00}, 4101, 0},
+        {{0x03, 0x00, 0x00}, 4101, 0},
+        {{0x03, 0x0B}, 4101, 11},
+    };
+    for (const auto &cut : cases) {
+        Decoder decoder(cut.bytes);
+        const HeaderItems items = readHeader(decoder);
+        EXPECT_EQ(items.result, cut.result);
+        EXPECT_EQ(items.publicId, cut.publicId);
+        EXPECT_EQ(decoder->pStringTable, nullptr);
+        EXPECT_EQ(decoder->nStrSize, 0U);
+    }
+}
+
+TEST(Kept, table_failure_ignored)
+{
+    blocks::BlockCheck check;
+    Decoder missing({0x03, 0x0B, 0x6A});
+    EXPECT_EQ(readHeader(missing).result, QVS_OK);
+    EXPECT_EQ(missing->nStrSize, 0xFFFFFFFFU);
+    EXPECT_EQ(missing->pStringTable, nullptr);
+    Decoder cut({0x03, 0x0B, 0x6A, 0x05, 'a'});
+    EXPECT_EQ(readHeader(cut).result, QVS_OK);
+    EXPECT_EQ(cut->nStrSize, 0xFFFFFFFFU);
+    EXPECT_STREQ(cut->pStringTable, "a");
+}
+
+TEST_F(Decode, RefusesNothingToDecode)
+{
+    Traces traces;
+    qvsWapDoc *document = nullptr;
+    EXPECT_EQ(qvsClientProvWbxmlDecoder(nullptr, &document), 2U);
+    EXPECT_EQ(traces.texts, std::vector<std::string>{"[Syncml] ERROR : 2\n"});
+    qvsWbxmlDecoder noBuffer = {};
+    EXPECT_EQ(qvsClientProvWbxmlDecoder(&noBuffer, &document), 2U);
+    EXPECT_EQ(decode({}), 2U);
+    EXPECT_EQ(document, nullptr);
+}
+
+TEST_F(Decode, AcceptsPublicIdentifierElevenWithAnyTable)
+{
+    EXPECT_EQ(decode({0x03, 0x0B, 0x6A, 0x00, 0x45, 0x01}), QVS_OK);
+    EXPECT_EQ(decode({0xFF, 0x0B, 0x03, 0x02, 'a', 'b', 0x45, 0x01}), QVS_OK);
+}
+
+TEST_F(Decode, RefusesAnotherPublicIdentifierWhateverTheTableNames)
+{
+    Traces traces;
+    Bytes bytes = {0x03, 0x01, 0x6A, sizeof(kType)};
+    bytes.insert(bytes.end(), kType, kType + sizeof(kType));
+    bytes.insert(bytes.end(), {0x45, 0x01});
+    EXPECT_EQ(decode(bytes), 4107U);
+    EXPECT_TRUE(traces.has("ERROR : qvsClientProvWbxmlDecoder Difference Ver!!\n\n"));
+    EXPECT_TRUE(traces.has("[Syncml] ERROR : DM = fffff00b\n")) << "4107 less 8192";
+}
+
+TEST_F(Decode, ComparesATypeGivenByTextExactly)
+{
+    const std::string type = kType;
+    EXPECT_EQ(decode(typedByTable(type + '\0')), QVS_OK);
+    EXPECT_EQ(decode(typedByTable(type)), QVS_OK) << "the table's own terminator will do";
+    EXPECT_EQ(decode(typedByTable(type + '\0' + "more")), QVS_OK);
+    EXPECT_EQ(decode(typedByTable("-//wapforum//dtd prov 1.0//en" + std::string(1, '\0'))), 4107U);
+    EXPECT_EQ(decode(typedByTable(type + "x" + '\0')), 4107U);
+    EXPECT_EQ(decode(typedByTable(type.substr(1))), 4107U);
+    EXPECT_EQ(decode(typedByTable("")), 4107U);
+}
+
+TEST(Kept, public_id_index)
+{
+    EXPECT_EQ(decode(typedByTable(std::string("x\0", 2) + kType, 2)), 4107U);
+    EXPECT_EQ(decode(typedByTable(kType, 77)), QVS_OK);
+}
+
+TEST(Kept, header_ignored)
+{
+    // Only a version byte: public identifier 0 and no table to compare.
+    EXPECT_EQ(decode({0x03}), 4107U);
+    // The charset is missing, the document type is known: the body is empty.
+    EXPECT_EQ(decode({0x03, 0x0B}), 4103U);
+    // The charset does not end; what follows it is taken for the body.
+    EXPECT_EQ(decode({0x03, 0x0B, 0x80, 0x80, 0x80, 0x80, 0x80, 0x45, 0x01}), QVS_OK);
+}
+
+TEST_F(Decode, NeedsTheTypeToBeReadBeforeTheTableIsCutOff)
+{
+    Bytes bytes = typedByTable(std::string(kType) + '\0');
+    bytes.resize(5 + 10);
+    EXPECT_EQ(decode(bytes), 4107U);
+}
+
+TEST_F(DecoderMain, MakesAContextAndReleasesAllElse)
+{
+    message::Body body;
+    body.characteristic(message::kNapDef, [&] { body.parm(message::kNapId, "n1"); });
+    Traces traces;
+    qvsClientProvCtx *context = decodeMain(message::document(body));
+    ASSERT_NE(context, nullptr);
+    ASSERT_NE(context->ptNapDef, nullptr);
+    EXPECT_STREQ(context->ptNapDef->pszNapId, "n1");
+    EXPECT_TRUE(traces.has("Success\n"));
+    qvsClientProvCtxDelectContext(context);
+}
+
+TEST_F(DecoderMain, AnswersNullWithItsStepTraced)
+{
+    {
+        Traces traces;
+        EXPECT_EQ(qvsClinetProvWbxmlDecoderMain(nullptr, 5), nullptr);
+        EXPECT_TRUE(traces.has("ERROR : qvsClinetProvWbxmlDecoderMain "
+                               "qvsClientProvWbxmlInitDecoder[0x2]\n\n"));
+    }
+    {
+        Traces traces;
+        EXPECT_EQ(decodeMain({0x03, 0x0B, 0x6A, 0x00, 0x45, 0x47}), nullptr);
+        EXPECT_TRUE(traces.has(
+            "ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlDecoder[0x1005]\n\n"))
+            << "a parm outside a characteristic";
+    }
+    {
+        // A document without a list of characteristics makes no context.
+        Traces traces;
+        EXPECT_EQ(decodeMain({0x03, 0x0B, 0x6A, 0x00, 0x45, 0x01}), nullptr);
+        EXPECT_TRUE(traces.has(
+            "ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvCtxMakeContext[0x0]\n\n"));
+    }
+    EXPECT_EQ(decodeMain({0x03, 0x0B, 0x6A, 0x00, 0x01}), nullptr) << "no document at all";
+    static const uint8_t byte = 3;
+    EXPECT_EQ(qvsClinetProvWbxmlDecoderMain(&byte, 0), nullptr);
+}
+
+TEST_F(DecoderMain, LeavesTheBytesAloneAndKeepsNoPointerIntoThem)
+{
+    message::Body body;
+    body.characteristic(message::kNapDef, [&] { body.parm(message::kNapId, "n1"); });
+    const Bytes original = message::document(body);
+    Bytes bytes = original;
+    qvsClientProvCtx *context = decodeMain(bytes);
+    ASSERT_NE(context, nullptr);
+    EXPECT_EQ(bytes, original);
+    bytes.assign(bytes.size(), 0xEE);
+    EXPECT_STREQ(context->ptNapDef->pszNapId, "n1");
+    qvsClientProvCtxDelectContext(context);
+}
+
+TEST_F(DecoderMain, SurvivesEveryFailingAllocation)
+{
+    message::Body body;
+    body.characteristic(message::kPxLogical, [&] {
+        body.parm(message::kProxyId, "p1").parm(message::kDomain, "d1");
+        body.characteristic(message::kPort, [&] { body.parm(message::kPortNbr, "80"); });
+    });
+    const Bytes bytes = message::document(body);
+    const auto attempt = [&] { qvsClientProvCtxDelectContext(decodeMain(bytes)); };
+    EXPECT_GT(blocks::failEach(attempt), 20);
+    EXPECT_GT(blocks::failEachFrom(attempt), 20);
+}
