@@ -119,4 +119,17 @@ QVS_API void qvsStrBinaryDump(char *out, const uint8_t *data, uint32_t len);
 
 QVS_END_DECLS
 
+#ifdef __cplusplus
+namespace [[gnu::visibility("hidden")]] qvs {
+
+// Bytes in a full line of a dump.
+constexpr uint32_t kDumpColumns = 16;
+
+// One line of a dump: the hexadecimal digits of `count` bytes, the gap, their printable
+// characters. Returns the position of the NUL behind it.
+char *dumpLine(char *out, const uint8_t *data, uint32_t count, const char *gap);
+
+} // namespace qvs
+#endif
+
 #endif

@@ -1,0 +1,307 @@
+// The list: every walk is a loop, and the last node is remembered.
+#include "qvslist.h"
+
+#include "qvsmemory.h"
+
+namespace {
+
+constexpr char kModule[] = "jni/src/ClientProv/qvslist";
+
+qvsListNode *newNode(void *item)
+{
+    qvsListNode *node = qvs::newRecord<qvsListNode>(kModule);
+    if (node) {
+        node->pItem = item;
+    }
+    return node;
+}
+
+void releaseItem(void *item, qvsListFree freeItem)
+{
+    if (!item || freeItem == QVS_LIST_KEEP_ITEMS) {
+        return;
+    }
+    if (freeItem) {
+        freeItem(item);
+    } else {
+        qvsMemFree_debug(item);
+    }
+}
+
+// The last node; null when the list is empty. The walk is for a list put together by hand.
+qvsListNode *lastNode(const qvsList *list)
+{
+    if (!list->ptFirst) {
+        return nullptr;
+    }
+    qvsListNode *node = list->ptTail ? list->ptTail : list->ptFirst;
+    while (node->ptNext) {
+        node = node->ptNext;
+    }
+    return node;
+}
+
+// Takes `node` out of the chain. `before` is its predecessor; without one, its successor becomes
+// the first node.
+void unlink(qvsList *list, qvsListNode *before, const qvsListNode *node)
+{
+    if (before) {
+        before->ptNext = node->ptNext;
+    } else {
+        list->ptFirst = node->ptNext;
+    }
+    if (!node->ptNext || list->ptTail == node) {
+        list->ptTail = before;
+    }
+}
+
+// Releases a node that was taken out, and moves a cursor that stood on it on.
+void releaseNode(qvsList *list, qvsListNode *node)
+{
+    if (list->ptCursor == node) {
+        list->ptCursor = node->ptNext;
+    }
+    qvsMemFree_debug(node);
+    --list->nCount;
+}
+
+// The node at `index`; null when the list has none.
+qvsListNode *nodeAt(const qvsList *list, uint32_t index)
+{
+    if (index >= list->nCount) {
+        return nullptr;
+    }
+    // hardened: a chain that is shorter than the count has no node behind its end.
+    qvsListNode *node = list->ptFirst;
+    for (; node && index > 0; --index) {
+        node = node->ptNext;
+    }
+    return node;
+}
+
+} // namespace
+
+qvsResult qvsListCreate(qvsList **list, void *item)
+{
+    *list = nullptr;
+    qvsList *made = qvs::newRecord<qvsList>(kModule);
+    if (!made) {
+        return QVS_ERROR_LIST_NO_MEMORY;
+    }
+    if (item) {
+        if (qvsResult result = qvsListAddNodeLast(made, item)) {
+            qvsMemFree_debug(made);
+            return result;
+        }
+    }
+    *list = made;
+    return QVS_OK;
+}
+
+qvsResult qvsListAddNodeLast(qvsList *list, void *item)
+{
+    if (!list || !item) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    qvsListNode *node = newNode(item);
+    if (!node) {
+        return QVS_ERROR_LIST_NO_MEMORY;
+    }
+    if (qvsListNode *last = lastNode(list)) {
+        last->ptNext = node;
+        ++list->nCount;
+    } else {
+        list->ptFirst = node;
+        list->nCount = 1;
+    }
+    list->ptTail = node;
+    return QVS_OK;
+}
+
+qvsResult qvsListAddNodeFirst(qvsList *list, void *item)
+{
+    if (!list || !item) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    qvsListNode *node = newNode(item);
+    if (!node) {
+        return QVS_ERROR_LIST_NO_MEMORY;
+    }
+    if (list->ptFirst) {
+        node->ptNext = list->ptFirst;
+        ++list->nCount;
+    } else {
+        list->ptTail = node;
+        list->nCount = 1;
+    }
+    list->ptFirst = node;
+    return QVS_OK;
+}
+
+qvsResult qvsListDeleteNodeFindItem(qvsList *list, void *item, qvsListFree freeItem)
+{
+    if (!list) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    qvsListNode *before = nullptr;
+    qvsListNode *node = list->ptFirst;
+    while (node && node->pItem != item) {
+        before = node;
+        node = node->ptNext;
+    }
+    if (!node) {
+        return QVS_ERROR_LIST_NOT_FOUND;
+    }
+    unlink(list, before, node);
+    releaseItem(node->pItem, freeItem);
+    releaseNode(list, node);
+    return QVS_OK;
+}
+
+qvsResult qvsListDeleteNodeFirst(qvsList *list, qvsListFree freeItem)
+{
+    if (!list) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    qvsListNode *node = list->ptFirst;
+    if (!node) {
+        return QVS_OK;
+    }
+    unlink(list, nullptr, node);
+    releaseItem(node->pItem, freeItem);
+    // kept[list-first-cursor]: a cursor on the node stays where it is.
+    qvsMemFree_debug(node);
+    --list->nCount;
+    return QVS_OK;
+}
+
+qvsResult qvsListDeleteNodeAll(qvsList *list, qvsListFree freeItem)
+{
+    if (!list) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    qvsListNode *node = list->ptFirst;
+    while (node) {
+        qvsListNode *next = node->ptNext;
+        releaseItem(node->pItem, freeItem);
+        qvsMemFree_debug(node);
+        node = next;
+    }
+    *list = {};
+    return QVS_OK;
+}
+
+qvsResult qvsListDeleteNodeAllAndList(qvsList *list, qvsListFree freeItem)
+{
+    const qvsResult result = qvsListDeleteNodeAll(list, freeItem);
+    qvsMemFree_debug(list);
+    return result;
+}
+
+qvsResult qvsListSetCurNodeFirst(qvsList *list)
+{
+    if (!list) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    list->ptCursor = list->ptFirst;
+    return QVS_OK;
+}
+
+qvsResult qvsListGetItemNext(qvsList *list, void **item)
+{
+    *item = nullptr;
+    if (!list) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    if (const qvsListNode *node = list->ptCursor) {
+        *item = node->pItem;
+        list->ptCursor = node->ptNext;
+    }
+    return QVS_OK;
+}
+
+qvsResult qvsListGetItemFirst(qvsList *list, void **item)
+{
+    if (!list) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    *item = list->ptFirst ? list->ptFirst->pItem : nullptr;
+    return QVS_OK;
+}
+
+qvsResult qvsListGetItemFirstAndDeleteNode(qvsList *list, void **item)
+{
+    *item = nullptr;
+    if (!list) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    if (qvsListNode *node = list->ptFirst) {
+        *item = node->pItem;
+        unlink(list, nullptr, node);
+        releaseNode(list, node);
+    }
+    return QVS_OK;
+}
+
+qvsResult qvsListGetItemNextAndDeleteNode(qvsList *list, void **item)
+{
+    if (!list) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    *item = nullptr;
+    qvsListNode *node = list->ptCursor;
+    if (!list->ptFirst || !node) {
+        return QVS_OK;
+    }
+    qvsListNode *before = nullptr;
+    if (node != list->ptFirst) {
+        // kept[list-stray-cursor]: a cursor's node that is not in the list takes the list along:
+        // its successor becomes the first node.
+        before = list->ptFirst;
+        while (before && before->ptNext != node) {
+            before = before->ptNext;
+        }
+        if (!before) {
+            list->ptTail = nullptr;
+        }
+    }
+    *item = node->pItem;
+    unlink(list, before, node);
+    releaseNode(list, node);
+    return QVS_OK;
+}
+
+qvsResult qvsListGetItemIndex(qvsList *list, void **item, uint32_t index)
+{
+    if (!list) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    const qvsListNode *node = nodeAt(list, index);
+    *item = node ? node->pItem : nullptr;
+    if (!node) {
+        return QVS_ERROR_LIST_NOT_FOUND;
+    }
+    return QVS_OK;
+}
+
+qvsResult qvsListGetItemIndexAndDeleteNode(qvsList *list, void **item, uint32_t index)
+{
+    if (!list) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    qvsListNode *node = nodeAt(list, index);
+    *item = node ? node->pItem : nullptr;
+    if (!node) {
+        return QVS_ERROR_LIST_NOT_FOUND;
+    }
+    // kept[list-index-delete]: the nodes before this one leave the list and stay allocated.
+    unlink(list, nullptr, node);
+    // hardened: a cursor on the node moves to the next one.
+    releaseNode(list, node);
+    return QVS_OK;
+}
+
+uint32_t qvsListGetCount(const qvsList *list)
+{
+    return list->nCount;
+}

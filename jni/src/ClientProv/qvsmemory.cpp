@@ -1,0 +1,215 @@
+// Heap blocks with their tracking table, and plain memory operations over the C library's.
+#include "qvsmemory.h"
+
+#include <stdio.h>
+#include <stdlib.h>
+#include <string.h>
+
+namespace {
+
+// One block in use; free while the address is null.
+struct Entry {
+    void *address;
+    uint32_t size;
+    const char *file;
+    int line;
+};
+
+constexpr uint32_t kEntries = 2000;
+
+static_assert(sizeof(void *) != 4 || kEntries * sizeof(Entry) == 32000);
+
+// A text handed to the Java VM may end in a cut multi-byte sequence, which leads its reader up to
+// four bytes behind the terminator.
+constexpr size_t kSpareZeros = 4;
+
+Entry *entries; // null while tracking is off
+
+// Free entries are those of the address null.
+Entry *findEntry(const void *address)
+{
+    for (Entry *entry = entries; entry != entries + kEntries; ++entry) {
+        if (entry->address == address) {
+            return entry;
+        }
+    }
+    return nullptr;
+}
+
+void remember(void *block, uint32_t size, const char *file, int line)
+{
+    Entry *entry = findEntry(nullptr);
+    if (!entry) {
+        puts("[syncml] MEMCHECK Not Found Empty Index");
+        return;
+    }
+    *entry = {block, size, file, line};
+}
+
+void forget(const void *block)
+{
+    Entry *entry = findEntry(block);
+    if (!entry) {
+        puts("[syncml] MEMCHECK Not Found Address ");
+        return;
+    }
+    *entry = {};
+}
+
+// The block, remembered if there is one and tracking is on.
+template <class T>
+T *tracked(T *block, uint32_t size, const char *file, int line)
+{
+    if (entries && block) {
+        remember(block, size, file, line);
+    }
+    return block;
+}
+
+} // namespace
+
+void *qvsMemAlloc_debug(uint32_t size, const char *file, int line)
+{
+    return tracked(malloc(size), size, file, line);
+}
+
+void *qvsMemAllocSetZero_debug(uint32_t size, const char *file, int line)
+{
+    return tracked(calloc(1, size), size, file, line);
+}
+
+uint16_t *qvsMemAllocW_debug(uint32_t count, const char *file, int line)
+{
+    // hardened: a count whose bytes cannot be counted in 32 bits gives null.
+    if (count > UINT32_MAX / sizeof(uint16_t)) {
+        return nullptr;
+    }
+    uint16_t *block = static_cast<uint16_t *>(malloc(count * sizeof(uint16_t)));
+    // kept[memcheck-unit-count]: the size that is remembered is the count of units, not of bytes.
+    return tracked(block, count, file, line);
+}
+
+char *qvsStrdup_debug(const char *str, const char *file, int line)
+{
+    // hardened: the copy of nothing is null.
+    if (!str) {
+        return nullptr;
+    }
+    const size_t length = strlen(str);
+    char *block = static_cast<char *>(malloc(length + 1 + kSpareZeros));
+    if (!block) {
+        return nullptr;
+    }
+    memcpy(block, str, length);
+    // hardened: four zero bytes follow the terminator.
+    memset(block + length, 0, 1 + kSpareZeros);
+    // kept[memcheck-text-length]: the size that is remembered leaves the terminator out.
+    return tracked(block, static_cast<uint32_t>(length), file, line);
+}
+
+void *qvsMemDup_debug(const void *src, uint32_t size, const char *file, int line)
+{
+    // hardened: the copy of nothing is null.
+    if (!src) {
+        return nullptr;
+    }
+    void *block = malloc(size);
+    // hardened: without memory nothing is copied.
+    if (!block) {
+        return nullptr;
+    }
+    memcpy(block, src, size);
+    return tracked(block, size, file, line);
+}
+
+void *qvsMemReAlloc_debug(void *old, uint32_t newsize, const char *file, int line)
+{
+    // kept[realloc-to-nothing]: a size of 0 gives null and releases nothing.
+    if (!old || newsize == 0) {
+        return nullptr;
+    }
+    // hardened: without memory the old block stays as it is.
+    void *block = qvsMemDup_debug(old, newsize, file, line);
+    if (block) {
+        qvsMemFree_debug(old);
+    }
+    return block;
+}
+
+void qvsMemFree_debug(void *ptr)
+{
+    if (entries && ptr) {
+        forget(ptr);
+    }
+    free(ptr);
+}
+
+void qvsMemStartMemCheck(void)
+{
+    // hardened: a second start empties the table that is there.
+    if (entries) {
+        memset(entries, 0, kEntries * sizeof(Entry));
+        return;
+    }
+    // hardened: without a table tracking stays off.
+    entries = static_cast<Entry *>(calloc(kEntries, sizeof(Entry)));
+}
+
+void qvsMemEndMemCheck(void)
+{
+    if (!entries) {
+        return;
+    }
+    for (Entry *entry = entries; entry != entries + kEntries; ++entry) {
+        if (entry->address) {
+            // hardened: a caller without a path has an empty one.
+            const char *file = entry->file ? entry->file : "";
+            printf("[syncml] MEMCHECK Filename:%s Line:%d Size:%d \n", file, entry->line,
+                   static_cast<int>(entry->size));
+        }
+    }
+    free(entries);
+    entries = nullptr;
+}
+
+void *qvsMemSet(void *dst, int byte, uint32_t n)
+{
+    return memset(dst, byte, n);
+}
+
+void *qvsMemSetZero(void *dst, uint32_t n)
+{
+    return memset(dst, 0, n);
+}
+
+void *qvsMemCpy(void *dst, const void *src, uint32_t n)
+{
+    return memcpy(dst, src, n);
+}
+
+void *qvsMemMove(void *dst, const void *src, uint32_t n)
+{
+    return memmove(dst, src, n);
+}
+
+int qvsMemCmp(const void *a, const void *b, uint32_t n)
+{
+    return memcmp(a, b, n);
+}
+
+uint16_t *qvsMemSetW(uint16_t *dst, uint16_t unit, uint32_t n)
+{
+    for (uint32_t i = 0; i < n; ++i) {
+        dst[i] = unit;
+    }
+    return dst;
+}
+
+uint16_t *qvsMemCpyW(uint16_t *dst, const uint16_t *src, uint32_t n)
+{
+    if (!dst || !src) {
+        return nullptr;
+    }
+    memcpy(dst, src, size_t{n} * sizeof(uint16_t));
+    return dst;
+}

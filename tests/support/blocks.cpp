@@ -1,0 +1,138 @@
+// The wrapped heap functions. Built with -fno-builtin: at -O2 a compiler turns malloc and memset
+// into calloc.
+#include "blocks.h"
+
+#include <algorithm>
+#include <cstdint>
+#include <unordered_map>
+
+extern "C" {
+void *__real_malloc(std::size_t size);
+void *__real_calloc(std::size_t count, std::size_t size);
+void *__real_realloc(void *block, std::size_t size);
+void __real_free(void *block);
+}
+
+namespace blocks {
+
+long failAt = -1;
+bool failFromThenOn = false;
+
+namespace {
+
+// What is counted. Never destroyed: blocks are released until the very end of the program.
+struct Heap {
+    std::unordered_map<void *, std::size_t> sizes;
+    std::size_t bytes = 0;
+    std::size_t peak = 0;
+    std::size_t calls = 0;
+    std::size_t total = 0;
+    bool failing = false;
+};
+
+Heap &heap()
+{
+    static Heap *counted = new Heap;
+    return *counted;
+}
+
+bool fails()
+{
+    if (failAt >= 0) {
+        heap().failing = failAt-- == 0;
+        return heap().failing;
+    }
+    return heap().failing && failFromThenOn;
+}
+
+void *added(void *block, std::size_t size)
+{
+    if (block) {
+        heap().sizes[block] = size;
+        heap().bytes += size;
+        heap().peak = std::max(heap().peak, heap().bytes);
+        ++heap().calls;
+        heap().total += size;
+    }
+    return block;
+}
+
+// A block that was allocated elsewhere is none of ours.
+void removed(void *block)
+{
+    const auto known = heap().sizes.find(block);
+    if (known != heap().sizes.end()) {
+        heap().bytes -= known->second;
+        heap().sizes.erase(known);
+    }
+}
+
+} // namespace
+
+void reset()
+{
+    failAt = -1;
+    heap().failing = false;
+}
+
+std::size_t live()
+{
+    return heap().sizes.size();
+}
+
+std::size_t liveBytes()
+{
+    return heap().bytes;
+}
+
+std::size_t peakBytes()
+{
+    return heap().peak;
+}
+
+std::size_t allocations()
+{
+    return heap().calls;
+}
+
+std::size_t allocated()
+{
+    return heap().total;
+}
+
+void startCounting()
+{
+    heap().peak = heap().bytes;
+    heap().calls = 0;
+    heap().total = 0;
+}
+
+} // namespace blocks
+
+extern "C" {
+
+void *__wrap_malloc(std::size_t size)
+{
+    return blocks::fails() ? nullptr : blocks::added(__real_malloc(size), size);
+}
+
+void *__wrap_calloc(std::size_t count, std::size_t size)
+{
+    return blocks::fails() ? nullptr : blocks::added(__real_calloc(count, size), count * size);
+}
+
+void *__wrap_realloc(void *block, std::size_t size)
+{
+    if (blocks::fails()) {
+        return nullptr;
+    }
+    blocks::removed(block);
+    return blocks::added(__real_realloc(block, size), size);
+}
+
+void __wrap_free(void *block)
+{
+    blocks::removed(block);
+    __real_free(block);
+}
+}
