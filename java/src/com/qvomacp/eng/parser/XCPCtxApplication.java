@@ -1,0 +1,188 @@
+package com.qvomacp.eng.parser;
+
+/**
+ * The APPLICATION characteristics of the message, with their TO-PROXY, TO-NAPID, ADDR, APPADDR,
+ * APPAUTH, RESOURCE and ROAMING below them.
+ *
+ * <p>Parameter names used here: {@code application} counts the APPLICATION of the message, the
+ * others count within the characteristic before them. All count from 1.
+ */
+public class XCPCtxApplication {
+    /** Makes an object to call the natives on; it holds no state. */
+    public XCPCtxApplication() {}
+
+    /**
+     * Counts the APPLICATION of the message.
+     *
+     * @return their number
+     */
+    public native int qvomacp_GetPxApplicationCount();
+
+    /**
+     * Counts the TO-PROXY values of an application.
+     *
+     * @param application APPLICATION, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxToProxyCount(int application);
+
+    /**
+     * One TO-PROXY of an application.
+     *
+     * @param application APPLICATION, from 1
+     * @param proxy TO-PROXY of that application, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxToProxyData(int application, int proxy);
+
+    /**
+     * Counts the TO-NAPID values of an application.
+     *
+     * @param application APPLICATION, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxNapIdCount(int application);
+
+    /**
+     * One TO-NAPID of an application.
+     *
+     * @param application APPLICATION, from 1
+     * @param napId TO-NAPID of that application, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxNapIdData(int application, int napId);
+
+    /**
+     * Counts the ADDR values directly in an application.
+     *
+     * @param application APPLICATION, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxToAddrCount(int application);
+
+    /**
+     * One ADDR directly in an application.
+     *
+     * @param application APPLICATION, from 1
+     * @param address ADDR of that application, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxToAddrData(int application, int address);
+
+    /**
+     * Counts the APPADDR of an application.
+     *
+     * @param application APPLICATION, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxAppAddrCount(int application);
+
+    /**
+     * One APPADDR of an application.
+     *
+     * @param application APPLICATION, from 1
+     * @param appAddr APPADDR of that application, from 1
+     * @return 3 elements: 0 ADDR, 1 ADDRTYPE (the text as it is held), 2 always {@code null}; or
+     *     {@code null}
+     */
+    public native String[] qvomacp_GetPxAppAddrData(int application, int appAddr);
+
+    /**
+     * Counts the PORT of an APPADDR.
+     *
+     * @param application APPLICATION, from 1
+     * @param appAddr APPADDR of that application, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxAppPortCount(int application, int appAddr);
+
+    /**
+     * The PORTNBR of a port of an APPADDR.
+     *
+     * @param application APPLICATION, from 1
+     * @param appAddr APPADDR of that application, from 1
+     * @param port PORT of that APPADDR, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxAppPortData(int application, int appAddr, int port);
+
+    /**
+     * Counts the SERVICE values of a port of an APPADDR.
+     *
+     * @param application APPLICATION, from 1
+     * @param appAddr APPADDR of that application, from 1
+     * @param port PORT of that APPADDR, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxServiceCount(int application, int appAddr, int port);
+
+    /**
+     * One SERVICE of a port of an APPADDR. Unlike a proxy's port, this answers the text itself.
+     *
+     * @param application APPLICATION, from 1
+     * @param appAddr APPADDR of that application, from 1
+     * @param port PORT of that APPADDR, from 1
+     * @param service SERVICE of that port, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxServiceData(
+            int application, int appAddr, int port, int service);
+
+    /**
+     * Counts the APPAUTH of an application.
+     *
+     * @param application APPLICATION, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxAppAuthCount(int application);
+
+    /**
+     * One APPAUTH of an application.
+     *
+     * <p>Element 0 is {@code APPSRV} for that text (capitals only) and for its token,
+     * {@code CLIENT} for that text in any case, and {@code null} for everything else, the token of
+     * CLIENT included.
+     *
+     * @param application APPLICATION, from 1
+     * @param appAuth APPAUTH of that application, from 1
+     * @return 6 elements: 0 AAUTHLEVEL as a name, 1 AAUTHTYPE, 2 AAUTHNAME, 3 AAUTHSECRET, 4
+     *     AAUTHDATA, 5 always {@code null}; or {@code null}
+     */
+    public native String[] qvomacp_GetPxAppAuthData(int application, int appAuth);
+
+    /**
+     * Counts the RESOURCE of an application.
+     *
+     * @param application APPLICATION, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxResourceCount(int application);
+
+    /**
+     * One RESOURCE of an application.
+     *
+     * @param application APPLICATION, from 1
+     * @param resource RESOURCE of that application, from 1
+     * @return 9 elements: 0 URI, 1 NAME, 2 AACCEPT, 3 AAUTHTYPE, 4 AAUTHNAME, 5 AAUTHSECRET, 6
+     *     AAUTHDATA, 7 STARTPAGE (the text {@code startpage} when the message has it without a
+     *     value), 8 always {@code null}; or {@code null}
+     */
+    public native String[] qvomacp_GetPxResourceData(int application, int resource);
+
+    /**
+     * The parameters of an application.
+     *
+     * @param application APPLICATION, from 1
+     * @return 13 elements: 0 APPID, 1 PROVIDER-ID, 2 FROM, 3 NAME, 4 AACCEPT, 5 APROTOCOL, 6
+     *     INTERNET, 7 XCAP_AUID_DCS, 8 XCAP_AUID_PMS, 9 XCAP_AUID_CDMS, 10 XCAP_IMEI_HEADER, 11
+     *     XCAP_TID_HEADER, 12 always {@code null}; or {@code null}
+     */
+    public native String[] qvomacp_GetApplicationData(int application);
+
+    /**
+     * The first ROAMING of the first application. No other ROAMING can be reached.
+     *
+     * @return 3 elements: 0 SYNC-ALLOWED, 1 SYNC-DEFAULT, 2 always {@code null}; or {@code null}
+     */
+    public native String[] qvomacp_GetPxRoamingData();
+}

@@ -1,0 +1,14 @@
+package com.qvomacp.eng.parser;
+
+/** The CLIENTIDENTITY of the message. Only the first one of a message is kept. */
+public class XCPCtxClientIdentity {
+    /** Makes an object to call the natives on; it holds no state. */
+    public XCPCtxClientIdentity() {}
+
+    /**
+     * The CLIENT-ID of the CLIENTIDENTITY.
+     *
+     * @return its text; {@code null} when there is no CLIENTIDENTITY or it sets no CLIENT-ID
+     */
+    public native String qvomacp_GetPxClientIdentityData();
+}

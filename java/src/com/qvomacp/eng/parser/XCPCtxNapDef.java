@@ -1,0 +1,160 @@
+package com.qvomacp.eng.parser;
+
+/**
+ * The network access points of the message: its NAPDEF characteristics, with their DNS-ADDR,
+ * BEARER, NAPAUTHINFO and VALIDITY below them.
+ *
+ * <p>Parameter names used here: {@code napDef} counts the NAPDEF of the message, or those that
+ * {@link #qvomacp_SetPxNapDefIndex} has left; everything counts from 1.
+ */
+public class XCPCtxNapDef {
+    /** Makes an object to call the natives on; it holds no state. */
+    public XCPCtxNapDef() {}
+
+    /**
+     * Counts the NAPDEF of the message, from the one on that {@link #qvomacp_SetPxNapDefIndex} has
+     * made the first.
+     *
+     * @return their number
+     */
+    public native int qvomacp_GetPxNapDefCount();
+
+    /**
+     * Counts the DNS-ADDR values of an access point.
+     *
+     * @param napDef NAPDEF, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxDnsAddrCount(int napDef);
+
+    /**
+     * One DNS-ADDR of an access point.
+     *
+     * @param napDef NAPDEF, from 1
+     * @param address DNS-ADDR of that access point, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxDnsAddrData(int napDef, int address);
+
+    /**
+     * Makes another access point the first one. This is the only query that changes something.
+     *
+     * <p>Index 1 changes nothing. The access points in front of the new first one are lost until
+     * the next parse: every native of this class counts from the new first one, so that a second
+     * call with 2 moves on by one more. An index that finds nothing (0 and negative ones too)
+     * leaves no access point at all.
+     *
+     * @param napDef NAPDEF, from 1, counted from the present first one
+     */
+    public native void qvomacp_SetPxNapDefIndex(int napDef);
+
+    /**
+     * Counts the BEARER values of an access point.
+     *
+     * <p>Unlike its siblings, an index of 0 or below answers for the first access point.
+     *
+     * @param napDef NAPDEF, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxBearerCount(int napDef);
+
+    /**
+     * One BEARER of an access point, as a name.
+     *
+     * <p>A bearer that the message gives as a token answers the token's name, such as
+     * {@code GSM-GPRS}, or {@code Unkown Bearer} for a token that is none. A bearer that the
+     * message gives as text answers not that text but the NAP-ADDRESS of the access point.
+     *
+     * @param napDef NAPDEF, from 1
+     * @param bearer BEARER of that access point, from 1
+     * @return the name, or {@code null}
+     */
+    public native String qvomacp_GetPxBearerData(int napDef, int bearer);
+
+    /**
+     * Counts the NAPAUTHINFO of an access point.
+     *
+     * @param napDef NAPDEF, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxNapAuthInfoCount(int napDef);
+
+    /**
+     * One NAPAUTHINFO of an access point.
+     *
+     * <p>Element 0 is one of {@code PAP}, {@code CHAP}, {@code HTTP-BASIC}, {@code HTTP-DIGEST},
+     * {@code WTLS-SS} and {@code MD5}, and {@code NONE} for any other value that the message gives.
+     *
+     * @param napDef NAPDEF, from 1
+     * @param authInfo NAPAUTHINFO of that access point, from 1
+     * @return 5 elements: 0 AUTHTYPE as a name, 1 AUTHNAME, 2 AUTHSECRET, 3 reserved (no parameter
+     *     fills it), 4 always {@code null}; or {@code null}
+     */
+    public native String[] qvomacp_GetPxNapAuthInfoData(int napDef, int authInfo);
+
+    /**
+     * Counts the AUTH-ENTITY values of a NAPAUTHINFO.
+     *
+     * @param napDef NAPDEF, from 1
+     * @param authInfo NAPAUTHINFO of that access point, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxNapAuthEntityCount(int napDef, int authInfo);
+
+    /**
+     * One AUTH-ENTITY of a NAPAUTHINFO.
+     *
+     * @param napDef NAPDEF, from 1
+     * @param authInfo NAPAUTHINFO of that access point, from 1
+     * @param entity AUTH-ENTITY of that NAPAUTHINFO, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxAuthInfopAuthEntityData(int napDef, int authInfo, int entity);
+
+    /**
+     * Counts the VALIDITY of an access point.
+     *
+     * @param napDef NAPDEF, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxNapValidityCount(int napDef);
+
+    /**
+     * One VALIDITY of an access point.
+     *
+     * @param napDef NAPDEF, from 1
+     * @param validity VALIDITY of that access point, from 1
+     * @return 6 elements: 0 COUNTRY, 1 NETWORK, 2 SID, 3 SOC, 4 VALIDUNTIL, 5 always {@code null};
+     *     or {@code null}
+     */
+    public native String[] qvomacp_GetPxValidityData(int napDef, int validity);
+
+    /**
+     * The parameters of an access point.
+     *
+     * <p>Elements 0 to 3 are NAPID, NAME, INTERNET and NAP-ADDRESS. What follows depends on
+     * NAP-ADDRTYPE:
+     *
+     * <ul>
+     *   <li>not set: element 4 is {@code null}; held as the token itself: element 4 is the token in
+     *       hexadecimal, {@code 0x85} (IPV4) to {@code 0x8c} (MAN). The other parameters stand on
+     *       elements 5 to 27 and element 28 is {@code null}.
+     *   <li>held as a text, which is the usual case, since a token that the message carries is held
+     *       under its name: there is no element for it, the other parameters move down to elements
+     *       4 to 26, element 27 is {@code null} and element 28 is the empty string. So an array of
+     *       this shape is known by its last element.
+     * </ul>
+     *
+     * <p>The other parameters, by their elements without (and with) the shift: 5 (4) CALLTYPE, 6
+     * (5) LOCAL-ADDR, 7 (6) LOCAL-ADDRTYPE, 8 (7) LINKSPEED, 9 (8) DNLINKSPEED, 10 (9) LINGER, 11
+     * (10) DELIVERY-ERR-SDU, 12 (11) DELIVERY-ORDER, 13 (12) TRAFFIC-CLASS, 14 (13) MAX-SDU-SIZE,
+     * 15 (14) MAX-BITRATE-UPLINK, 16 (15) MAX-BITRATE-DNLINK, 17 to 22 (16 to 21) reserved (no
+     * parameter fills them), 23 (22) MAX-NUM-RETRY, 24 (23) FIRST-RETRY-TIMEOUT, 25 (24)
+     * REREG-THRESHOLD, 26 (25) T-BIT, 27 (26) INIT, which is the text {@code empty} when the
+     * message has it without a value and {@code null} otherwise.
+     *
+     * @param napDef NAPDEF, from 1
+     * @return 29 elements, or {@code null}
+     */
+    public native String[] qvomacp_GetPxNapDefData(int napDef);
+}

@@ -1,0 +1,211 @@
+package com.qvomacp.eng.parser;
+
+/**
+ * The proxies of the message: its PXLOGICAL characteristics, with their DOMAIN, PXAUTHINFO, PORT
+ * and PXPHYSICAL below them.
+ *
+ * <p>Parameter names used here: {@code proxy} counts the PXLOGICAL of the message, {@code physical}
+ * the PXPHYSICAL of that PXLOGICAL, {@code port} the PORT of the one or of the other. All count
+ * from 1.
+ */
+public class XCPCtxPxLogical {
+    /** Makes an object to call the natives on; it holds no state. */
+    public XCPCtxPxLogical() {}
+
+    /**
+     * Counts the PXLOGICAL of the message.
+     *
+     * @return their number
+     */
+    public native int qvomacp_GetPxLogicalCount();
+
+    /**
+     * Counts the DOMAIN values of a proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxDomainCount(int proxy);
+
+    /**
+     * One DOMAIN of a proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param domain DOMAIN of that proxy, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxDomainData(int proxy, int domain);
+
+    /**
+     * Counts the PXAUTHINFO of a proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxAuthInfoCount(int proxy);
+
+    /**
+     * One PXAUTHINFO of a proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param authInfo PXAUTHINFO of that proxy, from 1
+     * @return 4 elements: 0 PXAUTH-TYPE, 1 PXAUTH-ID, 2 PXAUTH-PW, 3 always {@code null}; or
+     *     {@code null}
+     */
+    public native String[] qvomacp_GetPxAuthInfoData(int proxy, int authInfo);
+
+    /**
+     * Counts the PORT directly below a proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxPortCount(int proxy);
+
+    /**
+     * The PORTNBR of a port directly below a proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param port PORT of that proxy, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxPortData(int proxy, int port);
+
+    /**
+     * Counts the SERVICE values of a port directly below a proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param port PORT of that proxy, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxPortServiceCount(int proxy, int port);
+
+    /**
+     * A service name for a port directly below a proxy, chosen by the index alone.
+     *
+     * <p>The answer does not depend on the value in the message: the first SERVICE of a port
+     * answers {@code CO-WSP}, the second {@code CL-SEC-WSP}, then {@code CO-SEC-WSP},
+     * {@code CL-SEC-WTA}, {@code CO-SEC-WTA}, {@code OTA-HTTP-TO}, {@code OTA-HTTP-TLS-TO},
+     * {@code OTA-HTTP-PO}, {@code OTA-HTTP-TLS-PO} and, for the tenth, {@code Unkown Service}.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param port PORT of that proxy, from 1
+     * @param service SERVICE of that port, from 1
+     * @return the name, or {@code null} when there is no such SERVICE, and from the eleventh on
+     */
+    public native String qvomacp_GetPxPortServiceData(int proxy, int port, int service);
+
+    /**
+     * Counts the PXPHYSICAL of a proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxPhysicalCount(int proxy);
+
+    /**
+     * One PXPHYSICAL of a proxy.
+     *
+     * <p>Element 2 is not the text of the message but a name made from it: {@code NET_ADDR_IPV6}
+     * for IPV6, {@code NET_ADDR_IPV4} for every other value.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param physical PXPHYSICAL of that proxy, from 1
+     * @return 8 elements: 0 PHYSICAL-PROXY-ID, 1 PXADDR, 2 PXADDRTYPE as a name, 3 PXADDR-FQDN, 4
+     *     WSP-VERSION, 5 PUSHENABLED, 6 PULLENABLED, 7 always {@code null}; or {@code null}
+     */
+    public native String[] qvomacp_GetPxPhysicalData(int proxy, int physical);
+
+    /**
+     * Counts the DOMAIN values of a physical proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param physical PXPHYSICAL of that proxy, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxPhysicalDomainCount(int proxy, int physical);
+
+    /**
+     * One DOMAIN of a physical proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param physical PXPHYSICAL of that proxy, from 1
+     * @param domain DOMAIN of that physical proxy, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxPhsicalDomainData(int proxy, int physical, int domain);
+
+    /**
+     * Counts the TO-NAPID values of a physical proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param physical PXPHYSICAL of that proxy, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxPhsicalNapIdCount(int proxy, int physical);
+
+    /**
+     * One TO-NAPID of a physical proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param physical PXPHYSICAL of that proxy, from 1
+     * @param napId TO-NAPID of that physical proxy, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxPhysicalNapIdData(int proxy, int physical, int napId);
+
+    /**
+     * Counts the PORT of a physical proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param physical PXPHYSICAL of that proxy, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxPhysicalPortCount(int proxy, int physical);
+
+    /**
+     * The PORTNBR of a port of a physical proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param physical PXPHYSICAL of that proxy, from 1
+     * @param port PORT of that physical proxy, from 1
+     * @return its text, or {@code null}
+     */
+    public native String qvomacp_GetPxPhysicalPortData(int proxy, int physical, int port);
+
+    /**
+     * Counts the SERVICE values of a port of a physical proxy.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param physical PXPHYSICAL of that proxy, from 1
+     * @param port PORT of that physical proxy, from 1
+     * @return their number
+     */
+    public native int qvomacp_GetPxPhysicalPortServiceCount(int proxy, int physical, int port);
+
+    /**
+     * A service name for a port of a physical proxy, chosen by the index alone.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @param physical PXPHYSICAL of that proxy, from 1
+     * @param port PORT of that physical proxy, from 1
+     * @param service SERVICE of that port, from 1
+     * @return the name that {@link #qvomacp_GetPxPortServiceData} gives for the same index, or
+     *     {@code null} when there is no such SERVICE, and from the eleventh on
+     */
+    public native String qvomacp_GetPxPhysicalPortServiceData(
+            int proxy, int physical, int port, int service);
+
+    /**
+     * The parameters of a proxy.
+     *
+     * <p>Unlike every other array, a proxy that is not there answers an array of 14 empty strings.
+     * Without a parsed message the answer is {@code null}.
+     *
+     * @param proxy PXLOGICAL, from 1
+     * @return 14 elements: 0 PROXY-ID, 1 PROXY-PW, 2 PPGAUTH-TYPE, 3 PROXY-PROVIDER-ID, 4 NAME, 5
+     *     TRUST, 6 MASTER, 7 STARTPAGE, 8 to 12 reserved (no parameter fills them), 13 always
+     *     {@code null}
+     */
+    public native String[] qvomacp_GetProxyData(int proxy);
+}

@@ -1,0 +1,22 @@
+package com.qvomacp.eng.parser;
+
+/** The voice-over-Wi-Fi characteristics of the message. Indexes count from 1. */
+public class XCPCtxVoWifi {
+    /** Makes an object to call the natives on; it holds no state. */
+    public XCPCtxVoWifi() {}
+
+    /**
+     * Counts the voice-over-Wi-Fi characteristics of the message.
+     *
+     * @return their number
+     */
+    public native int qvomacp_GetPxVoWifiCount();
+
+    /**
+     * The parameter of a voice-over-Wi-Fi characteristic.
+     *
+     * @param voWifi the characteristic, from 1
+     * @return 2 elements: 0 {@code ePDG FQDN}, 1 always {@code null}; or {@code null}
+     */
+    public native String[] qvomacp_GetPxVoWifiData(int voWifi);
+}

@@ -1,0 +1,24 @@
+package com.qvomacp.eng.parser;
+
+/** The WI-FI characteristics of the message. Indexes count from 1. */
+public class XCPCtxWifi {
+    /** Makes an object to call the natives on; it holds no state. */
+    public XCPCtxWifi() {}
+
+    /**
+     * Counts the WI-FI of the message.
+     *
+     * @return their number
+     */
+    public native int qvomacp_GetPxWifiCount();
+
+    /**
+     * The parameters of a WI-FI.
+     *
+     * @param wifi WI-FI, from 1
+     * @return 13 elements: 0 NETSSID, 1 SECMODE, 2 EAPMETHOD, 3 EAPTYPE, 4 USERNAME, 5
+     *     ANONUSERNAME, 6 PASSWORD, 7 CACERT, 8 USERCERT, 9 PHASE1, 10 AUTHALGORITHM, 11 PRIORITY,
+     *     12 always {@code null}; or {@code null}
+     */
+    public native String[] qvomacp_GetPxWifiData(int wifi);
+}
