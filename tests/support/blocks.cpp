@@ -17,6 +17,7 @@ namespace blocks {
 
 long failAt = -1;
 bool failFromThenOn = false;
+std::function<void(const void *block)> onRelease;
 
 namespace {
 
@@ -62,6 +63,9 @@ void removed(void *block)
 {
     const auto known = heap().sizes.find(block);
     if (known != heap().sizes.end()) {
+        if (onRelease) {
+            onRelease(block);
+        }
         heap().bytes -= known->second;
         heap().sizes.erase(known);
     }
@@ -98,6 +102,15 @@ std::size_t allocations()
 std::size_t allocated()
 {
     return heap().total;
+}
+
+std::set<void *> all()
+{
+    std::set<void *> blocks;
+    for (const auto &known : heap().sizes) {
+        blocks.insert(known.first);
+    }
+    return blocks;
 }
 
 void startCounting()

@@ -8,6 +8,8 @@
 #include <gtest/gtest.h>
 
 #include <cstddef>
+#include <functional>
+#include <set>
 
 namespace blocks {
 
@@ -27,6 +29,12 @@ std::size_t peakBytes();   // the most that liveBytes() was since startCounting(
 std::size_t allocations(); // allocations that succeeded since startCounting()
 std::size_t allocated();   // their bytes
 void startCounting();
+
+// The live blocks themselves.
+std::set<void *> all();
+
+// Called with every live block before it is released, unless it is empty.
+extern std::function<void(const void *block)> onRelease;
 
 // Fails the test when more or fewer blocks are live at the end of the scope than at its start.
 class BlockCheck {
