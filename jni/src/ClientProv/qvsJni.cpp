@@ -1,0 +1,55 @@
+// String arrays, made so that few local references live at a time and none is left behind.
+#include "qvsJni.h"
+
+namespace [[gnu::visibility("hidden")]] qvs {
+
+namespace {
+
+constexpr PaddedText kBlank = "";
+
+// An array of empty strings; null with an exception pending.
+jobjectArray blankArray(JNIEnv *env, jsize length)
+{
+    jclass stringClass = env->FindClass("java/lang/String");
+    if (!stringClass) {
+        return nullptr;
+    }
+    jstring blank = env->NewStringUTF(kBlank.bytes);
+    jobjectArray result = blank ? env->NewObjectArray(length, stringClass, blank) : nullptr;
+    if (blank) {
+        env->DeleteLocalRef(blank);
+    }
+    env->DeleteLocalRef(stringClass);
+    return result;
+}
+
+// False with an exception pending.
+bool setElement(JNIEnv *env, jobjectArray array, jsize index, const char *value)
+{
+    jstring element = text(env, value);
+    if (value && !element) {
+        return false;
+    }
+    env->SetObjectArrayElement(array, index, element);
+    const bool set = !env->ExceptionCheck();
+    if (element) {
+        env->DeleteLocalRef(element);
+    }
+    return set;
+}
+
+} // namespace
+
+jobjectArray stringArray(JNIEnv *env, const char *const *texts, jsize shown, jsize length)
+{
+    jobjectArray result = blankArray(env, length);
+    for (jsize i = 0; result && i < shown; ++i) {
+        if (!setElement(env, result, i, texts[i])) {
+            env->DeleteLocalRef(result);
+            result = nullptr;
+        }
+    }
+    return result;
+}
+
+} // namespace qvs

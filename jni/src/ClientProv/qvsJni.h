@@ -1,0 +1,213 @@
+// What the natives of the ten Java classes share: walks along the context, answers made for the
+// virtual machine, and the tables they are registered with. Private, C++ only.
+#ifndef QVSJNI_H
+#define QVSJNI_H
+
+#include "qvsClientProvCtx.h"
+#include "qvsJniParser.h"
+#include "qvspushhandler.h"
+
+#include <stdarg.h>
+#include <stddef.h>
+#include <stdint.h>
+#include <stdio.h>
+
+// The inline wrappers of jni.h are compiled into this library, but no exports of it.
+#pragma GCC visibility push(hidden)
+#include <jni.h>
+#pragma GCC visibility pop
+
+namespace [[gnu::visibility("hidden")]] qvs {
+
+// ---- The session
+
+// The header of the last parse: null before the first one, after a message that was refused, and
+// after the delete method. Owned by the session.
+extern smlpushHdlrInfo *ptPushHdlrInfo;
+
+template <class Row, size_t N>
+consteval size_t countOf(const Row (&)[N])
+{
+    return N;
+}
+
+// ---- Walks. Indexes count from 1.
+
+// The n-th record of a chain; null when the chain ends before it or n is below 1.
+template <class Node>
+Node *nth(Node *node, jint n)
+{
+    if (n < 1) {
+        return nullptr;
+    }
+    for (; node && n != 1; --n) {
+        node = node->ptNext;
+    }
+    return node;
+}
+
+// The first record of the chain that hangs from `record`; null from a missing record.
+template <class Record, class Node>
+Node *chainOf(const Record *record, Node *Record::*head)
+{
+    return record ? record->*head : nullptr;
+}
+
+template <class Node>
+jint count(const Node *node)
+{
+    jint n = 0;
+    for (; node; node = node->ptNext) {
+        ++n;
+    }
+    return n;
+}
+
+// ---- Answers. Each is a new local reference, or null; with an exception pending it is null.
+
+// Constant text for the virtual machine, with the four zero bytes behind it that stand behind
+// every text of the context too: a multi-byte sequence cut off at the end is never read past them.
+struct PaddedText {
+    consteval PaddedText(const char *text)
+    {
+        for (size_t i = 0; text[i] != '\0'; ++i) {
+            bytes[i] = text[i];
+            bytes[i + kZeroes] = '\0'; // does not compile when the text leaves no room for it
+        }
+    }
+
+    static constexpr size_t kZeroes = 5; // the terminator is one of them
+    char bytes[28] = {};
+};
+
+inline jstring text(JNIEnv *env, const char *value)
+{
+    return value ? env->NewStringUTF(value) : nullptr;
+}
+
+inline jstring text(JNIEnv *env, const qvsCtxStrNode *node)
+{
+    return node ? text(env, node->pszValue) : nullptr;
+}
+
+template <class Record>
+jstring text(JNIEnv *env, const Record *record, char *Record::*field)
+{
+    return record ? text(env, record->*field) : nullptr;
+}
+
+// A String[] of `length` elements. The first `shown` hold the texts, null for a null text; those
+// behind them stay empty strings.
+jobjectArray stringArray(JNIEnv *env, const char *const *texts, jsize shown, jsize length);
+
+// One element of a String[]: a field, shown as it is or under a name made from it.
+template <class Record>
+struct Cell {
+    constexpr Cell(char *Record::*f, const char *(*n)(const char *) = nullptr) : field(f), nameOf(n)
+    {
+    }
+
+    const char *shownBy(const Record *record) const
+    {
+        const char *value = record->*field;
+        return value && nameOf ? nameOf(value) : value;
+    }
+
+    char *Record::*field;
+    const char *(*nameOf)(const char *value);
+};
+
+// Writes what the cells show of a record to texts[0..N-1] and ends it with a null.
+template <class Record, size_t N>
+void show(const Record *record, const Cell<Record> (&cells)[N], const char *(&texts)[N + 1])
+{
+    for (size_t i = 0; i < N; ++i) {
+        texts[i] = cells[i].shownBy(record);
+    }
+    texts[N] = nullptr; // kept[last-element-null]: an array ends with an element that is null.
+}
+
+// The record as a String[], one element per cell and the last one; null for a missing record.
+template <class Record, size_t N>
+jobjectArray array(JNIEnv *env, const Record *record, const Cell<Record> (&cells)[N])
+{
+    if (!record) {
+        return nullptr;
+    }
+    const char *texts[N + 1];
+    show(record, cells, texts);
+    return stringArray(env, texts, N + 1, N + 1);
+}
+
+// ---- Registration
+
+// What a type of a native is in a JNI signature.
+template <class Type>
+inline constexpr const char *kJavaType = nullptr;
+template <>
+inline constexpr const char *kJavaType<void> = "V";
+template <>
+inline constexpr const char *kJavaType<jboolean> = "Z";
+template <>
+inline constexpr const char *kJavaType<jint> = "I";
+template <>
+inline constexpr const char *kJavaType<jlong> = "J";
+template <>
+inline constexpr const char *kJavaType<jbyteArray> = "[B";
+template <>
+inline constexpr const char *kJavaType<jstring> = "Ljava/lang/String;";
+template <>
+inline constexpr const char *kJavaType<jobjectArray> = "[Ljava/lang/String;";
+
+consteval bool eat(const char *&text, const char *expected)
+{
+    while (*expected != '\0') {
+        if (*text++ != *expected++) {
+            return false;
+        }
+    }
+    return true;
+}
+
+template <class Result, class... Args>
+consteval bool describes(const char *signature, Result (*)(JNIEnv *, jobject, Args...))
+{
+    return eat(signature, "(") && (eat(signature, kJavaType<Args>) && ...) && eat(signature, ")") &&
+           eat(signature, kJavaType<Result>) && *signature == '\0';
+}
+
+template <bool Described>
+consteval const char *checked(const char *signature)
+{
+    static_assert(Described, "the JNI signature does not describe this function");
+    return signature;
+}
+
+// The JNI of a desktop VM takes these texts as char * and leaves them alone.
+consteval char *unguarded(const char *text)
+{
+    return const_cast<char *>(text);
+}
+
+// One row of a table: a native under its own name, with a signature that is held against its type.
+#define NATIVE(function, signature)                                                                \
+    {                                                                                              \
+        unguarded(#function), unguarded(checked<describes(signature, function)>(signature)),       \
+            reinterpret_cast<void *>(function)                                                     \
+    }
+
+// The natives of each class, in the order of their registration.
+extern const JNINativeMethod kParserNatives[9];
+extern const JNINativeMethod kPxLogicalNatives[20];
+extern const JNINativeMethod kNapDefNatives[13];
+extern const JNINativeMethod kBootstrapNatives[6];
+extern const JNINativeMethod kClientIdentityNatives[1];
+extern const JNINativeMethod kVendorConfigNatives[2];
+extern const JNINativeMethod kApplicationNatives[19];
+extern const JNINativeMethod kAccessNatives[13];
+extern const JNINativeMethod kWifiNatives[2];
+extern const JNINativeMethod kVoWifiNatives[2];
+
+} // namespace qvs
+
+#endif
