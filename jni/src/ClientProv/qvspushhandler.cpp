@@ -103,6 +103,7 @@ bool readContentType(Rest *rest, uint32_t *code)
         }
     }
     if (!type) {
+        // kept[push-short-form]: a short code needs no high bit.
         type = contentTypeOf(first & 0x7F);
     }
     if (!type) {
@@ -129,7 +130,9 @@ bool findValue(Rest *rest, const Parameter &parameter)
     return taken != 0;
 }
 
-// Reads the security parameters, SEC before MAC.
+// Reads the security parameters.
+// kept[push-order]: SEC is looked for once, MAC once behind it; any other order and any header
+// between them hides what follows.
 bool readSecurity(Rest rest, smlpushHdlrInfo *info)
 {
     if (findValue(&rest, kSec)) {
@@ -177,10 +180,12 @@ smlpushHdlrInfo *smlpushHdlrParsingWSPHeader(const uint8_t *message, uint32_t le
     if (!info) {
         return nullptr;
     }
+    // kept[push-headers-length]: the length of the headers is one byte, and alone finds the body.
     info->nHeaderLen = message[kHeadersLen];
     const Rest all = {message, length};
     Rest rest = all.behind(kHeaders);
     if (*rest.at == kLengthQuote) {
+        // kept[push-quoted-length]: the length behind Length-quote is skipped unread.
         const uint32_t quoted = kQuotedContentType - kHeaders;
         rest = rest.behind(quoted < rest.length ? quoted : rest.length);
     }

@@ -202,6 +202,7 @@ qvsResult smlBufferAppendTail(smlBuffer *buffer, const uint8_t *bytes, uint32_t 
         return QVS_OK;
     }
     settle(buffer);
+    // kept[append-exact-fit]: bytes that fit exactly grow the buffer all the same.
     if (count >= distance(buffer->pTail, buffer->pEnd)) {
         // hardened: growth beyond 32 bits cannot be had.
         if (count > UINT32_MAX - kAppendSpare) {
