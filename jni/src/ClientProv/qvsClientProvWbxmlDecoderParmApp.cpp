@@ -9,7 +9,9 @@ constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
 
 void traceToken(uint8_t token)
 {
-    trace("DecoderParam : nId = [0x%02x]", token);
+    if (token != wbxml::kEnd) {
+        trace("DecoderParam : nId = [0x%02x]", token);
+    }
 }
 
 qvsResult readAppNamed(qvsWbxmlDecoder *decoder, qvsWapApplication *record)

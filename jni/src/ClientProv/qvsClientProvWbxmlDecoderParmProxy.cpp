@@ -30,7 +30,10 @@ qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, uint8_t tag, const char *l
         result = QVS_ERROR_FAILED;
     }
     if (result != QVS_OK) {
-        trace("[%s] pszName NULL", label);
+        // Silent where not even a part of a name was read.
+        if (mayBeEmpty || name->text.data || result == QVS_ERROR_FAILED) {
+            trace("[%s] pszName NULL", label);
+        }
         return result;
     }
     trace("[%s] pszName [%s]", label, name->text.data ? name->text.data : "");
