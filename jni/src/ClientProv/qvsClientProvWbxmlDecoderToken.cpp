@@ -40,18 +40,24 @@ qvsResult unknownValue(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
     return QVS_OK;
 }
 
+// Reads a string or opaque data, whose token has just been read.
+qvsResult readData(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
+{
+    if (wbxml::isString(token)) {
+        return getString(decoder, text) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+    }
+    uint32_t length = 0;
+    return getStrExtension(decoder, token, text, &length) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+}
+
 qvsResult readValue(qvsWbxmlDecoder *decoder, Text *text)
 {
     uint8_t token = 0;
     if (!takeByte(decoder, &token)) {
         return QVS_ERROR_WBXML_NO_DATA;
     }
-    if (wbxml::isString(token)) {
-        return getString(decoder, text) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
-    }
-    if (token == wbxml::kOpaque) {
-        uint32_t length = 0;
-        return getStrExtension(decoder, token, text, &length) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+    if (wbxml::isString(token) || token == wbxml::kOpaque) {
+        return readData(decoder, token, text);
     }
     if (getParamTokenVal(decoder, token, text) == QVS_OK) {
         return QVS_OK;
@@ -59,12 +65,21 @@ qvsResult readValue(qvsWbxmlDecoder *decoder, Text *text)
     return unknownValue(decoder, token, text);
 }
 
-// Skips one value of any encoding.
-qvsResult skipValue(qvsWbxmlDecoder *decoder)
+// The result of reading a value, traced.
+qvsResult endOfContent(const qvsWbxmlDecoder *decoder, qvsResult result)
 {
-    stepBack(decoder);
+    if (decoder && decoder->bTextLimit) {
+        result = QVS_ERROR_NO_MEMORY;
+    }
+    trace("qvsClientProvWbxmlDecoderContent Error:%d", static_cast<int>(result));
+    return result;
+}
+
+// Skips a string or opaque data, whose token has just been read.
+qvsResult skipValue(qvsWbxmlDecoder *decoder, uint8_t token)
+{
     Text scratch;
-    return content(decoder, &scratch);
+    return endOfContent(decoder, readData(decoder, token, &scratch));
 }
 
 } // namespace
@@ -101,12 +116,7 @@ bool qvs::getString(qvsWbxmlDecoder *decoder, Text *text)
 
 qvsResult qvs::content(qvsWbxmlDecoder *decoder, Text *text)
 {
-    qvsResult result = readValue(decoder, text);
-    if (decoder && decoder->bTextLimit) {
-        result = QVS_ERROR_NO_MEMORY;
-    }
-    trace("qvsClientProvWbxmlDecoderContent Error:%d", static_cast<int>(result));
-    return result;
+    return endOfContent(decoder, readValue(decoder, text));
 }
 
 qvsResult qvsClientProvWbxmlDecoderReadElement(qvsWbxmlDecoder *decoder, uint8_t *tag)
@@ -299,7 +309,7 @@ qvsResult qvsClientProvWbxmlDecoderSkipElement(qvsWbxmlDecoder *decoder)
                 return QVS_OK;
             }
         } else if (wbxml::isString(token) || token == wbxml::kOpaque) {
-            if (qvsResult result = skipValue(decoder)) {
+            if (qvsResult result = skipValue(decoder, token)) {
                 return result;
             }
         } else {
