@@ -235,6 +235,9 @@ TEST_F(List, FindsTheEndOfAChainMadeByHand)
     expectAppends(list);
     list->ptTail = list->ptFirst;
     expectAppends(list);
+    list->ptTail = list->ptFirst;
+    EXPECT_EQ(qvsListDeleteNodeFirst(list, QVS_LIST_KEEP_ITEMS), QVS_OK);
+    expectAppends(list);
     drop(list);
 }
 

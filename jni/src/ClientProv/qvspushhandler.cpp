@@ -19,9 +19,6 @@ constexpr uint32_t kHeadersLen = 2;
 constexpr uint32_t kHeaders = 3;
 constexpr uint32_t kQuotedContentType = 5; // behind Length-quote and length
 
-constexpr uint32_t kLongestContentType = 63;
-constexpr uint32_t kLongestMac = SMLPUSH_MAC_SIZE - 1;
-
 struct ContentType {
     uint8_t code;
     const char *name;
@@ -52,19 +49,13 @@ struct Rest {
     Rest behind(uint32_t count) const { return {at + count, length - count}; }
 };
 
-// Length of the NUL-terminated text at the start; more than `longest` when there is none of up to
-// that length.
-uint32_t textLength(const Rest &rest, uint32_t longest)
-{
-    const uint32_t bytes = rest.length < longest + 1 ? rest.length : longest + 1;
-    const void *end = memchr(rest.at, '\0', bytes);
-    return end ? static_cast<uint32_t>(static_cast<const uint8_t *>(end) - rest.at) : longest + 1;
-}
-
-const ContentType *contentTypeNamed(const char *name)
+// The media type whose name, with its NUL, stands next; null when that is none of them.
+const ContentType *contentTypeNamed(const Rest &rest)
 {
     for (const ContentType &type : kContentTypes) {
-        if (qvsStrcmp(name, type.name) == 0) {
+        const uint32_t size = qvsStrlen(type.name) + 1;
+        // hardened: a name that does not end within the message is none.
+        if (size <= rest.length && qvsMemCmp(rest.at, type.name, size) == 0) {
             return &type;
         }
     }
@@ -81,30 +72,21 @@ const ContentType *contentTypeOf(uint8_t code)
     return nullptr;
 }
 
-// Reads the content type into *code and goes behind it. A byte that begins a text and is a code as
-// well is that code when the text is no name.
+// Reads the content type into *code and goes behind it: a name, or else a short code.
 bool readContentType(Rest *rest, uint32_t *code)
 {
     // hardened: a message that ends here has no content type.
     if (rest->length == 0) {
         return false;
     }
-    const uint8_t first = *rest->at;
-    const ContentType *type = nullptr;
+    const ContentType *type = contentTypeNamed(*rest);
     uint32_t taken = 1;
-    if (first >= 0x20 && first <= 0x7F) {
-        // hardened: a text that does not end within the message, or is too long, is no name.
-        const uint32_t length = textLength(*rest, kLongestContentType);
-        if (length <= kLongestContentType) {
-            type = contentTypeNamed(reinterpret_cast<const char *>(rest->at));
-        }
-        if (type) {
-            taken = length + 1;
-        }
-    }
-    if (!type) {
-        // kept[push-short-form]: a short code needs no high bit.
-        type = contentTypeOf(first & 0x7F);
+    if (type) {
+        taken = qvsStrlen(type->name) + 1;
+    } else {
+        // kept[push-short-form]: a short code needs no high bit, and a text that is no name may
+        // begin with one.
+        type = contentTypeOf(*rest->at & 0x7F);
     }
     if (!type) {
         return false;
@@ -140,13 +122,14 @@ bool readSecurity(Rest rest, smlpushHdlrInfo *info)
         rest = rest.behind(1);
     }
     if (findValue(&rest, kMac)) {
-        // hardened: a MAC that does not end within the message, or is too long, is refused.
-        const uint32_t length = textLength(rest, kLongestMac);
-        if (length > kLongestMac) {
+        // hardened: a MAC that does not end within the message, or does not fit, is refused.
+        const uint32_t bytes = rest.length < SMLPUSH_MAC_SIZE ? rest.length : SMLPUSH_MAC_SIZE;
+        const void *end = memchr(rest.at, '\0', bytes);
+        if (!end) {
             return false;
         }
-        memcpy(info->szMac, rest.at, length + 1);
-        info->nMacLen = length;
+        info->nMacLen = static_cast<uint32_t>(static_cast<const uint8_t *>(end) - rest.at);
+        memcpy(info->szMac, rest.at, info->nMacLen);
     }
     return true;
 }
