@@ -18,6 +18,7 @@
 #include <cstring>
 #include <functional>
 #include <map>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -26,7 +27,7 @@ namespace records {
 using Numbers = std::vector<size_t>; // of fields, from 1
 using Strings = std::vector<std::string>;
 
-// upTo: the numbers from `first` to `last`.
+// range: the numbers from `first` to `last`.
 inline Numbers range(size_t first, size_t last)
 {
     Numbers out;
@@ -117,6 +118,25 @@ inline void release(const std::vector<void *> &left)
         qvsMemFree_debug(block);
     }
 }
+
+// Lets everything go that was allocated while it lives.
+class Sweep {
+public:
+    Sweep() : before(blocks::all()) {}
+    Sweep(const Sweep &) = delete;
+    Sweep &operator=(const Sweep &) = delete;
+    ~Sweep()
+    {
+        for (void *block : blocks::all()) {
+            if (before.count(block) == 0) {
+                qvsMemFree_debug(block);
+            }
+        }
+    }
+
+private:
+    std::set<void *> before;
+};
 
 // ---- What is released, in its order
 

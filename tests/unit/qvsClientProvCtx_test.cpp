@@ -95,6 +95,11 @@ std::vector<Kind> linkedKinds()
     return some;
 }
 
+void PrintTo(const Kind &kind, std::ostream *out)
+{
+    *out << kind.name;
+}
+
 std::string nameOf(const testing::TestParamInfo<Kind> &row)
 {
     return row.param.name;

@@ -118,6 +118,11 @@ Strings fill(Names *names, const Kind &kind, void *record, size_t field)
     return {name};
 }
 
+void PrintTo(const Kind &kind, std::ostream *out)
+{
+    *out << kind.name;
+}
+
 std::string nameOf(const testing::TestParamInfo<Kind> &row)
 {
     return row.param.name;
