@@ -329,12 +329,11 @@ struct Vm::State {
     {
         State &state = *static_cast<JavaVm *>(vm)->state;
         state.enter("GetEnv");
-        if (state.owner->withoutEnvironment || version != JNI_VERSION_1_4) {
-            *env = nullptr;
-            return JNI_EVERSION;
+        if (version != JNI_VERSION_1_4) {
+            die("GetEnv of another version than 1.4");
         }
-        *env = static_cast<JNIEnv *>(&state.env);
-        return JNI_OK;
+        *env = state.owner->hasEnvironment ? static_cast<JNIEnv *>(&state.env) : nullptr;
+        return state.owner->environmentResult;
     }
 
     // ---- Tables

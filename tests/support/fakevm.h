@@ -60,9 +60,11 @@ public:
 
     // ---- Loading
 
-    // Set before load(): the machine knows no environment; it lacks a class, or refuses its
-    // natives, both with an exception pending.
-    bool withoutEnvironment = false;
+    // Set before load(): what the machine answers when it is asked for its environment, and
+    // whether it has one; a class that it lacks, or whose natives it refuses, both with an
+    // exception pending.
+    jint environmentResult = JNI_OK;
+    bool hasEnvironment = true;
     std::string lackedClass;
     std::string refusedClass;
 

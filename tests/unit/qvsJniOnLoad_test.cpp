@@ -1,10 +1,13 @@
 // What a load registers, and how it fails.
 #include "support/fakevm.h"
 
+#include "qvsJni.h"
+
 #include <gtest/gtest.h>
 
 #include <cstring>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace {
@@ -165,6 +168,25 @@ void expectRegistered(const Vm &vm, size_t classes)
     EXPECT_EQ(vm.natives().size(), next);
 }
 
+// A signature is held against the type of its function while compiling.
+constexpr jint (*sum)(JNIEnv *, jobject, jint, jlong) = nullptr;
+constexpr void (*parse)(JNIEnv *, jobject, jbyteArray) = nullptr;
+constexpr jobjectArray (*texts)(JNIEnv *, jobject) = nullptr;
+
+static_assert(qvs::describes("(IJ)I", sum));
+static_assert(qvs::describes("([B)V", parse));
+static_assert(qvs::describes("()[Ljava/lang/String;", texts));
+static_assert(!qvs::describes("", sum));
+static_assert(!qvs::describes("IJ)I", sum));
+static_assert(!qvs::describes("(I)I", sum));
+static_assert(!qvs::describes("(JI)I", sum));
+static_assert(!qvs::describes("(IJI)I", sum));
+static_assert(!qvs::describes("(IJI", sum));
+static_assert(!qvs::describes("(IJ)", sum));
+static_assert(!qvs::describes("(IJ)V", sum));
+static_assert(!qvs::describes("(IJ)II", sum));
+static_assert(!qvs::describes("()Ljava/lang/String;", texts));
+
 TEST(OnLoad, RegistersEveryNativeInOrder)
 {
     Vm vm;
@@ -198,11 +220,16 @@ TEST(OnLoad, RegistersAClassInOneCall)
 
 TEST(OnLoad, FailsWithoutAnEnvironment)
 {
-    Vm vm;
-    vm.withoutEnvironment = true;
-    EXPECT_EQ(vm.load(), Answer{.number = -1});
-    expectRegistered(vm, 0);
-    EXPECT_EQ(vm.calls(), std::vector<std::string>{"GetEnv"});
+    const std::vector<std::pair<jint, bool>> cases = {
+        {JNI_EVERSION, false}, {JNI_EDETACHED, false}, {JNI_ERR, true}, {JNI_OK, false}};
+    for (const auto &[result, hasEnvironment] : cases) {
+        Vm vm;
+        vm.environmentResult = result;
+        vm.hasEnvironment = hasEnvironment;
+        EXPECT_EQ(vm.load(), Answer{.number = -1});
+        expectRegistered(vm, 0);
+        EXPECT_EQ(vm.calls(), std::vector<std::string>{"GetEnv"});
+    }
 }
 
 TEST(OnLoad, StopsAtAMissingClassAndKeepsTheOnesBefore)

@@ -324,6 +324,10 @@ TEST(Parser, AnswersNullForABodyThatNoJavaArrayHolds)
         EXPECT_EQ(vm.call("qvomacp_GetParserBody"), Answer{});
         EXPECT_TRUE(vm.calls().empty());
     }
+    header.nBodyLen = INT32_MAX; // the longest that one holds, if there is memory for it
+    vm.failCall(0);
+    EXPECT_EQ(vm.call("qvomacp_GetParserBody"), Answer{.exception = true});
+    EXPECT_TRUE(vm.hasFailed());
     qvs::ptPushHdlrInfo = nullptr;
 }
 

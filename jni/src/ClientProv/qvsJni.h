@@ -37,10 +37,7 @@ consteval size_t countOf(const Row (&)[N])
 template <class Node>
 Node *nth(Node *node, jint n)
 {
-    if (n < 1) {
-        return nullptr;
-    }
-    for (; node && n != 1; --n) {
+    for (jint i = 1; node && i != n; ++i) {
         node = node->ptNext;
     }
     return node;
@@ -77,7 +74,7 @@ struct PaddedText {
     }
 
     static constexpr size_t kZeroes = 5; // the terminator is one of them
-    char bytes[28] = {};
+    char bytes[26] = {};
 };
 
 inline jstring text(JNIEnv *env, const char *value)

@@ -32,18 +32,15 @@ qvsCtxPort *port(jint p, jint h, jint t)
 
 // ---- Names
 
-// The services and their value tokens. Answers come by row, never by token.
-constexpr struct {
-    uint8_t token;
-    PaddedText name;
-} kServices[] = {
-    {0xCA, "CL-WSP"},          {0xCB, "CO-WSP"},          {0xCC, "CL-SEC-WSP"},
-    {0xCD, "CO-SEC-WSP"},      {0xCE, "CL-SEC-WTA"},      {0xCF, "CO-SEC-WTA"},
-    {0xD0, "OTA-HTTP-TO"},     {0xD1, "OTA-HTTP-TLS-TO"}, {0xD2, "OTA-HTTP-PO"},
-    {0xD3, "OTA-HTTP-TLS-PO"}, {0x00, "Unkown Service"},
+// The services in the order of their value tokens, 0xCA to 0xD3, and the one for all others.
+constexpr PaddedText kServices[] = {
+    "CL-WSP",      "CO-WSP",          "CL-SEC-WSP",     "CO-SEC-WSP",
+    "CL-SEC-WTA",  "CO-SEC-WTA",      "OTA-HTTP-TO",    "OTA-HTTP-TLS-TO",
+    "OTA-HTTP-PO", "OTA-HTTP-TLS-PO", "Unkown Service",
 };
 
-// kept[service-by-index]: the name of service s is that of row s, whatever its SERVICE says.
+// kept[service-by-index]: service s, counted from 1, has the name of row s, counted from 0,
+// whatever its SERVICE says.
 jstring serviceName(JNIEnv *env, const qvsCtxPort *owner, jint s)
 {
     if (!nth(chainOf(owner, &qvsCtxPort::ptService), s)) {
@@ -51,7 +48,7 @@ jstring serviceName(JNIEnv *env, const qvsCtxPort *owner, jint s)
     }
     // hardened: an index behind the last row answers null.
     const size_t row = static_cast<size_t>(s);
-    return row < countOf(kServices) ? text(env, kServices[row].name.bytes) : nullptr;
+    return row < countOf(kServices) ? text(env, kServices[row].bytes) : nullptr;
 }
 
 constexpr PaddedText kIpv4 = "NET_ADDR_IPV4";
