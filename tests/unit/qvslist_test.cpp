@@ -255,6 +255,10 @@ TEST_F(List, RemembersItsLastNode)
 {
     // Without it, appending would walk the whole chain each time.
     qvsList *list = listOf({});
+    EXPECT_EQ(qvsListAddNodeFirst(list, a), QVS_OK);
+    EXPECT_EQ(list->ptTail, list->ptFirst);
+    EXPECT_EQ(qvsListDeleteNodeFirst(list, QVS_LIST_KEEP_ITEMS), QVS_OK);
+    EXPECT_EQ(list->ptTail, nullptr);
     for (char *item : {a, b, c}) {
         EXPECT_EQ(qvsListAddNodeLast(list, item), QVS_OK);
         ASSERT_NE(list->ptTail, nullptr);
@@ -581,6 +585,18 @@ TEST_F(List, GivesTheItemAtAnIndex)
     item = &stranger;
     EXPECT_EQ(qvsListGetItemIndex(nullptr, &item, 0), 4108U);
     EXPECT_EQ(item, &stranger);
+}
+
+TEST_F(List, NodesBeyondTheCountHaveNoIndex)
+{
+    qvsList *list = listOf({a, b});
+    list->nCount = 1;
+    void *item = &stranger;
+    EXPECT_EQ(qvsListGetItemIndex(list, &item, 1), 4110U);
+    EXPECT_EQ(item, nullptr);
+    EXPECT_EQ(qvsListGetItemIndex(list, &item, 0), QVS_OK);
+    EXPECT_EQ(item, a);
+    drop(list);
 }
 
 TEST_F(List, HandsTheItemAtIndex0Over)

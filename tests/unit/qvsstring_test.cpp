@@ -481,7 +481,8 @@ TEST(WideStrings, CmpGivesTheSign)
 TEST(WideStrings, AreWidenedFromBytes)
 {
     Units units(5, 0xEEEE);
-    EXPECT_EQ(qvsStrAsciiToUcs2(units.data(), "a\xFF\0b", 4), 1U);
+    const std::vector<char> bytes = {'a', static_cast<char>(0xFF), '\0', 'b'};
+    EXPECT_EQ(qvsStrAsciiToUcs2(units.data(), bytes.data(), 4), 1U);
     EXPECT_EQ(units, (Units{'a', 0xFF, 0, 'b', 0}));
     EXPECT_EQ(qvsStrAsciiToUcs2(units.data(), "x", 0), 1U);
     EXPECT_EQ(units[0], 0);

@@ -489,6 +489,22 @@ TEST_F(Buffer, DoesNotGiveMoreThanThereIs)
     EXPECT_EQ(smlBufferGetData(&headless, out.data(), 1), 4114U);
 }
 
+TEST_F(Buffer, GivesAllTheDataOfAFullStorage)
+{
+    smlBuffer *buffer = bufferOf("abc", 5);
+    EXPECT_EQ(insert(buffer, "xy"), QVS_OK);
+    EXPECT_EQ(buffer->nCapacity, 5U);
+    EXPECT_EQ(smlBufferGetRemainSize(buffer), 0U);
+    uint8_t out[5];
+    EXPECT_EQ(smlBufferGetData(buffer, out, 5), QVS_OK);
+    EXPECT_EQ(text(out, 5), "xyabc");
+    EXPECT_EQ(buffer->pHead, buffer->pEnd);
+    EXPECT_EQ(append(buffer, "z"), QVS_OK);
+    EXPECT_EQ(buffer->nCapacity, 5U + 512U) << "there is no room behind the head";
+    EXPECT_EQ(dataOf(buffer), "z");
+    drop(buffer);
+}
+
 TEST_F(Buffer, PullConsumes)
 {
     smlBuffer *buffer = bufferOf("abcde", 10);
@@ -535,14 +551,16 @@ TEST_F(Buffer, ShiftheadAtTheStartDoesNothing)
     drop(buffer);
 }
 
-TEST_F(Buffer, ShiftheadWithoutDataEmpties)
+TEST_F(Buffer, ShiftheadClearsAllWithoutData)
 {
-    smlBuffer *buffer = bufferAt(3, "", 10);
-    EXPECT_EQ(smlBufferShifthead(buffer), QVS_OK);
-    EXPECT_EQ(buffer->pHead, buffer->pStorage);
-    EXPECT_EQ(storageOf(buffer), zeros(10));
-    expectInStep(buffer);
-    drop(buffer);
+    for (const std::string data : {"", "a"}) {
+        smlBuffer *buffer = bufferAt(3, data, 10);
+        EXPECT_EQ(smlBufferShifthead(buffer), QVS_OK);
+        EXPECT_EQ(buffer->pHead, buffer->pStorage);
+        EXPECT_EQ(storageOf(buffer), data + zeros(10 - data.size()));
+        expectInStep(buffer);
+        drop(buffer);
+    }
 }
 
 TEST_F(Buffer, CutClosesTheGap)
@@ -795,6 +813,12 @@ TEST(Kept, pull_unchecked)
     EXPECT_EQ(buffer->pHead, buffer->pStorage + 5);
     EXPECT_EQ(buffer->pTail, buffer->pStorage + 3);
     EXPECT_EQ(smlBufferGetRemainSize(buffer), 7U);
+    EXPECT_EQ(smlBufferPull(buffer, 5), QVS_OK);
+    EXPECT_EQ(smlBufferGetDataSize(buffer), 0xFFFFFFF9U);
+    EXPECT_EQ(buffer->pHead, buffer->pEnd);
+    EXPECT_EQ(append(buffer, "z"), QVS_OK);
+    EXPECT_EQ(buffer->nCapacity, 10U + 512U) << "the head stayed where it was";
+    EXPECT_EQ(dataOf(buffer), "z");
     drop(buffer);
 }
 

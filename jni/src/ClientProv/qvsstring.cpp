@@ -384,7 +384,6 @@ char *qvs::dumpLine(char *out, const uint8_t *data, uint32_t count, const char *
 
 void qvsStrBinaryDump(char *out, const uint8_t *data, uint32_t len)
 {
-    *out = '\0';
     // hardened: null is dumped as no bytes.
     uint32_t left = data ? len : 0;
     for (; left > qvs::kDumpColumns; left -= qvs::kDumpColumns) {

@@ -294,9 +294,6 @@ qvsResult smlBufferShifthead(smlBuffer *buffer)
         return QVS_OK;
     }
     settle(buffer);
-    if (buffer->nSize == 0) {
-        return smlBufferInit(buffer);
-    }
     move(buffer->pStorage, buffer->pHead, buffer->nSize);
     place(buffer, 0, buffer->nSize);
     memset(buffer->pTail, 0, distance(buffer->pTail, buffer->pEnd));
