@@ -1,0 +1,535 @@
+// Characteristics: types, their slots and parameters, attributes, and what stands between elements.
+#include "kinds.h"
+
+using namespace parms;
+using kinds::Character;
+using kinds::characteristic;
+using kinds::Document;
+using kinds::Kind;
+
+namespace {
+
+class Characteristic : public blocks::BlockTest {};
+class CharacteristicAttribute : public blocks::BlockTest {};
+
+// The attributes of a characteristic, read into a node of the test's own.
+struct Attributes {
+    explicit Attributes(const Bytes &bytes) : decoder(bytes)
+    {
+        result =
+            qvsClientProvWbxmlDecoderCharacterAttribute(decoder, node, &attrId, &codePage, &name);
+    }
+    Attributes(const Attributes &) = delete;
+    Attributes &operator=(const Attributes &) = delete;
+    ~Attributes()
+    {
+        kinds::releaseKept(node);
+        (void)qvsClientProvWbxmlDeleteCharacter(node);
+        qvsMemFree_debug(name);
+    }
+
+    decoding::Decoder decoder;
+    qvsWapCharacter *node = records::blank<qvsWapCharacter>();
+    uint8_t attrId = 0xEE;
+    uint8_t codePage = 0xEE;
+    char *name = nullptr;
+    qvsResult result;
+};
+
+// Attributes from page 1 instead of page 0.
+Bytes fromPage1(const Bytes &attributes)
+{
+    return join({{0x00, 0x01}, attributes});
+}
+
+// A node's field as it is shown.
+std::string shownIn(const qvsWapCharacter *node, const Kind &kind)
+{
+    const void *record = records::get(node, kind.slot);
+    if (!record) {
+        return "no record";
+    }
+    const void *value = records::get(record, kind.field);
+    return kind.place == kinds::kList ? shown(static_cast<const qvsList *>(value))
+                                      : shown(static_cast<const char *>(value));
+}
+
+// The trace of one turn over the content of a characteristic.
+Strings turn(unsigned tag, unsigned attrId)
+{
+    return lines({"qvsClientProvWbxmlDecoderCharacter :: " + format("nId[0x%02x], ", tag) +
+                  format("nAttrId[0x%02x]", attrId)});
+}
+
+// PXLOGICAL with nothing in it.
+const Bytes kLogical = characteristic({0x51});
+
+} // namespace
+
+// ---- Types
+
+TEST_F(Characteristic, MakesTheRecordOfItsTypeInItsSlot)
+{
+    for (const Kind &kind : kinds::all()) {
+        SCOPED_TRACE(kind.name);
+        const Character read(characteristic(kind.type));
+        EXPECT_EQ(read.result, 0U);
+        EXPECT_EQ(read.left(), 0U);
+        ASSERT_TRUE(read.node);
+        EXPECT_EQ(fieldsSet(read.node), records::Numbers{kind.slot});
+        for (const size_t field : records::range(1, kind.fields)) {
+            EXPECT_EQ(records::get(records::get(read.node, kind.slot), field), nullptr) << field;
+        }
+    }
+}
+
+TEST_F(Characteristic, ReadsItsParmsByItsType)
+{
+    for (const Kind &kind : kinds::all()) {
+        SCOPED_TRACE(kind.name);
+        const Character read(characteristic(kind.type, kind.parm));
+        EXPECT_EQ(read.result, 0U);
+        EXPECT_EQ(read.left(), 0U);
+        ASSERT_TRUE(read.node);
+        EXPECT_EQ(fieldsSet(read.node), records::Numbers{kind.slot});
+        EXPECT_EQ(shownIn(read.node, kind), kind.place == kinds::kList ? "[v]" : "v");
+    }
+}
+
+TEST_F(Characteristic, HasTheSameTypeOnBothPagesOrAnotherOne)
+{
+    for (const Kind &kind : kinds::all()) {
+        SCOPED_TRACE(kind.name);
+        const Bytes type = kind.type.size() == 3 ? Bytes{kind.type[2]} : fromPage1(kind.type);
+        const Character read(characteristic(type));
+        EXPECT_EQ(read.result, 0U);
+        ASSERT_TRUE(read.node);
+        EXPECT_EQ(fieldsSet(read.node) == records::Numbers{kind.slot},
+                  kind.pages == kinds::kBothPages);
+    }
+}
+
+TEST_F(Characteristic, TakesTheTypesOfThePageThatIsInForce)
+{
+    const struct {
+        uint8_t token;
+        size_t slots[2];
+    } types[] = {{0x55, {5, 11}}, {0x56, {12, 8}}, {0x57, {13, 10}}, {0x59, {2, 9}}};
+    for (const auto &type : types) {
+        for (const uint8_t page : {0, 1}) {
+            const Character read(characteristic({type.token}), page);
+            ASSERT_TRUE(read.node);
+            EXPECT_EQ(fieldsSet(read.node), records::Numbers{type.slots[page]});
+        }
+    }
+    const Character back(characteristic({0x00, 0x01, 0x00, 0x00, 0x55}));
+    ASSERT_TRUE(back.node);
+    EXPECT_TRUE(back.node->ptNapDef);
+}
+
+TEST_F(Characteristic, TakesANamedTypeInAnyEncoding)
+{
+    const Bytes names[] = {
+        message::opaque({'W', 'I', '-', 'F', 'I'}).bytes,
+        (message::Value("WI") + message::Value("-FI")).bytes,
+        (message::tableString(0) + message::Value("FI")).bytes,
+    };
+    for (const Bytes &name : names) {
+        SCOPED_TRACE(testing::PrintToString(name));
+        decoding::Decoder decoder(characteristic(join({{0x50}, name})));
+        decoder->pStringTable = qvsStrdup_debug("WI-", "test", __LINE__);
+        decoder->nStrSize = 4;
+        qvsWapCharacter *node = nullptr;
+        EXPECT_EQ(qvsClientProvWbxmlDecoderCharacter(decoder, &node), 0U);
+        ASSERT_TRUE(node);
+        EXPECT_TRUE(node->ptWifi);
+        (void)qvsClientProvWbxmlDeleteCharacter(node);
+    }
+}
+
+TEST_F(Characteristic, HasNoRecordOfAnotherName)
+{
+    for (const char *name : {"wi-fi", "WI-FI ", "WI-F", "WIFI", "", "roaming", "ROAMING2",
+                             "Vodafone", "vodafone vowifi"}) {
+        SCOPED_TRACE(name);
+        const Bytes type = kinds::byText(0x50, name);
+        const Character empty(characteristic(type));
+        EXPECT_EQ(empty.result, 0U);
+        ASSERT_TRUE(empty.node);
+        EXPECT_EQ(fieldsSet(empty.node), records::Numbers{});
+
+        Traces traces;
+        const Character read(characteristic(type, named("NETSSID", "v")));
+        EXPECT_EQ(read.result, 4101U);
+        EXPECT_EQ(read.node, nullptr);
+        EXPECT_EQ(traces.texts,
+                  lines({"qvsClientProvWbxmlDecoderContent Error:0"}) + turn(0x07, 0x50) +
+                      lines({"................NEW.................",
+                             "Tag Code = CHARACTER ATTR TYPE HAVE NOT...CP SPEC....."}));
+    }
+}
+
+TEST_F(Characteristic, HasNoRecordOfANameThatWasNotRead)
+{
+    const Character read(characteristic({0x50, 0x60}));
+    EXPECT_EQ(read.result, 0U);
+    ASSERT_TRUE(read.node);
+    EXPECT_EQ(fieldsSet(read.node), records::Numbers{});
+    EXPECT_EQ(Character(characteristic({0x50, 0x60}, parm({0x07}))).result, 4101U);
+}
+
+TEST_F(Characteristic, TracesTheNamesThatItKnows)
+{
+    const auto tracesOf = [](const char *name) {
+        Traces traces;
+        const Character read(characteristic(kinds::byText(0x50, name)));
+        return traces.texts;
+    };
+    const Strings content = lines({"qvsClientProvWbxmlDecoderContent Error:0"});
+    EXPECT_EQ(tracesOf("ROAMING"),
+              content + lines({"------------------NEW-------------------!!"}) + turn(0x01, 0x50));
+    for (const char *name : {"WI-FI", "Vodafone VoWiFi"}) {
+        EXPECT_EQ(tracesOf(name),
+                  content + lines({"------------WIFI------------------!!"}) + turn(0x01, 0x50));
+    }
+}
+
+TEST_F(Characteristic, FillsTheSlotOfEachOfItsTypesAndReadsParmsByTheLast)
+{
+    const Character port(characteristic({0x51, 0x53}, parm(0x23, "80")));
+    EXPECT_EQ(port.result, 0U);
+    ASSERT_TRUE(port.node);
+    EXPECT_EQ(fieldsSet(port.node), (records::Numbers{1, 3}));
+    EXPECT_STREQ(port.node->ptPort->pszPortNbr, "80");
+
+    EXPECT_EQ(Character(characteristic({0x53, 0x51}, parm(0x23, "80"))).result, 4101U);
+
+    const Character both(characteristic({0x55, 0x00, 0x01, 0x55}, parm(0x36, "w2")));
+    ASSERT_TRUE(both.node);
+    EXPECT_EQ(fieldsSet(both.node), (records::Numbers{5, 11}));
+    EXPECT_STREQ(both.node->ptApplication->pszAppId, "w2");
+
+    const Bytes wifi = join({{0x50}, message::opaque({'W', 'I', '-', 'F', 'I'}).bytes});
+    const Character last(characteristic(join({wifi, {0x53}}), parm(0x23, "80")));
+    ASSERT_TRUE(last.node);
+    EXPECT_EQ(fieldsSet(last.node), (records::Numbers{3, 17}));
+    const Character text(characteristic(join({{0x53}, wifi}), named("SECMODE", "1")));
+    ASSERT_TRUE(text.node);
+    EXPECT_EQ(fieldsSet(text.node), (records::Numbers{3, 17}));
+    EXPECT_STREQ(text.node->ptWifi->pszSecMode, "1");
+}
+
+TEST_F(Characteristic, FillsAllItsSlotsAtOnce)
+{
+    const auto opaqueType = [](const std::string &name) {
+        return join({{0x50}, message::opaque(Bytes(name.begin(), name.end())).bytes});
+    };
+    Bytes types;
+    for (const Kind &kind : kinds::all()) {
+        types =
+            join({types, {0x00, 0x00}, kind.type[0] == 0x50 ? opaqueType(kind.name) : kind.type});
+    }
+    const Character read(characteristic(types));
+    EXPECT_EQ(read.result, 0U);
+    ASSERT_TRUE(read.node);
+    EXPECT_EQ(fieldsSet(read.node), records::range(1, 18));
+}
+
+TEST_F(Characteristic, ReadsANameAfreshForEachTypeGivenAsText)
+{
+    const Bytes bytes = join({{0x50, 0xC3, 0x05, 'W', 'I', '-', 'F', 'I'},
+                              {0x50, 0xC3, 0x07, 'R', 'O', 'A', 'M', 'I', 'N', 'G', 0x01}});
+    const Attributes read(bytes);
+    EXPECT_EQ(read.result, 0U);
+    EXPECT_STREQ(read.name, "ROAMING");
+    EXPECT_EQ(fieldsSet(read.node), (records::Numbers{16, 17}));
+
+    // An unknown name behind a known one takes its place.
+    const Bytes unknown = {0x50, 0xC3, 0x05, 'W', 'I', '-', 'F', 'I', 0x50, 0xC3, 0x01, 'x'};
+    EXPECT_EQ(Character(characteristic(unknown, named("SECMODE", "1"))).result, 4101U);
+}
+
+// ---- Attributes
+
+TEST_F(CharacteristicAttribute, GivesTheLastTokenThePageAndTheName)
+{
+    const Attributes token({0x00, 0x01, 0x55, 0x01, 0x07});
+    EXPECT_EQ(token.result, 0U);
+    EXPECT_EQ(token.attrId, 0x55);
+    EXPECT_EQ(token.codePage, 1);
+    EXPECT_EQ(token.name, nullptr);
+    EXPECT_EQ(token.decoder.position(), 4U);
+
+    const Attributes text(join({kinds::byText(0x50, "any"), {0x01}}));
+    EXPECT_EQ(text.result, 0U);
+    EXPECT_EQ(text.attrId, 0x50);
+    EXPECT_EQ(text.codePage, 0);
+    EXPECT_STREQ(text.name, "any");
+
+    const Attributes none({0x01});
+    EXPECT_EQ(none.result, 0U);
+    EXPECT_EQ(none.attrId, 0xEE) << "untouched";
+    EXPECT_EQ(none.decoder.position(), 1U);
+}
+
+TEST_F(CharacteristicAttribute, RefusesEveryOtherToken)
+{
+    for (unsigned token = 0x02; token < 256; ++token) {
+        if (token >= 0x50 && token <= 0x5B) {
+            continue;
+        }
+        SCOPED_TRACE(token);
+        Traces traces;
+        const Attributes read({0x53, static_cast<uint8_t>(token), 0x01});
+        EXPECT_EQ(read.result, 4101U);
+        EXPECT_EQ(read.decoder.position(), 1U);
+        EXPECT_EQ(traces.texts, refusal("qvsClientProvWbxmlDecoderCharacterAttribute",
+                                        static_cast<uint8_t>(token)));
+        EXPECT_TRUE(read.node->ptPort) << "what was read before stays";
+    }
+}
+
+TEST_F(CharacteristicAttribute, ReturnsTheFailureOfAPageSwitch)
+{
+    for (const Bytes &bytes : {Bytes{0x53, 0x00, 0x02, 0x01}, Bytes{0x53, 0x00}}) {
+        const Attributes read(bytes);
+        EXPECT_EQ(read.result, 4101U);
+        EXPECT_TRUE(read.node->ptPort);
+    }
+    const Attributes masked({0x00, 0x41, 0x55, 0x01});
+    EXPECT_EQ(masked.result, 0U);
+    EXPECT_TRUE(masked.node->ptApplication);
+}
+
+TEST_F(CharacteristicAttribute, MakesTheRecordOfANameBeforeItReturnsItsFailure)
+{
+    const Attributes read({0x50, 0x03, 'W', 'I', '-', 'F', 'I', 0x00, 0x53, 0x01});
+    EXPECT_EQ(read.result, 4103U);
+    EXPECT_TRUE(read.node->ptWifi);
+    EXPECT_EQ(read.node->ptPort, nullptr);
+}
+
+TEST_F(CharacteristicAttribute, FailsWhereTheDataEnds)
+{
+    for (const Bytes &cut : {Bytes{}, Bytes{0x53}, Bytes{0x50}, Bytes{0x50, 0x03, 'x'},
+                             Bytes{0x50, 0x03, 'x', 0x00}, Bytes{0x00, 0x01}}) {
+        EXPECT_EQ(Attributes(cut).result, 4103U);
+    }
+}
+
+TEST(Kept, slot_replaced)
+{
+    blocks::BlockCheck check;
+    for (const Kind &kind : kinds::all()) {
+        SCOPED_TRACE(kind.name);
+        void *old = records::blank(kind.fields);
+        qvsWapCharacter *node = records::blank<qvsWapCharacter>();
+        records::set(node, kind.slot, old);
+        uint8_t attrId = 0;
+        uint8_t codePage = 0;
+        decoding::OwnText name;
+        Traces traces;
+        decoding::Decoder decoder(join({kind.type, {0x01}}));
+        EXPECT_EQ(
+            qvsClientProvWbxmlDecoderCharacterAttribute(decoder, node, &attrId, &codePage, &name),
+            0U);
+        EXPECT_TRUE(traces.has("qvsClientProvWbxmlDecoderCharacterAttribute : ERROR!!!\n"));
+        EXPECT_EQ(fieldsSet(node), records::Numbers{kind.slot});
+        EXPECT_NE(records::get(node, kind.slot), old);
+        records::release({old}); // it stayed allocated
+        kinds::releaseKept(node);
+        (void)qvsClientProvWbxmlDeleteCharacter(node);
+    }
+}
+
+TEST(Kept, attr_last_token)
+{
+    blocks::BlockCheck check;
+    const Attributes attributes({0x51, 0x00, 0x01, 0x01});
+    EXPECT_EQ(attributes.result, 0U);
+    EXPECT_EQ(attributes.attrId, 0);
+    EXPECT_EQ(attributes.codePage, 1);
+    EXPECT_TRUE(attributes.node->ptPxLogical);
+    for (const Bytes &content : {parm(0x15, "v"), kLogical}) {
+        Traces traces;
+        EXPECT_EQ(Character(characteristic({0x51, 0x00, 0x01}, content)).result, 4101U);
+        EXPECT_EQ(traces.texts.back(), turn(content[0] & 0x3F, 0x00).back()) << "without message";
+    }
+}
+
+// ---- What stands inside a characteristic
+
+TEST_F(Characteristic, IsNoNodeWithoutContent)
+{
+    const Bytes elements[] = {{0x86, 0x01}, {0x06, 0x01}, {0x86}, {0x06, 0x81}};
+    for (const Bytes &bytes : elements) {
+        SCOPED_TRACE(testing::PrintToString(bytes));
+        const Character read(bytes);
+        EXPECT_EQ(read.result, 0U);
+        EXPECT_EQ(read.left(), 0U);
+        EXPECT_EQ(read.node, nullptr);
+    }
+    const Character attributes({0x86, 0x51, 0x01});
+    EXPECT_EQ(attributes.result, 0U);
+    EXPECT_EQ(attributes.node, nullptr);
+    EXPECT_EQ(attributes.left(), 2U) << "its attributes are not read";
+}
+
+TEST_F(Characteristic, AcceptsNoElementWithoutAType)
+{
+    const Character empty({0x46, 0x01});
+    EXPECT_EQ(empty.result, 0U);
+    ASSERT_TRUE(empty.node);
+    EXPECT_EQ(fieldsSet(empty.node), records::Numbers{});
+    for (const Bytes &start : {Bytes{0x46}, Bytes{0xC6, 0x01}}) {
+        for (const Bytes &content : {parm(0x15, "v"), kLogical}) {
+            Traces traces;
+            const Character read(join({start, content, {0x01}}));
+            EXPECT_EQ(read.result, 4101U);
+            EXPECT_EQ(traces.texts, turn(content[0] & 0x3F, 0x00)) << "without message";
+        }
+    }
+}
+
+TEST_F(Characteristic, RefusesEveryOtherElement)
+{
+    for (unsigned byte = 0; byte < 256; ++byte) {
+        const uint8_t tag = byte & 0x3F;
+        SCOPED_TRACE(byte);
+        Traces traces;
+        const Character read(
+            characteristic({0x51}, join({{static_cast<uint8_t>(byte)}, {0x15, 0x06, 0x85, 0x01}})));
+        switch (tag) {
+        case 0x00: // with 0x15 as its page, then VALUE is the start of a characteristic
+        case 0x01:
+        case 0x03: // a string up to the end
+        case 0x06: // with attributes that are refused, or without content
+        case 0x07:
+            EXPECT_EQ(read.result, tag == 0x01 || tag == 0x07 ? 0U : tag == 0x03 ? 4103U : 4101U);
+            break;
+        default:
+            EXPECT_EQ(read.result, 4101U);
+            EXPECT_EQ(traces.texts,
+                      turn(tag, 0x51) + refusal("qvsClientProvWbxmlDecoderCharacter", tag));
+            EXPECT_EQ(read.decoder.position(), 3U) << "the tag stays";
+        }
+    }
+}
+
+TEST_F(Characteristic, DropsInlineStringsAmongItsParms)
+{
+    // Their tokens are seen without the top bits: a table string and opaque data are taken for
+    // inline strings, up to the next NUL.
+    for (const uint8_t string : {0x03, 0x43, 0x83, 0xC3}) {
+        const Bytes text = {string, ' ', 0x05, 0xC6, 0x00};
+        const Character read(characteristic(
+            {0x53}, join({text, parm(0x23, "80"), text, text, parm(0x24, "s"), text})));
+        EXPECT_EQ(read.result, 0U);
+        EXPECT_EQ(read.left(), 0U);
+        ASSERT_TRUE(read.node);
+        EXPECT_STREQ(read.node->ptPort->pszPortNbr, "80");
+        EXPECT_EQ(shown(read.node->ptPort->ptServiceList), "[s]");
+    }
+}
+
+TEST_F(Characteristic, EndsAtAnyByteWithTheTagOfAnEnd)
+{
+    for (const uint8_t end : {0x01, 0x41, 0x81, 0xC1}) {
+        const Character read({0xC6, 0x53, 0x01, end, 0x01});
+        EXPECT_EQ(read.result, 0U);
+        EXPECT_EQ(read.left(), 1U);
+        EXPECT_TRUE(read.node);
+    }
+}
+
+TEST_F(Characteristic, TracesEachTurn)
+{
+    Traces traces;
+    const Character read(
+        characteristic({0x53}, join({{0x03, 'x', 0x00, 0x00, 0x01}, parm(0x23, "80")})));
+    EXPECT_EQ(read.result, 0U);
+    EXPECT_EQ(traces.texts, turn(0x03, 0x53) + turn(0x00, 0x53) + turn(0x07, 0x53) +
+                                lines({"qvsClientProvWbxmlDecoderContent Error:0",
+                                       "qvsClientProvWbxmlDecoderParamString Error Code:0"}) +
+                                turn(0x01, 0x53));
+}
+
+TEST_F(Characteristic, KeepsItsKindWhenAParmSwitchesThePage)
+{
+    const Bytes switching = parm({0x00, 0x01, 0x14, 0x06, 0x85});
+    const Character read(characteristic({0x55}, join({switching, parm(0x11, "nap")})));
+    EXPECT_EQ(read.result, 0U);
+    ASSERT_TRUE(read.node);
+    EXPECT_STREQ(read.node->ptNapDef->pszNapId, "nap");
+    EXPECT_EQ(read.decoder->nCodePage, 1) << "for whoever comes next";
+}
+
+TEST_F(Characteristic, FailsWhereTheDataEnds)
+{
+    const Bytes whole =
+        characteristic({0x53}, join({{0x03, 'x', 0x00}, parm(0x23, "80"), {0x00, 0x00}}));
+    for (size_t count = 0; count < whole.size(); ++count) {
+        SCOPED_TRACE(count);
+        const Character read(prefix(whole, count));
+        EXPECT_EQ(read.result, 4103U);
+        EXPECT_EQ(read.node, nullptr);
+    }
+}
+
+TEST_F(Characteristic, EndsAtAStringThatPassesTheLimitOfAllTexts)
+{
+    decoding::Decoder decoder(characteristic({0x53}, {0x03, 'x', 0x00}));
+    decoder->nTextRead = 8 * 1024 * 1024;
+    qvsWapCharacter *node = nullptr;
+    EXPECT_EQ(qvsClientProvWbxmlDecoderCharacter(decoder, &node), 4111U);
+    EXPECT_EQ(node, nullptr);
+}
+
+TEST_F(Characteristic, JoinsALongValueOfManyPieces)
+{
+    Bytes attributes = {0x33, 0x06, 0x91};
+    std::string expected = "HTTP";
+    for (int i = 0; i < 500; ++i) {
+        attributes = join({attributes, {0x90, 0x92, 0x90, 0x94, 0x90, 0x00, 0x01, 0x9B}});
+        expected += ",BASIC,CHAP";
+    }
+    const Character read(
+        characteristic({0x00, 0x01, 0x57}, join({parm(join({attributes, {0x90, 0x03, 'x', 0x00}})),
+                                                 parm({0x90, 0x93}), parm(0x30, "level")})));
+    EXPECT_EQ(read.result, 0U);
+    ASSERT_TRUE(read.node);
+    EXPECT_EQ(read.node->ptAppAuth->pszAAuthType, expected + ",x,DIGEST");
+}
+
+TEST(CharacteristicKeeps, TheValueThatAJoinedOneTookThePlaceOf)
+{
+    const Bytes bytes = characteristic(
+        {0x00, 0x01, 0x57},
+        join({parm({0x33, 0x06, 0x91, 0x90, 0x92}), parm({0x33, 0x06, 0x9A, 0x90, 0x9B})}));
+    const size_t before = blocks::live();
+    {
+        const Character read(bytes);
+        ASSERT_TRUE(read.node);
+        EXPECT_STREQ(read.node->ptAppAuth->pszAAuthType, "PAP,CHAP");
+    }
+    EXPECT_EQ(blocks::live(), before + 1) << "the first one stays allocated";
+}
+
+TEST(Kept, element_switch)
+{
+    blocks::BlockCheck check;
+    // In a characteristic: neither its parms nor the next characteristic see the page.
+    for (const Bytes &page : {Bytes{0x00, 0x01}, Bytes{0x40, 0x01}, Bytes{0x00, 0x3F}}) {
+        const Bytes first = characteristic({0x55}, join({page, parm(0x11, "nap"), page}));
+        const Character read(first);
+        EXPECT_EQ(read.result, 0U);
+        EXPECT_EQ(read.decoder->nCodePage, 0);
+        ASSERT_TRUE(read.node);
+        EXPECT_STREQ(read.node->ptNapDef->pszNapId, "nap");
+
+        const Document document(join({{0x45}, page, characteristic({0x55}), {0x01}}));
+        EXPECT_EQ(document.result, 0U);
+        ASSERT_TRUE(kinds::nodeAt(document.nodes(), 0));
+        EXPECT_TRUE(kinds::nodeAt(document.nodes(), 0)->ptNapDef);
+    }
+}
