@@ -631,7 +631,7 @@ TEST_P(ContextList, GoesOnWithoutMemoryForAText)
 
 TEST(ContextLists, TakeAnyLength)
 {
-    Sweep sweep;
+    blocks::BlockCheck check;
     constexpr size_t kMany = 200000;
     qvsList *texts = list(Strings(kMany, "x"));
     onSmallStack([&] {
@@ -639,6 +639,7 @@ TEST(ContextLists, TakeAnyLength)
         EXPECT_EQ(textsOf(copy).size(), kMany);
         qvsClientProvCtxDelectContextServiceList(copy);
     });
+    EXPECT_EQ(qvsListDeleteNodeAllAndList(texts, nullptr), QVS_OK);
 }
 
 } // namespace

@@ -34,7 +34,7 @@ struct Chain {
 // Strips every record of a chain from the first to the last, then releases the records from the
 // last to the first. The links, turned round on the way there, lead the way back.
 template <class Record, class Strip>
-void releaseFrom(Record *first, Strip strip)
+void releaseRecords(Record *first, Strip strip)
 {
     if (!first) {
         traceError(QVS_ERROR_BAD_ARGUMENT);
@@ -61,7 +61,7 @@ void releaseChain(Record *first, Chain<Record, Nodes>... chains)
 {
     static_assert(sizeof...(chains) + 1 == kFieldsOf<Record>,
                   "a field is neither released nor left on purpose");
-    releaseFrom(first, [chains...](Record *record) { (chains.releaseFrom(record), ...); });
+    releaseRecords(first, [chains...](Record *record) { (chains.releaseFrom(record), ...); });
 }
 
 // Of each record the texts in the order of their rows, then the chains from left to right.
@@ -71,7 +71,7 @@ void releaseChain(Record *first, const TextField<Record> (&texts)[N], Left<L>,
 {
     static_assert(N + L + sizeof...(chains) + 1 == kFieldsOf<Record>,
                   "a field is neither released nor left on purpose");
-    releaseFrom(first, [&texts, chains...](Record *record) {
+    releaseRecords(first, [&texts, chains...](Record *record) {
         for (TextField<Record> text : texts) {
             releaseText(&(record->*text));
         }
@@ -82,7 +82,7 @@ void releaseChain(Record *first, const TextField<Record> (&texts)[N], Left<L>,
 // A list of texts, whatever it lists.
 void releaseTexts(qvsCtxStrNode *first)
 {
-    releaseFrom(first, [](qvsCtxStrNode *node) { releaseText(&node->pszValue); });
+    releaseRecords(first, [](qvsCtxStrNode *node) { releaseText(&node->pszValue); });
 }
 
 // The root: its chains from left to right, then itself.
