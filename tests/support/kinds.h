@@ -109,6 +109,14 @@ inline Bytes characteristic(const Bytes &attributes, const Bytes &content = {})
     return join({{0xC6}, attributes, {0x01}, content, {0x01}});
 }
 
+// The trace of one turn over the content of a characteristic.
+inline Strings turn(unsigned tag, unsigned attrId)
+{
+    return parms::lines(
+        {"qvsClientProvWbxmlDecoderCharacter :: " + parms::format("nId[0x%02x], ", tag) +
+         parms::format("nAttrId[0x%02x]", attrId)});
+}
+
 // What stays allocated when a tree is released, or becomes unreachable with it, is released by the
 // test: ROAMING, the named parameters of APPLICATION and of VENDORCONFIG.
 inline void releaseKept(const qvsList *nodes);

@@ -128,8 +128,7 @@ TEST(NestingTable, HoldsForEachParentAndEachChild)
             EXPECT_EQ(read.result, 4101U);
             EXPECT_EQ(read.node, nullptr);
             EXPECT_EQ(traces.texts.back(), parent.refusal ? std::string(parent.refusal) + "\n"
-                                                          : "qvsClientProvWbxmlDecoderCharacter :: "
-                                                            "nId[0x06], nAttrId[0x50]\n");
+                                                          : kinds::turn(0x06, 0x50).back());
             kept += parent.slot == 16; // the record of a ROAMING that failed
         }
     }
@@ -208,12 +207,8 @@ TEST_F(Nesting, TracesTheTurnsOfTheParentAroundThoseOfTheChild)
 {
     Traces traces;
     const Character read(characteristic({0x51}, kPort));
-    const auto turn = [](const char *tag, const char *type) {
-        return std::string("qvsClientProvWbxmlDecoderCharacter :: nId[") + tag + "], nAttrId[" +
-               type + "]";
-    };
     EXPECT_EQ(traces.texts,
-              lines({turn("0x06", "0x51"), turn("0x01", "0x53"), turn("0x01", "0x51")}));
+              kinds::turn(0x06, 0x51) + kinds::turn(0x01, 0x53) + kinds::turn(0x01, 0x51));
 }
 
 TEST_F(Nesting, KeepsItsOrderInEachParent)

@@ -190,6 +190,25 @@ TEST_F(DocumentBody, TracesTheFailureOfItsContent)
     EXPECT_EQ(traces.texts.back(), "WBXML Decode Error[1007]\n");
 }
 
+TEST_F(DocumentBody, TracesNothingOfItsOwnWithoutAFailure)
+{
+    Traces traces;
+    EXPECT_EQ(Document({0x45, 0x01}).result, 0U);
+    EXPECT_EQ(traces.texts, Strings{});
+}
+
+TEST_F(DocumentBody, TracesThatItsContentFoundNoMemory)
+{
+    decoding::Decoder decoder(join({{0x45}, kLogical, {0x01}}));
+    qvsWapDoc *document = nullptr;
+    Traces traces;
+    blocks::failAt = 1; // the first one is for the document
+    EXPECT_EQ(qvsClientProvWbxmlDecoderWbxmlBody(decoder, &document), 1U);
+    blocks::reset();
+    EXPECT_EQ(document, nullptr);
+    EXPECT_EQ(traces.texts, lines({"WBXML Decode Error[1]"}));
+}
+
 TEST_F(DocumentBody, FailsWithoutData)
 {
     Traces traces;

@@ -233,10 +233,13 @@ TEST_F(PxPhysicalParm, TakesADomainThatFoundNoMemoryForOneThatCannotBeRead)
                   const long failAt = std::exchange(blocks::failAt, -1);
                   Reading<PxPhysical> run(bytes);
                   blocks::failAt = failAt;
+                  Traces traces;
                   // Without memory for the text it is not read, and its first letter is refused.
                   EXPECT_EQ(run.read(), failAt == 0 ? 4101U : 0U);
-                  EXPECT_EQ(shown(run.record->ptDomainList),
-                            blocks::failAt < 0 ? "(null)" : "[value]");
+                  const bool failed = blocks::failAt < 0;
+                  EXPECT_EQ(shown(run.record->ptDomainList), failed ? "(null)" : "[value]");
+                  EXPECT_EQ(traces.has("[ERROR] qvsClientProvWbxmlDecoderParamListString Fail\n"),
+                            failed);
               }),
               1);
 }
