@@ -109,35 +109,13 @@ private:
         return kOk;
     }
 
-    // One more value of AAUTHTYPE.
-    uint32_t comma(Open *in)
+    uint32_t authType(Open *in)
     {
-        drop(1);
-        uint8_t token = 0;
-        if (!peek(&token)) {
-            return kNoData;
-        }
-        const bool switched = token == kSwitchPage;
-        if (switched) {
-            (void)switchPage();
-            if (!peek(&token)) {
-                return kNoData;
-            }
-        }
         Text text;
         if (in->texts[kAAuthType]) {
             text.own.emplace(); // what it says does not matter
         }
-        uint32_t result = kOk;
-        if (!switched && isString(token)) {
-            result = append(&text, ",") ? content(&text) : kTooMuchText;
-        } else {
-            if (const ValueToken *known = valueToken(token)) {
-                join(&text, *known);
-            }
-            drop(1);
-            result = tooMuch ? kTooMuchText : kOk;
-        }
+        const uint32_t result = comma(&text);
         in->texts[kAAuthType] = text.own.has_value();
         return result;
     }
@@ -152,12 +130,12 @@ private:
             return single(in, token);
         }
         if (has(kind.lists, token)) {
-            const uint32_t result = listOfTexts();
+            const uint32_t result = listOfTexts(nullptr);
             const bool mayFail = &kind == &kKinds[kPxPhysical] && token == kDomain;
             return mayFail && result != kTooMuchText ? kOk : result;
         }
         if (token == kComma && &kind == &kKinds[kAppAuth]) {
-            return comma(in);
+            return authType(in);
         }
         return kUnknown;
     }
@@ -340,22 +318,6 @@ private:
 
     // ---- The document
 
-    void readTable()
-    {
-        uint32_t length = 0;
-        tableSize = kUnreadTable;
-        if (!number(&length) || length > 0xFFFFFFFD) {
-            return;
-        }
-        const std::size_t present = std::min<std::size_t>(length, left());
-        table.emplace(reinterpret_cast<const char *>(data) + (present ? position : 0), present);
-        table->append(2, '\0');
-        position += present;
-        if (present == length) {
-            tableSize = length;
-        }
-    }
-
     uint32_t rootElement()
     {
         uint8_t token = 0;
@@ -366,21 +328,8 @@ private:
             return kOk;
         }
         if (token & kAttributesBit) {
-            uint8_t version = 0;
-            if (!take(&version)) {
-                return kNoData;
-            }
-            if (version != kVersionText && version != kVersion10) {
-                return kUnknown;
-            }
-            uint8_t next = 0;
-            if (!peekTag(&next)) {
-                return kNoData;
-            }
-            if (next != kEnd && next != kStrI) {
-                return kUnknown;
-            }
-            while (take(&next) && next != kEnd && next != kLiteral && next != kExtI0) {
+            if (uint32_t result = versionAttributes()) {
+                return result;
             }
         }
         for (;;) {
@@ -412,14 +361,9 @@ private:
 
     uint32_t document()
     {
-        uint8_t version = 0;
+        // A header that ends early is judged by what was read of it.
         uint32_t publicId = 0;
-        uint32_t index = 0;
-        uint32_t charset = 0;
-        if (take(&version) && number(&publicId) && (publicId != 0 || number(&index)) &&
-            number(&charset)) {
-            readTable();
-        }
+        (void)header(&publicId);
         const bool named = publicId == 0 && table && table->c_str() == kDocumentType;
         if (publicId != kProvisioning && !named) {
             return kWrongType;

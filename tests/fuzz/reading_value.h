@@ -9,6 +9,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace fuzz {
 
@@ -110,6 +111,38 @@ protected:
             }
         }
         return false;
+    }
+
+    // ---- The header
+
+    void readTable()
+    {
+        uint32_t length = 0;
+        tableSize = kUnreadTable;
+        if (!number(&length) || length > 0xFFFFFFFD) {
+            return;
+        }
+        const std::size_t present = std::min<std::size_t>(length, left());
+        table.emplace(reinterpret_cast<const char *>(data) + (present ? position : 0), present);
+        table->append(2, '\0');
+        position += present;
+        if (present == length) {
+            tableSize = length;
+        }
+    }
+
+    uint32_t header(uint32_t *publicId)
+    {
+        uint8_t version = 0;
+        uint32_t ignored = 0;
+        if (!take(&version)) {
+            return kNoData;
+        }
+        if (!number(publicId) || (*publicId == 0 && !number(&ignored)) || !number(&ignored)) {
+            return kUnknown;
+        }
+        readTable();
+        return kOk;
     }
 
     // ---- Text
@@ -299,6 +332,43 @@ protected:
         return token == expected ? kOk : kUnknown;
     }
 
+    uint32_t version()
+    {
+        uint8_t token = 0;
+        if (!take(&token)) {
+            return kNoData;
+        }
+        return token == kVersionText || token == kVersion10 ? kOk : kUnknown;
+    }
+
+    // Up to and with what ends the attributes of the document.
+    uint32_t skipAttributes()
+    {
+        uint8_t token = 0;
+        while (take(&token)) {
+            if (token == kEnd || token == kLiteral || token == kExtI0) {
+                return kOk;
+            }
+        }
+        return kNoData;
+    }
+
+    uint32_t versionAttributes()
+    {
+        if (uint32_t result = version()) {
+            return result;
+        }
+        uint8_t next = 0;
+        if (!peekTag(&next)) {
+            return kNoData;
+        }
+        if (next != kEnd && next != kStrI) {
+            return kUnknown;
+        }
+        (void)skipAttributes();
+        return kOk;
+    }
+
     uint32_t switchPage()
     {
         uint8_t number = 0;
@@ -353,7 +423,8 @@ protected:
         }
     }
 
-    uint32_t listOfTexts()
+    // Values of a list up to the END behind them, which are put into `items` if that is given.
+    uint32_t listOfTexts(std::vector<std::string> *items)
     {
         std::optional<std::string> last;
         for (;;) {
@@ -369,10 +440,37 @@ protected:
             if (uint32_t result = pair(token, &text)) {
                 return result;
             }
+            if (text.own && items) {
+                items->push_back(*text.own);
+            }
             if (text.own) {
                 last = std::move(text.own);
             }
         }
+    }
+
+    // One more value for a text, behind a token that stands for a comma.
+    uint32_t comma(Text *text)
+    {
+        uint8_t token = 0;
+        if (!take(&token) || !peek(&token)) {
+            return kNoData;
+        }
+        const bool switched = token == kSwitchPage;
+        if (switched) {
+            (void)switchPage();
+            if (!peek(&token)) {
+                return kNoData;
+            }
+        }
+        if (!switched && isString(token)) {
+            return append(text, ",") ? content(text) : kTooMuchText;
+        }
+        if (const ValueToken *known = valueToken(token)) {
+            join(text, *known);
+        }
+        drop(1);
+        return tooMuch ? kTooMuchText : kOk;
     }
 
     const uint8_t *data;
