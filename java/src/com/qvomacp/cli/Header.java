@@ -23,7 +23,13 @@ final class Header {
     }
 
     String mediaType() {
-        switch (contentType) {
+        String name = mediaType(contentType);
+        return name == null ? "unknown" : name;
+    }
+
+    /** The media type of a well-known content type that the library takes; null for others. */
+    static String mediaType(int code) {
+        switch (code) {
             case 53:
                 return "application/vnd.wap.connectivity-xml";
             case 54:
@@ -35,7 +41,7 @@ final class Header {
             case 78:
                 return "application/vnd.syncml.ds.notification";
             default:
-                return "unknown";
+                return null;
         }
     }
 
@@ -43,8 +49,17 @@ final class Header {
         return sec != 0;
     }
 
-    /** The name that OMA Provisioning Bootstrap gives the security method. */
     String secName() {
+        return secName(sec);
+    }
+
+    /** A SEC byte, for people. */
+    static String secShown(int sec) {
+        return String.format("%s (0x%02X)", secName(sec), sec);
+    }
+
+    /** The name that OMA Provisioning Bootstrap gives the security method. */
+    private static String secName(int sec) {
         int method = sec & 0x7F;
         return method < METHODS.length ? METHODS[method] : "unknown";
     }

@@ -8,7 +8,7 @@ import java.util.function.Consumer;
  *
  * <p>{@code header} has {@code contentType}, {@code contentTypeCode}, {@code headerLength} and
  * {@code bodyLength}, with {@code sec} (its name) and {@code secCode} (the byte as sent) when the
- * message has a SEC, and {@code mac} when it has a MAC. {@code characteristics} is an array; each
+ * message has a SEC, and {@code mac} when it has a MAC; it is null for a body alone. {@code characteristics} is an array; each
  * has {@code type}, {@code parms} (objects of {@code name} and {@code value}, the value null when
  * the parameter is set but the library answers none) and again {@code characteristics}.
  */
@@ -25,9 +25,60 @@ final class JsonWriter {
         return writer.out.append('\n').toString();
     }
 
+    /** The push header alone: the object that is {@code header} in a whole message. */
+    static String write(Header header) {
+        JsonWriter writer = new JsonWriter();
+        writer.out.append("{\n").append(INDENT);
+        writer.header(header);
+        return writer.out.append("\n}\n").toString();
+    }
+
+    /** Why a message is refused: an object with {@code refused}. */
+    static String write(Explanation explanation) {
+        JsonWriter writer = new JsonWriter();
+        writer.out.append("{\n").append(INDENT).append("\"refused\": {\n");
+        writer.member("reason").text(explanation.reason);
+        if (explanation.code != 0) {
+            writer.nextMember("code").out.append(explanation.code);
+            writer.nextMember("name").text(Vocabulary.result(explanation.code));
+        }
+        if (!explanation.isHeader()) {
+            writer.nextMember("bodyOffset").out.append(explanation.bodyOffset);
+        }
+        writer.nextMember("messageOffset").out.append(explanation.messageOffset);
+        writer.nextMember("path").text(explanation.path);
+        if (explanation.accepted != null) {
+            writer.nextMember("accepted").text(explanation.accepted);
+        }
+        writer.out.append('\n').append(INDENT).append("}\n}\n");
+        return writer.out.toString();
+    }
+
+    /** One of several objects, each of another file, which is named in {@code file}. */
+    static String element(String file, String object, boolean first) {
+        JsonWriter writer = new JsonWriter();
+        writer.out.append(first ? "\n" : ",\n").append("{\n").append(INDENT).append("\"file\": ");
+        writer.text(file);
+        writer.out.append(",\n").append(INDENT + object.substring("{\n".length()).trim());
+        int start = first ? 1 : 2;
+        String lines = writer.out.substring(start).replace("\n", "\n" + INDENT);
+        return writer.out.substring(0, start) + INDENT + lines;
+    }
+
     private void message(Message message) {
-        Header header = message.header;
-        out.append("{\n").append(INDENT).append("\"header\": {\n");
+        out.append("{\n").append(INDENT);
+        if (message.header == null) {
+            out.append("\"header\": null");
+        } else {
+            header(message.header);
+        }
+        out.append(",\n").append(INDENT);
+        characteristics(message.characteristics, INDENT);
+        out.append("\n}");
+    }
+
+    private void header(Header header) {
+        out.append("\"header\": {\n");
         member("contentType").text(header.mediaType());
         nextMember("contentTypeCode").out.append(header.contentType);
         nextMember("headerLength").out.append(header.headerLength);
@@ -39,9 +90,7 @@ final class JsonWriter {
         if (header.hasMac()) {
             nextMember("mac").text(header.mac);
         }
-        out.append('\n').append(INDENT).append("},\n").append(INDENT);
-        characteristics(message.characteristics, INDENT);
-        out.append("\n}");
+        out.append('\n').append(INDENT).append('}');
     }
 
     private JsonWriter nextMember(String name) {

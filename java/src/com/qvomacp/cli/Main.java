@@ -3,23 +3,22 @@ package com.qvomacp.cli;
 import java.io.FileDescriptor;
 import java.io.FileInputStream;
 import java.io.FileOutputStream;
-import java.io.IOException;
 import java.io.InputStream;
 import java.io.OutputStream;
 import java.io.OutputStreamWriter;
 import java.io.PrintWriter;
 import java.nio.charset.StandardCharsets;
-import java.nio.file.InvalidPathException;
-import java.util.concurrent.Callable;
+import java.util.Arrays;
+import picocli.AutoComplete;
 import picocli.CommandLine;
 import picocli.CommandLine.Command;
+import picocli.CommandLine.IVersionProvider;
 import picocli.CommandLine.Model.CommandSpec;
 import picocli.CommandLine.Option;
-import picocli.CommandLine.Parameters;
 import picocli.CommandLine.Spec;
 
 /**
- * Shows a pushed provisioning message, for people or as JSON.
+ * The command-line program: shows and checks pushed provisioning messages.
  *
  * <p>The values are those that the natives of {@code com.qvomacp.eng.parser} answer. Where these do
  * not answer what the message holds, neither does this program: the SERVICE of a proxy's port is
@@ -30,34 +29,33 @@ import picocli.CommandLine.Spec;
  */
 @Command(
         name = "omacp",
-        description = "Shows what a pushed OMA Client Provisioning message sets.",
-        optionListHeading = "%n",
+        versionProvider = Main.Version.class,
+        description = "Shows what pushed OMA Client Provisioning messages set, and checks them.",
+        synopsisHeading = "Usage: ",
+        customSynopsis = {"omacp [show] [OPTION...] [FILE...]", "       omacp COMMAND ..."},
+        commandListHeading = "%nCommands:%n",
+        optionListHeading = "%nOptions:%n",
         footerHeading = "%n",
         footer = {
-            "Values are shown as the library answers them: the SERVICE of a proxy's port by its"
-                    + " place in the list, a BEARER given as text by the NAP-ADDRESS of its access"
-                    + " point."
+            "\"omacp COMMAND --help\" tells the options of a command. Without a command, show is"
+                    + " meant."
         },
         exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
-            "0:the message was shown",
-            "1:the message cannot be parsed",
-            "2:wrong usage, the message cannot be read, the output cannot be written,"
+            "0:every message was shown, or its MAC is right",
+            "1:a message is refused, or its MAC is not right",
+            "2:wrong usage, a message cannot be read, the output cannot be written,"
                     + " or the library cannot be loaded"
         })
-public final class Main implements Callable<Integer> {
-    private static final int SHOWN = 0;
-    private static final int REFUSED = 1;
-    private static final int FAILED = 2;
+public final class Main implements Runnable {
+    static final int DONE = 0;
+    static final int REFUSED = 1;
+    static final int FAILED = 2;
 
-    private static final String STANDARD_INPUT = "-";
-
-    private final InputStream in;
+    final InputStream in;
+    final Terminal terminal;
 
     @Spec private CommandSpec spec;
-
-    @Option(names = "--json", description = "Print JSON.")
-    private boolean json;
 
     @Option(
             names = {"-h", "--help"},
@@ -65,17 +63,15 @@ public final class Main implements Callable<Integer> {
             description = "Show this help and exit.")
     private boolean help;
 
-    @Parameters(
-            arity = "0..1",
-            paramLabel = "FILE",
-            defaultValue = STANDARD_INPUT,
-            description =
-                    "The pushed message: its bytes, or hexadecimal text with or without blanks and"
-                            + " line breaks. Standard input when it is \"-\" or missing.")
-    private String file;
+    @Option(
+            names = {"-V", "--version"},
+            versionHelp = true,
+            description = "Show the version and exit.")
+    private boolean version;
 
-    private Main(InputStream in) {
+    private Main(InputStream in, Terminal terminal) {
         this.in = in;
+        this.terminal = terminal;
     }
 
     /**
@@ -89,6 +85,7 @@ public final class Main implements Callable<Integer> {
                         new FileInputStream(FileDescriptor.in),
                         new FileOutputStream(FileDescriptor.out),
                         new FileOutputStream(FileDescriptor.err),
+                        Terminal.ofProcess(System.getenv()),
                         arguments));
     }
 
@@ -98,14 +95,21 @@ public final class Main implements Callable<Integer> {
      * @param in standard input
      * @param out standard output
      * @param err standard error
+     * @param terminal what the outputs are connected to
      * @param arguments what the command line gives
-     * @return the exit status: 0 shown, 1 refused, 2 could not be tried
+     * @return the exit status: 0 all is well, 1 refused, 2 could not be tried
      */
-    static int run(InputStream in, OutputStream out, OutputStream err, String... arguments) {
+    static int run(
+            InputStream in,
+            OutputStream out,
+            OutputStream err,
+            Terminal terminal,
+            String... arguments) {
         PrintWriter output = new PrintWriter(new OutputStreamWriter(out, StandardCharsets.UTF_8));
         PrintWriter errors = new PrintWriter(new OutputStreamWriter(err, StandardCharsets.UTF_8));
+        CommandLine program = program(new Main(in, terminal));
         int status =
-                new CommandLine(new Main(in)).setOut(output).setErr(errors).execute(arguments);
+                program.setOut(output).setErr(errors).execute(withCommand(program, arguments));
         if (output.checkError()) {
             errors.println("omacp: the output cannot be written");
             status = FAILED;
@@ -114,30 +118,65 @@ public final class Main implements Callable<Integer> {
         return status;
     }
 
-    @Override
-    public Integer call() {
-        byte[] push;
-        try {
-            push = file.equals(STANDARD_INPUT) ? MessageInput.read(in) : MessageInput.read(file);
-        } catch (IOException | InvalidPathException unreadable) {
-            return fail(FAILED, MessageInput.reasonOf(unreadable));
+    static CommandLine program() {
+        return program(new Main(null, Terminal.NONE));
+    }
+
+    private static CommandLine program(Main main) {
+        return new CommandLine(main)
+                .addSubcommand(new Show(main))
+                .addSubcommand(new Verify(main))
+                .addSubcommand(new Completion());
+    }
+
+    /** The arguments with {@code show} in front, where no command or question is. */
+    private static String[] withCommand(CommandLine program, String[] arguments) {
+        if (arguments.length > 0
+                && (program.getSubcommands().containsKey(arguments[0])
+                        || Arrays.asList("-h", "--help", "-V", "--version")
+                                .contains(arguments[0]))) {
+            return arguments;
         }
-        try {
-            System.loadLibrary("omacp");
-            Message message = new MessageReader().read(push);
-            PrintWriter out = spec.commandLine().getOut();
-            out.print(json ? JsonWriter.write(message) : TextWriter.write(message));
-            return SHOWN;
-        } catch (RefusedException refused) {
-            return fail(REFUSED, refused.getMessage());
-        } catch (UnsatisfiedLinkError missing) {
-            return fail(FAILED, "the library cannot be loaded: " + missing.getMessage());
+        String[] withShow = new String[arguments.length + 1];
+        withShow[0] = "show";
+        System.arraycopy(arguments, 0, withShow, 1, arguments.length);
+        return withShow;
+    }
+
+    @Override
+    public void run() {
+        spec.commandLine().usage(spec.commandLine().getOut());
+    }
+
+    /** The version that the jar states. */
+    static final class Version implements IVersionProvider {
+        @Override
+        public String[] getVersion() {
+            String version = Main.class.getPackage().getImplementationVersion();
+            return new String[] {"omacp " + (version == null ? "unpacked" : version)};
         }
     }
 
-    private int fail(int status, String reason) {
-        String source = file.equals(STANDARD_INPUT) ? "standard input" : file;
-        spec.commandLine().getErr().println("omacp: " + source + ": " + reason);
-        return status;
+    /** Prints what a shell needs to complete the program's command lines. */
+    @Command(
+            name = "completion",
+            description = "Print a script with which bash and zsh complete command lines.",
+            optionListHeading = "%nOptions:%n",
+            footerHeading = "%n",
+            footer = {"Use it by: source <(omacp completion)"})
+    private static final class Completion implements Runnable {
+        @Spec private CommandSpec spec;
+
+        @Option(
+                names = {"-h", "--help"},
+                usageHelp = true,
+                description = "Show this help and exit.")
+        private boolean help;
+
+        @Override
+        public void run() {
+            CommandLine own = spec.commandLine();
+            own.getOut().print(AutoComplete.bash("omacp", own.getParent()));
+        }
     }
 }

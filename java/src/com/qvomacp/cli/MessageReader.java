@@ -30,25 +30,33 @@ final class MessageReader {
     private final XCPCtxWifi wifis = new XCPCtxWifi();
     private final XCPCtxVoWifi voWifis = new XCPCtxVoWifi();
 
-    /** Reads a push; leaves nothing behind in the library, whether the push is taken or not. */
-    Message read(byte[] push) throws RefusedException {
+    /**
+     * Reads a message; leaves nothing behind in the library, whether the message is taken or not.
+     */
+    Message read(Source source) throws RefusedException {
+        byte[] push = source.push();
         try {
             if (!parser.qvomacp_parser(push, push.length, WHOLE_MESSAGE)) {
-                throw new RefusedException(reasonFor(push));
+                throw new RefusedException(parser.qvomacp_parser(push, push.length, HEADER_ONLY));
             }
-            return new Message(header(), characteristics());
+            Header header = header();
+            return new Message(
+                    source.isPush ? header : null, header.bodyLength, characteristics());
         } finally {
             parser.qvomacp_parser_del();
         }
     }
 
-    private String reasonFor(byte[] push) {
-        if (!parser.qvomacp_parser(push, push.length, HEADER_ONLY)) {
-            return "not a push with a provisioning content type";
+    /** Reads the push header alone. */
+    Header readHeader(byte[] push) throws RefusedException {
+        try {
+            if (!parser.qvomacp_parser(push, push.length, HEADER_ONLY)) {
+                throw new RefusedException(false);
+            }
+            return header();
+        } finally {
+            parser.qvomacp_parser_del();
         }
-        return "the body is not a provisioning document that can be decoded (content type "
-                + header().mediaType()
-                + ")";
     }
 
     private Header header() {

@@ -1,10 +1,14 @@
 package com.qvomacp.cli;
 
-/** The library does not take the message; the text says which part of it, for people. */
+/** The library does not take the message. */
 final class RefusedException extends Exception {
     private static final long serialVersionUID = 1L;
 
-    RefusedException(String reason) {
-        super(reason);
+    /** Whether it takes the push header, so that it is the body that it refuses. */
+    final boolean headerTaken;
+
+    RefusedException(boolean headerTaken) {
+        super(headerTaken ? "the body is refused" : "the push header is refused");
+        this.headerTaken = headerTaken;
     }
 }

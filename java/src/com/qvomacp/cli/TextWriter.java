@@ -14,7 +14,7 @@ final class TextWriter {
 
     static String write(Message message) {
         TextWriter writer = new TextWriter();
-        writer.header(message.header);
+        writer.header(message);
         for (Characteristic characteristic : message.characteristics) {
             writer.out.append('\n');
             writer.characteristic(characteristic, 0);
@@ -22,12 +22,27 @@ final class TextWriter {
         return writer.out.toString();
     }
 
+    /** Writes what the push header says, alone. */
+    static String write(Header header) {
+        TextWriter writer = new TextWriter();
+        writer.header(header);
+        return writer.out.toString();
+    }
+
+    private void header(Message message) {
+        if (message.header == null) {
+            fact("Body length", message.bodyLength + " bytes, without a push header");
+        } else {
+            header(message.header);
+        }
+    }
+
     private void header(Header header) {
         fact("Content type", header.mediaType() + " (" + header.contentType + ")");
         fact("Header length", header.headerLength + " bytes");
         fact("Body length", header.bodyLength + " bytes");
         if (header.hasSec()) {
-            fact("SEC", String.format("%s (0x%02X)", header.secName(), header.sec));
+            fact("SEC", Header.secShown(header.sec));
         }
         if (header.hasMac()) {
             fact("MAC", header.mac);
@@ -44,7 +59,7 @@ final class TextWriter {
         out.append(characteristic.type).append('\n');
         int column = 0;
         for (Characteristic.Parm parm : characteristic.parms) {
-            column = Math.max(column, shown(parm.name).length() + INDENT);
+            column = Math.max(column, Visible.of(parm.name).length() + INDENT);
         }
         for (Characteristic.Parm parm : characteristic.parms) {
             String value = parm.value == null ? "(set, value not answered)" : parm.value;
@@ -56,47 +71,16 @@ final class TextWriter {
     }
 
     private void line(int indent, int column, String name, String value) {
-        String shownName = shown(name);
+        String shownName = Visible.of(name);
         spaces(indent);
         out.append(shownName);
         spaces(column - shownName.length());
-        out.append(shown(value)).append('\n');
+        out.append(Visible.of(value)).append('\n');
     }
 
     private void spaces(int count) {
         for (int i = 0; i < count; ++i) {
             out.append(' ');
-        }
-    }
-
-    /**
-     * The text with everything that is no visible character written as its code, since a message
-     * comes from a stranger and a terminal obeys control characters.
-     */
-    private static String shown(String text) {
-        StringBuilder visible = new StringBuilder();
-        text.codePoints()
-                .forEach(
-                        c -> {
-                            if (isVisible(c)) {
-                                visible.appendCodePoint(c);
-                            } else {
-                                visible.append(String.format("\\u%04x", c));
-                            }
-                        });
-        return visible.toString();
-    }
-
-    private static boolean isVisible(int codePoint) {
-        switch (Character.getType(codePoint)) {
-            case Character.CONTROL:
-            case Character.FORMAT:
-            case Character.LINE_SEPARATOR:
-            case Character.PARAGRAPH_SEPARATOR:
-            case Character.SURROGATE:
-                return false;
-            default:
-                return true;
         }
     }
 }

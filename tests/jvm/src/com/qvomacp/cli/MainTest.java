@@ -61,7 +61,8 @@ class MainTest extends Natives {
     private int run(byte[] input, String... arguments) {
         ByteArrayOutputStream out = new ByteArrayOutputStream();
         ByteArrayOutputStream err = new ByteArrayOutputStream();
-        int status = Main.run(new ByteArrayInputStream(input), out, err, arguments);
+        int status = Main.run(
+                        new ByteArrayInputStream(input), out, err, Terminal.NONE, arguments);
         output = out.toString(StandardCharsets.UTF_8);
         errors = err.toString(StandardCharsets.UTF_8);
         assertEquals(-1, parser.qvomacp_GetParserContentType(), "a header is left behind");
@@ -113,10 +114,10 @@ class MainTest extends Natives {
     @ParameterizedTest
     @ValueSource(strings = {"", "\n", "0106", "01 06 0", "0x0106", "hello", "A"})
     void refusesTextThatIsNoMessage(String text) {
-        assertFails(
-                1,
-                "omacp: standard input: not a push with a provisioning content type\n",
-                ascii(text));
+        assertEquals(1, run(ascii(text)));
+        assertEquals("", output);
+        assertTrue(errors.startsWith("omacp: standard input: refused: "), errors);
+        assertTrue(errors.contains(", in push header.\n"), errors);
     }
 
     @Test
@@ -297,23 +298,32 @@ class MainTest extends Natives {
         message[1] = 7;
         assertFails(
                 1,
-                "omacp: standard input: not a push with a provisioning content type\n",
+                """
+                omacp: standard input: refused: PDU type 0x07 is no push
+                  message offset 1 (0x1), in push header.
+                    0000  01 07 09 B6 91 81 92 41 42
+                             ^^
+                  Accepted here: 0x06 (Push).
+                """,
                 message,
                 "--json");
     }
 
     @Test
-    void refusesABodyThatCannotBeDecoded() throws IOException {
-        byte[] message = withShortType(0xC4, new byte[] {1, 2, 3}).bytes();
-        Path file = Files.write(directory.resolve("refused"), message);
+    void refusesABodyThatCannotBeDecoded() {
         assertFails(
                 1,
-                "omacp: "
-                        + file
-                        + ": the body is not a provisioning document that can be decoded"
-                        + " (content type application/vnd.syncml.notification)\n",
-                new byte[0],
-                file.toString());
+                """
+                omacp: standard input: refused: public identifier 2 (WML 1.0) is no
+                  provisioning document
+                  4107 QVS_ERROR_WBXML_DOCUMENT_TYPE, body offset 1 (0x1), message offset 5
+                  (0x5).
+                    0000  01 06 01 C4 01 02 03
+                                         ^^^^^
+                  Accepted here: public identifier 11, or 0 with a string table that begins with
+                  "-//WAPFORUM//DTD PROV 1.0//EN".
+                """,
+                withShortType(0xC4, new byte[] {1, 2, 3}).bytes());
     }
 
     @Test
@@ -339,7 +349,7 @@ class MainTest extends Natives {
                     }
                 };
         ByteArrayOutputStream err = new ByteArrayOutputStream();
-        assertEquals(2, Main.run(broken, OutputStream.nullOutputStream(), err));
+        assertEquals(2, Main.run(broken, OutputStream.nullOutputStream(), err, Terminal.NONE));
         assertEquals(
                 "omacp: standard input: cannot be read: it broke\n",
                 err.toString(StandardCharsets.UTF_8));
@@ -355,14 +365,23 @@ class MainTest extends Natives {
                     }
                 };
         ByteArrayOutputStream err = new ByteArrayOutputStream();
-        assertEquals(2, Main.run(new ByteArrayInputStream(SMALL), full, err));
+        assertEquals(2, Main.run(new ByteArrayInputStream(SMALL), full, err, Terminal.NONE));
         assertEquals(
                 "omacp: the output cannot be written\n", err.toString(StandardCharsets.UTF_8));
     }
 
     @Test
     void refusesWrongUsage() {
-        for (String[] arguments : List.of(array("--xml"), array("a", "b"))) {
+        for (String[] arguments :
+                List.of(
+                        array("--xml"),
+                        array("show", "--pin", "1"),
+                        array("--bytes", "--json"),
+                        array("--bytes", "--header"),
+                        array("--color=blue"),
+                        array("verify"),
+                        array("verify", "--json"),
+                        array("completion", "bash"))) {
             assertEquals(2, run(SMALL, arguments));
             assertEquals("", output);
             assertTrue(errors.contains("Usage: omacp "), errors);
@@ -374,8 +393,28 @@ class MainTest extends Natives {
         for (String option : List.of("-h", "--help")) {
             assertEquals(0, run(new byte[0], option));
             assertEquals("", errors);
-            assertTrue(output.startsWith("Usage: omacp [-h] [--json] [FILE]\n"), output);
+            assertTrue(output.startsWith("Usage: omacp [show] [OPTION...] [FILE...]\n"), output);
             assertTrue(output.contains("Exit status:\n"), output);
+        }
+        for (String command : List.of("show", "verify", "completion")) {
+            assertEquals(0, run(new byte[0], command, "--help"));
+            assertEquals("", errors);
+            assertTrue(output.startsWith("Usage: omacp " + command + " [-h]"), output);
+            assertTrue(output.lines().allMatch(line -> line.length() <= 80), output);
+        }
+    }
+
+    @Test
+    void tellsItsVersion() throws Exception {
+        for (String option : List.of("-V", "--version")) {
+            ChildVm.Result result =
+                    ChildVm.run(
+                            "none",
+                            "build/java/omacp.jar:/usr/share/java/picocli.jar",
+                            new byte[0],
+                            Main.class,
+                            option);
+            assertTrue(result.output().matches("omacp \\d+\\.\\d+\\.\\d+\n"), result.output());
         }
     }
 
@@ -385,7 +424,12 @@ class MainTest extends Natives {
         assertEquals(new ChildVm.Result(0, SMALL_SHOWN, ""), child(SMALL, "-"));
         ChildVm.Result json = child(Everything.push(), "--json");
         assertEquals(new ChildVm.Result(0, resource("everything.json"), ""), json);
-        String refusal = "omacp: standard input: not a push with a provisioning content type\n";
+        String refusal =
+                """
+                omacp: standard input: refused: the message ends within its push header, after
+                  0 bytes
+                  message offset 0 (0x0), in push header.
+                """;
         assertEquals(new ChildVm.Result(1, "", refusal), child(new byte[0]));
         Path missing = directory.resolve("missing");
         assertEquals(

@@ -43,7 +43,7 @@ class SamplesTest extends Natives {
     @ParameterizedTest
     @MethodSource("pushes")
     void setWhatTheirDocumentSays(Path push) throws Exception {
-        Message message = new MessageReader().read(Files.readAllBytes(push));
+        Message message = new MessageReader().read(new Source("", Files.readAllBytes(push)));
         List<String> answered = new ArrayList<>();
         describe("", message.characteristics, answered);
         assertFalse(answered.isEmpty());

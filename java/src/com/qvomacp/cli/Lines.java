@@ -1,0 +1,51 @@
+package com.qvomacp.cli;
+
+import java.util.ArrayList;
+import java.util.List;
+
+/** Breaks text into lines. */
+final class Lines {
+    /** The columns of a terminal that everybody has. */
+    static final int WIDTH = 80;
+
+    private Lines() {}
+
+    /** The lines of a text, none wider than {@code columns}; words longer than that are cut. */
+    static List<String> of(String text, int columns) {
+        List<String> lines = new ArrayList<>();
+        StringBuilder line = new StringBuilder();
+        for (String word : text.split(" ", -1)) {
+            int wanted = Visible.columns(word) + (line.length() == 0 ? 0 : 1);
+            if (line.length() > 0 && Visible.columns(line.toString()) + wanted > columns) {
+                lines.add(line.toString());
+                line.setLength(0);
+            }
+            if (line.length() > 0) {
+                line.append(' ');
+            }
+            line.append(word);
+            while (Visible.columns(line.toString()) > columns) {
+                int end = cut(line, columns);
+                lines.add(line.substring(0, end));
+                line.delete(0, end);
+            }
+        }
+        lines.add(line.toString());
+        return lines;
+    }
+
+    /** Where a line is cut that is too wide; behind one character at least. */
+    private static int cut(StringBuilder line, int columns) {
+        int used = 0;
+        int end = 0;
+        while (end < line.length()) {
+            int codePoint = line.codePointAt(end);
+            used += Visible.isWide(codePoint) ? 2 : 1;
+            if (used > columns && end > 0) {
+                break;
+            }
+            end += Character.charCount(codePoint);
+        }
+        return end;
+    }
+}
