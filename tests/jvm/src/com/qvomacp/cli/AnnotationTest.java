@@ -32,7 +32,7 @@ class AnnotationTest extends Natives {
     }
 
     /** The notes stand for the message's bytes, each once and in order; no line is too wide. */
-    private static void assertCovers(byte[] message) {
+    static void assertCovers(byte[] message) {
         for (boolean isPush : new boolean[] {true, false}) {
             Annotation annotation =
                     isPush ? Annotation.ofPush(message) : Annotation.ofBody(message);
@@ -78,7 +78,7 @@ class AnnotationTest extends Natives {
     }
 
     /** Whether, why and where the message is refused is as the library has it. */
-    private void assertAgrees(byte[] message) {
+    static void assertAgrees(byte[] message) {
         Annotation annotation = Annotation.ofPush(message);
         String hex = HexFormat.of().formatHex(message);
         boolean headerTaken = parse(message, HEADER_ONLY);
@@ -89,7 +89,7 @@ class AnnotationTest extends Natives {
         }
     }
 
-    private static void assertBodyAgrees(byte[] body, Annotation.Section section) {
+    static void assertBodyAgrees(byte[] body, Annotation.Section section) {
         NativeDecoder.Verdict verdict = NativeDecoder.verdict(body);
         assertNotNull(verdict, "libomacp_explain.so cannot be loaded");
         Stop stop = section.stop;
@@ -146,7 +146,7 @@ class AnnotationTest extends Natives {
     @ParameterizedTest
     @ValueSource(strings = {"internet", "string-table"})
     void stopsWhereTheLibraryStopsWhicheverByteIsChanged(String sample) throws Exception {
-        changeEachByte(sample(sample), this::assertAgrees);
+        changeEachByte(sample(sample), AnnotationTest::assertAgrees);
     }
 
     @ParameterizedTest
