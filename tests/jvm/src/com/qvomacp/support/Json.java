@@ -5,7 +5,7 @@ import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
 
-/** A strict JSON reader: objects are Maps, arrays Lists, numbers Integers; anything else throws. */
+/** A strict JSON reader: Maps, Lists, Strings, Integers, Booleans, null; anything else throws. */
 public final class Json {
     private final String text;
     private int at;
@@ -28,13 +28,17 @@ public final class Json {
             case '{' -> object();
             case '[' -> list();
             case '"' -> string();
-            case 'n' -> {
-                require(text.startsWith("null", at));
-                at += 4;
-                yield null;
-            }
+            case 'n' -> literal("null", null);
+            case 't' -> literal("true", true);
+            case 'f' -> literal("false", false);
             default -> number();
         };
+    }
+
+    private Boolean literal(String name, Boolean value) {
+        require(text.startsWith(name, at));
+        at += name.length();
+        return value;
     }
 
     private Map<String, Object> object() {
