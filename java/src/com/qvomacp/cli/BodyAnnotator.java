@@ -175,12 +175,18 @@ final class BodyAnnotator extends ParmAnnotator {
                     hex(next()) + " stands behind the version",
                     "STR_I (0x03), END (0x01)");
         }
+        int start = at;
         int stop = -1;
         while (!ended() && stop != END && stop != LITERAL && stop != EXT_I_0) {
             stop = next();
             ++at;
         }
-        note(stop == END && next == END ? "END of attributes" : "skipped, up to the end");
+        if (next == END) {
+            note(stop == END && at - start == 1 ? "END of attributes" : "skipped, up to an end");
+        } else {
+            String value = Visible.quoted(data, start + 1, endOfText(start + 1, at));
+            note(Note.Style.TEXT, value + " and all up to an END, skipped");
+        }
     }
 
     /** A run of characteristics. */

@@ -79,9 +79,13 @@ final class Listing {
             }
             line.append(palette.dim(offsets.toString()));
             pad(line, hexadecimal(message, start + from, start + to), BYTES_WIDTH + 2, line.length());
-            if (row < texts.size()) {
+            String text = row < texts.size() ? texts.get(row) : "";
+            if (text.isEmpty() && note.style == Note.Style.UNREAD) {
+                text = characters(message, start + from, start + to);
+            }
+            if (!text.isEmpty()) {
                 pad(line, "", indent, line.length());
-                line.append(palette.of(note.style, texts.get(row)));
+                line.append(palette.of(note.style, text));
             }
             out.append(trimmed(line)).append('\n');
         }
@@ -93,6 +97,15 @@ final class Listing {
             --end;
         }
         return line.substring(0, end);
+    }
+
+    /** Bytes that were not read, as characters where they are ones of ASCII. */
+    private static String characters(byte[] bytes, int from, int to) {
+        StringBuilder text = new StringBuilder("|");
+        for (int i = from; i < to; ++i) {
+            text.append(bytes[i] >= ' ' && bytes[i] <= '~' ? (char) bytes[i] : '.');
+        }
+        return text.append('|').toString();
     }
 
     static String hexadecimal(byte[] bytes, int from, int to) {

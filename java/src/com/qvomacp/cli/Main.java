@@ -3,6 +3,8 @@ package com.qvomacp.cli;
 import java.io.FileDescriptor;
 import java.io.FileInputStream;
 import java.io.FileOutputStream;
+import java.io.FilterOutputStream;
+import java.io.IOException;
 import java.io.InputStream;
 import java.io.OutputStream;
 import java.io.OutputStreamWriter;
@@ -105,13 +107,16 @@ public final class Main implements Runnable {
             OutputStream err,
             Terminal terminal,
             String... arguments) {
-        PrintWriter output = new PrintWriter(new OutputStreamWriter(out, StandardCharsets.UTF_8));
+        Pipe pipe = new Pipe(out);
+        PrintWriter output = new PrintWriter(new OutputStreamWriter(pipe, StandardCharsets.UTF_8));
         PrintWriter errors = new PrintWriter(new OutputStreamWriter(err, StandardCharsets.UTF_8));
         CommandLine program = program(new Main(in, terminal));
         int status =
                 program.setOut(output).setErr(errors).execute(withCommand(program, arguments));
         if (output.checkError()) {
-            errors.println("omacp: the output cannot be written");
+            if (!pipe.isBroken()) {
+                errors.println("omacp: the output cannot be written");
+            }
             status = FAILED;
         }
         errors.flush();
@@ -141,6 +146,29 @@ public final class Main implements Runnable {
         withShow[0] = "show";
         System.arraycopy(arguments, 0, withShow, 1, arguments.length);
         return withShow;
+    }
+
+    /** An output that notices when whoever reads it has seen enough, which is no news to him. */
+    private static final class Pipe extends FilterOutputStream {
+        private boolean broken;
+
+        Pipe(OutputStream out) {
+            super(out);
+        }
+
+        boolean isBroken() {
+            return broken;
+        }
+
+        @Override
+        public void write(byte[] bytes, int from, int count) throws IOException {
+            try {
+                out.write(bytes, from, count);
+            } catch (IOException failed) {
+                broken = "Broken pipe".equals(failed.getMessage());
+                throw failed;
+            }
+        }
     }
 
     @Override

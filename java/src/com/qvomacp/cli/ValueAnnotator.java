@@ -168,7 +168,7 @@ abstract class ValueAnnotator extends Cursor {
         --depth;
     }
 
-    private int endOfText(int from, int end) {
+    int endOfText(int from, int end) {
         int nul = from;
         while (nul < end && data[nul] != 0) {
             ++nul;

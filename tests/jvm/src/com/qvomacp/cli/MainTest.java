@@ -371,6 +371,21 @@ class MainTest extends Natives {
     }
 
     @Test
+    void isSilentWhenNobodyReadsOn() {
+        OutputStream closed =
+                new OutputStream() {
+                    @Override
+                    public void write(int b) throws IOException {
+                        throw new IOException("Broken pipe");
+                    }
+                };
+        ByteArrayOutputStream err = new ByteArrayOutputStream();
+        assertEquals(
+                2, Main.run(new ByteArrayInputStream(SMALL), closed, err, Terminal.NONE));
+        assertEquals("", err.toString(StandardCharsets.UTF_8));
+    }
+
+    @Test
     void refusesWrongUsage() {
         for (String[] arguments :
                 List.of(

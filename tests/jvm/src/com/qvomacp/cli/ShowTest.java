@@ -225,6 +225,20 @@ class ShowTest extends Natives {
     }
 
     @Test
+    void listsAVersionGivenAsText() {
+        byte[] body = HexFormat.of().parseHex("030b6a00c54503312e310001c6550101" + "01");
+        assertEquals(0, run(body, "--bytes"));
+        assertTrue(
+                output.contains(
+                        """
+                        0005  45                         VERSION=
+                        0006  03 31 2E 31 00 01          "1.1" and all up to an END, skipped
+                        000C  C6                         <characteristic> attributes, content
+                        """),
+                output);
+    }
+
+    @Test
     void endsWithTheReason() {
         assertEquals(1, run(REFUSED, "--bytes"));
         assertEquals("", errors);
