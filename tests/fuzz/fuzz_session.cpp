@@ -20,6 +20,12 @@ struct Expected {
     BodyReading body;
 };
 
+struct Message {
+    const fakevm::Bytes &array; // that is handed in
+    const fakevm::Bytes &bytes; // of it, those of the message
+    const Expected &expected;
+};
+
 // The natives that read the header.
 std::string askHeader(fakevm::Vm *vm, const HeaderReading &expected, const fakevm::Bytes &message)
 {
@@ -64,14 +70,15 @@ size_t moveStart(fakevm::Vm *vm, jint n, std::string *log)
     return blocksOf(before, ptCtx->ptNapDef);
 }
 
-// One session, from parse to delete. Returns all answers.
-std::string session(fakevm::Vm *vm, const fakevm::Bytes &message, const Expected &expected,
-                    jlong length, jint n)
+// One session, from parse to delete, in which the start of the NAPDEF records is moved twice.
+// Returns all answers.
+std::string session(fakevm::Vm *vm, const Message &message, jlong length, jint n)
 {
-    const bool accepted = vm->parse(message, length, 0).number != 0;
+    const Expected &expected = message.expected;
+    const bool accepted = vm->parse(message.array, length, 0).number != 0;
     check(accepted == expected.body.context, "the message is accepted as the format says",
           accepted ? "accepted" : "refused");
-    std::string log = askHeader(vm, accepted ? expected.header : HeaderReading{}, message);
+    std::string log = askHeader(vm, accepted ? expected.header : HeaderReading{}, message.bytes);
     log += askAll(vm);
     size_t kept = expected.body.kept;
     if (accepted) {
@@ -79,8 +86,9 @@ std::string session(fakevm::Vm *vm, const fakevm::Bytes &message, const Expected
         const size_t blocks = 2 + whole.blocks + whole.abandoned + kept;
         check(heap::live() == blocks, "header, body and context are all that a parse leaves",
               heap::live(), " blocks instead of ", blocks);
-        const size_t lost = moveStart(vm, n, &log);
-        kept += viewOf(ptCtx).kept + lost;
+        kept += moveStart(vm, n, &log);
+        kept += moveStart(vm, 2, &log);
+        kept += viewOf(ptCtx).kept;
     }
     (void)vm->call("qvomacp_parser_del");
     check(!ptCtx, "no context is left of a session");
@@ -102,6 +110,17 @@ void headerOnly(fakevm::Vm *vm, const fakevm::Bytes &message, const HeaderReadin
     check(heap::live() == 0, "no block is left of a header", heap::live());
 }
 
+// A length that the array does not have.
+void tooLong(fakevm::Vm *vm, const fakevm::Bytes &message)
+{
+    for (const jlong more :
+         {jlong{1}, jlong{INT32_MAX}, jlong{-1} - static_cast<jlong>(message.size())}) {
+        const jlong length = static_cast<jlong>(message.size()) + more;
+        check(vm->parse(message, length, 0).number == 0, "no more is parsed than there is", length);
+    }
+    check(heap::live() == 0, "nor is a block left", heap::live());
+}
+
 fakevm::Vm *machine()
 {
     static fakevm::Vm *const vm = [] {
@@ -116,21 +135,26 @@ fakevm::Vm *machine()
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size)
 {
-    const fakevm::Bytes message(data, data + size);
+    // The first byte of a message means nothing to the library. Here it chooses the NAPDEF to begin
+    // at, and bytes at the end of the array that are not said to belong to the message.
+    const uint8_t choice = size ? data[0] : 0;
+    const jint n = choice % 8 - 1;
+    const size_t said = choice < 0xF0 ? size : size - std::min<size_t>(size, choice & 0x0F);
+    const fakevm::Bytes array(data, data + size);
+    const fakevm::Bytes message(data, data + said);
     Expected expected;
-    expected.header = readHeader(data, size);
+    expected.header = readHeader(data, said);
     if (expected.header.accepted) {
         const size_t start = 3 + expected.header.headerLength;
-        expected.body = readBody(data + start, size - start);
+        expected.body = readBody(data + start, said - start);
     }
     fakevm::Vm *vm = machine();
     headerOnly(vm, message, expected.header);
-    // The first byte of a message means nothing to the library: it chooses the NAPDEF to begin at.
-    const jint n = size ? data[0] % 8 - 1 : 0;
-    const jlong length = static_cast<jlong>(size);
-    const std::string first = session(vm, message, expected, length, n);
+    tooLong(vm, message);
+    const jlong length = static_cast<jlong>(said);
+    const std::string first = session(vm, {array, message, expected}, length, n);
     // Only the low half of a length counts.
-    const std::string second = session(vm, message, expected, length | jlong{1} << 32, n);
+    const std::string second = session(vm, {array, message, expected}, length | jlong{1} << 32, n);
     check(first == second, "what was accepted answers the same when parsed again", first, "\n\n",
           second);
     return 0;

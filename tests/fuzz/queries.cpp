@@ -153,7 +153,11 @@ private:
         const bool last = depth + 1 == query.counts.size() || !query.counts[depth + 1];
         const jint end = count(query.counts[depth]);
         log += ' ' + std::to_string(end) + ':';
-        for (jint i : indexesUpTo(end)) {
+        std::vector<jint> asked = indexesUpTo(end);
+        if (depth == 0) {
+            asked.insert(asked.end(), {INT32_MIN, INT32_MAX});
+        }
+        for (jint i : asked) {
             indexes.push_back(i);
             const bool counted = i >= 1 && i <= end;
             if (!counted) {
