@@ -189,6 +189,21 @@ class AnnotationTest extends Natives {
     }
 
     @Test
+    void agreesWhichStringsATableHas() {
+        for (int length = 0; length < 4; ++length) {
+            for (int index = 0; index < 6; ++index) {
+                String table = "0" + length + "61".repeat(length);
+                String hex = "030b6a" + table + "45c65501870706" + "830" + index + "01010101";
+                byte[] body = HexFormat.of().parseHex(hex);
+                Annotation annotation = Annotation.ofBody(body);
+                int strings = length == 0 ? 2 : length;
+                assertEquals(index < strings, annotation.body.stop == null, hex);
+                assertBodyAgrees(body, annotation.body);
+            }
+        }
+    }
+
+    @Test
     void agreesThatTooMuchTextIsRefused() {
         byte[] table = new byte[60000];
         Arrays.fill(table, (byte) 'x');
