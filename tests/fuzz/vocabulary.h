@@ -175,7 +175,7 @@ struct ValueToken {
 };
 
 // The value tokens that stand for a text, each as it is understood.
-constexpr ValueToken kValueTokens[] = {
+inline constexpr ValueToken kValueTokens[] = {
     {0x85, Join::kBehind, "IPV4"},
     {0x86, Join::kBehind, "IPV6"},
     {0x87, Join::kBehind, "E164"},
