@@ -90,7 +90,7 @@ enum KindIndex : uint8_t {
 };
 
 // In the order of KindIndex.
-constexpr Kind kKinds[kKindCount] = {
+inline constexpr Kind kKinds[kKindCount] = {
     {"PXLOGICAL",
      0x51,
      {true, true},
