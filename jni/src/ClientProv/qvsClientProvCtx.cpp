@@ -4,99 +4,338 @@
 #include "qvsmemory.h"
 #include "qvstrace.h"
 
-#include <stddef.h>
-
 using namespace qvs;
 
 namespace {
 
-template <class Record>
-using TextField = char *Record::*;
+struct ReleaseKind;
 
-// A field that heads a chain, and the release of that chain.
-template <class Record, class Node>
-struct Chain {
-    using Release = void (*)(Node *first);
+// A field that a record owns: a text, or the head of a chain of records of a kind.
+struct ReleaseRow {
+    consteval ReleaseRow(TextField f) : field(f.number) {}
+    consteval ReleaseRow(RecordField f, const ReleaseKind &k) : field(f.number), chain(&k) {}
 
-    constexpr Chain(Node *Record::*f, Release r) : field(f), release(r) {}
-
-    void releaseFrom(Record *record) const
-    {
-        if (record->*field) {
-            release(record->*field);
-        }
-    }
-
-    Node *Record::*field;
-    Release release;
+    uint8_t field;
+    const ReleaseKind *chain = nullptr;
 };
 
-// Strips every record of a chain from the first to the last, then releases the records from the
+// One kind of record: what it owns, in the order in which that is released.
+struct ReleaseKind {
+    Rows<ReleaseRow> rows;
+    uint8_t link; // the last field, ptNext; kNoField for a kind that forms no chain
+};
+
+template <class Record, size_t N, size_t L = 0>
+consteval ReleaseKind releaseOf(const ReleaseRow (&rows)[N], Left<L> = {})
+{
+    static_assert(N + L + (kLinkOf<Record> == kNoField ? 0 : 1) == kFieldsOf<Record>,
+                  "a field is neither released nor left on purpose");
+    return {rows, kLinkOf<Record>};
+}
+
+namespace strNode {
+using R = qvsCtxStrNode;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszValue)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace strNode
+
+namespace port {
+using R = qvsCtxPort;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszPortNbr)},
+    {QVS_FIELD(R, ptService), strNode::kRelease},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace port
+
+namespace napAuthInfo {
+using R = qvsCtxNapAuthInfo;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszAuthType)},
+    {QVS_FIELD(R, pszAuthName)},
+    {QVS_FIELD(R, pszAuthSecret)},
+    {QVS_FIELD(R, pszReserved)},
+    {QVS_FIELD(R, ptAuthEntity), strNode::kRelease},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace napAuthInfo
+
+namespace validity {
+using R = qvsCtxValidity;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszCountry)}, {QVS_FIELD(R, pszNetwork)},    {QVS_FIELD(R, pszSid)},
+    {QVS_FIELD(R, pszSoc)},     {QVS_FIELD(R, pszValidUntil)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace validity
+
+namespace appAddr {
+using R = qvsCtxAppAddr;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszAddr)},
+    {QVS_FIELD(R, pszAddrType)},
+    {QVS_FIELD(R, ptPort), port::kRelease},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace appAddr
+
+namespace appAuth {
+using R = qvsCtxAppAuth;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszAAuthData)},   {QVS_FIELD(R, pszAAuthLevel)}, {QVS_FIELD(R, pszAAuthName)},
+    {QVS_FIELD(R, pszAAuthSecret)}, {QVS_FIELD(R, pszAAuthType)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace appAuth
+
+namespace resource {
+using R = qvsCtxResource;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszAAccept)},     {QVS_FIELD(R, pszAAuthData)}, {QVS_FIELD(R, pszAAuthName)},
+    {QVS_FIELD(R, pszAAuthSecret)}, {QVS_FIELD(R, pszAAuthType)}, {QVS_FIELD(R, pszName)},
+    {QVS_FIELD(R, pszStartPage)},   {QVS_FIELD(R, pszUri)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace resource
+
+namespace pxAuthInfo {
+using R = qvsCtxPxAuthInfo;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszPxAuthType)},
+    {QVS_FIELD(R, pszPxAuthId)},
+    {QVS_FIELD(R, pszPxAuthPw)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace pxAuthInfo
+
+namespace pxPhysical {
+using R = qvsCtxPxPhysical;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszPhysicalProxyId)},
+    {QVS_FIELD(R, pszPxAddr)},
+    {QVS_FIELD(R, pszPxAddrType)},
+    {QVS_FIELD(R, pszPxAddrFqdn)},
+    {QVS_FIELD(R, pszWspVersion)},
+    {QVS_FIELD(R, pszPushEnabled)},
+    {QVS_FIELD(R, pszPullEnabled)},
+    {QVS_FIELD(R, ptToNapId), strNode::kRelease},
+    {QVS_FIELD(R, ptDomain), strNode::kRelease},
+    {QVS_FIELD(R, ptPort), port::kRelease},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace pxPhysical
+
+namespace access {
+using R = qvsCtxAccess;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, ptAppId), strNode::kRelease},   {QVS_FIELD(R, ptDomain), strNode::kRelease},
+    {QVS_FIELD(R, ptPortNbr), strNode::kRelease}, {QVS_FIELD(R, ptRule), strNode::kRelease},
+    {QVS_FIELD(R, ptToNapId), strNode::kRelease}, {QVS_FIELD(R, ptToProxy), strNode::kRelease},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace access
+
+namespace application {
+using R = qvsCtxApplication;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszAAccept)},
+    {QVS_FIELD(R, pszAppId)},
+    {QVS_FIELD(R, pszAProtocol)},
+    {QVS_FIELD(R, pszName)},
+    {QVS_FIELD(R, pszProviderId)},
+    {QVS_FIELD(R, pszFrom)},
+    {QVS_FIELD(R, pszInternet)},
+    {QVS_FIELD(R, ptToAddr), strNode::kRelease},
+    {QVS_FIELD(R, ptToNapId), strNode::kRelease},
+    {QVS_FIELD(R, ptToProxy), strNode::kRelease},
+    {QVS_FIELD(R, ptAppAddr), appAddr::kRelease},
+    {QVS_FIELD(R, ptAppAuth), appAuth::kRelease},
+    {QVS_FIELD(R, ptResource), resource::kRelease},
+};
+// kept[context-application-left]: the XCAP texts and the ROAMING records stay allocated.
+constexpr ReleaseKind kRelease =
+    releaseOf<R>(kRows, leave(&R::pszXcapAuidDcs, &R::pszXcapAuidPms, &R::pszXcapAuidCdms,
+                              &R::pszXcapImeiHeader, &R::pszXcapTidHeader, &R::ptRoaming));
+} // namespace application
+
+namespace bootstrap {
+using R = qvsCtxBootstrap;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszContextAllow)},
+    {QVS_FIELD(R, pszCountry)},
+    {QVS_FIELD(R, pszName)},
+    {QVS_FIELD(R, pszProvUrl)},
+    {QVS_FIELD(R, ptNetwork), strNode::kRelease},
+    {QVS_FIELD(R, ptProxyId), strNode::kRelease},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace bootstrap
+
+namespace napDef {
+using R = qvsCtxNapDef;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszNapId)},
+    {QVS_FIELD(R, pszName)},
+    {QVS_FIELD(R, pszInternet)},
+    {QVS_FIELD(R, pszNapAddress)},
+    {QVS_FIELD(R, pszNapAddrType)},
+    {QVS_FIELD(R, pszCallType)},
+    {QVS_FIELD(R, pszLocalAddr)},
+    {QVS_FIELD(R, pszLocalAddrType)},
+    {QVS_FIELD(R, pszLinkSpeed)},
+    {QVS_FIELD(R, pszDnLinkSpeed)},
+    {QVS_FIELD(R, pszLinger)},
+    {QVS_FIELD(R, pszDeliveryErrSdu)},
+    {QVS_FIELD(R, pszDeliveryOrder)},
+    {QVS_FIELD(R, pszTrafficClass)},
+    {QVS_FIELD(R, pszMaxSduSize)},
+    {QVS_FIELD(R, pszMaxBitrateUplink)},
+    {QVS_FIELD(R, pszMaxBitrateDnlink)},
+    {QVS_FIELD(R, pszReserved1)},
+    {QVS_FIELD(R, pszReserved2)},
+    {QVS_FIELD(R, pszReserved3)},
+    {QVS_FIELD(R, pszReserved4)},
+    {QVS_FIELD(R, pszReserved5)},
+    {QVS_FIELD(R, pszReserved6)},
+    {QVS_FIELD(R, pszMaxNumRetry)},
+    {QVS_FIELD(R, pszFirstRetryTimeout)},
+    {QVS_FIELD(R, pszReregThreshold)},
+    {QVS_FIELD(R, pszTBit)},
+    {QVS_FIELD(R, ptDnsAddr), strNode::kRelease},
+    {QVS_FIELD(R, ptBearer), strNode::kRelease},
+    {QVS_FIELD(R, ptNapAuthInfo), napAuthInfo::kRelease},
+    {QVS_FIELD(R, ptValidity), validity::kRelease},
+};
+// kept[context-init-left]: the copy of INIT stays allocated.
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows, leave(&R::pszInit));
+} // namespace napDef
+
+namespace pxLogical {
+using R = qvsCtxPxLogical;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszProxyId)},
+    {QVS_FIELD(R, pszProxyPw)},
+    {QVS_FIELD(R, pszPpgAuthType)},
+    {QVS_FIELD(R, pszProxyProviderId)},
+    {QVS_FIELD(R, pszName)},
+    {QVS_FIELD(R, pszTrust)},
+    {QVS_FIELD(R, pszMaster)},
+    {QVS_FIELD(R, pszStartPage)},
+    {QVS_FIELD(R, pszReserved1)},
+    {QVS_FIELD(R, pszReserved2)},
+    {QVS_FIELD(R, pszReserved3)},
+    {QVS_FIELD(R, pszReserved4)},
+    {QVS_FIELD(R, pszReserved5)},
+    {QVS_FIELD(R, ptDomain), strNode::kRelease},
+    {QVS_FIELD(R, ptPort), port::kRelease},
+    {QVS_FIELD(R, ptPxAuthInfo), pxAuthInfo::kRelease},
+    {QVS_FIELD(R, ptPxPhysical), pxPhysical::kRelease},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace pxLogical
+
+namespace vendorConfig {
+using R = qvsCtxVendorConfig;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszName)},
+    {QVS_FIELD(R, pszParamName)},
+    {QVS_FIELD(R, pszParamValue)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace vendorConfig
+
+namespace wifi {
+using R = qvsCtxWifi;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszNetSsid)},  {QVS_FIELD(R, pszSecMode)},       {QVS_FIELD(R, pszEapMethod)},
+    {QVS_FIELD(R, pszEapType)},  {QVS_FIELD(R, pszUserName)},      {QVS_FIELD(R, pszAnonUserName)},
+    {QVS_FIELD(R, pszPassword)}, {QVS_FIELD(R, pszCaCert)},        {QVS_FIELD(R, pszUserCert)},
+    {QVS_FIELD(R, pszPhase1)},   {QVS_FIELD(R, pszAuthAlgorithm)}, {QVS_FIELD(R, pszPriority)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace wifi
+
+namespace voWifi {
+using R = qvsCtxVoWifi;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszEpdgFqdn)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace voWifi
+
+namespace clientIdent {
+using R = qvsCtxClientIdent;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszClientId)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace clientIdent
+
+namespace context {
+using R = qvsClientProvCtx;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, ptAccess), access::kRelease},
+    {QVS_FIELD(R, ptApplication), application::kRelease},
+    {QVS_FIELD(R, ptBootstrap), bootstrap::kRelease},
+    {QVS_FIELD(R, ptClientIdent), clientIdent::kRelease},
+    {QVS_FIELD(R, ptNapDef), napDef::kRelease},
+    {QVS_FIELD(R, ptPxLogical), pxLogical::kRelease},
+    {QVS_FIELD(R, ptVendorConfig), vendorConfig::kRelease},
+    {QVS_FIELD(R, ptVoWifi), voWifi::kRelease},
+};
+// kept[context-wifi-left]: the WIFI records stay allocated when the context is gone.
+// kept[context-napdef-skipped]: NAPDEF records before the one that ptNapDef was moved to stay
+// allocated too.
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows, leave(&R::ptWifi));
+} // namespace context
+
+void releaseChain(void *first, const ReleaseKind &kind);
+
+// Releases what a record owns. Kinds do not nest in themselves, so this goes a few levels deep.
+void releaseRows(void *record, const ReleaseKind &kind)
+{
+    for (const ReleaseRow &row : kind.rows) {
+        void *owned = pointerAt(record, row.field);
+        if (!owned) {
+            continue;
+        }
+        if (row.chain) {
+            releaseChain(owned, *row.chain);
+        } else {
+            qvsMemFree_debug(owned);
+        }
+    }
+}
+
+// Releases the records of a chain with what they own.
+// Strips every record from the first to the last, then releases the records from the
 // last to the first. The links, turned round on the way there, lead the way back.
-template <class Record, class Strip>
-void releaseRecords(Record *first, Strip strip)
+void releaseChain(void *first, const ReleaseKind &kind)
 {
     if (!first) {
         traceError(QVS_ERROR_BAD_ARGUMENT);
         return;
     }
-    Record *stripped = nullptr;
-    for (Record *record = first; record;) {
-        strip(record);
-        Record *next = record->ptNext;
-        record->ptNext = stripped;
+    if (kind.link == kNoField) {
+        releaseRows(first, kind);
+        qvsMemFree_debug(first);
+        return;
+    }
+    void *stripped = nullptr;
+    for (void *record = first; record;) {
+        releaseRows(record, kind);
+        void *next = pointerAt(record, kind.link);
+        setPointer(record, kind.link, stripped);
         stripped = record;
         record = next;
     }
     while (stripped) {
-        Record *record = stripped;
-        stripped = record->ptNext;
+        void *record = stripped;
+        stripped = pointerAt(record, kind.link);
         qvsMemFree_debug(record);
     }
-}
-
-// Of each record the chains from left to right; ptNext comes after them.
-template <class Record, class... Nodes>
-void releaseChain(Record *first, Chain<Record, Nodes>... chains)
-{
-    static_assert(sizeof...(chains) + 1 == kFieldsOf<Record>,
-                  "a field is neither released nor left on purpose");
-    releaseRecords(first, [chains...](Record *record) { (chains.releaseFrom(record), ...); });
-}
-
-// Of each record the texts in the order of their rows, then the chains from left to right.
-template <class Record, size_t N, size_t L, class... Nodes>
-void releaseChain(Record *first, const TextField<Record> (&texts)[N], Left<L>,
-                  Chain<Record, Nodes>... chains)
-{
-    static_assert(N + L + sizeof...(chains) + 1 == kFieldsOf<Record>,
-                  "a field is neither released nor left on purpose");
-    releaseRecords(first, [&texts, chains...](Record *record) {
-        for (TextField<Record> text : texts) {
-            releaseText(&(record->*text));
-        }
-        (chains.releaseFrom(record), ...);
-    });
-}
-
-// A list of texts, whatever it lists.
-void releaseTexts(qvsCtxStrNode *first)
-{
-    releaseRecords(first, [](qvsCtxStrNode *node) { releaseText(&node->pszValue); });
-}
-
-// The root: its chains from left to right, then itself.
-template <size_t L, class... Nodes>
-void releaseRoot(qvsClientProvCtx *root, Left<L>, Chain<qvsClientProvCtx, Nodes>... chains)
-{
-    static_assert(L + sizeof...(chains) == kFieldsOf<qvsClientProvCtx>,
-                  "a field is neither released nor left on purpose");
-    if (!root) {
-        traceError(QVS_ERROR_BAD_ARGUMENT);
-        return;
-    }
-    (chains.releaseFrom(root), ...);
-    qvsMemFree_debug(root);
 }
 
 } // namespace
@@ -115,301 +354,155 @@ qvsClientProvCtx *qvsClientProvCtxMakeContext(qvsWapDoc *document)
 
 void qvsClientProvCtxDelectContext(qvsClientProvCtx *root)
 {
-    using R = qvsClientProvCtx;
-    // kept[context-wifi-left]: the WIFI records stay allocated when the context is gone.
-    // kept[context-napdef-skipped]: NAPDEF records before the one that ptNapDef was moved to stay
-    // allocated too.
-    releaseRoot(root, leave(&R::ptWifi), Chain{&R::ptAccess, qvsClientProvCtxDelectContextAccess},
-                Chain{&R::ptApplication, qvsClientProvCtxDelectContextApplication},
-                Chain{&R::ptBootstrap, qvsClientProvCtxDelectContextBootstrap},
-                Chain{&R::ptClientIdent, qvsClientProvCtxDelectContextClientIdent},
-                Chain{&R::ptNapDef, qvsClientProvCtxDelectContextNapDef},
-                Chain{&R::ptPxLogical, qvsClientProvCtxDelectContextPxLogical},
-                Chain{&R::ptVendorConfig, qvsClientProvCtxDelectContextVenderConfig},
-                Chain{&R::ptVoWifi, qvsClientProvCtxDelectContextVoWifi});
+    releaseChain(root, context::kRelease);
 }
 
 void qvsClientProvCtxDelectContextRuleList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextAppIdList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextPortNbrList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextDomainList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextToNapIdList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextToProxyList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextToAddrList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextServiceList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextNetworkList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextProxyIdList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextDnsAddrList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextBearerList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextAuthEntityList(qvsCtxStrNode *node)
 {
-    releaseTexts(node);
+    releaseChain(node, strNode::kRelease);
 }
 
 void qvsClientProvCtxDelectContextPort(qvsCtxPort *record)
 {
-    using R = qvsCtxPort;
-    static constexpr TextField<R> kTexts[] = {&R::pszPortNbr};
-    releaseChain(record, kTexts, kNothingLeft,
-                 Chain{&R::ptService, qvsClientProvCtxDelectContextServiceList});
+    releaseChain(record, port::kRelease);
 }
 
 void qvsClientProvCtxDelectContextNapAuthInfo(qvsCtxNapAuthInfo *record)
 {
-    using R = qvsCtxNapAuthInfo;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszAuthType,
-        &R::pszAuthName,
-        &R::pszAuthSecret,
-        &R::pszReserved,
-    };
-    releaseChain(record, kTexts, kNothingLeft,
-                 Chain{&R::ptAuthEntity, qvsClientProvCtxDelectContextAuthEntityList});
+    releaseChain(record, napAuthInfo::kRelease);
 }
 
 void qvsClientProvCtxDelectContextValidity(qvsCtxValidity *record)
 {
-    using R = qvsCtxValidity;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszCountry, &R::pszNetwork, &R::pszSid, &R::pszSoc, &R::pszValidUntil,
-    };
-    releaseChain(record, kTexts, kNothingLeft);
+    releaseChain(record, validity::kRelease);
 }
 
 void qvsClientProvCtxDelectContextAppAddr(qvsCtxAppAddr *record)
 {
-    using R = qvsCtxAppAddr;
-    static constexpr TextField<R> kTexts[] = {&R::pszAddr, &R::pszAddrType};
-    releaseChain(record, kTexts, kNothingLeft,
-                 Chain{&R::ptPort, qvsClientProvCtxDelectContextPort});
+    releaseChain(record, appAddr::kRelease);
 }
 
 void qvsClientProvCtxDelectContextAppAuth(qvsCtxAppAuth *record)
 {
-    using R = qvsCtxAppAuth;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszAAuthData, &R::pszAAuthLevel, &R::pszAAuthName, &R::pszAAuthSecret, &R::pszAAuthType,
-    };
-    releaseChain(record, kTexts, kNothingLeft);
+    releaseChain(record, appAuth::kRelease);
 }
 
 void qvsClientProvCtxDelectContextResource(qvsCtxResource *record)
 {
-    using R = qvsCtxResource;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszAAccept,   &R::pszAAuthData, &R::pszAAuthName, &R::pszAAuthSecret,
-        &R::pszAAuthType, &R::pszName,      &R::pszStartPage, &R::pszUri,
-    };
-    releaseChain(record, kTexts, kNothingLeft);
+    releaseChain(record, resource::kRelease);
 }
 
 void qvsClientProvCtxDelectContextPxAuthInfo(qvsCtxPxAuthInfo *record)
 {
-    using R = qvsCtxPxAuthInfo;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszPxAuthType,
-        &R::pszPxAuthId,
-        &R::pszPxAuthPw,
-    };
-    releaseChain(record, kTexts, kNothingLeft);
+    releaseChain(record, pxAuthInfo::kRelease);
 }
 
 void qvsClientProvCtxDelectContextPxPhysical(qvsCtxPxPhysical *record)
 {
-    using R = qvsCtxPxPhysical;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszPhysicalProxyId, &R::pszPxAddr,      &R::pszPxAddrType,  &R::pszPxAddrFqdn,
-        &R::pszWspVersion,      &R::pszPushEnabled, &R::pszPullEnabled,
-    };
-    releaseChain(record, kTexts, kNothingLeft,
-                 Chain{&R::ptToNapId, qvsClientProvCtxDelectContextToNapIdList},
-                 Chain{&R::ptDomain, qvsClientProvCtxDelectContextDomainList},
-                 Chain{&R::ptPort, qvsClientProvCtxDelectContextPort});
+    releaseChain(record, pxPhysical::kRelease);
 }
 
 void qvsClientProvCtxDelectContextAccess(qvsCtxAccess *record)
 {
-    using R = qvsCtxAccess;
-    releaseChain(record, Chain{&R::ptAppId, qvsClientProvCtxDelectContextAppIdList},
-                 Chain{&R::ptDomain, qvsClientProvCtxDelectContextDomainList},
-                 Chain{&R::ptPortNbr, qvsClientProvCtxDelectContextPortNbrList},
-                 Chain{&R::ptRule, qvsClientProvCtxDelectContextRuleList},
-                 Chain{&R::ptToNapId, qvsClientProvCtxDelectContextToNapIdList},
-                 Chain{&R::ptToProxy, qvsClientProvCtxDelectContextToProxyList});
+    releaseChain(record, access::kRelease);
 }
 
 void qvsClientProvCtxDelectContextApplication(qvsCtxApplication *record)
 {
-    using R = qvsCtxApplication;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszAAccept,    &R::pszAppId, &R::pszAProtocol, &R::pszName,
-        &R::pszProviderId, &R::pszFrom,  &R::pszInternet,
-    };
-    // kept[context-application-left]: the XCAP texts and the ROAMING records stay allocated.
-    releaseChain(record, kTexts,
-                 leave(&R::pszXcapAuidDcs, &R::pszXcapAuidPms, &R::pszXcapAuidCdms,
-                       &R::pszXcapImeiHeader, &R::pszXcapTidHeader, &R::ptRoaming),
-                 Chain{&R::ptToAddr, qvsClientProvCtxDelectContextToAddrList},
-                 Chain{&R::ptToNapId, qvsClientProvCtxDelectContextToNapIdList},
-                 Chain{&R::ptToProxy, qvsClientProvCtxDelectContextToProxyList},
-                 Chain{&R::ptAppAddr, qvsClientProvCtxDelectContextAppAddr},
-                 Chain{&R::ptAppAuth, qvsClientProvCtxDelectContextAppAuth},
-                 Chain{&R::ptResource, qvsClientProvCtxDelectContextResource});
+    releaseChain(record, application::kRelease);
 }
 
 void qvsClientProvCtxDelectContextBootstrap(qvsCtxBootstrap *record)
 {
-    using R = qvsCtxBootstrap;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszContextAllow,
-        &R::pszCountry,
-        &R::pszName,
-        &R::pszProvUrl,
-    };
-    releaseChain(record, kTexts, kNothingLeft,
-                 Chain{&R::ptNetwork, qvsClientProvCtxDelectContextNetworkList},
-                 Chain{&R::ptProxyId, qvsClientProvCtxDelectContextProxyIdList});
+    releaseChain(record, bootstrap::kRelease);
 }
 
 void qvsClientProvCtxDelectContextClientIdent(qvsCtxClientIdent *record)
 {
-    if (!record) {
-        traceError(QVS_ERROR_BAD_ARGUMENT);
-        return;
-    }
-    releaseText(&record->pszClientId);
-    qvsMemFree_debug(record);
+    releaseChain(record, clientIdent::kRelease);
 }
 
 void qvsClientProvCtxDelectContextNapDef(qvsCtxNapDef *record)
 {
-    using R = qvsCtxNapDef;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszNapId,
-        &R::pszName,
-        &R::pszInternet,
-        &R::pszNapAddress,
-        &R::pszNapAddrType,
-        &R::pszCallType,
-        &R::pszLocalAddr,
-        &R::pszLocalAddrType,
-        &R::pszLinkSpeed,
-        &R::pszDnLinkSpeed,
-        &R::pszLinger,
-        &R::pszDeliveryErrSdu,
-        &R::pszDeliveryOrder,
-        &R::pszTrafficClass,
-        &R::pszMaxSduSize,
-        &R::pszMaxBitrateUplink,
-        &R::pszMaxBitrateDnlink,
-        &R::pszReserved1,
-        &R::pszReserved2,
-        &R::pszReserved3,
-        &R::pszReserved4,
-        &R::pszReserved5,
-        &R::pszReserved6,
-        &R::pszMaxNumRetry,
-        &R::pszFirstRetryTimeout,
-        &R::pszReregThreshold,
-        &R::pszTBit,
-    };
-    // kept[context-init-left]: the copy of INIT stays allocated.
-    releaseChain(record, kTexts, leave(&R::pszInit),
-                 Chain{&R::ptDnsAddr, qvsClientProvCtxDelectContextDnsAddrList},
-                 Chain{&R::ptBearer, qvsClientProvCtxDelectContextBearerList},
-                 Chain{&R::ptNapAuthInfo, qvsClientProvCtxDelectContextNapAuthInfo},
-                 Chain{&R::ptValidity, qvsClientProvCtxDelectContextValidity});
+    releaseChain(record, napDef::kRelease);
 }
 
 void qvsClientProvCtxDelectContextPxLogical(qvsCtxPxLogical *record)
 {
-    using R = qvsCtxPxLogical;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszProxyId,   &R::pszProxyPw,   &R::pszPpgAuthType, &R::pszProxyProviderId,
-        &R::pszName,      &R::pszTrust,     &R::pszMaster,      &R::pszStartPage,
-        &R::pszReserved1, &R::pszReserved2, &R::pszReserved3,   &R::pszReserved4,
-        &R::pszReserved5,
-    };
-    releaseChain(record, kTexts, kNothingLeft,
-                 Chain{&R::ptDomain, qvsClientProvCtxDelectContextDomainList},
-                 Chain{&R::ptPort, qvsClientProvCtxDelectContextPort},
-                 Chain{&R::ptPxAuthInfo, qvsClientProvCtxDelectContextPxAuthInfo},
-                 Chain{&R::ptPxPhysical, qvsClientProvCtxDelectContextPxPhysical});
+    releaseChain(record, pxLogical::kRelease);
 }
 
 void qvsClientProvCtxDelectContextVenderConfig(qvsCtxVendorConfig *record)
 {
-    using R = qvsCtxVendorConfig;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszName,
-        &R::pszParamName,
-        &R::pszParamValue,
-    };
-    releaseChain(record, kTexts, kNothingLeft);
+    releaseChain(record, vendorConfig::kRelease);
 }
 
 void qvsClientProvCtxDelectContextWifi(qvsCtxWifi *record)
 {
-    using R = qvsCtxWifi;
-    static constexpr TextField<R> kTexts[] = {
-        &R::pszNetSsid,  &R::pszSecMode,      &R::pszEapMethod,     &R::pszEapType,
-        &R::pszUserName, &R::pszAnonUserName, &R::pszPassword,      &R::pszCaCert,
-        &R::pszUserCert, &R::pszPhase1,       &R::pszAuthAlgorithm, &R::pszPriority,
-    };
-    releaseChain(record, kTexts, kNothingLeft);
+    releaseChain(record, wifi::kRelease);
 }
 
 void qvsClientProvCtxDelectContextVoWifi(qvsCtxVoWifi *record)
 {
-    using R = qvsCtxVoWifi;
-    static constexpr TextField<R> kTexts[] = {&R::pszEpdgFqdn};
-    releaseChain(record, kTexts, kNothingLeft);
+    releaseChain(record, voWifi::kRelease);
 }

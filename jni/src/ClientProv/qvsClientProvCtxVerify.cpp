@@ -1,182 +1,229 @@
-// Which characteristics of a document reach the context, and where: the top level, and the children
-// of the five kinds of record that have some.
+// The context built from the document tree: copies of records, of the lists in them and of the
+// children that they accept, by the tables of the kinds of record.
 #include "qvsClientProvCtx.h"
-#include "qvsCtxChain.h"
-#include "qvslist.h"
+#include "qvsCtxCopy.h"
+#include "qvsstring.h"
 #include "qvstrace.h"
 
 using namespace qvs;
 
 namespace {
 
-// Builds the record of one kind, if the node carries one, into the chain kept for that kind.
-template <class Wap, class Node>
-bool attach(Wap *record, Node *(*build)(Wap *record), ChainEnd<Node> *chain)
+constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvCtx";
+
+// One context record of `fields` pointers, all null; null without memory.
+void *newCtxRecord(uint32_t fields)
 {
-    if (record) {
-        chain->append(build(record));
-    }
-    return record != nullptr;
+    constexpr uint32_t kFieldSize = sizeof(void *);
+    constexpr uint32_t kSpare = 1; // kept[context-spare-byte]: one byte more than the record.
+    return qvsMemAllocSetZero_debug(fields * kFieldSize + kSpare, kModule, __LINE__);
 }
 
-// Hands every node of a child list to `attachChild`, which answers whether the parent accepts it.
-template <class AttachChild>
-qvsResult walkChildren(qvsList *children, AttachChild attachChild)
+char *copyOf(const char *text)
 {
-    void *item = nullptr;
-    qvsResult result = firstItem(children, &item);
-    while (result == QVS_OK && item) {
-        if (attachChild(*static_cast<const qvsWapCharacter *>(item))) {
-            (void)qvsListGetItemNext(children, &item); // refuses only a list that is not there
-        } else {
+    return qvsStrdup_debug(text, kModule, __LINE__);
+}
+
+// The item under the cursor of a list, which moves on; null behind the last one.
+void *nextItem(qvsList *list)
+{
+    const qvsListNode *node = list->ptCursor;
+    if (!node) {
+        return nullptr;
+    }
+    list->ptCursor = node->ptNext;
+    return node->pItem;
+}
+
+void *firstItem(qvsList *list)
+{
+    list->ptCursor = list->ptFirst;
+    return nextItem(list);
+}
+
+// The end of a chain that is appended to; remembered, so that building costs one step per record.
+struct ChainEnd {
+    // Goes on behind what the parent's chain already holds.
+    void startAt(void *parent, const ChildRow &row)
+    {
+        holder = parent;
+        field = row.chain;
+        link = row.kind->single ? kNoField : static_cast<uint8_t>(row.kind->fields - 1);
+        while (void *next = link == kNoField ? nullptr : pointerAt(holder, field)) {
+            holder = next;
+            field = link;
+        }
+    }
+
+    // Whether the one record that there may be is there.
+    [[nodiscard]] bool isTaken() const { return link == kNoField && pointerAt(holder, field); }
+
+    // kept[context-null-linked]: a builder that answered null has added nothing, and the chain goes
+    // on behind it.
+    void append(void *record)
+    {
+        if (!record) {
+            return;
+        }
+        setPointer(holder, field, record);
+        if (link != kNoField) {
+            holder = record;
+            field = link;
+        }
+    }
+
+    void *holder;  // the record whose field the next record is put into
+    uint8_t field; // of the holder
+    uint8_t link;  // the last field of the records, ptNext
+};
+
+// The chains of one parent, in the order of its rows.
+struct Chains {
+    Chains(void *parent, const Rows<ChildRow> &rows)
+    {
+        ChainEnd *chain = ends;
+        for (const ChildRow &row : rows) {
+            chain++->startAt(parent, row);
+        }
+    }
+
+    ChainEnd ends[kMostChildRows];
+};
+
+// Copies the record of a tree node that `row` is about, if the node carries one.
+bool copySlot(const qvsWapCharacter &node, const ChildRow &row, ChainEnd *chain)
+{
+    void *record = pointerAt(&node, row.slot);
+    if (!record) {
+        return false;
+    }
+    chain->append(copyRecord(record, *row.kind));
+    return true;
+}
+
+// Copies every record of a node at the top of the document.
+void copyNode(const qvsWapCharacter &node, Chains *chains)
+{
+    ChainEnd *chain = chains->ends;
+    for (const ChildRow &row : kRootRows) {
+        if (pointerAt(&node, row.slot) && chain->isTaken()) {
+            trace("[WARNING] Already Have ClientIdent Context");
+            return;
+        }
+        copySlot(node, row, chain++);
+    }
+}
+
+// Copies the first record of a child that the parent accepts; false when it accepts none.
+bool copyChild(const qvsWapCharacter &node, const Rows<ChildRow> &rows, Chains *chains)
+{
+    ChainEnd *chain = chains->ends;
+    for (const ChildRow &row : rows) {
+        if (copySlot(node, row, chain++)) {
+            return true;
+        }
+    }
+    return false;
+}
+
+qvsResult walkChildren(qvsList *children, void *parent, const Rows<ChildRow> &rows)
+{
+    Chains chains(parent, rows);
+    for (void *item = firstItem(children); item; item = nextItem(children)) {
+        if (!copyChild(*static_cast<const qvsWapCharacter *>(item), rows, &chains)) {
             // kept[context-misfit-ends-walk]: the children behind one that does not fit are lost.
             trace("[WARNING] Not Support Context");
-            result = QVS_ERROR_FAILED;
+            return QVS_ERROR_FAILED;
         }
+    }
+    return QVS_OK;
+}
+
+} // namespace
+
+qvsCtxStrNode *qvs::copyTexts(qvsList *texts)
+{
+    if (!texts) {
+        traceError(QVS_ERROR_LIST_ARGUMENT);
+        return nullptr;
+    }
+    qvsCtxStrNode *head = nullptr;
+    qvsCtxStrNode **end = &head;
+    const void *text = firstItem(texts);
+    for (; text; text = nextItem(texts)) {
+        auto *node = static_cast<qvsCtxStrNode *>(newCtxRecord(kFieldsOf<qvsCtxStrNode>));
+        if (!node) {
+            break;
+        }
+        *end = node;
+        end = &node->ptNext;
+        node->pszValue = copyOf(static_cast<const char *>(text));
+    }
+    return head;
+}
+
+qvsResult qvs::copyChildren(qvsList *children, void *parent, const CopyKind &kind)
+{
+    qvsResult result = QVS_OK;
+    if (!parent) {
+        // hardened: nothing can be attached to a parent that is not there.
+        result = QVS_ERROR_BAD_ARGUMENT;
+    } else if (!children) {
+        result = QVS_ERROR_LIST_ARGUMENT;
+    } else {
+        result = walkChildren(children, parent, kind.children);
     }
     traceError(result);
     return result;
 }
 
-// hardened: nothing can be attached to a parent that is not there.
-qvsResult refuseParent()
+void *qvs::copyRecord(void *record, const CopyKind &kind)
 {
-    traceError(QVS_ERROR_BAD_ARGUMENT);
-    return QVS_ERROR_BAD_ARGUMENT;
-}
-
-// The root with the ends of its chains.
-struct RootChains {
-    explicit RootChains(qvsClientProvCtx *of)
-        : root(of), pxLogicals(&of->ptPxLogical), napDefs(&of->ptNapDef),
-          bootstraps(&of->ptBootstrap), vendorConfigs(&of->ptVendorConfig),
-          applications(&of->ptApplication), accesses(&of->ptAccess), wifis(&of->ptWifi),
-          voWifis(&of->ptVoWifi)
-    {
+    if (!record) {
+        traceError(QVS_ERROR_BAD_ARGUMENT);
+        return nullptr;
     }
-
-    // Every record that the node carries goes into its chain.
-    // kept[context-top-level-dropped]: the kinds that are not named here are left out silently.
-    void attachNode(const qvsWapCharacter &node)
-    {
-        attach(node.ptPxLogical, qvsClientProvCtxVerifyContextPxLogical, &pxLogicals);
-        attach(node.ptNapDef, qvsClientProvCtxVerifyContextNapdef, &napDefs);
-        attach(node.ptBootstrap, qvsClientProvCtxVerifyContextBootstrap, &bootstraps);
-        if (node.ptClientIdentity) {
-            if (root->ptClientIdent) {
-                // kept[context-second-clientidentity]: the kinds below are lost with it.
-                trace("[WARNING] Already Have ClientIdent Context");
-                return;
-            }
-            root->ptClientIdent = qvsClientProvCtxVerifyContextClientIdent(node.ptClientIdentity);
+    void *copy = newCtxRecord(kind.fields);
+    if (!copy) {
+        return nullptr;
+    }
+    for (const CopyRow &row : kind.rows) {
+        if (row.list) {
+            setPointer(copy, row.to, copyTexts(*listAt(record, row.from)));
+        } else if (const char *text = *textAt(record, row.from)) {
+            *textAt(copy, row.to) = copyOf(text);
         }
-        attach(node.ptVendorConfig, qvsClientProvCtxVerifyContextVenderConfig, &vendorConfigs);
-        attach(node.ptWifi, qvsClientProvCtxVerifyContextWifi, &wifis);
-        attach(node.ptVoWifi, qvsClientProvCtxVerifyContextVoWifi, &voWifis);
-        attach(node.ptApplication, qvsClientProvCtxVerifyContextApplication, &applications);
-        attach(node.ptAccess, qvsClientProvCtxVerifyContextAccess, &accesses);
     }
-
-    qvsClientProvCtx *root;
-    ChainEnd<qvsCtxPxLogical> pxLogicals;
-    ChainEnd<qvsCtxNapDef> napDefs;
-    ChainEnd<qvsCtxBootstrap> bootstraps;
-    ChainEnd<qvsCtxVendorConfig> vendorConfigs;
-    ChainEnd<qvsCtxApplication> applications;
-    ChainEnd<qvsCtxAccess> accesses;
-    ChainEnd<qvsCtxWifi> wifis;
-    ChainEnd<qvsCtxVoWifi> voWifis;
-};
-
-} // namespace
+    if (kind.onCopied) {
+        kind.onCopied(copy);
+    }
+    if (kind.childList.number != kNoField) {
+        const qvsResult result = copyChildren(*listAt(record, kind.childList.number), copy, kind);
+        if (kind.refusalTraced) {
+            traceError(result);
+        }
+    }
+    return copy;
+}
 
 qvsResult qvsClientProvCtxVerifyContext(qvsList *list, qvsClientProvCtx **root)
 {
-    void *item = nullptr;
     // hardened: without a place to put it no context is made.
-    const qvsResult result =
-        list && root ? firstItem(list, &item) : qvsResult{QVS_ERROR_BAD_ARGUMENT};
-    if (result != QVS_OK) {
+    if (!list || !root) {
+        const qvsResult result = QVS_ERROR_BAD_ARGUMENT;
         traceError(result);
         return result;
     }
-    qvsClientProvCtx *made = newCtxRecord<qvsClientProvCtx>();
+    void *item = firstItem(list);
+    void *made = newCtxRecord(kFieldsOf<qvsClientProvCtx>);
     if (!made) {
         traceError(QVS_ERROR_FAILED);
         return QVS_ERROR_FAILED;
     }
-    RootChains chains(made);
-    while (item) {
-        chains.attachNode(*static_cast<const qvsWapCharacter *>(item));
-        (void)qvsListGetItemNext(list, &item); // refuses only a list that is not there
+    Chains chains(made, kRootRows);
+    for (; item; item = nextItem(list)) {
+        copyNode(*static_cast<const qvsWapCharacter *>(item), &chains);
     }
-    *root = made;
+    *root = static_cast<qvsClientProvCtx *>(made);
     return QVS_OK;
-}
-
-qvsResult qvsClientProvCtxVerifyCharacterPxLogical(qvsList *children, qvsCtxPxLogical *parent)
-{
-    if (!parent) {
-        return refuseParent();
-    }
-    ChainEnd authInfos(&parent->ptPxAuthInfo);
-    ChainEnd physicals(&parent->ptPxPhysical);
-    ChainEnd ports(&parent->ptPort);
-    return walkChildren(children, [&](const qvsWapCharacter &node) {
-        return attach(node.ptPxAuthInfo, qvsClientProvCtxVerifyContextPxAuthInfo, &authInfos) ||
-               attach(node.ptPxPhysical, qvsClientProvCtxVerifyContextPxPhysical, &physicals) ||
-               attach(node.ptPort, qvsClientProvCtxVerifyContextPort, &ports);
-    });
-}
-
-qvsResult qvsClientProvCtxVerifyCharacterPxPhysical(qvsList *children, qvsCtxPxPhysical *parent)
-{
-    if (!parent) {
-        return refuseParent();
-    }
-    ChainEnd ports(&parent->ptPort);
-    return walkChildren(children, [&](const qvsWapCharacter &node) {
-        return attach(node.ptPort, qvsClientProvCtxVerifyContextPort, &ports);
-    });
-}
-
-qvsResult qvsClientProvCtxVerifyCharacterNapDef(qvsList *children, qvsCtxNapDef *parent)
-{
-    if (!parent) {
-        return refuseParent();
-    }
-    ChainEnd authInfos(&parent->ptNapAuthInfo);
-    ChainEnd validities(&parent->ptValidity);
-    return walkChildren(children, [&](const qvsWapCharacter &node) {
-        return attach(node.ptNapAuthInfo, qvsClientProvCtxVerifyContextNapAuthInfo, &authInfos) ||
-               attach(node.ptValidity, qvsClientProvCtxVerifyContextValidity, &validities);
-    });
-}
-
-qvsResult qvsClientProvCtxVerifyCharacterApplication(qvsList *children, qvsCtxApplication *parent)
-{
-    if (!parent) {
-        return refuseParent();
-    }
-    ChainEnd roamings(&parent->ptRoaming);
-    ChainEnd addresses(&parent->ptAppAddr);
-    ChainEnd auths(&parent->ptAppAuth);
-    ChainEnd resources(&parent->ptResource);
-    return walkChildren(children, [&](const qvsWapCharacter &node) {
-        return attach(node.ptRoaming, qvsClientProvCtxVerifyContextRoaming, &roamings) ||
-               attach(node.ptAppAddr, qvsClientProvCtxVerifyContextAppAddr, &addresses) ||
-               attach(node.ptAppAuth, qvsClientProvCtxVerifyContextAppAuth, &auths) ||
-               attach(node.ptResource, qvsClientProvCtxVerifyContextResource, &resources);
-    });
-}
-
-qvsResult qvsClientProvCtxVerifyCharacterAppAddr(qvsList *children, qvsCtxAppAddr *parent)
-{
-    if (!parent) {
-        return refuseParent();
-    }
-    ChainEnd ports(&parent->ptPort);
-    return walkChildren(children, [&](const qvsWapCharacter &node) {
-        return attach(node.ptPort, qvsClientProvCtxVerifyContextPort, &ports);
-    });
 }

@@ -1,420 +1,501 @@
-// The records of the context: each a copy of one record of the document tree, with its texts, its
-// lists and the children that it accepts.
+// The kinds of record of the context: for each the texts, lists and children of the tree's record
+// that it is a copy of.
 #include "qvsClientProvCtx.h"
-#include "qvsCtxChain.h"
-#include "qvslist.h"
-#include "qvsstring.h"
+#include "qvsCtxCopy.h"
 #include "qvstrace.h"
-
-#include <stddef.h>
 
 using namespace qvs;
 
 namespace {
 
-// A text of a record of the tree, and the field that its copy goes to.
-template <class Ctx, class Wap>
-struct CopyText {
-    char *Wap::*from;
-    char *Ctx::*to;
+using Node = qvsWapCharacter;
+
+namespace port {
+using C = qvsCtxPort;
+using W = qvsWapPort;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszPortNbr), QVS_FIELD(C, pszPortNbr)},
+    {QVS_FIELD(W, ptServiceList), QVS_FIELD(C, ptService)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace port
+
+namespace pxAuthInfo {
+using C = qvsCtxPxAuthInfo;
+using W = qvsWapPxAuthInfo;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszPxAuthType), QVS_FIELD(C, pszPxAuthType)},
+    {QVS_FIELD(W, pszPxAuthId), QVS_FIELD(C, pszPxAuthId)},
+    {QVS_FIELD(W, pszPxAuthPw), QVS_FIELD(C, pszPxAuthPw)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace pxAuthInfo
+
+namespace pxPhysical {
+using C = qvsCtxPxPhysical;
+using W = qvsWapPxPhysical;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszPhysicalProxyId), QVS_FIELD(C, pszPhysicalProxyId)},
+    {QVS_FIELD(W, pszPxAddr), QVS_FIELD(C, pszPxAddr)},
+    {QVS_FIELD(W, pszPxAddrType), QVS_FIELD(C, pszPxAddrType)},
+    {QVS_FIELD(W, pszPxAddrFqdn), QVS_FIELD(C, pszPxAddrFqdn)},
+    {QVS_FIELD(W, pszWspVersion), QVS_FIELD(C, pszWspVersion)},
+    {QVS_FIELD(W, pszPushEnabled), QVS_FIELD(C, pszPushEnabled)},
+    {QVS_FIELD(W, pszPullEnabled), QVS_FIELD(C, pszPullEnabled)},
+    {QVS_FIELD(W, ptDomainList), QVS_FIELD(C, ptDomain)},
+    {QVS_FIELD(W, ptToNapIdList), QVS_FIELD(C, ptToNapId)},
+};
+constexpr ChildRow kChildren[] = {
+    {QVS_FIELD(Node, ptPort), QVS_FIELD(C, ptPort), port::kCopy},
+};
+// kept[context-misfit-ignored]: a child that is not accepted is not even traced here.
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+    .children = kChildren,
+    .childList = QVS_FIELD(W, ptCharacterList),
+};
+} // namespace pxPhysical
+
+namespace pxLogical {
+using C = qvsCtxPxLogical;
+using W = qvsWapPxLogical;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszProxyId), QVS_FIELD(C, pszProxyId)},
+    {QVS_FIELD(W, pszProxyPw), QVS_FIELD(C, pszProxyPw)},
+    {QVS_FIELD(W, pszPpgAuthType), QVS_FIELD(C, pszPpgAuthType)},
+    {QVS_FIELD(W, pszProxyProviderId), QVS_FIELD(C, pszProxyProviderId)},
+    {QVS_FIELD(W, pszName), QVS_FIELD(C, pszName)},
+    {QVS_FIELD(W, pszTrust), QVS_FIELD(C, pszTrust)},
+    {QVS_FIELD(W, pszMaster), QVS_FIELD(C, pszMaster)},
+    {QVS_FIELD(W, pszStartPage), QVS_FIELD(C, pszStartPage)},
+    {QVS_FIELD(W, pszReserved1), QVS_FIELD(C, pszReserved1)},
+    {QVS_FIELD(W, pszReserved2), QVS_FIELD(C, pszReserved2)},
+    {QVS_FIELD(W, pszReserved3), QVS_FIELD(C, pszReserved3)},
+    // kept[context-pxlogical-twelfth]: pszReserved4 is never copied.
+    {QVS_FIELD(W, pszReserved5), QVS_FIELD(C, pszReserved5)},
+    {QVS_FIELD(W, ptDomainList), QVS_FIELD(C, ptDomain)},
+};
+constexpr ChildRow kChildren[] = {
+    {QVS_FIELD(Node, ptPxAuthInfo), QVS_FIELD(C, ptPxAuthInfo), pxAuthInfo::kCopy},
+    {QVS_FIELD(Node, ptPxPhysical), QVS_FIELD(C, ptPxPhysical), pxPhysical::kCopy},
+    {QVS_FIELD(Node, ptPort), QVS_FIELD(C, ptPort), port::kCopy},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+    .children = kChildren,
+    .childList = QVS_FIELD(W, ptCharacterList),
+    .refusalTraced = true,
+};
+} // namespace pxLogical
+
+namespace napAuthInfo {
+using C = qvsCtxNapAuthInfo;
+using W = qvsWapNapAuthInfo;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszAuthType), QVS_FIELD(C, pszAuthType)},
+    {QVS_FIELD(W, pszAuthName), QVS_FIELD(C, pszAuthName)},
+    {QVS_FIELD(W, pszAuthSecret), QVS_FIELD(C, pszAuthSecret)},
+    {QVS_FIELD(W, pszReserved), QVS_FIELD(C, pszReserved)},
+    {QVS_FIELD(W, ptAuthEntityList), QVS_FIELD(C, ptAuthEntity)},
 };
 
-// A list of a record of the tree, the chain that is made of it, and by whom.
-template <class Ctx, class Wap>
-struct CopyList {
-    qvsList *Wap::*from;
-    qvsCtxStrNode *Ctx::*to;
-    qvsCtxStrNode *(*build)(qvsList *texts);
+void traceEntity(const void *copy)
+{
+    const qvsCtxStrNode *entity = static_cast<const C *>(copy)->ptAuthEntity;
+    // hardened: an entity without memory for its text is left out of the trace.
+    if (entity && entity->pAuthEntity) {
+        trace("NAP:ptCtx->ptAuthEntity->pAuthEntity[%s]", entity->pAuthEntity);
+    }
+}
+
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+    .onCopied = traceEntity,
 };
+} // namespace napAuthInfo
 
-char *copyOf(const char *text)
-{
-    return qvsStrdup_debug(text, kCtxModule, __LINE__);
-}
+namespace validity {
+using C = qvsCtxValidity;
+using W = qvsWapValidity;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszCountry), QVS_FIELD(C, pszCountry)},
+    {QVS_FIELD(W, pszNetwork), QVS_FIELD(C, pszNetwork)},
+    {QVS_FIELD(W, pszSid), QVS_FIELD(C, pszSid)},
+    {QVS_FIELD(W, pszSoc), QVS_FIELD(C, pszSoc)},
+    {QVS_FIELD(W, pszValidUntil), QVS_FIELD(C, pszValidUntil)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace validity
 
-template <class Ctx, class Wap, size_t N>
-void copyFields(Ctx *copy, const Wap *record, const CopyText<Ctx, Wap> (&texts)[N])
-{
-    for (const CopyText<Ctx, Wap> &text : texts) {
-        if (record->*text.from) {
-            copy->*text.to = copyOf(record->*text.from);
-        }
-    }
-}
+namespace napDef {
+using C = qvsCtxNapDef;
+using W = qvsWapNapDef;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszNapId), QVS_FIELD(C, pszNapId)},
+    {QVS_FIELD(W, pszName), QVS_FIELD(C, pszName)},
+    {QVS_FIELD(W, pszInternet), QVS_FIELD(C, pszInternet)},
+    {QVS_FIELD(W, pszNapAddress), QVS_FIELD(C, pszNapAddress)},
+    {QVS_FIELD(W, pszNapAddrType), QVS_FIELD(C, pszNapAddrType)},
+    {QVS_FIELD(W, pszInit), QVS_FIELD(C, pszInit)},
+    {QVS_FIELD(W, pszCallType), QVS_FIELD(C, pszCallType)},
+    {QVS_FIELD(W, pszLocalAddr), QVS_FIELD(C, pszLocalAddr)},
+    {QVS_FIELD(W, pszLocalAddrType), QVS_FIELD(C, pszLocalAddrType)},
+    {QVS_FIELD(W, pszLinkSpeed), QVS_FIELD(C, pszLinkSpeed)},
+    {QVS_FIELD(W, pszDnLinkSpeed), QVS_FIELD(C, pszDnLinkSpeed)},
+    {QVS_FIELD(W, pszLinger), QVS_FIELD(C, pszLinger)},
+    {QVS_FIELD(W, pszDeliveryErrSdu), QVS_FIELD(C, pszDeliveryErrSdu)},
+    {QVS_FIELD(W, pszDeliveryOrder), QVS_FIELD(C, pszDeliveryOrder)},
+    {QVS_FIELD(W, pszTrafficClass), QVS_FIELD(C, pszTrafficClass)},
+    {QVS_FIELD(W, pszMaxSduSize), QVS_FIELD(C, pszMaxSduSize)},
+    {QVS_FIELD(W, pszMaxBitrateUplink), QVS_FIELD(C, pszMaxBitrateUplink)},
+    {QVS_FIELD(W, pszMaxBitrateDnlink), QVS_FIELD(C, pszMaxBitrateDnlink)},
+    {QVS_FIELD(W, pszReserved1), QVS_FIELD(C, pszReserved1)},
+    {QVS_FIELD(W, pszReserved2), QVS_FIELD(C, pszReserved2)},
+    {QVS_FIELD(W, pszReserved3), QVS_FIELD(C, pszReserved3)},
+    {QVS_FIELD(W, pszReserved4), QVS_FIELD(C, pszReserved4)},
+    {QVS_FIELD(W, pszReserved5), QVS_FIELD(C, pszReserved5)},
+    {QVS_FIELD(W, pszReserved6), QVS_FIELD(C, pszReserved6)},
+    {QVS_FIELD(W, pszMaxNumRetry), QVS_FIELD(C, pszMaxNumRetry)},
+    {QVS_FIELD(W, pszFirstRetryTimeout), QVS_FIELD(C, pszFirstRetryTimeout)},
+    {QVS_FIELD(W, pszReregThreshold), QVS_FIELD(C, pszReregThreshold)},
+    {QVS_FIELD(W, pszTBit), QVS_FIELD(C, pszTBit)},
+    {QVS_FIELD(W, ptDnsAddrList), QVS_FIELD(C, ptDnsAddr)},
+    {QVS_FIELD(W, ptBearerList), QVS_FIELD(C, ptBearer)},
+};
+constexpr ChildRow kChildren[] = {
+    {QVS_FIELD(Node, ptNapAuthInfo), QVS_FIELD(C, ptNapAuthInfo), napAuthInfo::kCopy},
+    {QVS_FIELD(Node, ptValidity), QVS_FIELD(C, ptValidity), validity::kCopy},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+    .children = kChildren,
+    .childList = QVS_FIELD(W, ptCharacterList),
+    .refusalTraced = true,
+};
+} // namespace napDef
 
-template <class Ctx, class Wap, size_t N>
-void copyFields(Ctx *copy, const Wap *record, const CopyList<Ctx, Wap> (&lists)[N])
-{
-    for (const CopyList<Ctx, Wap> &list : lists) {
-        copy->*list.to = list.build(record->*list.from);
-    }
-}
+namespace roaming {
+using C = qvsCtxRoaming;
+using W = qvsWapRoaming;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszSyncAllowed), QVS_FIELD(C, pszSyncAllowed)},
+    {QVS_FIELD(W, pszSyncDefault), QVS_FIELD(C, pszSyncDefault)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace roaming
 
-// A new record with the fields of the tables, in their order. Null for a null record or without
-// memory.
-template <class Ctx, class Wap, class... Tables>
-Ctx *copyRecord(const Wap *record, const Tables &...tables)
-{
-    if (!record) {
-        traceError(QVS_ERROR_BAD_ARGUMENT);
-        return nullptr;
-    }
-    Ctx *copy = newCtxRecord<Ctx>();
-    if (copy) {
-        (copyFields(copy, record, tables), ...);
-    }
-    return copy;
-}
+namespace appAddr {
+using C = qvsCtxAppAddr;
+using W = qvsWapAppAddr;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszAddr), QVS_FIELD(C, pszAddr)},
+    {QVS_FIELD(W, pszAddrType), QVS_FIELD(C, pszAddrType)},
+};
+constexpr ChildRow kChildren[] = {
+    {QVS_FIELD(Node, ptPort), QVS_FIELD(C, ptPort), port::kCopy},
+};
+// kept[context-misfit-ignored]: a child that is not accepted is not even traced here.
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+    .children = kChildren,
+    .childList = QVS_FIELD(W, ptCharacterList),
+};
+} // namespace appAddr
 
-// The texts of a list as a chain, up to the first one without memory; null when there are none.
-qvsCtxStrNode *copyTexts(qvsList *texts)
-{
-    qvsCtxStrNode *head = nullptr;
-    ChainEnd chain(&head);
-    void *text = nullptr;
-    qvsResult result = firstItem(texts, &text);
-    while (result == QVS_OK && text) {
-        qvsCtxStrNode *node = newCtxRecord<qvsCtxStrNode>();
-        if (!node) {
-            break;
-        }
-        chain.append(node);
-        node->pszValue = copyOf(static_cast<const char *>(text));
-        result = qvsListGetItemNext(texts, &text);
-    }
-    traceError(result);
-    return head;
-}
+namespace appAuth {
+using C = qvsCtxAppAuth;
+using W = qvsWapAppAuth;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszAAuthLevel), QVS_FIELD(C, pszAAuthLevel)},
+    {QVS_FIELD(W, pszAAuthType), QVS_FIELD(C, pszAAuthType)},
+    {QVS_FIELD(W, pszAAuthName), QVS_FIELD(C, pszAAuthName)},
+    {QVS_FIELD(W, pszAAuthSecret), QVS_FIELD(C, pszAAuthSecret)},
+    {QVS_FIELD(W, pszAAuthData), QVS_FIELD(C, pszAAuthData)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace appAuth
+
+namespace resource {
+using C = qvsCtxResource;
+using W = qvsWapResource;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszUri), QVS_FIELD(C, pszUri)},
+    {QVS_FIELD(W, pszName), QVS_FIELD(C, pszName)},
+    {QVS_FIELD(W, pszAAccept), QVS_FIELD(C, pszAAccept)},
+    {QVS_FIELD(W, pszAAuthType), QVS_FIELD(C, pszAAuthType)},
+    {QVS_FIELD(W, pszAAuthName), QVS_FIELD(C, pszAAuthName)},
+    {QVS_FIELD(W, pszAAuthSecret), QVS_FIELD(C, pszAAuthSecret)},
+    {QVS_FIELD(W, pszAAuthData), QVS_FIELD(C, pszAAuthData)},
+    {QVS_FIELD(W, pszStartPage), QVS_FIELD(C, pszStartPage)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace resource
+
+namespace application {
+using C = qvsCtxApplication;
+using W = qvsWapApplication;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszAppId), QVS_FIELD(C, pszAppId)},
+    {QVS_FIELD(W, pszProviderId), QVS_FIELD(C, pszProviderId)},
+    {QVS_FIELD(W, pszFrom), QVS_FIELD(C, pszFrom)},
+    {QVS_FIELD(W, pszName), QVS_FIELD(C, pszName)},
+    {QVS_FIELD(W, pszAAccept), QVS_FIELD(C, pszAAccept)},
+    {QVS_FIELD(W, pszAProtocol), QVS_FIELD(C, pszAProtocol)},
+    {QVS_FIELD(W, pszInternet), QVS_FIELD(C, pszInternet)},
+    {QVS_FIELD(W, pszXcapAuidDcs), QVS_FIELD(C, pszXcapAuidDcs)},
+    {QVS_FIELD(W, pszXcapAuidPms), QVS_FIELD(C, pszXcapAuidPms)},
+    {QVS_FIELD(W, pszXcapAuidCdms), QVS_FIELD(C, pszXcapAuidCdms)},
+    {QVS_FIELD(W, pszXcapImeiHeader), QVS_FIELD(C, pszXcapImeiHeader)},
+    {QVS_FIELD(W, pszXcapTidHeader), QVS_FIELD(C, pszXcapTidHeader)},
+    // kept[context-from-twice]: FROM is copied once more, and the first copy stays allocated.
+    {QVS_FIELD(W, pszFrom), QVS_FIELD(C, pszFrom)},
+    {QVS_FIELD(W, ptToProxyList), QVS_FIELD(C, ptToProxy)},
+    {QVS_FIELD(W, ptToNapIdList), QVS_FIELD(C, ptToNapId)},
+    {QVS_FIELD(W, ptAddrList), QVS_FIELD(C, ptToAddr)},
+};
+constexpr ChildRow kChildren[] = {
+    {QVS_FIELD(Node, ptRoaming), QVS_FIELD(C, ptRoaming), roaming::kCopy},
+    {QVS_FIELD(Node, ptAppAddr), QVS_FIELD(C, ptAppAddr), appAddr::kCopy},
+    {QVS_FIELD(Node, ptAppAuth), QVS_FIELD(C, ptAppAuth), appAuth::kCopy},
+    {QVS_FIELD(Node, ptResource), QVS_FIELD(C, ptResource), resource::kCopy},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+    .children = kChildren,
+    .childList = QVS_FIELD(W, ptCharacterList),
+    .refusalTraced = true,
+};
+} // namespace application
+
+namespace bootstrap {
+using C = qvsCtxBootstrap;
+using W = qvsWapBootstrap;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszName), QVS_FIELD(C, pszName)},
+    {QVS_FIELD(W, pszCountry), QVS_FIELD(C, pszCountry)},
+    {QVS_FIELD(W, pszProvUrl), QVS_FIELD(C, pszProvUrl)},
+    {QVS_FIELD(W, pszContextAllow), QVS_FIELD(C, pszContextAllow)},
+    {QVS_FIELD(W, ptProxyIdList), QVS_FIELD(C, ptProxyId)},
+    {QVS_FIELD(W, ptNetworkList), QVS_FIELD(C, ptNetwork)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace bootstrap
+
+namespace clientIdent {
+using C = qvsCtxClientIdent;
+using W = qvsWapClientIdentity;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszClientId), QVS_FIELD(C, pszClientId)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+    .single = true,
+};
+} // namespace clientIdent
+
+namespace vendorConfig {
+using C = qvsCtxVendorConfig;
+using W = qvsWapVendorConfig;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszName), QVS_FIELD(C, pszName)},
+    {QVS_FIELD(W, pszParamName), QVS_FIELD(C, pszParamName)},
+    {QVS_FIELD(W, pszParamValue), QVS_FIELD(C, pszParamValue)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace vendorConfig
+
+namespace access {
+using C = qvsCtxAccess;
+using W = qvsWapAccess;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, ptRuleList), QVS_FIELD(C, ptRule)},
+    {QVS_FIELD(W, ptAppIdList), QVS_FIELD(C, ptAppId)},
+    {QVS_FIELD(W, ptPortNbrList), QVS_FIELD(C, ptPortNbr)},
+    {QVS_FIELD(W, ptDomainList), QVS_FIELD(C, ptDomain)},
+    {QVS_FIELD(W, ptToNapIdList), QVS_FIELD(C, ptToNapId)},
+    {QVS_FIELD(W, ptToProxyList), QVS_FIELD(C, ptToProxy)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace access
+
+namespace wifi {
+using C = qvsCtxWifi;
+using W = qvsWapWifi;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszNetSsid), QVS_FIELD(C, pszNetSsid)},
+    {QVS_FIELD(W, pszSecMode), QVS_FIELD(C, pszSecMode)},
+    {QVS_FIELD(W, pszEapMethod), QVS_FIELD(C, pszEapMethod)},
+    {QVS_FIELD(W, pszEapType), QVS_FIELD(C, pszEapType)},
+    {QVS_FIELD(W, pszUserName), QVS_FIELD(C, pszUserName)},
+    {QVS_FIELD(W, pszAnonUserName), QVS_FIELD(C, pszAnonUserName)},
+    {QVS_FIELD(W, pszPassword), QVS_FIELD(C, pszPassword)},
+    {QVS_FIELD(W, pszCaCert), QVS_FIELD(C, pszCaCert)},
+    {QVS_FIELD(W, pszUserCert), QVS_FIELD(C, pszUserCert)},
+    {QVS_FIELD(W, pszPhase1), QVS_FIELD(C, pszPhase1)},
+    {QVS_FIELD(W, pszAuthAlgorithm), QVS_FIELD(C, pszAuthAlgorithm)},
+    {QVS_FIELD(W, pszPriority), QVS_FIELD(C, pszPriority)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace wifi
+
+namespace voWifi {
+using C = qvsCtxVoWifi;
+using W = qvsWapVoWifi;
+constexpr CopyRow kRows[] = {
+    {QVS_FIELD(W, pszEpdgFqdn), QVS_FIELD(C, pszEpdgFqdn)},
+};
+constexpr CopyKind kCopy = {
+    .fields = kFieldsOf<C>,
+    .rows = kRows,
+};
+} // namespace voWifi
+
+constexpr ChildRow kAtTheTop[] = {
+    {QVS_FIELD(Node, ptPxLogical), QVS_FIELD(qvsClientProvCtx, ptPxLogical), pxLogical::kCopy},
+    {QVS_FIELD(Node, ptNapDef), QVS_FIELD(qvsClientProvCtx, ptNapDef), napDef::kCopy},
+    {QVS_FIELD(Node, ptBootstrap), QVS_FIELD(qvsClientProvCtx, ptBootstrap), bootstrap::kCopy},
+    // kept[context-second-clientidentity]: with a second one the kinds below are lost.
+    {QVS_FIELD(Node, ptClientIdentity), QVS_FIELD(qvsClientProvCtx, ptClientIdent),
+     clientIdent::kCopy},
+    {QVS_FIELD(Node, ptVendorConfig), QVS_FIELD(qvsClientProvCtx, ptVendorConfig),
+     vendorConfig::kCopy},
+    {QVS_FIELD(Node, ptWifi), QVS_FIELD(qvsClientProvCtx, ptWifi), wifi::kCopy},
+    {QVS_FIELD(Node, ptVoWifi), QVS_FIELD(qvsClientProvCtx, ptVoWifi), voWifi::kCopy},
+    {QVS_FIELD(Node, ptApplication), QVS_FIELD(qvsClientProvCtx, ptApplication),
+     application::kCopy},
+    {QVS_FIELD(Node, ptAccess), QVS_FIELD(qvsClientProvCtx, ptAccess), access::kCopy},
+    // kept[context-top-level-dropped]: the kinds that are not named here are left out silently.
+};
 
 } // namespace
 
+const Rows<ChildRow> qvs::kRootRows = kAtTheTop;
+
 qvsCtxPxLogical *qvsClientProvCtxVerifyContextPxLogical(qvsWapPxLogical *record)
 {
-    using C = qvsCtxPxLogical;
-    using W = qvsWapPxLogical;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszProxyId, &C::pszProxyId},
-        {&W::pszProxyPw, &C::pszProxyPw},
-        {&W::pszPpgAuthType, &C::pszPpgAuthType},
-        {&W::pszProxyProviderId, &C::pszProxyProviderId},
-        {&W::pszName, &C::pszName},
-        {&W::pszTrust, &C::pszTrust},
-        {&W::pszMaster, &C::pszMaster},
-        {&W::pszStartPage, &C::pszStartPage},
-        {&W::pszReserved1, &C::pszReserved1},
-        {&W::pszReserved2, &C::pszReserved2},
-        {&W::pszReserved3, &C::pszReserved3},
-        // kept[context-pxlogical-twelfth]: pszReserved4 is never copied.
-        {&W::pszReserved5, &C::pszReserved5},
-    };
-    static constexpr CopyList<C, W> kLists[] = {
-        {&W::ptDomainList, &C::ptDomain, qvsClientProvCtxVerifyContextDomainList},
-    };
-    C *copy = copyRecord<C>(record, kTexts, kLists);
-    if (copy) {
-        traceError(qvsClientProvCtxVerifyCharacterPxLogical(record->ptCharacterList, copy));
-    }
-    return copy;
+    return static_cast<qvsCtxPxLogical *>(copyRecord(record, pxLogical::kCopy));
 }
 
 qvsCtxPxAuthInfo *qvsClientProvCtxVerifyContextPxAuthInfo(qvsWapPxAuthInfo *record)
 {
-    using C = qvsCtxPxAuthInfo;
-    using W = qvsWapPxAuthInfo;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszPxAuthType, &C::pszPxAuthType},
-        {&W::pszPxAuthId, &C::pszPxAuthId},
-        {&W::pszPxAuthPw, &C::pszPxAuthPw},
-    };
-    return copyRecord<C>(record, kTexts);
+    return static_cast<qvsCtxPxAuthInfo *>(copyRecord(record, pxAuthInfo::kCopy));
 }
 
 qvsCtxPxPhysical *qvsClientProvCtxVerifyContextPxPhysical(qvsWapPxPhysical *record)
 {
-    using C = qvsCtxPxPhysical;
-    using W = qvsWapPxPhysical;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszPhysicalProxyId, &C::pszPhysicalProxyId}, {&W::pszPxAddr, &C::pszPxAddr},
-        {&W::pszPxAddrType, &C::pszPxAddrType},           {&W::pszPxAddrFqdn, &C::pszPxAddrFqdn},
-        {&W::pszWspVersion, &C::pszWspVersion},           {&W::pszPushEnabled, &C::pszPushEnabled},
-        {&W::pszPullEnabled, &C::pszPullEnabled},
-    };
-    static constexpr CopyList<C, W> kLists[] = {
-        {&W::ptDomainList, &C::ptDomain, qvsClientProvCtxVerifyContextDomainList},
-        {&W::ptToNapIdList, &C::ptToNapId, qvsClientProvCtxVerifyContextToNapIdList},
-    };
-    C *copy = copyRecord<C>(record, kTexts, kLists);
-    if (copy) {
-        // kept[context-misfit-ignored]: not even traced here.
-        (void)qvsClientProvCtxVerifyCharacterPxPhysical(record->ptCharacterList, copy);
-    }
-    return copy;
+    return static_cast<qvsCtxPxPhysical *>(copyRecord(record, pxPhysical::kCopy));
 }
 
 qvsCtxPort *qvsClientProvCtxVerifyContextPort(qvsWapPort *record)
 {
-    using C = qvsCtxPort;
-    using W = qvsWapPort;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszPortNbr, &C::pszPortNbr},
-    };
-    static constexpr CopyList<C, W> kLists[] = {
-        {&W::ptServiceList, &C::ptService, qvsClientProvCtxVerifyContextServiceList},
-    };
-    return copyRecord<C>(record, kTexts, kLists);
+    return static_cast<qvsCtxPort *>(copyRecord(record, port::kCopy));
 }
 
 qvsCtxNapDef *qvsClientProvCtxVerifyContextNapdef(qvsWapNapDef *record)
 {
-    using C = qvsCtxNapDef;
-    using W = qvsWapNapDef;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszNapId, &C::pszNapId},
-        {&W::pszName, &C::pszName},
-        {&W::pszInternet, &C::pszInternet},
-        {&W::pszNapAddress, &C::pszNapAddress},
-        {&W::pszNapAddrType, &C::pszNapAddrType},
-        {&W::pszInit, &C::pszInit},
-        {&W::pszCallType, &C::pszCallType},
-        {&W::pszLocalAddr, &C::pszLocalAddr},
-        {&W::pszLocalAddrType, &C::pszLocalAddrType},
-        {&W::pszLinkSpeed, &C::pszLinkSpeed},
-        {&W::pszDnLinkSpeed, &C::pszDnLinkSpeed},
-        {&W::pszLinger, &C::pszLinger},
-        {&W::pszDeliveryErrSdu, &C::pszDeliveryErrSdu},
-        {&W::pszDeliveryOrder, &C::pszDeliveryOrder},
-        {&W::pszTrafficClass, &C::pszTrafficClass},
-        {&W::pszMaxSduSize, &C::pszMaxSduSize},
-        {&W::pszMaxBitrateUplink, &C::pszMaxBitrateUplink},
-        {&W::pszMaxBitrateDnlink, &C::pszMaxBitrateDnlink},
-        {&W::pszReserved1, &C::pszReserved1},
-        {&W::pszReserved2, &C::pszReserved2},
-        {&W::pszReserved3, &C::pszReserved3},
-        {&W::pszReserved4, &C::pszReserved4},
-        {&W::pszReserved5, &C::pszReserved5},
-        {&W::pszReserved6, &C::pszReserved6},
-        {&W::pszMaxNumRetry, &C::pszMaxNumRetry},
-        {&W::pszFirstRetryTimeout, &C::pszFirstRetryTimeout},
-        {&W::pszReregThreshold, &C::pszReregThreshold},
-        {&W::pszTBit, &C::pszTBit},
-    };
-    static constexpr CopyList<C, W> kLists[] = {
-        {&W::ptDnsAddrList, &C::ptDnsAddr, qvsClientProvCtxVerifyContextDnsAddrList},
-        {&W::ptBearerList, &C::ptBearer, qvsClientProvCtxVerifyContextBearerList},
-    };
-    C *copy = copyRecord<C>(record, kTexts, kLists);
-    if (copy) {
-        traceError(qvsClientProvCtxVerifyCharacterNapDef(record->ptCharacterList, copy));
-    }
-    return copy;
+    return static_cast<qvsCtxNapDef *>(copyRecord(record, napDef::kCopy));
 }
 
 qvsCtxNapAuthInfo *qvsClientProvCtxVerifyContextNapAuthInfo(qvsWapNapAuthInfo *record)
 {
-    using C = qvsCtxNapAuthInfo;
-    using W = qvsWapNapAuthInfo;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszAuthType, &C::pszAuthType},
-        {&W::pszAuthName, &C::pszAuthName},
-        {&W::pszAuthSecret, &C::pszAuthSecret},
-        {&W::pszReserved, &C::pszReserved},
-    };
-    static constexpr CopyList<C, W> kLists[] = {
-        {&W::ptAuthEntityList, &C::ptAuthEntity, qvsClientProvCtxVerifyContextAuthEntityList},
-    };
-    C *copy = copyRecord<C>(record, kTexts, kLists);
-    // hardened: an entity without memory for its text is left out of the trace.
-    if (copy && copy->ptAuthEntity && copy->ptAuthEntity->pAuthEntity) {
-        trace("NAP:ptCtx->ptAuthEntity->pAuthEntity[%s]", copy->ptAuthEntity->pAuthEntity);
-    }
-    return copy;
+    return static_cast<qvsCtxNapAuthInfo *>(copyRecord(record, napAuthInfo::kCopy));
 }
 
 qvsCtxValidity *qvsClientProvCtxVerifyContextValidity(qvsWapValidity *record)
 {
-    using C = qvsCtxValidity;
-    using W = qvsWapValidity;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszCountry, &C::pszCountry},
-        {&W::pszNetwork, &C::pszNetwork},
-        {&W::pszSid, &C::pszSid},
-        {&W::pszSoc, &C::pszSoc},
-        {&W::pszValidUntil, &C::pszValidUntil},
-    };
-    return copyRecord<C>(record, kTexts);
+    return static_cast<qvsCtxValidity *>(copyRecord(record, validity::kCopy));
 }
 
 qvsCtxApplication *qvsClientProvCtxVerifyContextApplication(qvsWapApplication *record)
 {
-    using C = qvsCtxApplication;
-    using W = qvsWapApplication;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszAppId, &C::pszAppId},
-        {&W::pszProviderId, &C::pszProviderId},
-        {&W::pszFrom, &C::pszFrom},
-        {&W::pszName, &C::pszName},
-        {&W::pszAAccept, &C::pszAAccept},
-        {&W::pszAProtocol, &C::pszAProtocol},
-        {&W::pszInternet, &C::pszInternet},
-        {&W::pszXcapAuidDcs, &C::pszXcapAuidDcs},
-        {&W::pszXcapAuidPms, &C::pszXcapAuidPms},
-        {&W::pszXcapAuidCdms, &C::pszXcapAuidCdms},
-        {&W::pszXcapImeiHeader, &C::pszXcapImeiHeader},
-        {&W::pszXcapTidHeader, &C::pszXcapTidHeader},
-        // kept[context-from-twice]: FROM is copied once more, and the first copy stays allocated.
-        {&W::pszFrom, &C::pszFrom},
-    };
-    static constexpr CopyList<C, W> kLists[] = {
-        {&W::ptToProxyList, &C::ptToProxy, qvsClientProvCtxVerifyContextToProxyList},
-        {&W::ptToNapIdList, &C::ptToNapId, qvsClientProvCtxVerifyContextToNapIdList},
-        {&W::ptAddrList, &C::ptToAddr, qvsClientProvCtxVerifyContextToAddrList},
-    };
-    C *copy = copyRecord<C>(record, kTexts, kLists);
-    if (copy) {
-        traceError(qvsClientProvCtxVerifyCharacterApplication(record->ptCharacterList, copy));
-    }
-    return copy;
+    return static_cast<qvsCtxApplication *>(copyRecord(record, application::kCopy));
 }
 
 qvsCtxAppAddr *qvsClientProvCtxVerifyContextAppAddr(qvsWapAppAddr *record)
 {
-    using C = qvsCtxAppAddr;
-    using W = qvsWapAppAddr;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszAddr, &C::pszAddr},
-        {&W::pszAddrType, &C::pszAddrType},
-    };
-    C *copy = copyRecord<C>(record, kTexts);
-    if (copy) {
-        // kept[context-misfit-ignored]: not even traced here.
-        (void)qvsClientProvCtxVerifyCharacterAppAddr(record->ptCharacterList, copy);
-    }
-    return copy;
+    return static_cast<qvsCtxAppAddr *>(copyRecord(record, appAddr::kCopy));
 }
 
 qvsCtxAppAuth *qvsClientProvCtxVerifyContextAppAuth(qvsWapAppAuth *record)
 {
-    using C = qvsCtxAppAuth;
-    using W = qvsWapAppAuth;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszAAuthLevel, &C::pszAAuthLevel}, {&W::pszAAuthType, &C::pszAAuthType},
-        {&W::pszAAuthName, &C::pszAAuthName},   {&W::pszAAuthSecret, &C::pszAAuthSecret},
-        {&W::pszAAuthData, &C::pszAAuthData},
-    };
-    return copyRecord<C>(record, kTexts);
+    return static_cast<qvsCtxAppAuth *>(copyRecord(record, appAuth::kCopy));
 }
 
 qvsCtxResource *qvsClientProvCtxVerifyContextResource(qvsWapResource *record)
 {
-    using C = qvsCtxResource;
-    using W = qvsWapResource;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszUri, &C::pszUri},
-        {&W::pszName, &C::pszName},
-        {&W::pszAAccept, &C::pszAAccept},
-        {&W::pszAAuthType, &C::pszAAuthType},
-        {&W::pszAAuthName, &C::pszAAuthName},
-        {&W::pszAAuthSecret, &C::pszAAuthSecret},
-        {&W::pszAAuthData, &C::pszAAuthData},
-        {&W::pszStartPage, &C::pszStartPage},
-    };
-    return copyRecord<C>(record, kTexts);
+    return static_cast<qvsCtxResource *>(copyRecord(record, resource::kCopy));
 }
 
 qvsCtxRoaming *qvsClientProvCtxVerifyContextRoaming(qvsWapRoaming *record)
 {
-    using C = qvsCtxRoaming;
-    using W = qvsWapRoaming;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszSyncAllowed, &C::pszSyncAllowed},
-        {&W::pszSyncDefault, &C::pszSyncDefault},
-    };
-    return copyRecord<C>(record, kTexts);
+    return static_cast<qvsCtxRoaming *>(copyRecord(record, roaming::kCopy));
 }
 
 qvsCtxBootstrap *qvsClientProvCtxVerifyContextBootstrap(qvsWapBootstrap *record)
 {
-    using C = qvsCtxBootstrap;
-    using W = qvsWapBootstrap;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszName, &C::pszName},
-        {&W::pszCountry, &C::pszCountry},
-        {&W::pszProvUrl, &C::pszProvUrl},
-        {&W::pszContextAllow, &C::pszContextAllow},
-    };
-    static constexpr CopyList<C, W> kLists[] = {
-        {&W::ptProxyIdList, &C::ptProxyId, qvsClientProvCtxVerifyContextProxyIdList},
-        {&W::ptNetworkList, &C::ptNetwork, qvsClientProvCtxVerifyContextNetworkList},
-    };
-    return copyRecord<C>(record, kTexts, kLists);
+    return static_cast<qvsCtxBootstrap *>(copyRecord(record, bootstrap::kCopy));
 }
 
 qvsCtxClientIdent *qvsClientProvCtxVerifyContextClientIdent(qvsWapClientIdentity *record)
 {
-    using C = qvsCtxClientIdent;
-    using W = qvsWapClientIdentity;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszClientId, &C::pszClientId},
-    };
-    return copyRecord<C>(record, kTexts);
+    return static_cast<qvsCtxClientIdent *>(copyRecord(record, clientIdent::kCopy));
 }
 
 qvsCtxVendorConfig *qvsClientProvCtxVerifyContextVenderConfig(qvsWapVendorConfig *record)
 {
-    using C = qvsCtxVendorConfig;
-    using W = qvsWapVendorConfig;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszName, &C::pszName},
-        {&W::pszParamName, &C::pszParamName},
-        {&W::pszParamValue, &C::pszParamValue},
-    };
-    return copyRecord<C>(record, kTexts);
+    return static_cast<qvsCtxVendorConfig *>(copyRecord(record, vendorConfig::kCopy));
 }
 
 qvsCtxAccess *qvsClientProvCtxVerifyContextAccess(qvsWapAccess *record)
 {
-    using C = qvsCtxAccess;
-    using W = qvsWapAccess;
-    static constexpr CopyList<C, W> kLists[] = {
-        {&W::ptRuleList, &C::ptRule, qvsClientProvCtxVerifyContextRuleList},
-        {&W::ptAppIdList, &C::ptAppId, qvsClientProvCtxVerifyContextAppIdList},
-        {&W::ptPortNbrList, &C::ptPortNbr, qvsClientProvCtxVerifyContextPortNbrList},
-        {&W::ptDomainList, &C::ptDomain, qvsClientProvCtxVerifyContextDomainList},
-        {&W::ptToNapIdList, &C::ptToNapId, qvsClientProvCtxVerifyContextToNapIdList},
-        {&W::ptToProxyList, &C::ptToProxy, qvsClientProvCtxVerifyContextToProxyList},
-    };
-    return copyRecord<C>(record, kLists);
+    return static_cast<qvsCtxAccess *>(copyRecord(record, access::kCopy));
 }
 
 qvsCtxWifi *qvsClientProvCtxVerifyContextWifi(qvsWapWifi *record)
 {
-    using C = qvsCtxWifi;
-    using W = qvsWapWifi;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszNetSsid, &C::pszNetSsid},
-        {&W::pszSecMode, &C::pszSecMode},
-        {&W::pszEapMethod, &C::pszEapMethod},
-        {&W::pszEapType, &C::pszEapType},
-        {&W::pszUserName, &C::pszUserName},
-        {&W::pszAnonUserName, &C::pszAnonUserName},
-        {&W::pszPassword, &C::pszPassword},
-        {&W::pszCaCert, &C::pszCaCert},
-        {&W::pszUserCert, &C::pszUserCert},
-        {&W::pszPhase1, &C::pszPhase1},
-        {&W::pszAuthAlgorithm, &C::pszAuthAlgorithm},
-        {&W::pszPriority, &C::pszPriority},
-    };
-    return copyRecord<C>(record, kTexts);
+    return static_cast<qvsCtxWifi *>(copyRecord(record, wifi::kCopy));
 }
 
 qvsCtxVoWifi *qvsClientProvCtxVerifyContextVoWifi(qvsWapVoWifi *record)
 {
-    using C = qvsCtxVoWifi;
-    using W = qvsWapVoWifi;
-    static constexpr CopyText<C, W> kTexts[] = {
-        {&W::pszEpdgFqdn, &C::pszEpdgFqdn},
-    };
-    return copyRecord<C>(record, kTexts);
+    return static_cast<qvsCtxVoWifi *>(copyRecord(record, voWifi::kCopy));
 }
 
 qvsCtxStrNode *qvsClientProvCtxVerifyContextToAddrList(qvsList *texts)
@@ -480,4 +561,29 @@ qvsCtxStrNode *qvsClientProvCtxVerifyContextServiceList(qvsList *texts)
 qvsCtxStrNode *qvsClientProvCtxVerifyContextDomainList(qvsList *texts)
 {
     return copyTexts(texts);
+}
+
+qvsResult qvsClientProvCtxVerifyCharacterPxLogical(qvsList *children, qvsCtxPxLogical *parent)
+{
+    return copyChildren(children, parent, pxLogical::kCopy);
+}
+
+qvsResult qvsClientProvCtxVerifyCharacterPxPhysical(qvsList *children, qvsCtxPxPhysical *parent)
+{
+    return copyChildren(children, parent, pxPhysical::kCopy);
+}
+
+qvsResult qvsClientProvCtxVerifyCharacterNapDef(qvsList *children, qvsCtxNapDef *parent)
+{
+    return copyChildren(children, parent, napDef::kCopy);
+}
+
+qvsResult qvsClientProvCtxVerifyCharacterApplication(qvsList *children, qvsCtxApplication *parent)
+{
+    return copyChildren(children, parent, application::kCopy);
+}
+
+qvsResult qvsClientProvCtxVerifyCharacterAppAddr(qvsList *children, qvsCtxAppAddr *parent)
+{
+    return copyChildren(children, parent, appAddr::kCopy);
 }

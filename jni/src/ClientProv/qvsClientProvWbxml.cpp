@@ -1,5 +1,5 @@
-// Creation of the decoder, and the releases of the document tree: one per kind of record, and one
-// loop for all that is nested in a record.
+// Creation of the decoder, and the releases of the document tree: one table per kind of record, and
+// one loop for all that is nested in a record.
 #include "qvsClientProvWbxml.h"
 #include "qvsFields.h"
 #include "qvslist.h"
@@ -17,14 +17,251 @@ constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxml";
 constexpr qvsResult kNothing = 0;
 constexpr qvsResult kReleased = 1;
 
-// One field that a record owns: a text, or a list of texts.
-template <class Record>
-struct Owned {
-    constexpr Owned(char *Record::*f) : text(f) {}
-    constexpr Owned(qvsList *Record::*f) : list(f) {}
+// A field that a record owns: a text, or a list of texts.
+struct ReleaseRow {
+    consteval ReleaseRow(TextField f) : field(f.number), list(false) {}
+    consteval ReleaseRow(ListField f) : field(f.number), list(true) {}
 
-    char *Record::*text = nullptr;
-    qvsList *Record::*list = nullptr;
+    uint8_t field;
+    bool list;
+};
+
+// One kind of record: what it owns, in the order in which that is released, and where its children
+// are.
+struct ReleaseKind {
+    Rows<ReleaseRow> rows;
+    uint8_t childList; // kNoField for a kind in which nothing nests
+};
+
+template <class Record, size_t N, size_t L = 0>
+consteval ReleaseKind releaseOf(const ReleaseRow (&rows)[N], Left<L> = {})
+{
+    static_assert(N + L + (kChildListOf<Record> == kNoField ? 0 : 1) == kFieldsOf<Record>,
+                  "a field is neither released nor left on purpose");
+    return {rows, kChildListOf<Record>};
+}
+
+namespace pxLogical {
+using R = qvsWapPxLogical;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszProxyId)},     {QVS_FIELD(R, pszProxyPw)},
+    {QVS_FIELD(R, pszPpgAuthType)}, {QVS_FIELD(R, pszProxyProviderId)},
+    {QVS_FIELD(R, pszName)},        {QVS_FIELD(R, pszTrust)},
+    {QVS_FIELD(R, pszMaster)},      {QVS_FIELD(R, pszStartPage)},
+    {QVS_FIELD(R, pszReserved1)},   {QVS_FIELD(R, pszReserved2)},
+    {QVS_FIELD(R, pszReserved3)},   {QVS_FIELD(R, pszReserved4)},
+    {QVS_FIELD(R, pszReserved5)},   {QVS_FIELD(R, ptDomainList)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace pxLogical
+
+namespace pxAuthInfo {
+using R = qvsWapPxAuthInfo;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszPxAuthType)},
+    {QVS_FIELD(R, pszPxAuthId)},
+    {QVS_FIELD(R, pszPxAuthPw)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace pxAuthInfo
+
+namespace port {
+using R = qvsWapPort;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszPortNbr)},
+    {QVS_FIELD(R, ptServiceList)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace port
+
+namespace pxPhysical {
+using R = qvsWapPxPhysical;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszPhysicalProxyId)}, {QVS_FIELD(R, pszPxAddr)},
+    {QVS_FIELD(R, pszPxAddrType)},      {QVS_FIELD(R, pszPxAddrFqdn)},
+    {QVS_FIELD(R, pszWspVersion)},      {QVS_FIELD(R, pszPushEnabled)},
+    {QVS_FIELD(R, pszPullEnabled)},     {QVS_FIELD(R, ptToNapIdList)},
+    {QVS_FIELD(R, ptDomainList)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace pxPhysical
+
+namespace napDef {
+using R = qvsWapNapDef;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszNapId)},
+    {QVS_FIELD(R, pszName)},
+    {QVS_FIELD(R, pszInternet)},
+    {QVS_FIELD(R, pszNapAddress)},
+    {QVS_FIELD(R, pszNapAddrType)},
+    {QVS_FIELD(R, pszCallType)},
+    {QVS_FIELD(R, pszLocalAddr)},
+    {QVS_FIELD(R, pszLocalAddrType)},
+    {QVS_FIELD(R, pszLinkSpeed)},
+    {QVS_FIELD(R, pszDnLinkSpeed)},
+    {QVS_FIELD(R, pszLinger)},
+    {QVS_FIELD(R, pszDeliveryErrSdu)},
+    {QVS_FIELD(R, pszDeliveryOrder)},
+    {QVS_FIELD(R, pszTrafficClass)},
+    {QVS_FIELD(R, pszMaxSduSize)},
+    {QVS_FIELD(R, pszMaxBitrateUplink)},
+    {QVS_FIELD(R, pszMaxBitrateDnlink)},
+    {QVS_FIELD(R, pszReserved1)},
+    {QVS_FIELD(R, pszReserved2)},
+    {QVS_FIELD(R, pszReserved3)},
+    {QVS_FIELD(R, pszReserved4)},
+    {QVS_FIELD(R, pszReserved5)},
+    {QVS_FIELD(R, pszReserved6)},
+    {QVS_FIELD(R, pszMaxNumRetry)},
+    {QVS_FIELD(R, pszFirstRetryTimeout)},
+    {QVS_FIELD(R, pszReregThreshold)},
+    {QVS_FIELD(R, pszTBit)},
+    {QVS_FIELD(R, ptDnsAddrList)},
+    {QVS_FIELD(R, ptBearerList)},
+};
+// kept[tree-init-left]: INIT is constant text, which no release touches.
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows, leave(&R::pszInit));
+} // namespace napDef
+
+namespace napAuthInfo {
+using R = qvsWapNapAuthInfo;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszAuthType)}, {QVS_FIELD(R, pszAuthName)},      {QVS_FIELD(R, pszAuthSecret)},
+    {QVS_FIELD(R, pszReserved)}, {QVS_FIELD(R, ptAuthEntityList)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace napAuthInfo
+
+namespace validity {
+using R = qvsWapValidity;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszCountry)}, {QVS_FIELD(R, pszNetwork)},    {QVS_FIELD(R, pszSid)},
+    {QVS_FIELD(R, pszSoc)},     {QVS_FIELD(R, pszValidUntil)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace validity
+
+namespace appAddr {
+using R = qvsWapAppAddr;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszAddrType)},
+    {QVS_FIELD(R, pszAddr)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace appAddr
+
+namespace resource {
+using R = qvsWapResource;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszUri)},       {QVS_FIELD(R, pszName)},      {QVS_FIELD(R, pszAAccept)},
+    {QVS_FIELD(R, pszAAuthType)}, {QVS_FIELD(R, pszAAuthName)}, {QVS_FIELD(R, pszAAuthSecret)},
+    {QVS_FIELD(R, pszAAuthData)}, {QVS_FIELD(R, pszStartPage)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace resource
+
+namespace appAuth {
+using R = qvsWapAppAuth;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszAAuthLevel)},  {QVS_FIELD(R, pszAAuthType)}, {QVS_FIELD(R, pszAAuthName)},
+    {QVS_FIELD(R, pszAAuthSecret)}, {QVS_FIELD(R, pszAAuthData)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace appAuth
+
+namespace application {
+using R = qvsWapApplication;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszAppId)},      {QVS_FIELD(R, pszProviderId)}, {QVS_FIELD(R, pszName)},
+    {QVS_FIELD(R, pszAAccept)},    {QVS_FIELD(R, pszAProtocol)},  {QVS_FIELD(R, pszInternet)},
+    {QVS_FIELD(R, ptToProxyList)}, {QVS_FIELD(R, ptToNapIdList)}, {QVS_FIELD(R, ptAddrList)},
+};
+// kept[tree-application-left]: these six stay allocated when the tree is gone.
+constexpr ReleaseKind kRelease =
+    releaseOf<R>(kRows, leave(&R::pszFrom, &R::pszXcapAuidDcs, &R::pszXcapAuidPms,
+                              &R::pszXcapAuidCdms, &R::pszXcapImeiHeader, &R::pszXcapTidHeader));
+} // namespace application
+
+namespace bootstrap {
+using R = qvsWapBootstrap;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszName)},         {QVS_FIELD(R, pszCountry)},    {QVS_FIELD(R, pszProvUrl)},
+    {QVS_FIELD(R, pszContextAllow)}, {QVS_FIELD(R, ptProxyIdList)}, {QVS_FIELD(R, ptNetworkList)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace bootstrap
+
+namespace vendorConfig {
+using R = qvsWapVendorConfig;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszName)},
+};
+// kept[tree-vendorconfig-left]: name and value of the parameter stay allocated.
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows, leave(&R::pszParamName, &R::pszParamValue));
+} // namespace vendorConfig
+
+namespace clientIdentity {
+using R = qvsWapClientIdentity;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszClientId)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace clientIdentity
+
+namespace access {
+using R = qvsWapAccess;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, ptRuleList)},   {QVS_FIELD(R, ptAppIdList)},   {QVS_FIELD(R, ptPortNbrList)},
+    {QVS_FIELD(R, ptDomainList)}, {QVS_FIELD(R, ptToNapIdList)}, {QVS_FIELD(R, ptToProxyList)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace access
+
+namespace wifi {
+using R = qvsWapWifi;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszNetSsid)},  {QVS_FIELD(R, pszSecMode)},       {QVS_FIELD(R, pszEapMethod)},
+    {QVS_FIELD(R, pszEapType)},  {QVS_FIELD(R, pszUserName)},      {QVS_FIELD(R, pszAnonUserName)},
+    {QVS_FIELD(R, pszPassword)}, {QVS_FIELD(R, pszCaCert)},        {QVS_FIELD(R, pszUserCert)},
+    {QVS_FIELD(R, pszPhase1)},   {QVS_FIELD(R, pszAuthAlgorithm)}, {QVS_FIELD(R, pszPriority)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace wifi
+
+namespace voWifi {
+using R = qvsWapVoWifi;
+constexpr ReleaseRow kRows[] = {
+    {QVS_FIELD(R, pszEpdgFqdn)},
+};
+constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
+} // namespace voWifi
+
+// A slot of a node and the kind of record in it.
+struct SlotRow {
+    RecordField slot;
+    ReleaseKind kind;
+};
+
+// The slots of a node, in the order in which they are released.
+// kept[tree-roaming-left]: the ROAMING record and its texts stay allocated.
+constexpr SlotRow kSlots[] = {
+    {QVS_FIELD(qvsWapCharacter, ptPxLogical), pxLogical::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptPxAuthInfo), pxAuthInfo::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptPort), port::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptPxPhysical), pxPhysical::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptNapDef), napDef::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptNapAuthInfo), napAuthInfo::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptValidity), validity::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptAppAddr), appAddr::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptResource), resource::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptAppAuth), appAuth::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptApplication), application::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptBootstrap), bootstrap::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptVendorConfig), vendorConfig::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptClientIdentity), clientIdentity::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptAccess), access::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptWifi), wifi::kRelease},
+    {QVS_FIELD(qvsWapCharacter, ptVoWifi), voWifi::kRelease},
 };
 
 void releaseList(qvsList **field)
@@ -35,191 +272,51 @@ void releaseList(qvsList **field)
     }
 }
 
-// Releases the fields in the order of their rows, and clears them.
-template <class Record, size_t N>
-void releaseFields(Record *record, const Owned<Record> (&fields)[N])
+// Releases the fields of a record and clears them. Harmless when it was done before.
+void releaseFields(void *record, const ReleaseKind &kind)
 {
-    for (const Owned<Record> &field : fields) {
-        if (field.text) {
-            releaseText(&(record->*field.text));
+    for (const ReleaseRow &row : kind.rows) {
+        if (row.list) {
+            releaseList(listAt(record, row.field));
         } else {
-            releaseList(&(record->*field.list));
+            releaseText(textAt(record, row.field));
         }
     }
 }
 
-// Releases a record in which nothing is nested.
-template <class Record, size_t N, size_t L = 0>
-qvsResult releaseLeaf(Record *record, const Owned<Record> (&fields)[N], Left<L> = {})
+// The children of a record; null when there are none.
+qvsList *childrenOf(void *record, const ReleaseKind &kind)
 {
-    static_assert(N + L == kFieldsOf<Record>, "a field is neither released nor left on purpose");
-    if (!record) {
-        return kNothing;
+    qvsList *children = kind.childList == kNoField ? nullptr : *listAt(record, kind.childList);
+    return children && children->ptFirst ? children : nullptr;
+}
+
+// Releases a record whose fields and children are gone.
+void closeRecord(void *record, const ReleaseKind &kind)
+{
+    if (kind.childList != kNoField) {
+        releaseList(listAt(record, kind.childList));
     }
-    releaseFields(record, fields);
     qvsMemFree_debug(record);
-    return kReleased;
-}
-
-// The first half of the release of a record with children: everything that comes before them.
-// Harmless when it was done before.
-template <class Record, size_t N, size_t L = 0>
-void openParent(Record *record, const Owned<Record> (&fields)[N], Left<L> = {})
-{
-    constexpr size_t kChildList = 1;
-    static_assert(N + L + kChildList == kFieldsOf<Record>,
-                  "a field is neither released nor left on purpose");
-    releaseFields(record, fields);
-}
-
-// The second half, once the children are gone.
-template <class Record>
-void closeParent(Record *record)
-{
-    releaseList(&record->ptCharacterList);
-    qvsMemFree_debug(record);
-}
-
-void openPxLogical(qvsWapPxLogical *record)
-{
-    using R = qvsWapPxLogical;
-    static constexpr Owned<R> kFields[] = {
-        &R::pszProxyId,   &R::pszProxyPw,   &R::pszPpgAuthType, &R::pszProxyProviderId,
-        &R::pszName,      &R::pszTrust,     &R::pszMaster,      &R::pszStartPage,
-        &R::pszReserved1, &R::pszReserved2, &R::pszReserved3,   &R::pszReserved4,
-        &R::pszReserved5, &R::ptDomainList,
-    };
-    openParent(record, kFields);
-}
-
-void openPxPhysical(qvsWapPxPhysical *record)
-{
-    using R = qvsWapPxPhysical;
-    static constexpr Owned<R> kFields[] = {
-        &R::pszPhysicalProxyId, &R::pszPxAddr,     &R::pszPxAddrType,
-        &R::pszPxAddrFqdn,      &R::pszWspVersion, &R::pszPushEnabled,
-        &R::pszPullEnabled,     &R::ptToNapIdList, &R::ptDomainList,
-    };
-    openParent(record, kFields);
-}
-
-void openNapDef(qvsWapNapDef *record)
-{
-    using R = qvsWapNapDef;
-    static constexpr Owned<R> kFields[] = {
-        &R::pszNapId,
-        &R::pszName,
-        &R::pszInternet,
-        &R::pszNapAddress,
-        &R::pszNapAddrType,
-        &R::pszCallType,
-        &R::pszLocalAddr,
-        &R::pszLocalAddrType,
-        &R::pszLinkSpeed,
-        &R::pszDnLinkSpeed,
-        &R::pszLinger,
-        &R::pszDeliveryErrSdu,
-        &R::pszDeliveryOrder,
-        &R::pszTrafficClass,
-        &R::pszMaxSduSize,
-        &R::pszMaxBitrateUplink,
-        &R::pszMaxBitrateDnlink,
-        &R::pszReserved1,
-        &R::pszReserved2,
-        &R::pszReserved3,
-        &R::pszReserved4,
-        &R::pszReserved5,
-        &R::pszReserved6,
-        &R::pszMaxNumRetry,
-        &R::pszFirstRetryTimeout,
-        &R::pszReregThreshold,
-        &R::pszTBit,
-        &R::ptDnsAddrList,
-        &R::ptBearerList,
-    };
-    // kept[tree-init-left]: INIT is constant text, which no release touches.
-    openParent(record, kFields, leave(&R::pszInit));
-}
-
-void openAppAddr(qvsWapAppAddr *record)
-{
-    using R = qvsWapAppAddr;
-    static constexpr Owned<R> kFields[] = {&R::pszAddrType, &R::pszAddr};
-    openParent(record, kFields);
-}
-
-void openApplication(qvsWapApplication *record)
-{
-    using R = qvsWapApplication;
-    static constexpr Owned<R> kFields[] = {
-        &R::pszAppId,    &R::pszProviderId, &R::pszName,       &R::pszAAccept, &R::pszAProtocol,
-        &R::pszInternet, &R::ptToProxyList, &R::ptToNapIdList, &R::ptAddrList,
-    };
-    // kept[tree-application-left]: these six stay allocated when the tree is gone.
-    openParent(record, kFields,
-               leave(&R::pszFrom, &R::pszXcapAuidDcs, &R::pszXcapAuidPms, &R::pszXcapAuidCdms,
-                     &R::pszXcapImeiHeader, &R::pszXcapTidHeader));
-}
-
-template <class Record>
-void releaseLeafSlot(Record **slot, qvsResult (*release)(Record *record))
-{
-    if (*slot) {
-        (void)release(*slot); // never null here
-        *slot = nullptr;
-    }
-}
-
-// Releases the record in the slot unless it has children. They have to go first: answers their
-// list, and does the rest when called again.
-template <class Record>
-qvsList *releaseParentSlot(Record **slot, void (*open)(Record *record))
-{
-    if (!*slot) {
-        return nullptr;
-    }
-    open(*slot);
-    qvsList *children = (*slot)->ptCharacterList;
-    if (children && children->ptFirst) {
-        return children;
-    }
-    closeParent(*slot);
-    *slot = nullptr;
-    return nullptr;
 }
 
 // Releases the records of a node in the order of its slots. Stops at a record with children, which
-// have to go first, and answers their list; null when nothing is left but the node itself.
+// have to go first, and answers their list; does the rest when called again. Null when nothing is
+// left but the node itself.
 qvsList *releaseSlots(qvsWapCharacter *node)
 {
-    if (qvsList *children = releaseParentSlot(&node->ptPxLogical, openPxLogical)) {
-        return children;
+    for (const SlotRow &row : kSlots) {
+        void *record = pointerAt(node, row.slot.number);
+        if (!record) {
+            continue;
+        }
+        releaseFields(record, row.kind);
+        if (qvsList *children = childrenOf(record, row.kind)) {
+            return children;
+        }
+        closeRecord(record, row.kind);
+        setPointer(node, row.slot.number, nullptr);
     }
-    releaseLeafSlot(&node->ptPxAuthInfo, qvsClientProvWbxmlDeletePxAuthInfo);
-    releaseLeafSlot(&node->ptPort, qvsClientProvWbxmlDeletePort);
-    if (qvsList *children = releaseParentSlot(&node->ptPxPhysical, openPxPhysical)) {
-        return children;
-    }
-    if (qvsList *children = releaseParentSlot(&node->ptNapDef, openNapDef)) {
-        return children;
-    }
-    releaseLeafSlot(&node->ptNapAuthInfo, qvsClientProvWbxmlDeleteNapAuthInfo);
-    releaseLeafSlot(&node->ptValidity, qvsClientProvWbxmlDeleteValidity);
-    if (qvsList *children = releaseParentSlot(&node->ptAppAddr, openAppAddr)) {
-        return children;
-    }
-    releaseLeafSlot(&node->ptResource, qvsClientProvWbxmlDeleteResource);
-    releaseLeafSlot(&node->ptAppAuth, qvsClientProvWbxmlDeleteAppAuth);
-    if (qvsList *children = releaseParentSlot(&node->ptApplication, openApplication)) {
-        return children;
-    }
-    releaseLeafSlot(&node->ptBootstrap, qvsClientProvWbxmlDeleteBootstrap);
-    releaseLeafSlot(&node->ptVendorConfig, qvsClientProvWbxmlDeleteVendorConfig);
-    releaseLeafSlot(&node->ptClientIdentity, qvsClientProvWbxmlDeleteClientIdentity);
-    releaseLeafSlot(&node->ptAccess, qvsClientProvWbxmlDeleteAccess);
-    // kept[tree-roaming-left]: the ROAMING record and its texts stay allocated.
-    releaseLeafSlot(&node->ptWifi, qvsClientProvWbxmlDeleteWifi);
-    releaseLeafSlot(&node->ptVoWifi, qvsClientProvWbxmlDeleteVoWifi);
     return nullptr;
 }
 
@@ -258,15 +355,15 @@ void releaseNodes(qvsList *list)
     }
 }
 
-template <class Record>
-qvsResult releaseParent(Record *record, void (*open)(Record *record))
+// Releases a record with everything nested in it.
+qvsResult releaseRecord(void *record, const ReleaseKind &kind)
 {
     if (!record) {
         return kNothing;
     }
-    open(record);
-    releaseNodes(record->ptCharacterList);
-    closeParent(record);
+    releaseFields(record, kind);
+    releaseNodes(childrenOf(record, kind));
+    closeRecord(record, kind);
     return kReleased;
 }
 
@@ -314,7 +411,8 @@ qvsResult qvsClientProvWbxmlDeleteWapDoc(qvsWapDoc *document)
         return kNothing;
     }
     releaseNodes(document->ptCharacterList);
-    closeParent(document);
+    releaseList(&document->ptCharacterList);
+    qvsMemFree_debug(document);
     return kReleased;
 }
 
@@ -332,127 +430,85 @@ qvsResult qvsClientProvWbxmlDeleteCharacter(qvsWapCharacter *node)
 
 qvsResult qvsClientProvWbxmlDeletePxlogical(qvsWapPxLogical *record)
 {
-    return releaseParent(record, openPxLogical);
+    return releaseRecord(record, pxLogical::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeletePxAuthInfo(qvsWapPxAuthInfo *record)
 {
-    using R = qvsWapPxAuthInfo;
-    static constexpr Owned<R> kFields[] = {&R::pszPxAuthType, &R::pszPxAuthId, &R::pszPxAuthPw};
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, pxAuthInfo::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeletePort(qvsWapPort *record)
 {
-    using R = qvsWapPort;
-    static constexpr Owned<R> kFields[] = {&R::pszPortNbr, &R::ptServiceList};
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, port::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeletePxphysical(qvsWapPxPhysical *record)
 {
-    return releaseParent(record, openPxPhysical);
+    return releaseRecord(record, pxPhysical::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteNapDef(qvsWapNapDef *record)
 {
-    return releaseParent(record, openNapDef);
+    return releaseRecord(record, napDef::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteNapAuthInfo(qvsWapNapAuthInfo *record)
 {
-    using R = qvsWapNapAuthInfo;
-    static constexpr Owned<R> kFields[] = {
-        &R::pszAuthType, &R::pszAuthName, &R::pszAuthSecret, &R::pszReserved, &R::ptAuthEntityList,
-    };
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, napAuthInfo::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteValidity(qvsWapValidity *record)
 {
-    using R = qvsWapValidity;
-    static constexpr Owned<R> kFields[] = {
-        &R::pszCountry, &R::pszNetwork, &R::pszSid, &R::pszSoc, &R::pszValidUntil,
-    };
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, validity::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteAppAddr(qvsWapAppAddr *record)
 {
-    return releaseParent(record, openAppAddr);
+    return releaseRecord(record, appAddr::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteResource(qvsWapResource *record)
 {
-    using R = qvsWapResource;
-    static constexpr Owned<R> kFields[] = {
-        &R::pszUri,       &R::pszName,        &R::pszAAccept,   &R::pszAAuthType,
-        &R::pszAAuthName, &R::pszAAuthSecret, &R::pszAAuthData, &R::pszStartPage,
-    };
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, resource::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteAppAuth(qvsWapAppAuth *record)
 {
-    using R = qvsWapAppAuth;
-    static constexpr Owned<R> kFields[] = {
-        &R::pszAAuthLevel, &R::pszAAuthType, &R::pszAAuthName, &R::pszAAuthSecret, &R::pszAAuthData,
-    };
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, appAuth::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteApplication(qvsWapApplication *record)
 {
-    return releaseParent(record, openApplication);
+    return releaseRecord(record, application::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteBootstrap(qvsWapBootstrap *record)
 {
-    using R = qvsWapBootstrap;
-    static constexpr Owned<R> kFields[] = {
-        &R::pszName,         &R::pszCountry,    &R::pszProvUrl,
-        &R::pszContextAllow, &R::ptProxyIdList, &R::ptNetworkList,
-    };
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, bootstrap::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteVendorConfig(qvsWapVendorConfig *record)
 {
-    using R = qvsWapVendorConfig;
-    static constexpr Owned<R> kFields[] = {&R::pszName};
-    // kept[tree-vendorconfig-left]: name and value of the parameter stay allocated.
-    return releaseLeaf(record, kFields, leave(&R::pszParamName, &R::pszParamValue));
+    return releaseRecord(record, vendorConfig::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteClientIdentity(qvsWapClientIdentity *record)
 {
-    static constexpr Owned<qvsWapClientIdentity> kFields[] = {&qvsWapClientIdentity::pszClientId};
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, clientIdentity::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteAccess(qvsWapAccess *record)
 {
-    using R = qvsWapAccess;
-    static constexpr Owned<R> kFields[] = {
-        &R::ptRuleList,   &R::ptAppIdList,   &R::ptPortNbrList,
-        &R::ptDomainList, &R::ptToNapIdList, &R::ptToProxyList,
-    };
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, access::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteWifi(qvsWapWifi *record)
 {
-    using R = qvsWapWifi;
-    static constexpr Owned<R> kFields[] = {
-        &R::pszNetSsid,  &R::pszSecMode,      &R::pszEapMethod,     &R::pszEapType,
-        &R::pszUserName, &R::pszAnonUserName, &R::pszPassword,      &R::pszCaCert,
-        &R::pszUserCert, &R::pszPhase1,       &R::pszAuthAlgorithm, &R::pszPriority,
-    };
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, wifi::kRelease);
 }
 
 qvsResult qvsClientProvWbxmlDeleteVoWifi(qvsWapVoWifi *record)
 {
-    static constexpr Owned<qvsWapVoWifi> kFields[] = {&qvsWapVoWifi::pszEpdgFqdn};
-    return releaseLeaf(record, kFields);
+    return releaseRecord(record, voWifi::kRelease);
 }

@@ -2,6 +2,7 @@
 // and the walk through elements of any depth in constant stack.
 // Elements and types are those of the OMA Client Provisioning content.
 #include "qvsClientProvWbxmlDecoder.h"
+#include "qvsParm.h"
 #include "qvsText.h"
 #include "qvsTokens.h"
 #include "qvstrace.h"
@@ -18,121 +19,137 @@ using Node = qvsWapCharacter;
 
 enum Pages : uint8_t { kPage0, kPage1, kBothPages };
 
-// One kind of characteristic: the TYPE that names it, who reads its parameters, what may nest in
-// it.
+// One kind of characteristic: the TYPE that names it, the record it makes and where a node keeps
+// it, its parameters, and what may nest in it.
 struct Kind {
     uint8_t token;
     Pages pages;
-    const char *name; // of a TYPE given as text
-    qvsResult (*create)(Node *node);
-    qvsResult (*readParm)(qvsWbxmlDecoder *decoder, Node *node);
-    qvsList **(*children)(Node *node); // null where nothing may nest; answers null without a record
-    const char *refusal;               // traced when something does
-    const char *created;               // traced before the record is made
+    uint8_t slot;      // of a node
+    uint8_t fields;    // of the record
+    uint8_t childList; // of the record; kNoField where nothing may nest
+    const ParmTable *parms;
+    const char *name;    // of a TYPE given as text
+    const char *refusal; // traced when something nests where nothing may
+    const char *created; // traced before the record is made
+};
+
+struct Wording {
+    const char *name = nullptr;
+    const char *refusal = nullptr;
+    const char *created = nullptr;
 };
 
 template <class Record>
-qvsResult createIn(Record **slot)
+consteval Kind kindOf(uint8_t token, Pages pages, Record *Node::*, RecordField slot,
+                      const ParmTable &parms, Wording wording = {})
 {
-    auto *record = newRecord<Record>(kModule);
-    if (!record) {
-        return QVS_ERROR_FAILED;
-    }
-    if (*slot) {
-        // kept[slot-replaced]: the record that was there stays allocated.
-        trace("qvsClientProvWbxmlDecoderCharacterAttribute : ERROR!!!");
-    }
-    *slot = record;
-    return QVS_OK;
+    return {token,  pages,        slot.number,     kFieldsOf<Record>, kChildListOf<Record>,
+            &parms, wording.name, wording.refusal, wording.created};
 }
 
-template <auto Slot>
-qvsResult create(Node *node)
-{
-    return createIn(&(node->*Slot));
-}
-
-template <auto Slot, auto Decode>
-qvsResult readParm(qvsWbxmlDecoder *decoder, Node *node)
-{
-    return Decode(decoder, node->*Slot);
-}
-
-template <auto Slot, auto List>
-qvsList **children(Node *node)
-{
-    return node->*Slot ? &(node->*Slot->*List) : nullptr;
-}
+#define QVS_SLOT(name) &Node::name, QVS_FIELD(Node, name)
 
 // kept[refusal-wording]: the refusals name other types than their parents.
 constexpr Kind kKinds[] = {
-    {attr::kType, kBothPages, "ROAMING", create<&Node::ptRoaming>,
-     readParm<&Node::ptRoaming, qvsClientProvWbxmlDecoderParamRoaming>, nullptr, nullptr,
-     "------------------NEW-------------------!!"},
-    {attr::kType, kBothPages, "WI-FI", create<&Node::ptWifi>,
-     readParm<&Node::ptWifi, qvsClientProvWbxmlDecoderParamWifi>, nullptr, nullptr,
-     "------------WIFI------------------!!"},
-    {attr::kType, kBothPages, "Vodafone VoWiFi", create<&Node::ptVoWifi>,
-     readParm<&Node::ptVoWifi, qvsClientProvWbxmlDecoderParamVoWifi>, nullptr, nullptr,
-     "------------WIFI------------------!!"},
-    {attr::kTypePxLogical, kBothPages, nullptr, create<&Node::ptPxLogical>,
-     readParm<&Node::ptPxLogical, qvsClientProvWbxmlDecoderParamPxlogical>,
-     children<&Node::ptPxLogical, &qvsWapPxLogical::ptCharacterList>, nullptr, nullptr},
-    {attr::kTypePxPhysical, kBothPages, nullptr, create<&Node::ptPxPhysical>,
-     readParm<&Node::ptPxPhysical, qvsClientProvWbxmlDecoderParamPxPhysical>,
-     children<&Node::ptPxPhysical, &qvsWapPxPhysical::ptCharacterList>, nullptr, nullptr},
-    {attr::kTypePort, kBothPages, nullptr, create<&Node::ptPort>,
-     readParm<&Node::ptPort, qvsClientProvWbxmlDecoderParamPort>, nullptr,
-     "BOOTSTRAP is Not Support Chiled PORT.", nullptr},
-    {attr::kTypeValidity, kBothPages, nullptr, create<&Node::ptValidity>,
-     readParm<&Node::ptValidity, qvsClientProvWbxmlDecoderParamValidity>, nullptr,
-     "BOOTSTRAP is Not Support Chiled PORT.", nullptr},
-    {attr::kTypeNapDef, kPage0, nullptr, create<&Node::ptNapDef>,
-     readParm<&Node::ptNapDef, qvsClientProvWbxmlDecoderParamNapDef>,
-     children<&Node::ptNapDef, &qvsWapNapDef::ptCharacterList>, nullptr, nullptr},
-    {attr::kTypeApplication, kPage1, nullptr, create<&Node::ptApplication>,
-     readParm<&Node::ptApplication, qvsClientProvWbxmlDecoderParamApplication>,
-     children<&Node::ptApplication, &qvsWapApplication::ptCharacterList>, nullptr, nullptr},
-    {attr::kTypeBootstrap, kPage0, nullptr, create<&Node::ptBootstrap>,
-     readParm<&Node::ptBootstrap, qvsClientProvWbxmlDecoderParamBootstrap>, nullptr,
-     "BOOTSTRAP is Not Support Chiled CHARACTER.", nullptr},
-    {attr::kTypeAppAddr, kPage1, nullptr, create<&Node::ptAppAddr>,
-     readParm<&Node::ptAppAddr, qvsClientProvWbxmlDecoderParamAppAddr>,
-     children<&Node::ptAppAddr, &qvsWapAppAddr::ptCharacterList>, nullptr, nullptr},
-    {attr::kTypeVendorConfig, kPage0, nullptr, create<&Node::ptVendorConfig>,
-     readParm<&Node::ptVendorConfig, qvsClientProvWbxmlDecoderParamVendorConfig>, nullptr,
-     "VENDORCONFIG is Not Support Chiled CHARACTER.", nullptr},
-    {attr::kTypeAppAuth, kPage1, nullptr, create<&Node::ptAppAuth>,
-     readParm<&Node::ptAppAuth, qvsClientProvWbxmlDecoderParamAppAuth>, nullptr,
-     "APPAUTH is Not Support Chiled CHARACTER.", nullptr},
-    {attr::kTypeClientIdentity, kBothPages, nullptr, create<&Node::ptClientIdentity>,
-     readParm<&Node::ptClientIdentity, qvsClientProvWbxmlDecoderParamClientIdentity>, nullptr,
-     "BOOTSTRAP is Not Support Chiled CLIENTIDENTITY.", nullptr},
-    {attr::kTypePxAuthInfo, kPage0, nullptr, create<&Node::ptPxAuthInfo>,
-     readParm<&Node::ptPxAuthInfo, qvsClientProvWbxmlDecoderParamPxAuthInfo>, nullptr,
-     "RESOURCE is Not Support Chiled CHARACTER.", nullptr},
-    {attr::kTypeResource, kPage1, nullptr, create<&Node::ptResource>,
-     readParm<&Node::ptResource, qvsClientProvWbxmlDecoderParamResource>, nullptr,
-     "RESOURCE is Not Support Chiled CHARACTER.", nullptr},
-    {attr::kTypeNapAuthInfo, kBothPages, nullptr, create<&Node::ptNapAuthInfo>,
-     readParm<&Node::ptNapAuthInfo, qvsClientProvWbxmlDecoderParamNapAuthInfo>, nullptr,
-     "BOOTSTRAP is Not Support Chiled PORT.", nullptr},
-    {attr::kTypeAccess, kBothPages, nullptr, create<&Node::ptAccess>,
-     readParm<&Node::ptAccess, qvsClientProvWbxmlDecoderParamAccess>, nullptr,
-     "BOOTSTRAP is Not Support Chiled ACCESS.", nullptr},
+    kindOf(attr::kType, kBothPages, QVS_SLOT(ptRoaming), kRoamingParms,
+           {.name = "ROAMING", .created = "------------------NEW-------------------!!"}),
+    kindOf(attr::kType, kBothPages, QVS_SLOT(ptWifi), kWifiParms,
+           {.name = "WI-FI", .created = "------------WIFI------------------!!"}),
+    kindOf(attr::kType, kBothPages, QVS_SLOT(ptVoWifi), kVoWifiParms,
+           {.name = "Vodafone VoWiFi", .created = "------------WIFI------------------!!"}),
+    kindOf(attr::kTypePxLogical, kBothPages, QVS_SLOT(ptPxLogical), kPxLogicalParms),
+    kindOf(attr::kTypePxPhysical, kBothPages, QVS_SLOT(ptPxPhysical), kPxPhysicalParms),
+    kindOf(attr::kTypePort, kBothPages, QVS_SLOT(ptPort), kPortParms,
+           {.refusal = "BOOTSTRAP is Not Support Chiled PORT."}),
+    kindOf(attr::kTypeValidity, kBothPages, QVS_SLOT(ptValidity), kValidityParms,
+           {.refusal = "BOOTSTRAP is Not Support Chiled PORT."}),
+    kindOf(attr::kTypeNapDef, kPage0, QVS_SLOT(ptNapDef), kNapDefParms),
+    kindOf(attr::kTypeApplication, kPage1, QVS_SLOT(ptApplication), kApplicationParms),
+    kindOf(attr::kTypeBootstrap, kPage0, QVS_SLOT(ptBootstrap), kBootstrapParms,
+           {.refusal = "BOOTSTRAP is Not Support Chiled CHARACTER."}),
+    kindOf(attr::kTypeAppAddr, kPage1, QVS_SLOT(ptAppAddr), kAppAddrParms),
+    kindOf(attr::kTypeVendorConfig, kPage0, QVS_SLOT(ptVendorConfig), kVendorConfigParms,
+           {.refusal = "VENDORCONFIG is Not Support Chiled CHARACTER."}),
+    kindOf(attr::kTypeAppAuth, kPage1, QVS_SLOT(ptAppAuth), kAppAuthParms,
+           {.refusal = "APPAUTH is Not Support Chiled CHARACTER."}),
+    kindOf(attr::kTypeClientIdentity, kBothPages, QVS_SLOT(ptClientIdentity), kClientIdentityParms,
+           {.refusal = "BOOTSTRAP is Not Support Chiled CLIENTIDENTITY."}),
+    kindOf(attr::kTypePxAuthInfo, kPage0, QVS_SLOT(ptPxAuthInfo), kPxAuthInfoParms,
+           {.refusal = "RESOURCE is Not Support Chiled CHARACTER."}),
+    kindOf(attr::kTypeResource, kPage1, QVS_SLOT(ptResource), kResourceParms,
+           {.refusal = "RESOURCE is Not Support Chiled CHARACTER."}),
+    kindOf(attr::kTypeNapAuthInfo, kBothPages, QVS_SLOT(ptNapAuthInfo), kNapAuthInfoParms,
+           {.refusal = "BOOTSTRAP is Not Support Chiled PORT."}),
+    kindOf(attr::kTypeAccess, kBothPages, QVS_SLOT(ptAccess), kAccessParms,
+           {.refusal = "BOOTSTRAP is Not Support Chiled ACCESS."}),
 };
 
-// The kind of a TYPE token on a code page, and of a TYPE given as `name`; null for none.
-const Kind *findKind(uint8_t token, uint8_t page, const char *name)
+// The rows of kKinds by TYPE token and code page, counted from 1; 0 for none.
+struct KindRows {
+    uint8_t of[2][attr::kTypeAccess - attr::kType + 1];
+};
+
+consteval KindRows rowsByToken()
 {
-    const Pages own = page == 0 ? kPage0 : kPage1;
+    KindRows rows = {};
+    for (uint8_t row = 1; row <= sizeof kKinds / sizeof *kKinds; ++row) {
+        const Kind &kind = kKinds[row - 1];
+        for (uint8_t page = 0; page < 2; ++page) {
+            if (kind.pages == kBothPages || kind.pages == page) {
+                rows.of[page][kind.token - attr::kType] = row;
+            }
+        }
+    }
+    return rows;
+}
+
+constexpr KindRows kRows = rowsByToken();
+
+// The kind that a TYPE given as `name` has; null for none.
+const Kind *findNamedKind(const char *name)
+{
     for (const Kind &kind : kKinds) {
-        if (kind.token == token && (kind.pages == own || kind.pages == kBothPages) &&
-            (!kind.name || (name && qvsStrcmp(name, kind.name) == 0))) {
+        if (kind.name && name && qvsStrcmp(name, kind.name) == 0) {
             return &kind;
         }
     }
     return nullptr;
+}
+
+// The kind of a TYPE token on a code page, and of a TYPE given as `name`; null for none.
+const Kind *findKind(uint8_t token, uint8_t page, const char *name)
+{
+    if (token == attr::kType) {
+        return findNamedKind(name);
+    }
+    if (token < attr::kType || token > attr::kTypeAccess) {
+        return nullptr;
+    }
+    const uint8_t row = kRows.of[page == 0 ? 0 : 1][token - attr::kType];
+    return row ? &kKinds[row - 1] : nullptr;
+}
+
+// Makes the record of a kind in its slot.
+qvsResult create(Node *node, const Kind &kind)
+{
+    constexpr uint32_t kFieldSize = sizeof(void *);
+    void *record = qvsMemAllocSetZero_debug(kind.fields * kFieldSize, kModule, __LINE__);
+    if (!record) {
+        return QVS_ERROR_FAILED;
+    }
+    if (pointerAt(node, kind.slot)) {
+        // kept[slot-replaced]: the record that was there stays allocated.
+        trace("qvsClientProvWbxmlDecoderCharacterAttribute : ERROR!!!");
+    }
+    setPointer(node, kind.slot, record);
+    return QVS_OK;
+}
+
+// The list of what nests in the record of a kind; null without the record.
+qvsList **childrenOf(Node *node, const Kind &kind)
+{
+    void *record = pointerAt(node, kind.slot);
+    return record ? listAt(record, kind.childList) : nullptr;
 }
 
 // ---- Attributes of a characteristic
@@ -157,7 +174,7 @@ qvsResult readNamedType(qvsWbxmlDecoder *decoder, Node *node, ScopedText *name)
     name->text = read.take();
     if (const Kind *kind = findKind(attr::kType, decoder->nCodePage, name->text)) {
         trace("%s", kind->created);
-        if (qvsResult failure = kind->create(node)) {
+        if (qvsResult failure = create(node, *kind)) {
             return failure;
         }
     }
@@ -171,7 +188,7 @@ qvsResult readType(qvsWbxmlDecoder *decoder, Node *node, uint8_t token)
     if (!kind) {
         return refuseAttribute(token);
     }
-    if (qvsResult result = kind->create(node)) {
+    if (qvsResult result = create(node, *kind)) {
         return result;
     }
     return qvsClientProvWbxmlDecoderReadAttr(decoder, &token);
@@ -236,7 +253,8 @@ qvsResult readParmElement(qvsWbxmlDecoder *decoder, Open *open)
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
     decoder->ptJoined = &open->joined;
-    const qvsResult result = open->kind->readParm(decoder, &open->node);
+    const qvsResult result =
+        readParms(decoder, pointerAt(&open->node, open->kind->slot), *open->kind->parms);
     decoder->ptJoined = nullptr;
     return result;
 }
@@ -244,13 +262,13 @@ qvsResult readParmElement(qvsWbxmlDecoder *decoder, Open *open)
 // Whether a characteristic may nest in an open one.
 qvsResult acceptChild(Open *open)
 {
-    if (!open->kind || !open->kind->children) {
+    if (!open->kind || open->kind->childList == kNoField) {
         if (open->kind && open->kind->refusal) {
             trace("%s", open->kind->refusal);
         }
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
-    return open->kind->children(&open->node) ? QVS_OK : QVS_ERROR_BAD_ARGUMENT;
+    return childrenOf(&open->node, *open->kind) ? QVS_OK : QVS_ERROR_BAD_ARGUMENT;
 }
 
 // A SWITCH_PAGE between elements.
@@ -367,7 +385,7 @@ qvsResult readSubtree(qvsWbxmlDecoder *decoder, Open **innermost, Node **root)
             *root = complete;
             return QVS_OK;
         }
-        qvsList **siblings = (*innermost)->kind->children(&(*innermost)->node);
+        qvsList **siblings = childrenOf(&(*innermost)->node, *(*innermost)->kind);
         if (qvsResult result = addSibling(siblings, complete)) {
             return result;
         }

@@ -14,63 +14,153 @@ void traceToken(uint8_t token)
     }
 }
 
-qvsResult readAppNamed(qvsWbxmlDecoder *decoder, qvsWapApplication *record)
+qvsResult readAppNamed(qvsWbxmlDecoder *decoder, void *record)
 {
-    return qvsClientProvWbxmlDecoderParamAppNameString(decoder, &record, attr::kName);
+    auto *application = static_cast<qvsWapApplication *>(record);
+    return qvsClientProvWbxmlDecoderParamAppNameString(decoder, &application, attr::kName);
 }
 
 // The comma token where a name is expected: one more value of AAUTHTYPE.
-qvsResult readComma(qvsWbxmlDecoder *decoder, qvsWapAppAuth *record)
+qvsResult readComma(qvsWbxmlDecoder *decoder, void *record)
 {
-    const qvsResult result = qvsCommaAdd(decoder, &record->pszAAuthType);
-    trace("--------------------------[%s]", record->pszAAuthType ? record->pszAAuthType : "");
+    char **types = &static_cast<qvsWapAppAuth *>(record)->pszAAuthType;
+    const qvsResult result = qvsCommaAdd(decoder, types);
+    trace("--------------------------[%s]", *types ? *types : "");
     return result;
 }
 
 // kept[resource-startpage]: a STARTPAGE that leaves the field without a value stores "startpage".
-qvsResult readStartPage(qvsWbxmlDecoder *decoder, qvsWapResource *record)
+qvsResult readStartPage(qvsWbxmlDecoder *decoder, void *record)
 {
-    if (qvsResult result = qvsClientProvWbxmlDecoderParamString(decoder, &record->pszStartPage,
-                                                                page1::kStartPage)) {
+    char **page = &static_cast<qvsWapResource *>(record)->pszStartPage;
+    if (qvsResult result = qvsClientProvWbxmlDecoderParamString(decoder, page, page1::kStartPage)) {
         return result;
     }
-    if (!record->pszStartPage) {
-        record->pszStartPage = qvsStrdup_debug("startpage", kModule, __LINE__);
+    if (!*page) {
+        *page = qvsStrdup_debug("startpage", kModule, __LINE__);
     }
     return QVS_OK;
 }
 
+namespace application {
+using R = qvsWapApplication;
+constexpr Parm kParms[] = {
+    {attr::kName, kByReader, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME"},
+    {page1::kName, QVS_FIELD(R, pszName), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_NAME"},
+    {page1::kInternet, QVS_FIELD(R, pszInternet), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_INTERNET"},
+    {page1::kToNapId, QVS_FIELD(R, ptToNapIdList), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_TO_NAPID"},
+    {page1::kAAccept, QVS_FIELD(R, pszAAccept), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AACCEPT"},
+    {page1::kAddr, QVS_FIELD(R, ptAddrList), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_ADDR"},
+    {page1::kAppId, QVS_FIELD(R, pszAppId), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_APPID"},
+    {page1::kAProtocol, QVS_FIELD(R, pszAProtocol),
+     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_APROTOCOL"},
+    {page1::kProviderId, QVS_FIELD(R, pszProviderId),
+     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_PROVIDER_ID"},
+    {page1::kToProxy, QVS_FIELD(R, ptToProxyList), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_TO_PROXY"},
+};
+
+// Parameters whose name is given as text.
+constexpr NamedParm kNamed[] = {
+    {"XCAP_AUID_DCS", QVS_FIELD(R, pszXcapAuidDcs)},
+    {"XCAP_AUID_PMS", QVS_FIELD(R, pszXcapAuidPms)},
+    {"XCAP_AUID_CDMS", QVS_FIELD(R, pszXcapAuidCdms)},
+    {"XCAP_IMEI_HEADER", QVS_FIELD(R, pszXcapImeiHeader)},
+    {"XCAP_TID_HEADER", QVS_FIELD(R, pszXcapTidHeader)},
+    {"FROM", QVS_FIELD(R, pszFrom)},
+};
+} // namespace application
+
+namespace appAddr {
+using R = qvsWapAppAddr;
+constexpr Parm kParms[] = {
+    {page1::kAddr, QVS_FIELD(R, pszAddr)},
+    {page1::kAddrType, QVS_FIELD(R, pszAddrType)},
+};
+} // namespace appAddr
+
+namespace appAuth {
+using R = qvsWapAppAuth;
+constexpr Parm kParms[] = {
+    {page1::kAAuthData, QVS_FIELD(R, pszAAuthData)},
+    {page1::kAAuthLevel, QVS_FIELD(R, pszAAuthLevel)},
+    {page1::kAAuthName, QVS_FIELD(R, pszAAuthName)},
+    {page1::kAAuthSecret, QVS_FIELD(R, pszAAuthSecret)},
+    {page1::kAAuthType, QVS_FIELD(R, pszAAuthType)},
+    {kCommaToken, kByReader},
+};
+} // namespace appAuth
+
+namespace resource {
+using R = qvsWapResource;
+constexpr Parm kParms[] = {
+    {page1::kName, QVS_FIELD(R, pszName), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_NAME"},
+    {page1::kStartPage, kByReader, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_STARTPAGE"},
+    {page1::kAAccept, QVS_FIELD(R, pszAAccept), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AACCEPT"},
+    {page1::kAAuthData, QVS_FIELD(R, pszAAuthData),
+     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHDATA"},
+    {page1::kAAuthName, QVS_FIELD(R, pszAAuthName),
+     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHNAME"},
+    {page1::kAAuthSecret, QVS_FIELD(R, pszAAuthSecret),
+     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHSECRET"},
+    {page1::kAAuthType, QVS_FIELD(R, pszAAuthType),
+     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHTYPE"},
+    {page1::kUri, QVS_FIELD(R, pszUri), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_URI"},
+};
+} // namespace resource
+
 } // namespace
+
+constexpr ParmTable qvs::kApplicationParms = {
+    .name = "qvsClientProvWbxmlDecoderParamApplication",
+    .rows = application::kParms,
+    .reader = readAppNamed,
+    .onToken = traceToken,
+};
+
+constexpr ParmTable qvs::kAppAddrParms = {
+    .name = "qvsClientProvWbxmlDecoderParamAppAddr",
+    .rows = appAddr::kParms,
+};
+
+constexpr ParmTable qvs::kAppAuthParms = {
+    .name = "qvsClientProvWbxmlDecoderParamAppAuth",
+    .rows = appAuth::kParms,
+    .reader = readComma,
+    .freshTokenAfterSwitch = true,
+};
+
+constexpr ParmTable qvs::kResourceParms = {
+    .name = "qvsClientProvWbxmlDecoderParamResource",
+    .rows = resource::kParms,
+    .reader = readStartPage,
+    .freshTokenAfterSwitch = true,
+};
 
 qvsResult qvsClientProvWbxmlDecoderParamApplication(qvsWbxmlDecoder *decoder,
                                                     qvsWapApplication *record)
 {
-    using R = qvsWapApplication;
-    static constexpr Parm<R> kParms[] = {
-        {attr::kName, readAppNamed, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME"},
-        {page1::kName, &R::pszName, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_NAME"},
-        {page1::kInternet, &R::pszInternet, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_INTERNET"},
-        {page1::kToNapId, &R::ptToNapIdList, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_TO_NAPID"},
-        {page1::kAAccept, &R::pszAAccept, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AACCEPT"},
-        {page1::kAddr, &R::ptAddrList, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_ADDR"},
-        {page1::kAppId, &R::pszAppId, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_APPID"},
-        {page1::kAProtocol, &R::pszAProtocol, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_APROTOCOL"},
-        {page1::kProviderId, &R::pszProviderId, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_PROVIDER_ID"},
-        {page1::kToProxy, &R::ptToProxyList, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_TO_PROXY"},
-    };
-    return readParms(decoder, record, kParms, {.name = __func__, .onToken = traceToken});
+    return readParms(decoder, record, kApplicationParms);
+}
+
+qvsResult qvsClientProvWbxmlDecoderParamAppAddr(qvsWbxmlDecoder *decoder, qvsWapAppAddr *record)
+{
+    return readParms(decoder, record, kAppAddrParms);
+}
+
+qvsResult qvsClientProvWbxmlDecoderParamAppAuth(qvsWbxmlDecoder *decoder, qvsWapAppAuth *record)
+{
+    return readParms(decoder, record, kAppAuthParms);
+}
+
+qvsResult qvsClientProvWbxmlDecoderParamResource(qvsWbxmlDecoder *decoder, qvsWapResource *record)
+{
+    return readParms(decoder, record, kResourceParms);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamAppNameString(qvsWbxmlDecoder *decoder,
                                                       qvsWapApplication **record, uint8_t tag)
 {
-    using R = qvsWapApplication;
     static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamNameString";
-    static constexpr NamedParm<R> kNames[] = {
-        {"XCAP_AUID_DCS", &R::pszXcapAuidDcs},     {"XCAP_AUID_PMS", &R::pszXcapAuidPms},
-        {"XCAP_AUID_CDMS", &R::pszXcapAuidCdms},   {"XCAP_IMEI_HEADER", &R::pszXcapImeiHeader},
-        {"XCAP_TID_HEADER", &R::pszXcapTidHeader}, {"FROM", &R::pszFrom},
-    };
     ParmName name;
     if (qvsResult result = readParmName(decoder, tag, kLabel, false, &name)) {
         return result;
@@ -78,7 +168,7 @@ qvsResult qvsClientProvWbxmlDecoderParamAppNameString(qvsWbxmlDecoder *decoder,
     if (name.next != attr::kValue) {
         return QVS_OK;
     }
-    if (char **field = findNamed(*record, kNames, name.text.data)) {
+    if (char **field = findNamed(*record, application::kNamed, name.text.data)) {
         return readParmValue(decoder, field);
     }
     Text dropped;
@@ -87,42 +177,4 @@ qvsResult qvsClientProvWbxmlDecoderParamAppNameString(qvsWbxmlDecoder *decoder,
         trace("[%s] pszValue [%s]", kLabel, dropped.data ? dropped.data : "");
     }
     return result;
-}
-
-qvsResult qvsClientProvWbxmlDecoderParamAppAddr(qvsWbxmlDecoder *decoder, qvsWapAppAddr *record)
-{
-    using R = qvsWapAppAddr;
-    static constexpr Parm<R> kParms[] = {
-        {page1::kAddr, &R::pszAddr},
-        {page1::kAddrType, &R::pszAddrType},
-    };
-    return readParms(decoder, record, kParms, {__func__});
-}
-
-qvsResult qvsClientProvWbxmlDecoderParamAppAuth(qvsWbxmlDecoder *decoder, qvsWapAppAuth *record)
-{
-    using R = qvsWapAppAuth;
-    static constexpr Parm<R> kParms[] = {
-        {page1::kAAuthData, &R::pszAAuthData}, {page1::kAAuthLevel, &R::pszAAuthLevel},
-        {page1::kAAuthName, &R::pszAAuthName}, {page1::kAAuthSecret, &R::pszAAuthSecret},
-        {page1::kAAuthType, &R::pszAAuthType}, {kCommaToken, readComma},
-    };
-    return readParms(decoder, record, kParms, {.name = __func__, .freshTokenAfterSwitch = true});
-}
-
-qvsResult qvsClientProvWbxmlDecoderParamResource(qvsWbxmlDecoder *decoder, qvsWapResource *record)
-{
-    using R = qvsWapResource;
-    static constexpr Parm<R> kParms[] = {
-        {page1::kName, &R::pszName, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_NAME"},
-        {page1::kStartPage, readStartPage, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_STARTPAGE"},
-        {page1::kAAccept, &R::pszAAccept, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AACCEPT"},
-        {page1::kAAuthData, &R::pszAAuthData, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHDATA"},
-        {page1::kAAuthName, &R::pszAAuthName, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHNAME"},
-        {page1::kAAuthSecret, &R::pszAAuthSecret,
-         "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHSECRET"},
-        {page1::kAAuthType, &R::pszAAuthType, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHTYPE"},
-        {page1::kUri, &R::pszUri, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_URI"},
-    };
-    return readParms(decoder, record, kParms, {.name = __func__, .freshTokenAfterSwitch = true});
 }

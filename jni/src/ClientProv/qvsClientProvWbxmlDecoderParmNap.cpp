@@ -8,52 +8,103 @@ namespace {
 // What pszInit points at: never allocated, never released.
 char kInit[] = "empty";
 
-qvsResult readNapNamed(qvsWbxmlDecoder *decoder, qvsWapNapDef *record)
+qvsResult readNapNamed(qvsWbxmlDecoder *decoder, void *record)
 {
-    return qvsClientProvWbxmlDecoderParamNapNameString(decoder, &record, attr::kName);
+    auto *napDef = static_cast<qvsWapNapDef *>(record);
+    return qvsClientProvWbxmlDecoderParamNapNameString(decoder, &napDef, attr::kName);
 }
+
+namespace napDef {
+using R = qvsWapNapDef;
+constexpr Parm kParms[] = {
+    {attr::kName, kByReader},
+    {page0::kName, QVS_FIELD(R, pszName)},
+    {page0::kNapAddress, QVS_FIELD(R, pszNapAddress)},
+    {page0::kNapAddrType, QVS_FIELD(R, pszNapAddrType)},
+    {page0::kCallType, QVS_FIELD(R, pszCallType)},
+    {page0::kLinger, QVS_FIELD(R, pszLinger)},
+    {page0::kBearer, QVS_FIELD(R, ptBearerList)},
+    {page0::kNapId, QVS_FIELD(R, pszNapId)},
+    {page0::kInternet, QVS_FIELD(R, pszInternet)},
+    {page0::kLinkSpeed, QVS_FIELD(R, pszLinkSpeed)},
+    {page0::kDnLinkSpeed, QVS_FIELD(R, pszDnLinkSpeed)},
+    {page0::kLocalAddr, QVS_FIELD(R, pszLocalAddr)},
+    {page0::kLocalAddrType, QVS_FIELD(R, pszLocalAddrType)},
+    {page0::kDeliveryErrSdu, QVS_FIELD(R, pszDeliveryErrSdu)},
+    {page0::kDeliveryOrder, QVS_FIELD(R, pszDeliveryOrder)},
+    {page0::kTrafficClass, QVS_FIELD(R, pszTrafficClass)},
+    {page0::kMaxSduSize, QVS_FIELD(R, pszMaxSduSize)},
+    {page0::kMaxBitrateUplink, QVS_FIELD(R, pszMaxBitrateUplink)},
+    {page0::kMaxBitrateDnlink, QVS_FIELD(R, pszMaxBitrateDnlink)},
+    {page0::kDnsAddr, QVS_FIELD(R, ptDnsAddrList)},
+    {page0::kMaxNumRetry, QVS_FIELD(R, pszMaxNumRetry)},
+    {page0::kFirstRetryTimeout, QVS_FIELD(R, pszFirstRetryTimeout)},
+    {page0::kReregThreshold, QVS_FIELD(R, pszReregThreshold)},
+    {page0::kTBit, QVS_FIELD(R, pszTBit)},
+};
+
+void traceRefused(uint8_t token)
+{
+    trace("qvsClientProvWbxmlDecoderParamNapDef : Tag Code [%d] = "
+          "QVS_ERROR_WBXML_UNKNOWN_ELEMENT\n",
+          token);
+}
+} // namespace napDef
+
+namespace napAuthInfo {
+using R = qvsWapNapAuthInfo;
+constexpr Parm kParms[] = {
+    {page0::kAuthType, QVS_FIELD(R, pszAuthType)},
+    {page0::kAuthName, QVS_FIELD(R, pszAuthName)},
+    {page0::kAuthSecret, QVS_FIELD(R, pszAuthSecret)},
+    {page0::kAuthEntity, QVS_FIELD(R, ptAuthEntityList)},
+};
+} // namespace napAuthInfo
+
+namespace validity {
+using R = qvsWapValidity;
+constexpr Parm kParms[] = {
+    {page0::kValidUntil, QVS_FIELD(R, pszValidUntil)},
+    {page0::kCountry, QVS_FIELD(R, pszCountry)},
+    {page0::kNetwork, QVS_FIELD(R, pszNetwork)},
+    {page0::kSid, QVS_FIELD(R, pszSid)},
+    {page0::kSoc, QVS_FIELD(R, pszSoc)},
+};
+} // namespace validity
 
 } // namespace
 
+constexpr ParmTable qvs::kNapDefParms = {
+    .name = "qvsClientProvWbxmlDecoderParamNapDef",
+    .rows = napDef::kParms,
+    .reader = readNapNamed,
+    .onRefused = napDef::traceRefused,
+};
+
+constexpr ParmTable qvs::kNapAuthInfoParms = {
+    .name = "qvsClientProvWbxmlDecoderParamNapAuthInfo",
+    .rows = napAuthInfo::kParms,
+};
+
+constexpr ParmTable qvs::kValidityParms = {
+    .name = "qvsClientProvWbxmlDecoderParamValidity",
+    .rows = validity::kParms,
+};
+
 qvsResult qvsClientProvWbxmlDecoderParamNapDef(qvsWbxmlDecoder *decoder, qvsWapNapDef *record)
 {
-    using R = qvsWapNapDef;
-    static constexpr Parm<R> kParms[] = {
-        {attr::kName, readNapNamed},
-        {page0::kName, &R::pszName},
-        {page0::kNapAddress, &R::pszNapAddress},
-        {page0::kNapAddrType, &R::pszNapAddrType},
-        {page0::kCallType, &R::pszCallType},
-        {page0::kLinger, &R::pszLinger},
-        {page0::kBearer, &R::ptBearerList},
-        {page0::kNapId, &R::pszNapId},
-        {page0::kInternet, &R::pszInternet},
-        {page0::kLinkSpeed, &R::pszLinkSpeed},
-        {page0::kDnLinkSpeed, &R::pszDnLinkSpeed},
-        {page0::kLocalAddr, &R::pszLocalAddr},
-        {page0::kLocalAddrType, &R::pszLocalAddrType},
-        {page0::kDeliveryErrSdu, &R::pszDeliveryErrSdu},
-        {page0::kDeliveryOrder, &R::pszDeliveryOrder},
-        {page0::kTrafficClass, &R::pszTrafficClass},
-        {page0::kMaxSduSize, &R::pszMaxSduSize},
-        {page0::kMaxBitrateUplink, &R::pszMaxBitrateUplink},
-        {page0::kMaxBitrateDnlink, &R::pszMaxBitrateDnlink},
-        {page0::kDnsAddr, &R::ptDnsAddrList},
-        {page0::kMaxNumRetry, &R::pszMaxNumRetry},
-        {page0::kFirstRetryTimeout, &R::pszFirstRetryTimeout},
-        {page0::kReregThreshold, &R::pszReregThreshold},
-        {page0::kTBit, &R::pszTBit},
-    };
-    static constexpr ParmStyle kStyle = {
-        .name = "qvsClientProvWbxmlDecoderParamNapDef",
-        .onRefused =
-            [](uint8_t token) {
-                trace("qvsClientProvWbxmlDecoderParamNapDef : Tag Code [%d] = "
-                      "QVS_ERROR_WBXML_UNKNOWN_ELEMENT\n",
-                      token);
-            },
-    };
-    return readParms(decoder, record, kParms, kStyle);
+    return readParms(decoder, record, kNapDefParms);
+}
+
+qvsResult qvsClientProvWbxmlDecoderParamNapAuthInfo(qvsWbxmlDecoder *decoder,
+                                                    qvsWapNapAuthInfo *record)
+{
+    return readParms(decoder, record, kNapAuthInfoParms);
+}
+
+qvsResult qvsClientProvWbxmlDecoderParamValidity(qvsWbxmlDecoder *decoder, qvsWapValidity *record)
+{
+    return readParms(decoder, record, kValidityParms);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamNapNameString(qvsWbxmlDecoder *decoder,
@@ -75,30 +126,4 @@ qvsResult qvsClientProvWbxmlDecoderParamNapNameString(qvsWbxmlDecoder *decoder,
         return paramValue(decoder, &dropped);
     }
     return QVS_OK;
-}
-
-qvsResult qvsClientProvWbxmlDecoderParamNapAuthInfo(qvsWbxmlDecoder *decoder,
-                                                    qvsWapNapAuthInfo *record)
-{
-    using R = qvsWapNapAuthInfo;
-    static constexpr Parm<R> kParms[] = {
-        {page0::kAuthType, &R::pszAuthType},
-        {page0::kAuthName, &R::pszAuthName},
-        {page0::kAuthSecret, &R::pszAuthSecret},
-        {page0::kAuthEntity, &R::ptAuthEntityList},
-    };
-    return readParms(decoder, record, kParms, {__func__});
-}
-
-qvsResult qvsClientProvWbxmlDecoderParamValidity(qvsWbxmlDecoder *decoder, qvsWapValidity *record)
-{
-    using R = qvsWapValidity;
-    static constexpr Parm<R> kParms[] = {
-        {page0::kValidUntil, &R::pszValidUntil},
-        {page0::kCountry, &R::pszCountry},
-        {page0::kNetwork, &R::pszNetwork},
-        {page0::kSid, &R::pszSid},
-        {page0::kSoc, &R::pszSoc},
-    };
-    return readParms(decoder, record, kParms, {__func__});
 }

@@ -5,44 +5,92 @@ using namespace qvs;
 
 namespace {
 
-qvsResult readVendorNamed(qvsWbxmlDecoder *decoder, qvsWapVendorConfig *record)
+qvsResult readVendorNamed(qvsWbxmlDecoder *decoder, void *record)
 {
-    return qvsClientProvWbxmlDecoderParamVendorNameString(decoder, &record->pszParamName,
-                                                          &record->pszParamValue, attr::kName);
+    auto *vendor = static_cast<qvsWapVendorConfig *>(record);
+    return qvsClientProvWbxmlDecoderParamVendorNameString(decoder, &vendor->pszParamName,
+                                                          &vendor->pszParamValue, attr::kName);
 }
+
+namespace bootstrap {
+using R = qvsWapBootstrap;
+constexpr Parm kParms[] = {
+    {page0::kName, QVS_FIELD(R, pszName)},
+    {page0::kCountry, QVS_FIELD(R, pszCountry)},
+    {page0::kNetwork, QVS_FIELD(R, ptNetworkList)},
+    {page0::kProxyId, QVS_FIELD(R, ptProxyIdList)},
+    {page0::kProvUrl, QVS_FIELD(R, pszProvUrl)},
+    {page0::kContextAllow, QVS_FIELD(R, pszContextAllow)},
+};
+} // namespace bootstrap
+
+namespace clientIdentity {
+using R = qvsWapClientIdentity;
+constexpr Parm kParms[] = {
+    {page0::kClientId, QVS_FIELD(R, pszClientId)},
+};
+} // namespace clientIdentity
+
+namespace vendorConfig {
+using R = qvsWapVendorConfig;
+constexpr Parm kParms[] = {
+    {attr::kName, kByReader},
+    {page0::kName, QVS_FIELD(R, pszName)},
+};
+} // namespace vendorConfig
+
+namespace access {
+using R = qvsWapAccess;
+constexpr Parm kParms[] = {
+    {page0::kDomain, QVS_FIELD(R, ptDomainList)},   {page0::kToNapId, QVS_FIELD(R, ptToNapIdList)},
+    {page0::kPortNbr, QVS_FIELD(R, ptPortNbrList)}, {page1::kAppId, QVS_FIELD(R, ptAppIdList)},
+    {page1::kToProxy, QVS_FIELD(R, ptToProxyList)}, {page1::kRule, QVS_FIELD(R, ptRuleList)},
+};
+} // namespace access
 
 } // namespace
 
+constexpr ParmTable qvs::kBootstrapParms = {
+    .name = "qvsClientProvWbxmlDecoderParamBootstrap",
+    .rows = bootstrap::kParms,
+};
+
+constexpr ParmTable qvs::kClientIdentityParms = {
+    .name = "qvsClientProvWbxmlDecoderParamClientIdentity",
+    .rows = clientIdentity::kParms,
+};
+
+constexpr ParmTable qvs::kVendorConfigParms = {
+    .name = "qvsClientProvWbxmlDecoderParamVendorConfig",
+    .rows = vendorConfig::kParms,
+    .reader = readVendorNamed,
+};
+
+constexpr ParmTable qvs::kAccessParms = {
+    .name = "qvsClientProvWbxmlDecoderParamAccess",
+    .rows = access::kParms,
+};
+
 qvsResult qvsClientProvWbxmlDecoderParamBootstrap(qvsWbxmlDecoder *decoder, qvsWapBootstrap *record)
 {
-    using R = qvsWapBootstrap;
-    static constexpr Parm<R> kParms[] = {
-        {page0::kName, &R::pszName},          {page0::kCountry, &R::pszCountry},
-        {page0::kNetwork, &R::ptNetworkList}, {page0::kProxyId, &R::ptProxyIdList},
-        {page0::kProvUrl, &R::pszProvUrl},    {page0::kContextAllow, &R::pszContextAllow},
-    };
-    return readParms(decoder, record, kParms, {__func__});
+    return readParms(decoder, record, kBootstrapParms);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamClientIdentity(qvsWbxmlDecoder *decoder,
                                                        qvsWapClientIdentity *record)
 {
-    using R = qvsWapClientIdentity;
-    static constexpr Parm<R> kParms[] = {
-        {page0::kClientId, &R::pszClientId},
-    };
-    return readParms(decoder, record, kParms, {__func__});
+    return readParms(decoder, record, kClientIdentityParms);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamVendorConfig(qvsWbxmlDecoder *decoder,
                                                      qvsWapVendorConfig *record)
 {
-    using R = qvsWapVendorConfig;
-    static constexpr Parm<R> kParms[] = {
-        {attr::kName, readVendorNamed},
-        {page0::kName, &R::pszName},
-    };
-    return readParms(decoder, record, kParms, {__func__});
+    return readParms(decoder, record, kVendorConfigParms);
+}
+
+qvsResult qvsClientProvWbxmlDecoderParamAccess(qvsWbxmlDecoder *decoder, qvsWapAccess *record)
+{
+    return readParms(decoder, record, kAccessParms);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamVendorNameString(qvsWbxmlDecoder *decoder, char **name,
@@ -67,15 +115,4 @@ qvsResult qvsClientProvWbxmlDecoderParamVendorNameString(qvsWbxmlDecoder *decode
     // which stay allocated.
     *name = read.text.take();
     return QVS_OK;
-}
-
-qvsResult qvsClientProvWbxmlDecoderParamAccess(qvsWbxmlDecoder *decoder, qvsWapAccess *record)
-{
-    using R = qvsWapAccess;
-    static constexpr Parm<R> kParms[] = {
-        {page0::kDomain, &R::ptDomainList},   {page0::kToNapId, &R::ptToNapIdList},
-        {page0::kPortNbr, &R::ptPortNbrList}, {page1::kAppId, &R::ptAppIdList},
-        {page1::kToProxy, &R::ptToProxyList}, {page1::kRule, &R::ptRuleList},
-    };
-    return readParms(decoder, record, kParms, {__func__});
 }

@@ -23,6 +23,8 @@ static_assert(sizeof(void *) != 4 || kEntries * sizeof(Entry) == 32000);
 // four bytes behind the terminator.
 constexpr size_t kSpareZeros = 4;
 
+constexpr uint32_t kClearedByHand = 512;
+
 Entry *entries; // null while tracking is off
 
 // Free entries are those of the address null.
@@ -75,6 +77,12 @@ void *qvsMemAlloc_debug(uint32_t size, const char *file, int line)
 
 void *qvsMemAllocSetZero_debug(uint32_t size, const char *file, int line)
 {
+    // Small blocks come from a cache of the C library's that calloc passes by.
+    if (size <= kClearedByHand) {
+        void *block = malloc(size);
+        asm("" : "+r"(block)); // keeps a compiler from making a calloc of the two
+        return tracked(block ? memset(block, 0, size) : nullptr, size, file, line);
+    }
     return tracked(calloc(1, size), size, file, line);
 }
 
