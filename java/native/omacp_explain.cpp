@@ -1,6 +1,6 @@
-// What the command-line program asks of the decoder when a message is refused: the result code, and
-// how much of the body had been read by then. A library of its own, so that libomacp.so shows no
-// more to Java than its ten classes.
+// What com.qvomacp.eng.omacp asks of the decoder when a message is refused: the result code, and how
+// much of the body had been read by then. A library of its own, so that libomacp.so shows no more to
+// Java than its ten classes.
 #include "qvsClientProvWbxmlDecoder.h"
 
 #include <jni.h>
@@ -27,10 +27,10 @@ void decode(const uint8_t *body, uint32_t length, jint *answers)
 } // namespace
 
 // Answers {result code, bytes read} for a body; null with an exception pending.
-extern "C" QVS_API jintArray Java_com_qvomacp_cli_NativeDecoder_decode(JNIEnv *env, jclass,
+extern "C" QVS_API jintArray Java_com_qvomacp_eng_omacp_NativeDecoder_decode(JNIEnv *env, jclass,
                                                                        jbyteArray body);
 
-jintArray Java_com_qvomacp_cli_NativeDecoder_decode(JNIEnv *env, jclass, jbyteArray body)
+jintArray Java_com_qvomacp_eng_omacp_NativeDecoder_decode(JNIEnv *env, jclass, jbyteArray body)
 {
     jbyte *bytes = env->GetByteArrayElements(body, nullptr);
     if (!bytes) {

@@ -3,6 +3,7 @@ import com.qvomacp.eng.omacp.ProvisioningException;
 import com.qvomacp.eng.omacp.ProvisioningMessage;
 import java.nio.file.Files;
 import java.nio.file.Paths;
+import java.util.Arrays;
 
 /** A program that knows the jar and nothing else: {@code Show MESSAGE PIN}. */
 final class Show {
@@ -15,8 +16,14 @@ final class Show {
         for (AccessPoint accessPoint : message.getAccessPoints()) {
             System.out.println(accessPoint.getName() + ": " + accessPoint.getAddress());
         }
+        refuse(new byte[] {1, 7, 1, 0});
+        refuse(Arrays.copyOf(bytes, bytes.length / 2));
+    }
+
+    private static void refuse(byte[] bytes) {
         try {
-            ProvisioningMessage.parse(new byte[] {1, 7, 1, 0});
+            ProvisioningMessage.parse(bytes);
+            System.out.println("taken");
         } catch (ProvisioningException e) {
             System.out.println(e.getReason() + ": " + e.getMessage());
         }

@@ -34,7 +34,7 @@ final class Explanation {
     private final String remark;
 
     private Explanation(
-            Source source, Stop stop, int start, NativeDecoder.Verdict verdict, String remark) {
+            Source source, Stop stop, int start, Verdict verdict, String remark) {
         this.source = source;
         this.remark = remark;
         this.reason = stop.getMessage();
@@ -56,7 +56,7 @@ final class Explanation {
         if (annotation.body == null) {
             return new Explanation(source, unknown(0, 0, "body"), 0, null, null);
         }
-        NativeDecoder.Verdict verdict = NativeDecoder.verdict(annotation.bodyBytes());
+        Verdict verdict = Verdict.of(source.push());
         Stop stop = annotation.body.stop;
         String remark = null;
         if (verdict == null) {
@@ -68,17 +68,18 @@ final class Explanation {
             }
         } else if (stop == null && verdict.code == 0) {
             stop = new Stop(0, 0, 0, "the body holds no document", "wap-provisioningdoc (0x05)");
-        } else if (!agrees(stop, verdict)) {
-            stop = unknown(verdict.code, Math.min(verdict.read, annotation.body.length), "body");
+        } else if (!agrees(annotation.body, verdict)) {
+            stop = unknown(verdict.code, verdict.read, "body");
         }
         return new Explanation(source, stop, annotation.bodyAt(), verdict, remark);
     }
 
-    /** Whether the annotation stops as the decoder does. */
-    static boolean agrees(Stop stop, NativeDecoder.Verdict verdict) {
-        return stop == null
+    /** Whether the annotation of a body stops as the decoder does. */
+    static boolean agrees(Annotation.Section body, Verdict verdict) {
+        return body.stop == null
                 ? verdict.code == 0
-                : stop.code == verdict.code && stop.read == verdict.read;
+                : body.stop.code == verdict.code
+                        && Math.min(body.stop.read, body.length) == verdict.read;
     }
 
     private static Stop unknown(int code, int at, String part) {

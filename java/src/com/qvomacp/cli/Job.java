@@ -1,5 +1,6 @@
 package com.qvomacp.cli;
 
+import com.qvomacp.eng.omacp.NativeLibrary;
 import java.io.IOException;
 import java.io.PrintWriter;
 import java.nio.file.InvalidPathException;
@@ -77,14 +78,13 @@ abstract class Job implements Callable<Integer> {
             return;
         }
         try {
-            System.loadLibrary("omacp");
+            NativeLibrary.load();
             run(source);
         } catch (RefusedException refused) {
             raise(Main.REFUSED);
             refused(Explanation.of(source, refused.headerTaken));
         } catch (UnsatisfiedLinkError missing) {
-            String reason = "the library cannot be loaded: " + missing.getMessage();
-            fail(Main.FAILED, source.name, reason);
+            fail(Main.FAILED, source.name, missing.getMessage());
         }
     }
 

@@ -60,12 +60,14 @@ final class Source {
 
     /** The message as the library takes it. */
     byte[] push() {
-        if (isPush) {
-            return bytes;
-        }
-        byte[] push = new byte[BARE_HEADER.length + bytes.length];
+        return isPush ? bytes : push(bytes);
+    }
+
+    /** A body behind the least header that the library takes. */
+    static byte[] push(byte[] body) {
+        byte[] push = new byte[BARE_HEADER.length + body.length];
         System.arraycopy(BARE_HEADER, 0, push, 0, BARE_HEADER.length);
-        System.arraycopy(bytes, 0, push, BARE_HEADER.length, bytes.length);
+        System.arraycopy(body, 0, push, BARE_HEADER.length, body.length);
         return push;
     }
 

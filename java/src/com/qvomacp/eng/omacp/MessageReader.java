@@ -88,7 +88,8 @@ final class MessageReader {
                     return message(header());
                 }
                 if (parser.qvomacp_parser(message, message.length, HEADER_ONLY)) {
-                    throw Refusal.ofBody(header());
+                    PushHeader header = header();
+                    throw Refusal.ofBody(header, NativeDecoder.ask(header.getBody()));
                 }
                 throw Refusal.ofHeader(message);
             } finally {

@@ -8,12 +8,17 @@ import java.nio.file.Files;
 import java.nio.file.Path;
 import java.util.Locale;
 
-/** Loads the native library, once for all. */
-final class NativeLibrary {
+/**
+ * Loads the native library, once for all. {@link ProvisioningMessage} does so by itself; a program
+ * that calls the natives of {@link com.qvomacp.eng.parser} may have it done here.
+ */
+public final class NativeLibrary {
     private static final String NAME = "omacp";
+    private static final String EXPLANATIONS = "omacp_explain";
     private static final String FOLDER = "/com/qvomacp/eng/native/";
 
     private static boolean loaded;
+    private static boolean fromCopy;
 
     private NativeLibrary() {}
 
@@ -24,7 +29,7 @@ final class NativeLibrary {
      *
      * @throws UnsatisfiedLinkError without any of them; a later call tries again
      */
-    static void load() {
+    public static void load() {
         synchronized (MessageReader.LOCK) {
             if (loaded) {
                 return;
@@ -33,10 +38,29 @@ final class NativeLibrary {
                 try {
                     System.loadLibrary(NAME);
                 } catch (UnsatisfiedLinkError error) {
-                    Copy.load(error);
+                    Copy.load(NAME, error);
+                    fromCopy = true;
                 }
             }
             loaded = true;
+        }
+    }
+
+    /** Loads the library that asks the decoder, from where the other one is; false without it. */
+    static boolean loadExplanations() {
+        try {
+            System.loadLibrary(EXPLANATIONS);
+            return true;
+        } catch (UnsatisfiedLinkError error) {
+            if (!fromCopy) {
+                return false;
+            }
+            try {
+                Copy.load(EXPLANATIONS, error);
+                return true;
+            } catch (UnsatisfiedLinkError missing) {
+                return false;
+            }
         }
     }
 
@@ -50,9 +74,9 @@ final class NativeLibrary {
         }
     }
 
-    /** The resource with the library for an operating system and an architecture. */
-    static String resource(String system, String architecture) {
-        return FOLDER + platform(system) + '-' + machine(architecture) + "/libomacp.so";
+    /** The resource with a library for an operating system and an architecture. */
+    static String resource(String name, String system, String architecture) {
+        return FOLDER + platform(system) + '-' + machine(architecture) + "/lib" + name + ".so";
     }
 
     private static String platform(String system) {
@@ -80,14 +104,14 @@ final class NativeLibrary {
         private Copy() {}
 
         /** Loads the copy; without one, {@code first} is the cause of the error that says so. */
-        static void load(UnsatisfiedLinkError first) {
+        static void load(String name, UnsatisfiedLinkError first) {
             String resource =
-                    resource(System.getProperty("os.name"), System.getProperty("os.arch"));
+                    resource(name, System.getProperty("os.name"), System.getProperty("os.arch"));
             try (InputStream in = NativeLibrary.class.getResourceAsStream(resource)) {
                 if (in == null) {
                     throw error("there is no " + resource + " beside its classes", first, null);
                 }
-                Path file = Files.createTempFile("libomacp", ".so");
+                Path file = Files.createTempFile("lib" + name, ".so");
                 try {
                     fill(file, in);
                     System.load(file.toString());

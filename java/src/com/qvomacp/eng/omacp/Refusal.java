@@ -77,25 +77,46 @@ final class Refusal {
                 Reason.BAD_MAC, "the MAC of the push header does not end, or is too long");
     }
 
-    /** Says why the library refuses a body whose push header it has taken. */
-    static ProvisioningException ofBody(PushHeader header) {
+    /**
+     * Says why the library refuses a body whose push header it has taken.
+     *
+     * @param decoder the decoder's word on the body; null without it
+     */
+    static ProvisioningException ofBody(PushHeader header, NativeDecoder decoder) {
         String mediaType = header.getContentType().getMediaType();
         if (header.getBodyLength() == 0) {
-            return exception(
+            return new ProvisioningException(
                     Reason.EMPTY_BODY,
-                    "the message (%s) ends with its push header: it has no body",
-                    mediaType);
+                    text("the message (%s) ends with its push header: it has no body", mediaType),
+                    decoder);
         }
-        return exception(
+        return new ProvisioningException(
                 Reason.BODY_REFUSED,
-                "the body (%s, %d bytes) is not a provisioning document that can be decoded%s",
-                mediaType,
-                header.getBodyLength(),
-                header.firstBodyByte() == '<' ? ": it is XML, not WBXML" : "");
+                text(
+                        "the body (%s, %d bytes) is not a provisioning document that can be"
+                                + " decoded%s",
+                        mediaType, header.getBodyLength(), detail(header, decoder)),
+                decoder);
+    }
+
+    private static String detail(PushHeader header, NativeDecoder decoder) {
+        if (header.firstBodyByte() == '<') {
+            return ": it is XML, not WBXML";
+        }
+        if (decoder == null) {
+            return "";
+        }
+        return decoder.code == 0
+                ? ": it holds no document"
+                : text(": result code %d behind %d bytes of it", decoder.code, decoder.read);
     }
 
     private static ProvisioningException exception(Reason reason, String text, Object... values) {
-        return new ProvisioningException(reason, String.format(Locale.ROOT, text, values));
+        return new ProvisioningException(reason, text(text, values));
+    }
+
+    private static String text(String text, Object... values) {
+        return String.format(Locale.ROOT, text, values);
     }
 
     private static int unsigned(byte[] message, int at) {

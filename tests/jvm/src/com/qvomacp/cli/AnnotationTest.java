@@ -90,7 +90,7 @@ class AnnotationTest extends Natives {
     }
 
     static void assertBodyAgrees(byte[] body, Annotation.Section section) {
-        NativeDecoder.Verdict verdict = NativeDecoder.verdict(body);
+        Verdict verdict = Verdict.of(Source.push(body));
         assertNotNull(verdict, "libomacp_explain.so cannot be loaded");
         Stop stop = section.stop;
         String own =
@@ -98,7 +98,7 @@ class AnnotationTest extends Natives {
                         ? "taken"
                         : stop.code + " at " + stop.read + ": " + stop.getMessage();
         assertTrue(
-                Explanation.agrees(stop, verdict),
+                Explanation.agrees(section, verdict),
                 () ->
                         own
                                 + ", but the library says "

@@ -460,7 +460,7 @@ class MainTest extends Natives {
                 ChildVm.run(directory.toString(), classPath, SMALL, Main.class);
         assertEquals(2, result.status());
         assertEquals("", result.output());
-        String start = "omacp: standard input: the library cannot be loaded: ";
+        String start = "omacp: standard input: The library omacp cannot be loaded: ";
         assertTrue(result.errors().startsWith(start), result.errors());
     }
 

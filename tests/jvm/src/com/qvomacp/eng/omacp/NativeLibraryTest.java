@@ -39,12 +39,29 @@ class NativeLibraryTest {
         }
     }
 
+    /** What another child runs: prints what the library says about a body that it refuses. */
+    static final class Refuse {
+        private Refuse() {}
+
+        public static void main(String[] arguments) {
+            try {
+                ProvisioningMessage.parse(new byte[] {1, 6, 1, (byte) 0xB6, 3, 11, 106, 0, 127});
+            } catch (ProvisioningException e) {
+                System.out.println(e.getResultCode() + " at " + e.getBodyOffset());
+            }
+        }
+    }
+
     private static final String SAMPLE = "samples/vowifi.push";
     private static final String PARSED = "epdg.epc.mnc001.mcc001.example.net\n".repeat(2);
 
     private static String resource() {
+        return resource("omacp");
+    }
+
+    private static String resource(String name) {
         return NativeLibrary.resource(
-                System.getProperty("os.name"), System.getProperty("os.arch"));
+                name, System.getProperty("os.name"), System.getProperty("os.arch"));
     }
 
     private static Path library() {
@@ -85,16 +102,16 @@ class NativeLibraryTest {
         for (String x86 : List.of("x86", "i386", "i586", "i686")) {
             assertEquals(
                     "/com/qvomacp/eng/native/linux-x86/libomacp.so",
-                    NativeLibrary.resource("Linux", x86));
+                    NativeLibrary.resource("omacp", "Linux", x86));
         }
         for (String x86_64 : List.of("amd64", "x86_64")) {
             assertEquals(
                     "/com/qvomacp/eng/native/linux-x86_64/libomacp.so",
-                    NativeLibrary.resource("Linux", x86_64));
+                    NativeLibrary.resource("omacp", "Linux", x86_64));
         }
         assertEquals(
                 "/com/qvomacp/eng/native/macosx-aarch64/libomacp.so",
-                NativeLibrary.resource("Mac OS X", "aarch64"));
+                NativeLibrary.resource("omacp", "Mac OS X", "aarch64"));
     }
 
     @Test
@@ -122,6 +139,27 @@ class NativeLibraryTest {
         ChildVm.Result result = run(directory.toString(), null, SAMPLE, library().toString());
         assertEquals(PARSED, result.output());
         assertEquals("", result.errors());
+    }
+
+    @Test
+    void asksTheDecoderFromTheCopyToo() throws Exception {
+        Path explanations = library().resolveSibling("libomacp_explain.so");
+        String classPath = classPath(Files.readAllBytes(library()));
+        Path copy = directory.resolve(resource("omacp_explain").substring(1));
+        assertEquals("null at null\n", refuse(classPath));
+        Files.copy(explanations, copy);
+        assertEquals("4101 at 4\n", refuse(classPath));
+    }
+
+    private String refuse(String classPath) throws Exception {
+        Set<String> before = temporaryCopies();
+        ChildVm.Result result =
+                ChildVm.run(directory.toString(), classPath, new byte[0], Refuse.class);
+        assertEquals("", result.errors());
+        Set<String> left = temporaryCopies();
+        left.removeAll(before);
+        assertEquals(Set.of(), left);
+        return result.output();
     }
 
     @Test

@@ -140,7 +140,9 @@ class RefusalTest extends Natives {
         String text = "is not a provisioning document that can be decoded";
         assertBodyRefused(
                 Reason.BODY_REFUSED,
-                "the body (application/vnd.wap.connectivity-wbxml, 5 bytes) " + text,
+                "the body (application/vnd.wap.connectivity-wbxml, 5 bytes) "
+                        + text
+                        + ": result code 4101 behind 4 bytes of it",
                 Push.push(UNDECODABLE));
         byte[] xml = "<wap-provisioningdoc/>".getBytes(StandardCharsets.US_ASCII);
         assertBodyRefused(
@@ -154,8 +156,42 @@ class RefusalTest extends Natives {
                 "the body (application/vnd.wap.connectivity-wbxml, "
                         + document().length
                         + " bytes) "
-                        + text,
+                        + text
+                        + ": it holds no document",
                 Push.push(document()));
+    }
+
+    @Test
+    void theLibraryTellsResultCodeAndOffsetOfABody() {
+        assertVerdict(4101, 4, Push.push(UNDECODABLE));
+        assertVerdict(4103, 4, Push.push(bytes(0x03, 0x0B, 0x6A, 0x00)));
+        assertVerdict(4107, 4, Push.push(bytes(0x03, 0x04, 0x6A, 0x00)));
+        assertVerdict(2, 0, Push.push(new byte[0]));
+        assertVerdict(0, document().length, Push.push(document()));
+        assertVerdict(null, null, bytes(1, 7, 1, 0));
+        assertVerdict(null, null, null);
+    }
+
+    /** A text without an end is behind the last byte, not behind the byte after that. */
+    @Test
+    void theOffsetIsOneOfTheBody() {
+        byte[] message = Everything.push();
+        for (int length = 51; length < message.length; ++length) {
+            byte[] cut = Arrays.copyOf(message, length);
+            try {
+                ProvisioningMessage.parse(cut);
+            } catch (ProvisioningException e) {
+                assertEquals(length - 50, e.getBodyOffset(), "cut to " + length);
+            }
+        }
+    }
+
+    private static void assertVerdict(Integer code, Integer offset, byte[] message) {
+        ProvisioningException refusal =
+                assertThrows(
+                        ProvisioningException.class, () -> ProvisioningMessage.parse(message));
+        assertEquals(code, refusal.getResultCode());
+        assertEquals(offset, refusal.getBodyOffset());
     }
 
     @Test
