@@ -16,6 +16,7 @@ using message::cString;
 using message::join;
 using message::mbUint32;
 using message::Type;
+using namespace std::string_literals;
 
 const Bytes kElementEnd = {message::kEnd};
 const Bytes kUnknownElement = {0x3F};
@@ -96,13 +97,22 @@ Family chain(const std::string &name, const Bytes &outer, const Bytes &begin, co
     return {.name = "chain-" + name,
             .open = outer,
             .unit = begin + inner + kElementEnd,
-            .close = outer.empty() ? Bytes{} : kElementEnd};
+            .close = outer.empty() ? Bytes{} : kElementEnd,
+            .blocks = 2};
 }
 
 // One characteristic full of parms.
 Family full(const std::string &name, const Bytes &begin, const Bytes &unit)
 {
     return {.name = name, .open = begin, .unit = unit, .close = kElementEnd};
+}
+
+// The same with parms that make the list of a record.
+Family list(const std::string &name, const Bytes &begin, const Bytes &unit)
+{
+    Family family = full(name, begin, unit);
+    family.blocks = 2;
+    return family;
 }
 
 // One parm with a value made of many pieces.
@@ -122,6 +132,7 @@ Family refused(Family family)
     family.name += "-refused";
     family.close = kUnknownElement + family.close;
     family.result = QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    family.blocks = 0;
     return family;
 }
 
@@ -134,12 +145,15 @@ const Bytes kAuth = kApplication + start(message::kAppAuth);
 
 void addElements(std::vector<Family> *all)
 {
-    const Family siblings{.name = "siblings", .unit = start(message::kPxLogical) + kElementEnd};
+    all->push_back({.name = "smallest", .open = kLogical + kElementEnd});
+    const Family siblings{
+        .name = "siblings", .unit = start(message::kPxLogical) + kElementEnd, .blocks = 1};
     const Family nesting{.name = "nesting", .unit = kLogical, .end = kElementEnd};
     all->push_back(siblings);
     all->push_back(refused(siblings));
     all->push_back({.name = "siblings-widest", // the largest records
-                    .unit = start(message::kNapDef) + kElementEnd});
+                    .unit = start(message::kNapDef) + kElementEnd,
+                    .blocks = 1});
     all->push_back({.name = "siblings-nameless",
                     .unit = {message::kCharacteristicTag | message::kHasContent, message::kEnd}});
     all->push_back({.name = "siblings-empty",
@@ -168,7 +182,8 @@ void addElements(std::vector<Family> *all)
     all->push_back({.name = "children",
                     .open = kLogical,
                     .unit = start(message::kPort) + kElementEnd,
-                    .close = kElementEnd});
+                    .close = kElementEnd,
+                    .blocks = 1});
     // The worst case of memory: each TYPE makes a record.
     all->push_back({.name = "types",
                     .open = {kCharacteristic},
@@ -187,23 +202,25 @@ void addElements(std::vector<Family> *all)
 
 void addParms(std::vector<Family> *all)
 {
-    const Family lists = full("lists", kLogical, parm(message::kDomain, kToken));
+    const Family lists = list("lists", kLogical, parm(message::kDomain, kToken));
     all->push_back(lists);
     all->push_back(refused(lists));
-    all->push_back(full("lists-byte", kLogical, parm(message::kDomain, kByteToken)));
-    all->push_back(full("lists-text", kLogical, parm(message::kDomain, kShort)));
+    all->push_back(list("lists-byte", kLogical, parm(message::kDomain, kByteToken)));
+    all->push_back(list("lists-text", kLogical, parm(message::kDomain, kShort)));
     all->push_back(
         full("lists-empty", kLogical, Bytes{message::kParm, message::kDomain, message::kEnd}));
     all->push_back({.name = "lists-one-parm",
                     .open = kLogical + Bytes{message::kParm},
                     .unit = pair(message::kDomain, kByteToken),
                     .close = kElementEnd + kElementEnd});
-    all->push_back(
-        full("lists-services", start(message::kPort), parm(message::kService, kByteToken)));
+    all->push_back(list("lists-services", kLogical + start(message::kPort),
+                        parm(message::kService, kByteToken)));
+    all->back().close = kElementEnd + kElementEnd;
     all->push_back({.name = "lists-services-nested",
                     .open = kLogical + kPhysical + start(message::kPort),
                     .unit = parm(message::kService, text("wta")),
-                    .close = kElementEnd + kElementEnd + kElementEnd});
+                    .close = kElementEnd + kElementEnd + kElementEnd,
+                    .blocks = 2});
     const Family strings = full("strings", kLogical, parm(message::kName, kShort));
     all->push_back(strings);
     all->push_back(refused(strings));
@@ -348,6 +365,7 @@ void addChains(std::vector<Family> *all)
         chain("bootstrap", {}, start(message::kBootstrap), parm(message::kName, kShort)));
     all->push_back(chain("clientidentity", {}, start(message::kClientIdentity),
                          parm(message::kClientId, kShort)));
+    all->back().blocks = 0; // only the first one reaches the context
     all->push_back(
         chain("vendorconfig", {}, start(message::kVendorConfig), parm(message::kName, kShort)));
     all->push_back(
@@ -383,10 +401,9 @@ void addChains(std::vector<Family> *all)
         {"appid", start(message::kAccess), message::kAppId},
         {"portnbr", start(message::kAccess), message::kPortNbr},
     };
-    for (const auto &list : lists) {
-        all->push_back(
-            full(std::string("list-") + list.name, list.begin, parm(list.list, kByteToken)));
-        if (list.list == message::kAuthEntity) {
+    for (const auto &record : lists) {
+        all->push_back(list("list-"s + record.name, record.begin, parm(record.list, kByteToken)));
+        if (record.list == message::kAuthEntity) {
             all->back().close = kElementEnd + kElementEnd;
         }
     }
@@ -474,17 +491,31 @@ const Family &family(const std::string &name)
     abort();
 }
 
-Bytes messageOf(const Family &family, size_t size)
+namespace {
+
+std::string tableOf(const Family &family, size_t size)
 {
     std::string table = family.table;
     if (family.tableText > 0) {
         table.append(size / 100 * family.tableText, 't').push_back('\0');
     }
+    return table;
+}
+
+} // namespace
+
+size_t unitsOf(const Family &family, size_t size)
+{
     constexpr size_t kFrame = 64; // more than the push header and the ends of the document
-    const size_t taken =
-        kFrame + table.size() + family.open.size() + family.middle.size() + family.close.size();
+    const size_t taken = kFrame + tableOf(family, size).size() + family.open.size() +
+                         family.middle.size() + family.close.size();
     const size_t each = family.unit.size() + family.end.size();
-    const size_t units = each > 0 && size > taken ? (size - taken) / each : 0;
+    return each > 0 && size > taken ? (size - taken) / each : 0;
+}
+
+Bytes messageOf(const Family &family, size_t size)
+{
+    const size_t units = unitsOf(family, size);
     Bytes content;
     content.reserve(size);
     append(&content, family.open);
@@ -494,7 +525,7 @@ Bytes messageOf(const Family &family, size_t size)
     append(&content, family.close);
     Body body;
     body.bytes(content);
-    return message::push(message::document(body, {.table = table}));
+    return message::push(message::document(body, {.table = tableOf(family, size)}));
 }
 
 } // namespace cost

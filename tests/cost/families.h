@@ -26,15 +26,22 @@ struct Family {
     // 8 MiB and 100 times its length.
     qvsResult result = QVS_OK;
 
+    // The blocks that the context has for each unit, at least: a record and its text are two.
+    size_t blocks = 0;
+
     // Whether the limit is what bounds the heap. Such a family says little of smaller messages.
     bool aboutLimit = false;
 };
 
-// All of them, in an order that stays.
+// All of them, in an order that stays: first the one that has nothing to repeat, whose session is
+// what every session costs.
 const std::vector<Family> &families();
 
 // The family of that name, which there must be.
 const Family &family(const std::string &name);
+
+// How many units there are in a message of the family and of at most `size` bytes.
+size_t unitsOf(const Family &family, size_t size);
 
 // A pushed message of at most `size` bytes with as many units as fit.
 Bytes messageOf(const Family &family, size_t size);

@@ -16,16 +16,18 @@ namespace {
 bool counting;
 std::size_t used;
 std::size_t peak;
+std::size_t blocks;
 
 std::size_t taken(void *block)
 {
     constexpr std::size_t kHeader = sizeof(std::size_t);
-    return block ? malloc_usable_size(block) + kHeader : 0;
+    return malloc_usable_size(block) + kHeader;
 }
 
 void *added(void *block)
 {
-    if (counting) {
+    if (counting && block) {
+        ++blocks;
         used += taken(block);
         peak = used > peak ? used : peak;
     }
@@ -34,7 +36,8 @@ void *added(void *block)
 
 void removed(void *block)
 {
-    if (counting) {
+    if (counting && block) {
+        --blocks;
         used -= taken(block);
     }
 }
@@ -46,9 +49,9 @@ std::size_t peakHeap()
     return peak;
 }
 
-std::size_t heapInUse()
+std::size_t blocksInUse()
 {
-    return used;
+    return blocks;
 }
 
 void startHeap()
@@ -56,6 +59,7 @@ void startHeap()
     counting = true;
     used = 0;
     peak = 0;
+    blocks = 0;
 }
 
 } // namespace cost

@@ -11,8 +11,8 @@ namespace cost {
 // The most bytes that were in use at a time since startHeap().
 std::size_t peakHeap();
 
-// The bytes that are in use now, counted from startHeap() on.
-std::size_t heapInUse();
+// The blocks that are in use now, counted from startHeap() on.
+std::size_t blocksInUse();
 
 void startHeap();
 

@@ -82,6 +82,13 @@ public:
                                                                                   refer<jobject>());
     }
 
+    // Chooses an access point by its index.
+    void choose(jint index)
+    {
+        reinterpret_cast<void (*)(JNIEnv *, jobject, jint)>(find("qvomacp_SetPxNapDefIndex"))(
+            &env_, refer<jobject>(), index);
+    }
+
     // Asks each query once: the last of its indexes is `last`, those before it are `first`.
     // Answers how many of them answered something, numbers counted.
     long query(jint first, jint last)
