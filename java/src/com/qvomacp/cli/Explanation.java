@@ -51,7 +51,11 @@ final class Explanation {
         if (!headerTaken) {
             Stop stop = annotation.header == null ? null : annotation.header.stop;
             return new Explanation(
-                    source, stop == null ? unknown(0, 0, "push header") : stop, -1, null, null);
+                    source,
+                    stop == null ? unknown(0, 0, "push header") : stop,
+                    -1,
+                    null,
+                    source.remark());
         }
         if (annotation.body == null) {
             return new Explanation(source, unknown(0, 0, "body"), 0, null, null);

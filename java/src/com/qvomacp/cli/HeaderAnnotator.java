@@ -49,7 +49,11 @@ final class HeaderAnnotator extends Cursor {
                     0,
                     data.length,
                     0,
-                    "the message ends within its push header, after " + data.length + " bytes",
+                    data.length == 0
+                            ? "there is no message, not a single byte"
+                            : "the message ends within its push header, after "
+                                    + data.length
+                                    + " bytes",
                     null);
         }
         if ((data[1] & 0xFF) != PUSH) {

@@ -51,6 +51,9 @@ abstract class Job implements Callable<Integer> {
     /** Says that a message is refused. */
     abstract void refused(Explanation explanation);
 
+    /** Says in which other way a file has failed. */
+    void failed(String name, String reason) {}
+
     /** Called in front of the first file and behind the last one. */
     void begin() {}
 
@@ -120,6 +123,7 @@ abstract class Job implements Callable<Integer> {
     void fail(int raised, String name, String reason) {
         raise(raised);
         complain(startOf(name) + reason + System.lineSeparator());
+        failed(name, reason);
     }
 
     /** The exit status is the worst of all files. */

@@ -54,15 +54,21 @@ final class JsonWriter {
         return writer.out.toString();
     }
 
-    /** One of several objects, each of another file, which is named in {@code file}. */
-    static String element(String file, String object, boolean first) {
+    /** Why nothing can be said of a message: an object with {@code error}. */
+    static String error(String reason) {
         JsonWriter writer = new JsonWriter();
-        writer.out.append(first ? "\n" : ",\n").append("{\n").append(INDENT).append("\"file\": ");
+        writer.out.append("{\n").append(INDENT).append("\"error\": ");
+        writer.text(reason);
+        return writer.out.append("\n}\n").toString();
+    }
+
+    /** An object as an element of an array, with {@code file} in front; without a line end. */
+    static String element(String file, String object) {
+        JsonWriter writer = new JsonWriter();
+        writer.out.append("{\n").append(INDENT).append("\"file\": ");
         writer.text(file);
-        writer.out.append(",\n").append(INDENT + object.substring("{\n".length()).trim());
-        int start = first ? 1 : 2;
-        String lines = writer.out.substring(start).replace("\n", "\n" + INDENT);
-        return writer.out.substring(0, start) + INDENT + lines;
+        writer.out.append(",\n").append(INDENT).append(object.substring("{\n".length()).trim());
+        return INDENT + writer.out.toString().replace("\n", "\n" + INDENT);
     }
 
     private void message(Message message) {

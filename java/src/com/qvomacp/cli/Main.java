@@ -17,6 +17,7 @@ import picocli.CommandLine.Command;
 import picocli.CommandLine.IVersionProvider;
 import picocli.CommandLine.Model.CommandSpec;
 import picocli.CommandLine.Option;
+import picocli.CommandLine.ParameterException;
 import picocli.CommandLine.Spec;
 
 /**
@@ -131,7 +132,18 @@ public final class Main implements Runnable {
         return new CommandLine(main)
                 .addSubcommand(new Show(main))
                 .addSubcommand(new Verify(main))
-                .addSubcommand(new Completion());
+                .addSubcommand(new Completion())
+                .setParameterExceptionHandler(Main::explainUsage);
+    }
+
+    /** Says in a few lines what is wrong with a command line. */
+    private static int explainUsage(ParameterException wrong, String[] arguments) {
+        CommandLine command = wrong.getCommandLine();
+        PrintWriter err = command.getErr();
+        err.println("omacp: " + wrong.getMessage());
+        err.print(command.getHelp().synopsisHeading() + command.getHelp().synopsis(0));
+        err.println('"' + command.getCommandSpec().qualifiedName() + " --help\" tells more.");
+        return FAILED;
     }
 
     /** The arguments with {@code show} in front, where no command or question is. */

@@ -36,6 +36,9 @@ final class Show extends Job {
 
     private int shown;
 
+    /** The last element of the JSON array, which waits for what separates it from the next. */
+    private String waiting = "";
+
     Show(Main main) {
         super(main);
     }
@@ -47,14 +50,14 @@ final class Show extends Job {
                     spec.commandLine(), "--bytes goes with neither --json nor --header");
         }
         if (json && hasSeveralFiles()) {
-            out().print("[");
+            out().print("[\n");
         }
     }
 
     @Override
     void end() {
         if (json && hasSeveralFiles()) {
-            out().print(shown == 0 ? "]\n" : "\n]\n");
+            out().print(waiting + "\n]\n");
         }
     }
 
@@ -67,12 +70,12 @@ final class Show extends Job {
                 return;
             }
             Header answered = reader.readHeader(source.bytes);
-            print(source, json ? JsonWriter.write(answered) : TextWriter.write(answered));
+            print(source.name, json ? JsonWriter.write(answered) : TextWriter.write(answered));
         } else if (bytes) {
             list(source, reader);
         } else {
             Message message = reader.read(source);
-            print(source, json ? JsonWriter.write(message) : TextWriter.write(message));
+            print(source.name, json ? JsonWriter.write(message) : TextWriter.write(message));
         }
     }
 
@@ -86,18 +89,19 @@ final class Show extends Job {
             Explanation explanation = Explanation.of(source, refused.headerTaken);
             listing += "\n" + explanation.write("", outPalette());
         }
-        print(source, listing);
+        print(source.name, listing);
     }
 
     /** Prints what is shown of a file; of several, each under its name. */
-    private void print(Source source, String text) {
+    private void print(String name, String text) {
         if (!hasSeveralFiles()) {
             out().print(text);
         } else if (json) {
-            out().print(JsonWriter.element(source.name, text, shown == 0));
+            out().print(shown == 0 ? "" : waiting + ",\n");
+            waiting = JsonWriter.element(name, text);
         } else {
             out().print(shown == 0 ? "" : "\n");
-            out().println(outPalette().bold("==> " + Visible.of(source.name) + " <=="));
+            out().println(outPalette().bold("==> " + Visible.of(name) + " <=="));
             out().print(text);
         }
         ++shown;
@@ -106,8 +110,15 @@ final class Show extends Job {
     @Override
     void refused(Explanation explanation) {
         complain(explanation);
-        if (json && hasSeveralFiles()) {
-            print(explanation.source, JsonWriter.write(explanation));
+        if (json) {
+            print(explanation.source.name, JsonWriter.write(explanation));
+        }
+    }
+
+    @Override
+    void failed(String name, String reason) {
+        if (json) {
+            print(name, JsonWriter.error(reason));
         }
     }
 }

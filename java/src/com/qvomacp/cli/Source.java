@@ -8,6 +8,7 @@ import java.nio.file.AccessDeniedException;
 import java.nio.file.Files;
 import java.nio.file.NoSuchFileException;
 import java.nio.file.Paths;
+import java.util.Arrays;
 import java.util.Base64;
 
 /**
@@ -18,6 +19,7 @@ final class Source {
     static final String STANDARD_INPUT = "-";
 
     private static final int PUSH = 0x06;
+    private static final int DELETE = 0x7F;
 
     /** A push header that says no more than that a body follows. */
     private static final byte[] BARE_HEADER = {0x01, PUSH, 0x01, (byte) 0xB6};
@@ -55,6 +57,9 @@ final class Source {
         if (unreadable instanceof AccessDeniedException) {
             return "permission denied";
         }
+        if ("Is a directory".equals(unreadable.getMessage())) {
+            return "is a directory";
+        }
         return "cannot be read: " + unreadable.getMessage();
     }
 
@@ -69,6 +74,30 @@ final class Source {
         System.arraycopy(BARE_HEADER, 0, push, 0, BARE_HEADER.length);
         System.arraycopy(body, 0, push, BARE_HEADER.length, body.length);
         return push;
+    }
+
+    /** Says for people what a text is that is no message; null for anything but a text. */
+    String remark() {
+        int digits = 0;
+        int others = 0;
+        for (byte b : bytes) {
+            boolean isSpace = Character.isWhitespace(b);
+            if (b < ' ' && !isSpace || b == DELETE) {
+                return null;
+            }
+            boolean isDigit = Character.digit(b, 16) >= 0;
+            digits += isDigit ? 1 : 0;
+            others += isDigit || isSpace || isSeparator(b) ? 0 : 1;
+        }
+        if (bytes.length == 0) {
+            return null;
+        }
+        if (bytes[0] == '<') {
+            return "This is XML. What is pushed to a handset is the WBXML that encodes it.";
+        }
+        return digits % 2 != 0 && others == 0
+                ? "This is hexadecimal text with an odd number of digits: " + digits + "."
+                : "This is text, and neither hexadecimal nor base64 of a message.";
     }
 
     Annotation annotation() {
@@ -106,29 +135,37 @@ final class Source {
         return bytes.length > 1 && bytes[1] == PUSH || BodyAnnotator.isDocument(bytes);
     }
 
-    /** What hexadecimal digits with any white space stand for; null for anything else. */
+    /**
+     * What hexadecimal digits stand for; null for anything else. White space, separators and {@code
+     * 0x} in front of a byte are left out.
+     */
     private static byte[] ofHexadecimal(byte[] content) {
+        byte[] bytes = new byte[content.length / 2];
         int digits = 0;
-        for (byte b : content) {
-            if (Character.digit(b, 16) >= 0) {
+        for (int i = 0; i < content.length; ++i) {
+            byte b = content[i];
+            boolean isPrefix =
+                    b == '0'
+                            && digits % 2 == 0
+                            && i + 1 < content.length
+                            && (content[i + 1] | ' ') == 'x';
+            int digit = Character.digit(b, 16);
+            if (isPrefix) {
+                ++i;
+            } else if (digit >= 0) {
+                if (digits / 2 < bytes.length) {
+                    bytes[digits / 2] = (byte) (bytes[digits / 2] << 4 | digit);
+                }
                 ++digits;
-            } else if (!Character.isWhitespace(b)) {
+            } else if (!Character.isWhitespace(b) && !isSeparator(b)) {
                 return null;
             }
         }
-        if (digits == 0 || digits % 2 != 0) {
-            return null;
-        }
-        byte[] bytes = new byte[digits / 2];
-        int at = 0;
-        for (byte b : content) {
-            int digit = Character.digit(b, 16);
-            if (digit >= 0) {
-                bytes[at / 2] = (byte) (bytes[at / 2] << 4 | digit);
-                ++at;
-            }
-        }
-        return bytes;
+        return digits == 0 || digits % 2 != 0 ? null : Arrays.copyOf(bytes, digits / 2);
+    }
+
+    private static boolean isSeparator(byte b) {
+        return b == ':' || b == ',' || b == ';' || b == '-';
     }
 
     /** What base64 of either alphabet stands for, white space left out; null for anything else. */

@@ -107,6 +107,8 @@ class MainTest extends Natives {
         assertShows(SMALL_SHOWN, ascii(hex.toUpperCase() + "\n"));
         assertShows(SMALL_SHOWN, ascii(HexFormat.ofDelimiter(" ").formatHex(SMALL)));
         assertShows(SMALL_SHOWN, ascii("\t" + hex.replaceAll("(.{7})", "$1\r\n") + "\f"));
+        assertShows(SMALL_SHOWN, ascii(HexFormat.ofDelimiter(":").formatHex(SMALL)));
+        assertShows(SMALL_SHOWN, ascii(HexFormat.ofDelimiter(", ").withPrefix("0x").formatHex(SMALL)));
         Path file = Files.writeString(directory.resolve("message.hex"), hex);
         assertShows(SMALL_SHOWN, new byte[0], file.toString());
     }
@@ -305,8 +307,7 @@ class MainTest extends Natives {
                              ^^
                   Accepted here: 0x06 (Push).
                 """,
-                message,
-                "--json");
+                message);
     }
 
     @Test
@@ -336,7 +337,7 @@ class MainTest extends Natives {
     void cannotReadADirectory() {
         assertEquals(2, run(SMALL, directory.toString()));
         assertEquals("", output);
-        assertTrue(errors.startsWith("omacp: " + directory + ": cannot be read: "), errors);
+        assertTrue(errors.startsWith("omacp: " + directory + ": is a directory\n"), errors);
     }
 
     @Test
@@ -399,7 +400,10 @@ class MainTest extends Natives {
                         array("completion", "bash"))) {
             assertEquals(2, run(SMALL, arguments));
             assertEquals("", output);
-            assertTrue(errors.contains("Usage: omacp "), errors);
+            assertTrue(errors.startsWith("omacp: "), errors);
+            assertTrue(errors.contains("\nUsage: omacp "), errors);
+            assertTrue(errors.endsWith(" --help\" tells more.\n"), errors);
+            assertTrue(errors.lines().count() < 6, errors);
         }
     }
 
@@ -441,8 +445,7 @@ class MainTest extends Natives {
         assertEquals(new ChildVm.Result(0, resource("everything.json"), ""), json);
         String refusal =
                 """
-                omacp: standard input: refused: the message ends within its push header, after
-                  0 bytes
+                omacp: standard input: refused: there is no message, not a single byte
                   message offset 0 (0x0), in push header.
                 """;
         assertEquals(new ChildVm.Result(1, "", refusal), child(new byte[0]));

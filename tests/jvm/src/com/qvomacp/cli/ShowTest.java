@@ -26,8 +26,11 @@ import java.util.Base64;
 import java.util.HexFormat;
 import java.util.List;
 import java.util.Map;
+import java.util.regex.Pattern;
 import org.junit.jupiter.api.Test;
 import org.junit.jupiter.api.io.TempDir;
+import org.junit.jupiter.params.ParameterizedTest;
+import org.junit.jupiter.params.provider.CsvSource;
 
 /** What the program shows of bytes, of several files, of bodies alone and of refused messages. */
 class ShowTest extends Natives {
@@ -340,6 +343,64 @@ class ShowTest extends Natives {
         assertEquals("31", String.valueOf(why.get("bodyOffset")).replace(".0", ""));
         assertEquals(good, ((Map<?, ?>) array.get(1)).get("file"));
         assertTrue(((Map<?, ?>) array.get(1)).containsKey("characteristics"));
+    }
+
+    @Test
+    void explainsASingleMessageInJson() {
+        assertEquals(1, run(new byte[] {1, 7, 1, 0}, "--json"));
+        Map<?, ?> why = (Map<?, ?>) ((Map<?, ?>) Json.parse(output)).get("refused");
+        assertEquals("PDU type 0x07 is no push", why.get("reason"));
+        assertTrue(errors.startsWith("omacp: standard input: refused: PDU type 0x07"), errors);
+    }
+
+    @Test
+    void saysInJsonWhatCannotBeRead() throws Exception {
+        String missing = directory.resolve("missing").toString();
+        assertEquals(2, run(new byte[0], "--json", missing));
+        assertEquals(Map.of("error", "no such file"), Json.parse(output));
+        String good = file("good", push(BODY));
+        assertEquals(2, run(new byte[0], "--json", missing, good, directory.toString()));
+        List<?> array = (List<?>) Json.parse(output);
+        assertEquals(Map.of("file", missing, "error", "no such file"), array.get(0));
+        assertTrue(((Map<?, ?>) array.get(1)).containsKey("characteristics"));
+        assertEquals("is a directory", ((Map<?, ?>) array.get(2)).get("error"));
+    }
+
+    /** Where both go to one terminal, what is wrong stands on lines of its own. */
+    @Test
+    void complainsBetweenTheLinesOfJson() throws Exception {
+        ByteArrayOutputStream both = new ByteArrayOutputStream();
+        String missing = directory.resolve("missing").toString();
+        String good = file("good", push(BODY));
+        Main.run(
+                new ByteArrayInputStream(new byte[0]),
+                both,
+                both,
+                Terminal.NONE,
+                "--json",
+                missing,
+                good,
+                missing);
+        String complaint = "omacp: " + missing + ": no such file\n";
+        String json = both.toString(StandardCharsets.UTF_8);
+        assertEquals(3, json.split("(?m)^" + Pattern.quote(complaint), -1).length, json);
+        assertEquals(3, ((List<?>) Json.parse(json.replace(complaint, ""))).size());
+    }
+
+    @ParameterizedTest
+    @CsvSource(
+            delimiter = '|',
+            value = {
+                "<?xml version='1.0'?>|This is XML. What is pushed to a handset is the WBXML",
+                "0106 2|This is hexadecimal text with an odd number of digits: 5.",
+                "01:06:2|This is hexadecimal text with an odd number of digits: 5.",
+                "hello world|This is text, and neither hexadecimal nor base64 of a message.",
+            })
+    void saysWhatATextIsThatIsNoMessage(String text, String remark) {
+        assertEquals(1, run(text.getBytes(StandardCharsets.US_ASCII)));
+        assertTrue(errors.contains("\n  " + remark), errors);
+        assertEquals(1, run(("\u0001" + text).getBytes(StandardCharsets.US_ASCII)));
+        assertFalse(errors.contains("This is"), errors);
     }
 
     // ---- Input
