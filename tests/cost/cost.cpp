@@ -1,7 +1,7 @@
 // cost [--heap] SIZE...: one whole session for every family of messages and each size in bytes,
 // each in a process of its own, so that none finds a heap that another one has left. A family that
 // is about the limit of text is not made smaller than it has to be for that. A line per session:
-//   pid family size length peak-heap microseconds
+//   pid family size length peak-heap heap-left microseconds
 // The heap is counted in bytes with --heap only, and what becomes of the message is held to what
 // its family says. Under a tool that counts instructions, those of the function `session` are the
 // cost.
@@ -99,8 +99,8 @@ bool measure(const cost::Family &family, size_t size)
     session(&vm, &message, &outcome);
     const long time = static_cast<long>(
         std::chrono::duration_cast<std::chrono::microseconds>(Clock::now() - start).count());
-    printf("%d %s %zu %zu %zu %ld\n", static_cast<int>(getpid()), family.name.c_str(), size,
-           bytes.size(), cost::peakHeap(), time);
+    printf("%d %s %zu %zu %zu %zu %ld\n", static_cast<int>(getpid()), family.name.c_str(), size,
+           bytes.size(), cost::peakHeap(), cost::heapInUse(), time);
     return !countHeap || isAsExpected(family, size, bytes, outcome);
 }
 

@@ -450,6 +450,22 @@ void addLimits(std::vector<Family> *all)
     below.aboutLimit = true;
     below.table = std::string(90 * below.unit.size(), 't') + '\0';
     all->push_back(below);
+    // What stays allocated by design: records whose place another one of the same element takes,
+    // and texts of parms that are repeated.
+    constexpr size_t kRecords = 300;
+    constexpr size_t kTexts = 10;
+    below.name = "limit-below-left";
+    below.open.clear();
+    below.unit = {kCharacteristic};
+    below.unit.resize(1 + kRecords, static_cast<uint8_t>(message::kNapDef));
+    below.unit = below.unit + kElementEnd;
+    for (size_t i = 0; i < kTexts; ++i) {
+        below.unit = below.unit + parm(message::kName, reference(0));
+    }
+    below.unit = below.unit + kElementEnd;
+    below.close.clear();
+    below.table = std::string(90 * below.unit.size() / kTexts, 't') + '\0';
+    all->push_back(below);
 }
 
 std::vector<Family> allFamilies()

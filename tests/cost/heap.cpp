@@ -49,6 +49,11 @@ std::size_t peakHeap()
     return peak;
 }
 
+std::size_t heapInUse()
+{
+    return used;
+}
+
 std::size_t blocksInUse()
 {
     return blocks;

@@ -11,7 +11,8 @@ namespace cost {
 // The most bytes that were in use at a time since startHeap().
 std::size_t peakHeap();
 
-// The blocks that are in use now, counted from startHeap() on.
+// The bytes, and the blocks, that are in use now, counted from startHeap() on.
+std::size_t heapInUse();
 std::size_t blocksInUse();
 
 void startHeap();
