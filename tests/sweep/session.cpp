@@ -6,7 +6,6 @@
 
 #include <algorithm>
 #include <climits>
-#include <utility>
 
 namespace sweep {
 
@@ -19,10 +18,18 @@ using Indexes = std::vector<jint>;
 
 constexpr jint kHeaderOnly = 1;
 constexpr jint kWhole = 0;
-constexpr char kSetter[] = "qvomacp_SetPxNapDefIndex";
-constexpr char kDelete[] = "qvomacp_parser_del";
 
-// The indexes that a native with so many of them is called with: the first of everything, nothing,
+Vm &machine()
+{
+    static Vm *const vm = [] {
+        auto *made = new Vm;
+        EXPECT_EQ(made->load().number, JNI_VERSION_1_4);
+        return made;
+    }();
+    return *vm;
+}
+
+// The indexes that a query with so many of them is asked with: the first of everything, nothing,
 // and the second of the innermost and of the outermost.
 std::vector<Indexes> representative(size_t count)
 {
@@ -39,26 +46,41 @@ std::vector<Indexes> representative(size_t count)
     return all;
 }
 
-std::string shown(const std::string &name, const Indexes &indexes)
+std::vector<Call> makeCalls()
 {
-    std::string text = name;
-    for (const jint index : indexes) {
-        text += ' ' + std::to_string(index);
+    std::vector<Call> all;
+    const auto add = [&](std::string_view name, const Indexes &arguments = {}) {
+        for (const Native &native : machine().natives()) {
+            if (native.name == name) {
+                all.push_back({Call::kOther, &native, arguments});
+            }
+        }
+    };
+    const auto addQueries = [&](bool ofHeader) {
+        for (const Native &native : machine().natives()) {
+            const bool asksHeader = native.name.rfind("qvomacp_GetParser", 0) == 0;
+            const bool isQuery = native.signature.back() != 'V' && native.signature.back() != 'Z';
+            if (isQuery && (asksHeader || !ofHeader)) {
+                for (const Indexes &indexes : representative(native.indexes())) {
+                    all.push_back(
+                        {asksHeader ? Call::kHeaderQuery : Call::kQuery, &native, indexes});
+                }
+            }
+        }
+    };
+    all.push_back({Call::kParse, nullptr, {kHeaderOnly}});
+    addQueries(true);
+    add("qvomacp_parser_del");
+    all.push_back({Call::kParse, nullptr, {kWhole}});
+    addQueries(false);
+    // The access points before a chosen one are lost, behind the last one all are.
+    for (const jint chosen : {1, 2, INT_MAX}) {
+        add("qvomacp_SetPxNapDefIndex", {chosen});
+        add("qvomacp_GetPxNapDefCount");
+        add("qvomacp_GetPxNapDefData", {1});
     }
-    return text;
-}
-
-// Whether a native asks something and takes nothing but indexes.
-bool isQuery(const Native &native)
-{
-    return native.signature.back() != 'V' && native.signature.back() != 'Z';
-}
-
-bool isFallible(const std::string &entry)
-{
-    static const std::vector<std::string> kSafe = {
-        "ExceptionCheck", "DeleteLocalRef", "GetArrayLength", "ReleaseByteArrayElements", "GetEnv"};
-    return std::find(kSafe.begin(), kSafe.end(), entry) == kSafe.end();
+    add("qvomacp_parser_del");
+    return all;
 }
 
 // The texts among so many first fields of a record.
@@ -89,157 +111,81 @@ size_t keptBy(const qvsClientProvCtx *context)
 
 } // namespace
 
-// One run through a session.
-struct Session::Run {
-    explicit Run(const fakevm::Bytes &message) : message_(message) {}
+const std::vector<Call> &calls()
+{
+    static const std::vector<Call> all = makeCalls();
+    return all;
+}
 
-    Steps play()
-    {
-        if (load().number != JNI_VERSION_1_4) {
-            return steps;
-        }
-        parse(kHeaderOnly);
-        askHeader();
-        call(kDelete);
-        parse(kWhole);
-        askEverything();
-        // The access points before a chosen one are lost, behind the last one all are.
-        for (const jint chosen : {1, 2, INT_MAX}) {
-            call(kSetter, {chosen});
-            call("qvomacp_GetPxNapDefCount");
-            call("qvomacp_GetPxNapDefData", {1});
-        }
-        call(kDelete);
-        parse(kWhole);
-        call("qvomacp_GetParserContentType");
-        call("qvomacp_GetPxNapDefCount");
-        call(kDelete);
-        EXPECT_EQ(ptCtx, nullptr);
-        EXPECT_EQ(qvs::ptPushHdlrInfo, nullptr);
-        return steps;
+std::string Call::shown() const
+{
+    std::string text = native ? native->name : "parse";
+    for (const jint argument : arguments) {
+        text += ' ' + std::to_string(argument);
     }
+    return text;
+}
 
-    Vm vm;
-    Steps steps;
-    long fallible = 0;
-    size_t kept = 0;
-    bool repeating = false;
+bool saysNothing(const Answer &answer)
+{
+    return answer.number <= 0 && !answer.text && !answer.array && !answer.bytes;
+}
 
-private:
-    const Answer &note(const std::string &name, const Answer &answer)
-    {
-        fallible += std::count_if(vm.calls().begin(), vm.calls().end(), isFallible);
-        steps.push_back({name, answer});
-        return answer;
+Answer Session::ask(const Call &call)
+{
+    if (call.kind != Call::kParse) {
+        return machine().call(*call.native, call.arguments);
     }
+    Answer answer = machine().parse(message_, call.arguments[0]);
+    kept_ += ptCtx ? keptBy(ptCtx) : 0;
+    return answer;
+}
 
-    Answer load()
-    {
-        // Each on a machine of its own, which keeps the classes that were registered before.
-        for (long n = 0; repeating; ++n) {
-            Vm fresh;
-            fresh.failCall(n);
-            const Answer answer = fresh.load();
-            if (!fresh.hasFailed()) {
-                break;
-            }
-            EXPECT_EQ(answer, (Answer{.number = JNI_ERR, .exception = true})) << n;
+void Session::failEach(const Call &call)
+{
+    for (long n = 0;; ++n) {
+        machine().failCall(n);
+        // A parse has one call that can fail; behind it a message would be parsed.
+        const Answer answer = n > 0 && call.kind == Call::kParse ? Answer{} : ask(call);
+        if (!machine().hasFailed()) {
+            return;
         }
-        return note("load", vm.load());
+        ++failures_;
+        EXPECT_EQ(answer, Answer{.exception = true}) << call.shown() << ", call " << n;
     }
+}
 
-    void parse(jint mode)
-    {
-        const std::string name = "parse " + std::to_string(mode);
-        if (repeating) {
-            // One call can fail; behind it a message would be parsed.
-            vm.failCall(0);
-            EXPECT_EQ(vm.parse(message_, mode), Answer{.exception = true}) << name;
-            EXPECT_TRUE(vm.hasFailed());
-        }
-        note(name, vm.parse(message_, mode));
-        kept += ptCtx ? keptBy(ptCtx) : 0;
+Answers Session::play()
+{
+    Answers answers;
+    answers.reserve(calls().size());
+    kept_ = 0;
+    for (const Call &call : calls()) {
+        answers.push_back(ask(call));
     }
+    EXPECT_EQ(ptCtx, nullptr);
+    EXPECT_EQ(qvs::ptPushHdlrInfo, nullptr);
+    return answers;
+}
 
-    void call(const Native &native, const Indexes &indexes)
-    {
-        const std::string name = shown(native.name, indexes);
-        long n = 0;
-        if (repeating) {
-            vm.failCall(n);
+Answers Session::playFailing()
+{
+    Answers answers;
+    for (const Call &call : calls()) {
+        // What sets or deletes calls nothing that can fail, and is done once.
+        if (call.kind != Call::kOther) {
+            failEach(call);
         }
-        Answer answer = vm.call(native, indexes);
-        while (repeating && vm.hasFailed()) {
-            EXPECT_EQ(answer, Answer{.exception = true}) << name << ", call " << n;
-            vm.failCall(++n);
-            answer = vm.call(native, indexes);
-        }
-        note(name, answer);
-    }
-
-    void call(const std::string &name, const Indexes &indexes = {})
-    {
-        for (const Native &native : vm.natives()) {
-            if (native.name == name) {
-                call(native, indexes);
-                return;
-            }
-        }
-        ADD_FAILURE() << "no native " << name;
-    }
-
-    void askHeader()
-    {
-        for (const Native &native : vm.natives()) {
-            if (isQuery(native) && native.name.rfind("qvomacp_GetParser", 0) == 0) {
-                call(native, {});
-            }
-        }
-    }
-
-    void askEverything()
-    {
-        for (const Native &native : vm.natives()) {
-            if (isQuery(native)) {
-                for (const Indexes &indexes : representative(native.indexes())) {
-                    call(native, indexes);
+        if (call.kind == Call::kParse) {
+            for (const Call &other : calls()) {
+                if (other.kind == Call::kQuery || other.kind == Call::kHeaderQuery) {
+                    EXPECT_TRUE(saysNothing(ask(other))) << other.shown();
                 }
             }
         }
+        answers.push_back(ask(call));
     }
-
-    const fakevm::Bytes &message_;
-};
-
-void PrintTo(const Step &step, std::ostream *out)
-{
-    *out << step.call << ": ";
-    PrintTo(step.answer, out);
-}
-
-Steps Session::play()
-{
-    Run run(message_);
-    Steps steps = run.play();
-    fallibleCalls_ = run.fallible;
-    keptByContexts_ = run.kept;
-    return steps;
-}
-
-Steps Session::playFailing(long n)
-{
-    Run run(message_);
-    run.vm.failCall(n);
-    Steps steps = run.play();
-    EXPECT_TRUE(run.vm.hasFailed()) << "there was no such call";
-    return steps;
-}
-
-Steps Session::playRepeating()
-{
-    Run run(message_);
-    run.repeating = true;
-    return run.play();
+    return answers;
 }
 
 } // namespace sweep

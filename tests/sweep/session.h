@@ -1,56 +1,59 @@
-// A whole session of a Java program with the library: load, parse for the header alone, delete,
-// parse, every query, the choice of an access point, delete, parse again, delete.
+// A whole session of a Java program with the library: a parse for the header alone, its queries,
+// the delete; a parse, every query, the choice of an access point, the delete.
 #pragma once
 
 #include "support/fakevm.h"
 
 #include <cstddef>
-#include <ostream>
 #include <string>
 #include <vector>
 
 namespace sweep {
 
-// A call of a native and what it answered.
-struct Step {
-    std::string call;
-    fakevm::Answer answer;
+using Answers = std::vector<fakevm::Answer>;
 
-    bool operator==(const Step &) const = default;
+// A call of a native: what is the same in every session.
+struct Call {
+    enum Kind { kParse, kHeaderQuery, kQuery, kOther } kind;
+    const fakevm::Native *native; // but of a parse
+    std::vector<jint> arguments;  // the mode of a parse
+
+    std::string shown() const;
 };
 
-void PrintTo(const Step &step, std::ostream *out);
+// The calls of a session, in their order.
+const std::vector<Call> &calls();
 
-using Steps = std::vector<Step>;
+// Whether an answer holds nothing.
+bool saysNothing(const fakevm::Answer &answer);
 
 class Session {
 public:
     explicit Session(fakevm::Bytes message) : message_(std::move(message)) {}
 
-    // Plays the session to its end, or to a load that fails. Afterwards the library holds neither a
+    // Plays the session and returns the answer to each call. Afterwards the library holds neither a
     // context nor a header.
-    Steps play();
+    Answers play();
 
-    // The calls of the last play() that the virtual machine could have let fail.
-    long fallibleCalls() const { return fallibleCalls_; }
+    // Plays it with every call of the virtual machine that can fail failing in turn, and the native
+    // called again: with a failing call a native answers nothing, and as ever without. With a parse
+    // that failed there is nothing to be asked.
+    Answers playFailing();
 
-    // The blocks that the contexts of the last play leave behind by design: an allocation that
+    // How many calls have failed in it.
+    size_t failures() const { return failures_; }
+
+    // The blocks that the contexts of the last session leave behind by design: an allocation that
     // fails may bring to light what another record would have hidden.
-    size_t keptByContexts() const { return keptByContexts_; }
-
-    // Plays it with the n-th of those calls failing, counted from 0.
-    Steps playFailing(long n);
-
-    // Plays it with each of those calls failing in turn and the native called once more: a native
-    // with a failing call must answer nothing, and as ever when it is called again.
-    Steps playRepeating();
+    size_t keptByContexts() const { return kept_; }
 
 private:
-    struct Run;
+    fakevm::Answer ask(const Call &call);
+    void failEach(const Call &call);
 
     fakevm::Bytes message_;
-    long fallibleCalls_ = 0;
-    size_t keptByContexts_ = 0;
+    size_t failures_ = 0;
+    size_t kept_ = 0;
 };
 
 } // namespace sweep

@@ -23,13 +23,14 @@ namespace {
 constexpr size_t kStack = 64 * 1024;
 constexpr size_t kGuard = 64 * 1024;
 constexpr size_t kShare = 16 * 1024; // of the library
-constexpr size_t kSize = 1024 * 1024;
 constexpr uint8_t kPaint = 0xA5;
 
 #if defined(__SANITIZE_ADDRESS__)
 constexpr bool kMeasures = false; // what a sanitizer adds to a frame is not the library's
+constexpr size_t kSize = 128 * 1024;
 #else
 constexpr bool kMeasures = true;
+constexpr size_t kSize = 1024 * 1024;
 #endif
 
 // The stack of a thread, with memory that cannot be touched below it.
@@ -133,11 +134,10 @@ public:
     ~Tracing() { qvs::traceSink = nullptr; }
 };
 
-const char *const kParsed[] = {"nesting",        "nesting-pairs",   "nesting-filled",
-                               "siblings",       "siblings-widest", "lists",
-                               "lists-one-parm", "types",           "skip-deep"};
+const char *const kParsed[] = {"nesting", "nesting-filled", "siblings",
+                               "lists",   "types",          "skip-deep"};
 const char *const kRefused[] = {"nesting-refused", "nesting-unfinished", "siblings-refused",
-                                "lists-refused", "strings-refused"};
+                                "lists-refused"};
 
 TEST(SmallStack, HoldsASessionOfAnyMessage)
 {
@@ -156,12 +156,9 @@ TEST(SmallStack, HoldsASessionWhoseDecodeFailsAtItsEnd)
 TEST(SmallStack, HoldsTheTracesToo)
 {
     const Tracing tracing;
-    for (const char *family : {"nesting", "siblings", "lists"}) {
-        play(family, true);
-    }
-    for (const char *family : {"nesting-unfinished", "siblings-refused"}) {
-        play(family, false);
-    }
+    play("nesting", true);
+    play("lists", true);
+    play("nesting-unfinished", false);
 }
 
 } // namespace

@@ -4,6 +4,7 @@
 #include "losses.h"
 #include "session.h"
 
+#include "fuzz/generate.h"
 #include "support/blocks.h"
 
 #include <gtest/gtest.h>
@@ -17,11 +18,23 @@ namespace sweep {
 
 namespace {
 
-// OMACP_SWEEP=all in the environment: no failure is left out.
-bool sweepsAll()
+// Which failures are tried: those that a number in the environment chooses, as OMACP_SWEEP=325; all
+// of them without.
+struct Choice {
+    uint64_t seed = 0;
+    size_t parts = 1; // of which one is tried
+};
+
+#if defined(__SANITIZE_ADDRESS__)
+constexpr size_t kParts = 12; // a session takes ten times as long
+#else
+constexpr size_t kParts = 4;
+#endif
+
+Choice choice()
 {
-    const char *wanted = getenv("OMACP_SWEEP");
-    return wanted && std::string(wanted) == "all";
+    const char *seed = getenv("OMACP_SWEEP");
+    return seed ? Choice{strtoull(seed, nullptr, 10), kParts} : Choice{};
 }
 
 // A session as it goes when nothing fails.
@@ -30,10 +43,9 @@ struct Expected {
     {
         Losses losses;
         blocks::startCounting();
-        steps = session->play();
-        allocations = static_cast<long>(blocks::allocations());
+        answers = session->play();
+        allocations = blocks::allocations();
         lost = losses.count();
-        fallibleCalls = session->fallibleCalls();
         keptByContexts = session->keptByContexts();
     }
 
@@ -43,35 +55,17 @@ struct Expected {
         return lost + std::max(session.keptByContexts(), keptByContexts) - keptByContexts;
     }
 
-    Steps steps;
-    long allocations;
+    Answers answers;
+    size_t allocations;
     size_t lost;
-    long fallibleCalls;
     size_t keptByContexts;
 };
 
-// The failures to try out of `count`: all of them, or the first and the last ones and so many in
-// between that there are about `most`.
-std::vector<long> chosen(long count, long most)
+void expectSame(const Answers &answers, const Answers &expected)
 {
-    const long edge = most / 4;
-    const long stride = std::max(1L, (count - 2 * edge) / (most - 2 * edge));
-    std::vector<long> numbers;
-    for (long n = 0; n < count; ++n) {
-        if (sweepsAll() || n < edge || n >= count - edge || (n - edge) % stride == 0) {
-            numbers.push_back(n);
-        }
-    }
-    return numbers;
-}
-
-void expectSame(const Steps &steps, const Steps &expected)
-{
-    EXPECT_EQ(steps.size(), expected.size());
-    const auto [step, other] =
-        std::mismatch(steps.begin(), steps.end(), expected.begin(), expected.end());
-    if (step != steps.end() && other != expected.end()) {
-        EXPECT_EQ(*step, *other);
+    ASSERT_EQ(answers.size(), expected.size());
+    for (size_t i = 0; i < answers.size(); ++i) {
+        ASSERT_EQ(answers[i], expected[i]) << calls()[i].shown();
     }
 }
 
@@ -79,159 +73,132 @@ void expectWorks(Session *session, const Expected &expected)
 {
     SCOPED_TRACE("the next session");
     Losses losses;
-    expectSame(session->play(), expected.steps);
+    expectSame(session->play(), expected.answers);
     EXPECT_EQ(losses.count(), expected.lost);
-}
-
-bool saysNothing(const fakevm::Answer &answer)
-{
-    return answer.number <= 0 && !answer.text && !answer.array && !answer.bytes;
 }
 
 // Without memory a message is parsed in part, or not at all: then there is nothing to be asked. No
 // native throws anything.
-void expectLessThan(const Steps &steps, const Expected &expected)
+void expectLessThan(const Answers &answers, const Expected &expected)
 {
-    ASSERT_EQ(steps.size(), expected.steps.size());
     bool parsed = true;
-    for (size_t i = 0; i < steps.size(); ++i) {
-        EXPECT_FALSE(steps[i].answer.exception);
-        if (steps[i].call.rfind("parse ", 0) == 0) {
-            parsed = steps[i].answer.number == 1;
-            EXPECT_LE(steps[i].answer.number, expected.steps[i].answer.number);
+    for (size_t i = 0; i < answers.size(); ++i) {
+        const Call &call = calls()[i];
+        EXPECT_FALSE(answers[i].exception) << call.shown();
+        if (call.kind == Call::kParse) {
+            parsed = answers[i].number == 1;
+            EXPECT_LE(answers[i].number, expected.answers[i].number) << call.shown();
         } else if (!parsed) {
-            EXPECT_TRUE(saysNothing(steps[i].answer)) << testing::PrintToString(steps[i]);
-        } else if (steps[i].call.rfind("qvomacp_GetParser", 0) == 0) {
-            EXPECT_EQ(steps[i], expected.steps[i]);
+            EXPECT_TRUE(saysNothing(answers[i])) << call.shown();
+        } else if (call.kind == Call::kHeaderQuery) {
+            EXPECT_EQ(answers[i], expected.answers[i]) << call.shown();
         }
     }
 }
 
-// With an allocation failing, once or from then on.
-void sweepAllocations(const Document &document, long most)
+// With an allocation failing, once or from then on. Returns how many failures were tried.
+size_t sweepAllocations(const Document &document, fuzz::Random *random, size_t parts)
 {
     SCOPED_TRACE(document.name);
     Session session(document.message);
     const Expected expected(&session);
+    size_t tried = 0;
     for (const bool fromThenOn : {false, true}) {
-        for (const long n : chosen(expected.allocations, most)) {
+        for (size_t n = random->below(parts); n < expected.allocations; n += parts) {
             SCOPED_TRACE(testing::Message()
                          << (fromThenOn ? "from" : "only") << " allocation " << n << " fails");
             Losses losses;
             blocks::failFromThenOn = fromThenOn;
-            blocks::failAt = n;
-            const Steps steps = session.play();
+            blocks::failAt = static_cast<long>(n);
+            const Answers answers = session.play();
             EXPECT_LT(blocks::failAt, 0) << "there was no such allocation";
             blocks::reset();
             blocks::failFromThenOn = false;
             EXPECT_LE(losses.count(), expected.mayLose(session));
-            expectLessThan(steps, expected);
+            expectLessThan(answers, expected);
             expectWorks(&session, expected);
+            ++tried;
             if (testing::Test::HasFailure()) {
-                return;
+                return tried;
             }
         }
     }
+    return tried;
 }
 
-// With each call of the machine failing and the native called again.
-void sweepCalls(const Document &document)
+TEST(Sweep, OfAllocations)
 {
-    SCOPED_TRACE(document.name);
-    Session session(document.message);
-    const Expected expected(&session);
-    Losses losses;
-    expectSame(session.playRepeating(), expected.steps);
-    EXPECT_EQ(losses.count(), expected.lost);
-}
-
-// With each call of the machine failing and the session going on as if nothing had been.
-void sweepCallsOfSession(const Document &document, long most)
-{
-    SCOPED_TRACE(document.name);
-    Session session(document.message);
-    const Expected expected(&session);
-    EXPECT_GT(expected.fallibleCalls, 0);
-    for (const long n : chosen(expected.fallibleCalls, most)) {
-        SCOPED_TRACE(testing::Message() << "call " << n << " fails");
-        Losses losses;
-        const Steps steps = session.playFailing(n);
-        EXPECT_LE(losses.count(), expected.lost);
-        EXPECT_EQ(std::count_if(steps.begin(), steps.end(),
-                                [](const Step &step) { return step.answer.exception; }),
-                  1);
-        expectWorks(&session, expected);
-        if (testing::Test::HasFailure()) {
+    const Choice chosen = choice();
+    fuzz::Random random(chosen.seed);
+    size_t tried = 0;
+    for (const Document &document : documents(chosen.seed)) {
+        tried += sweepAllocations(document, &random, chosen.parts);
+        if (HasFailure()) {
             return;
         }
     }
+    EXPECT_GT(tried, 0U);
+    printf("%zu failing allocations\n", tried);
+}
+
+TEST(Sweep, OfCallsOfTheMachine)
+{
+    const Choice chosen = choice();
+    fuzz::Random random(chosen.seed);
+    size_t tried = 0;
+    for (const Document &document : documents(chosen.seed)) {
+        if (!random.oneIn(chosen.parts)) {
+            continue;
+        }
+        SCOPED_TRACE(document.name);
+        Session session(document.message);
+        const Expected expected(&session);
+        Losses losses;
+        expectSame(session.playFailing(), expected.answers);
+        EXPECT_EQ(losses.count(), expected.lost);
+        expectWorks(&session, expected);
+        if (HasFailure()) {
+            return;
+        }
+        tried += session.failures();
+    }
+    EXPECT_GT(tried, 0U);
+    printf("%zu failing calls\n", tried);
+}
+
+TEST(Sweep, OfTheLoad)
+{
+    long n = 0;
+    for (;; ++n) {
+        fakevm::Vm vm; // which keeps the classes that were registered before
+        vm.failCall(n);
+        const fakevm::Answer answer = vm.load();
+        if (!vm.hasFailed()) {
+            EXPECT_EQ(answer, fakevm::Answer{.number = JNI_VERSION_1_4});
+            break;
+        }
+        EXPECT_EQ(answer, (fakevm::Answer{.number = JNI_ERR, .exception = true})) << n;
+    }
+    EXPECT_GT(n, 0);
 }
 
 TEST(Documents, LetEveryNativeAnswerSomething)
 {
     std::set<std::string> silent;
-    std::set<std::string> heard;
-    for (const Document &document : smallDocuments()) {
+    for (const Call &call : calls()) {
+        silent.insert(call.native ? call.native->name : "parse");
+    }
+    for (const Document &document : documents(0)) {
         Losses losses;
-        for (const Step &step : Session(document.message).play()) {
-            const std::string name = step.call.substr(0, step.call.find(' '));
-            (saysNothing(step.answer) ? silent : heard).insert(name);
-        }
+        const Answers answers = Session(document.message).play();
         losses.count();
+        for (size_t i = 0; i < answers.size(); ++i) {
+            if (!saysNothing(answers[i])) {
+                silent.erase(calls()[i].native ? calls()[i].native->name : "parse");
+            }
+        }
     }
-    for (const std::string &name : silent) {
-        const bool answersNothing =
-            name == "qvomacp_parser_del" || name == "qvomacp_SetPxNapDefIndex";
-        EXPECT_EQ(heard.count(name), answersNothing ? 0U : 1U) << name;
-    }
-    EXPECT_FALSE(samples().empty());
-}
-
-constexpr long kForSmall = 40;
-constexpr long kForSamples = 120;
-constexpr long kForSeeds = 12;
-
-TEST(AllocationSweep, OverSmallDocuments)
-{
-    for (const Document &document : smallDocuments()) {
-        sweepAllocations(document, kForSmall);
-    }
-}
-
-TEST(AllocationSweep, OverSamples)
-{
-    for (const Document &document : samples()) {
-        sweepAllocations(document, kForSamples);
-    }
-}
-
-TEST(AllocationSweep, OverSeeds)
-{
-    for (const Document &document : seeds()) {
-        sweepAllocations(document, kForSeeds);
-    }
-}
-
-TEST(CallSweep, OverSmallDocuments)
-{
-    for (const Document &document : smallDocuments()) {
-        sweepCalls(document);
-    }
-}
-
-TEST(CallSweep, OverSamples)
-{
-    for (const Document &document : samples()) {
-        sweepCalls(document);
-        sweepCallsOfSession(document, kForSamples);
-    }
-}
-
-TEST(CallSweep, OverSeeds)
-{
-    for (const Document &document : seeds()) {
-        sweepCalls(document);
-    }
+    EXPECT_EQ(silent, (std::set<std::string>{"qvomacp_SetPxNapDefIndex", "qvomacp_parser_del"}));
 }
 
 } // namespace
