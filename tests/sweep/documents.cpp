@@ -43,14 +43,20 @@ Bytes asItIs(Bytes message)
 
 } // namespace
 
-std::vector<Document> documents(uint64_t seed)
+std::vector<Document> files()
 {
-    constexpr size_t kGenerated = 100;
     std::vector<Document> all;
     addFiles(OMACP_SAMPLES_DIR, ".push", asItIs, &all);
     addFiles(OMACP_SEEDS_DIR "/body", "", pushed, &all);
     addFiles(OMACP_SEEDS_DIR "/push_header", "", asItIs, &all);
     addFiles(OMACP_SEEDS_DIR "/session", "", asItIs, &all);
+    return all;
+}
+
+std::vector<Document> generated(uint64_t seed)
+{
+    constexpr size_t kGenerated = 100;
+    std::vector<Document> all;
     fuzz::Random random(seed);
     fuzz::Generator generator(&random);
     for (size_t i = 0; i < kGenerated; ++i) {

@@ -14,7 +14,10 @@ struct Document {
     Bytes message; // as it is pushed
 };
 
-// All of them. The same seed generates the same.
-std::vector<Document> documents(uint64_t seed);
+// The samples and the seeds.
+std::vector<Document> files();
+
+// Generated ones. The same seed generates the same.
+std::vector<Document> generated(uint64_t seed);
 
 } // namespace sweep

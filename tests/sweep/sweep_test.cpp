@@ -126,44 +126,57 @@ size_t sweepAllocations(const Document &document, fuzz::Random *random, size_t p
     return tried;
 }
 
-TEST(Sweep, OfAllocations)
+// With each call of the machine failing, in one of so many documents. Returns how many were tried.
+size_t sweepCalls(const Document &document, fuzz::Random *random, size_t parts)
+{
+    if (!random->oneIn(parts)) {
+        return 0;
+    }
+    SCOPED_TRACE(document.name);
+    Session session(document.message);
+    const Expected expected(&session);
+    Losses losses;
+    expectSame(session.playFailing(), expected.answers);
+    EXPECT_EQ(losses.count(), expected.lost);
+    expectWorks(&session, expected);
+    return session.failures();
+}
+
+using Try = size_t (*)(const Document &document, fuzz::Random *random, size_t parts);
+
+void tryAll(const std::vector<Document> &documents, Try attempt)
 {
     const Choice chosen = choice();
     fuzz::Random random(chosen.seed);
     size_t tried = 0;
-    for (const Document &document : documents(chosen.seed)) {
-        tried += sweepAllocations(document, &random, chosen.parts);
-        if (HasFailure()) {
+    for (const Document &document : documents) {
+        tried += attempt(document, &random, chosen.parts);
+        if (testing::Test::HasFailure()) {
             return;
         }
     }
     EXPECT_GT(tried, 0U);
-    printf("%zu failing allocations\n", tried);
+    printf("%zu failures in %zu documents\n", tried, documents.size());
+}
+
+TEST(Sweep, OfAllocations)
+{
+    tryAll(files(), sweepAllocations);
+}
+
+TEST(Sweep, OfAllocationsWithGenerated)
+{
+    tryAll(generated(choice().seed), sweepAllocations);
 }
 
 TEST(Sweep, OfCallsOfTheMachine)
 {
-    const Choice chosen = choice();
-    fuzz::Random random(chosen.seed);
-    size_t tried = 0;
-    for (const Document &document : documents(chosen.seed)) {
-        if (!random.oneIn(chosen.parts)) {
-            continue;
-        }
-        SCOPED_TRACE(document.name);
-        Session session(document.message);
-        const Expected expected(&session);
-        Losses losses;
-        expectSame(session.playFailing(), expected.answers);
-        EXPECT_EQ(losses.count(), expected.lost);
-        expectWorks(&session, expected);
-        if (HasFailure()) {
-            return;
-        }
-        tried += session.failures();
-    }
-    EXPECT_GT(tried, 0U);
-    printf("%zu failing calls\n", tried);
+    tryAll(files(), sweepCalls);
+}
+
+TEST(Sweep, OfCallsOfTheMachineWithGenerated)
+{
+    tryAll(generated(choice().seed), sweepCalls);
 }
 
 TEST(Sweep, OfTheLoad)
@@ -188,7 +201,7 @@ TEST(Documents, LetEveryNativeAnswerSomething)
     for (const Call &call : calls()) {
         silent.insert(call.native ? call.native->name : "parse");
     }
-    for (const Document &document : documents(0)) {
+    for (const Document &document : files()) {
         Losses losses;
         const Answers answers = Session(document.message).play();
         losses.count();
