@@ -1,0 +1,78 @@
+package com.qvomacp.support;
+
+import java.nio.charset.StandardCharsets;
+import java.nio.file.Files;
+import java.nio.file.Path;
+import java.util.ArrayList;
+import java.util.HexFormat;
+import java.util.List;
+import java.util.Map;
+
+/**
+ * A message from elsewhere, of the file that OMACP_FIELD_MESSAGES names: a JSON object a line. Of its
+ * members, {@code id} names the message, {@code kind} says what {@code data} is: {@code push-hex} a
+ * whole push, {@code wbxml-hex} a body, {@code xml} a document, which is encoded as a sample is.
+ */
+public final class FieldMessage {
+    public static final String VARIABLE = "OMACP_FIELD_MESSAGES";
+
+    public final String id;
+
+    /** False for a body alone. */
+    public final boolean isPush;
+
+    /** Null for another kind, and for a document that cannot be encoded. */
+    public final byte[] bytes;
+
+    private FieldMessage(String id, String kind, String data) throws Exception {
+        this.id = id;
+        this.isPush = !kind.equals("wbxml-hex");
+        if (kind.equals("xml")) {
+            this.bytes = encoded(data);
+        } else if (kind.equals("push-hex") || kind.equals("wbxml-hex")) {
+            this.bytes = HexFormat.of().parseHex(data.replaceAll("\\s", ""));
+        } else {
+            this.bytes = null;
+        }
+    }
+
+    /** The messages of the file, those that can be tried and those that cannot. */
+    public static List<FieldMessage> all() throws Exception {
+        List<FieldMessage> messages = new ArrayList<>();
+        for (String line : Files.readAllLines(Path.of(System.getenv(VARIABLE)))) {
+            if (!line.isBlank()) {
+                Map<?, ?> fields = (Map<?, ?>) Json.parse(line);
+                messages.add(
+                        new FieldMessage(
+                                String.valueOf(fields.get("id")),
+                                String.valueOf(fields.get("kind")),
+                                String.valueOf(fields.get("data"))));
+            }
+        }
+        return messages;
+    }
+
+    /** The message as a push. */
+    public byte[] push() {
+        return isPush ? bytes : Push.push(bytes);
+    }
+
+    /** What the samples' encoder makes of a document; null, and said so, when it refuses it. */
+    private static byte[] encoded(String document) throws Exception {
+        Path file = Files.writeString(Files.createTempFile("field", ".xml"), document);
+        try {
+            Process encoder =
+                    new ProcessBuilder("tools/encode-sample", "-o", "-", file.toString())
+                            .redirectErrorStream(true)
+                            .start();
+            byte[] output = encoder.getInputStream().readAllBytes();
+            if (encoder.waitFor() == 0) {
+                return output;
+            }
+            System.out.print(new String(output, StandardCharsets.UTF_8));
+            return null;
+        } finally {
+            Files.delete(file);
+        }
+    }
+}
