@@ -639,12 +639,17 @@ TEST(Kept, decoder_buffer_unchecked)
     EXPECT_EQ(decoder->ptBuffer, nullptr); // none could be made
     EXPECT_EQ(qvsClientProvWbxmlDeleteDecoder(decoder), QVS_OK);
 
-    blocks::failAt = 3;
+    blocks::failAt = 2;
     EXPECT_EQ(qvsClientProvWbxmlInitDecoder(&decoder, body, sizeof body), QVS_OK);
     blocks::reset();
     ASSERT_NE(decoder, nullptr);
+    EXPECT_EQ(decoder->ptBuffer, nullptr); // there was no storage for it
+    EXPECT_EQ(qvsClientProvWbxmlDeleteDecoder(decoder), QVS_OK);
+
+    EXPECT_EQ(qvsClientProvWbxmlInitDecoder(&decoder, body, 0), QVS_OK);
+    ASSERT_NE(decoder, nullptr);
     ASSERT_NE(decoder->ptBuffer, nullptr);
-    EXPECT_EQ(decoder->ptBuffer->nSize, 0u); // one that could not be filled
+    EXPECT_EQ(decoder->ptBuffer->nSize, 0u);
     EXPECT_EQ(qvsClientProvWbxmlDeleteDecoder(decoder), QVS_OK);
 }
 

@@ -112,6 +112,39 @@ smlBuffer *overdrawn(uint32_t over)
     return buffer;
 }
 
+// The decoder's buffer: one block, and otherwise what creating and appending make.
+TEST(MakeBuffer, IsABufferThatWasCreatedAndAppendedTo)
+{
+    blocks::BlockCheck check;
+    const uint8_t data[600] = {1, 2, 3};
+    for (uint32_t length : {0u, 1u, 255u, 256u, 257u, 600u}) {
+        smlBuffer *grown = nullptr;
+        ASSERT_EQ(smlBufferCreate(&grown, length), QVS_OK);
+        ASSERT_EQ(smlBufferAppendTail(grown, data, length), QVS_OK);
+        smlBuffer *made = nullptr;
+        ASSERT_EQ(qvs::makeBuffer(&made, data, length), QVS_OK);
+        EXPECT_EQ(made->nSize, grown->nSize);
+        EXPECT_EQ(made->nCapacity, grown->nCapacity) << length;
+        EXPECT_EQ(made->bOutside, 0u);
+        EXPECT_EQ(made->pHead, made->pStorage);
+        EXPECT_EQ(made->pTail, made->pStorage + length);
+        EXPECT_EQ(made->pEnd, made->pStorage + made->nCapacity);
+        EXPECT_EQ(memcmp(made->pStorage, grown->pStorage, grown->nCapacity + 1), 0);
+        EXPECT_EQ(smlBufferDelete(made), QVS_OK);
+        EXPECT_EQ(smlBufferDelete(grown), QVS_OK);
+    }
+}
+
+TEST(MakeBuffer, HasNoMemoryForALengthWhoseRoomCannotBeCounted)
+{
+    const uint8_t data[1] = {};
+    for (uint32_t length : {UINT32_MAX / 2 - 255, UINT32_MAX}) {
+        smlBuffer *made = nullptr;
+        EXPECT_EQ(qvs::makeBuffer(&made, data, length), QVS_ERROR_NO_MEMORY);
+        EXPECT_EQ(made, nullptr);
+    }
+}
+
 } // namespace
 
 TEST_F(Buffer, IsCreatedEmptyAndZeroed)

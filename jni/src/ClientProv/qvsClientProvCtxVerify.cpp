@@ -188,10 +188,11 @@ void *qvs::copyRecord(void *record, const CopyKind &kind)
         return nullptr;
     }
     for (const CopyRow &row : kind.rows) {
+        void *field = pointerAt(record, row.from);
         if (row.list) {
-            setPointer(copy, row.to, copyTexts(*listAt(record, row.from)));
-        } else if (const char *text = *textAt(record, row.from)) {
-            *textAt(copy, row.to) = copyOf(text);
+            setPointer(copy, row.to, copyTexts(static_cast<qvsList *>(field)));
+        } else if (field) {
+            setPointer(copy, row.to, copyOf(static_cast<const char *>(field)));
         }
     }
     if (kind.onCopied) {

@@ -238,12 +238,14 @@ constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 
 // A slot of a node and the kind of record in it.
 struct SlotRow {
-    RecordField slot;
-    ReleaseKind kind;
+    consteval SlotRow(RecordField s, const ReleaseKind &k) : slot(s.number), kind(&k) {}
+    consteval SlotRow(RecordField s) : slot(s.number) {}
+
+    uint8_t slot;
+    const ReleaseKind *kind = nullptr; // null for a record that is left
 };
 
-// The slots of a node, in the order in which they are released.
-// kept[tree-roaming-left]: the ROAMING record and its texts stay allocated.
+// The slots of a node in their order, which is also that of the release.
 constexpr SlotRow kSlots[] = {
     {QVS_FIELD(qvsWapCharacter, ptPxLogical), pxLogical::kRelease},
     {QVS_FIELD(qvsWapCharacter, ptPxAuthInfo), pxAuthInfo::kRelease},
@@ -260,9 +262,23 @@ constexpr SlotRow kSlots[] = {
     {QVS_FIELD(qvsWapCharacter, ptVendorConfig), vendorConfig::kRelease},
     {QVS_FIELD(qvsWapCharacter, ptClientIdentity), clientIdentity::kRelease},
     {QVS_FIELD(qvsWapCharacter, ptAccess), access::kRelease},
+    // kept[tree-roaming-left]: the ROAMING record and its texts stay allocated.
+    {QVS_FIELD(qvsWapCharacter, ptRoaming)},
     {QVS_FIELD(qvsWapCharacter, ptWifi), wifi::kRelease},
     {QVS_FIELD(qvsWapCharacter, ptVoWifi), voWifi::kRelease},
 };
+
+consteval bool everySlotHasItsRow()
+{
+    uint8_t slot = 0;
+    for (const SlotRow &row : kSlots) {
+        if (row.slot != slot++) {
+            return false;
+        }
+    }
+    return slot == kFieldsOf<qvsWapCharacter>;
+}
+static_assert(everySlotHasItsRow());
 
 void releaseList(qvsList **field)
 {
@@ -276,10 +292,16 @@ void releaseList(qvsList **field)
 void releaseFields(void *record, const ReleaseKind &kind)
 {
     for (const ReleaseRow &row : kind.rows) {
+        void *owned = pointerAt(record, row.field);
+        if (!owned) {
+            continue;
+        }
+        setPointer(record, row.field, nullptr);
         if (row.list) {
-            releaseList(listAt(record, row.field));
+            // Items go as texts do; only a list that is not there is refused.
+            (void)qvsListDeleteNodeAllAndList(static_cast<qvsList *>(owned), nullptr);
         } else {
-            releaseText(textAt(record, row.field));
+            qvsMemFree_debug(owned);
         }
     }
 }
@@ -305,17 +327,18 @@ void closeRecord(void *record, const ReleaseKind &kind)
 // left but the node itself.
 qvsList *releaseSlots(qvsWapCharacter *node)
 {
-    for (const SlotRow &row : kSlots) {
-        void *record = pointerAt(node, row.slot.number);
-        if (!record) {
+    for (uint8_t slot = 0; slot < kFieldsOf<qvsWapCharacter>; ++slot) {
+        void *record = pointerAt(node, slot);
+        const ReleaseKind *kind = record ? kSlots[slot].kind : nullptr;
+        if (!kind) {
             continue;
         }
-        releaseFields(record, row.kind);
-        if (qvsList *children = childrenOf(record, row.kind)) {
+        releaseFields(record, *kind);
+        if (qvsList *children = childrenOf(record, *kind)) {
             return children;
         }
-        closeRecord(record, row.kind);
-        setPointer(node, row.slot.number, nullptr);
+        closeRecord(record, *kind);
+        setPointer(node, slot, nullptr);
     }
     return nullptr;
 }
@@ -388,8 +411,7 @@ qvsResult qvsClientProvWbxmlInitDecoder(qvsWbxmlDecoder **decoder, const uint8_t
     }
     // kept[decoder-buffer-unchecked]: a decoder without a buffer, or with an empty one, is handed
     // out as a good one.
-    (void)smlBufferCreate(&made->ptBuffer, length);
-    (void)smlBufferAppendTail(made->ptBuffer, data, length);
+    (void)makeBuffer(&made->ptBuffer, data, length);
     *decoder = made;
     return QVS_OK;
 }

@@ -1,6 +1,7 @@
 // The decoder's entry: the WBXML header, the document type, and the way from bytes to a context.
 #include "qvsClientProvWbxmlDecoder.h"
 #include "qvsTokens.h"
+#include "qvsmemory.h"
 #include "qvsstring.h"
 #include "qvstrace.h"
 
@@ -41,21 +42,30 @@ qvsResult decode(qvsWbxmlDecoder *decoder, qvsWapDoc **document)
     return qvsClientProvWbxmlDecoderWbxmlBody(decoder, document);
 }
 
-// The document of a body; null with its failure traced.
+// A buffer over bytes that stay the caller's, to be read only.
+smlBuffer bufferOver(const uint8_t *data, uint32_t length)
+{
+    auto *start = const_cast<uint8_t *>(data);
+    return {start, start, start + length, start + length, length, length, 1};
+}
+
+// The document of a body; null with its failure traced. The decoder lives here, over the caller's
+// bytes: a copy of them and a block for each record would cost more than reading a short message.
 qvsResult readDocument(const uint8_t *data, uint32_t length, qvsWapDoc **document)
 {
-    qvsWbxmlDecoder *decoder = nullptr;
-    qvsResult result = qvsClientProvWbxmlInitDecoder(&decoder, data, length);
-    if (result != QVS_OK) {
+    if (!data) {
         trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlInitDecoder[0x%x]\n",
-              result);
-        return result;
+              QVS_ERROR_BAD_ARGUMENT);
+        return QVS_ERROR_BAD_ARGUMENT;
     }
-    result = qvsClientProvWbxmlDecoder(decoder, document);
+    smlBuffer buffer = bufferOver(data, length);
+    qvsWbxmlDecoder decoder = {};
+    decoder.ptBuffer = &buffer;
+    const qvsResult result = qvsClientProvWbxmlDecoder(&decoder, document);
     if (result != QVS_OK) {
         trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlDecoder[0x%x]\n", result);
     }
-    (void)qvsClientProvWbxmlDeleteDecoder(decoder);
+    qvsMemFree_debug(decoder.pStringTable);
     return result;
 }
 

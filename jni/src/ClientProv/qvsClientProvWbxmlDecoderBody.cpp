@@ -165,9 +165,7 @@ qvsResult refuseAttribute(uint8_t token)
 qvsResult readNamedType(qvsWbxmlDecoder *decoder, Node *node, ScopedText *name)
 {
     uint8_t token = 0;
-    if (qvsResult result = qvsClientProvWbxmlDecoderReadAttr(decoder, &token)) {
-        return result;
-    }
+    (void)takeByte(decoder, &token);
     Text read;
     const qvsResult result = content(decoder, &read);
     qvsMemFree_debug(name->take());
@@ -191,7 +189,8 @@ qvsResult readType(qvsWbxmlDecoder *decoder, Node *node, uint8_t token)
     if (qvsResult result = create(node, *kind)) {
         return result;
     }
-    return qvsClientProvWbxmlDecoderReadAttr(decoder, &token);
+    (void)takeByte(decoder, &token);
+    return QVS_OK;
 }
 
 // ---- Open elements
@@ -214,7 +213,7 @@ void releaseNode(void *node)
 // Reads the start of a characteristic. One with content becomes the innermost open one.
 qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)
 {
-    if (qvsResult result = qvsClientProvWbxmlDecoderCheckElement(decoder, tag::kCharacteristic)) {
+    if (qvsResult result = checkElement(decoder, tag::kCharacteristic)) {
         return result;
     }
     if (!decoder->nHasContent) {
@@ -285,8 +284,8 @@ qvsResult readContent(qvsWbxmlDecoder *decoder, Open *open, bool *child)
 {
     for (;;) {
         uint8_t tag = 0;
-        if (qvsResult result = qvsClientProvWbxmlDecoderCurElement(decoder, &tag)) {
-            return result;
+        if (!peekTag(decoder, &tag)) {
+            return QVS_ERROR_WBXML_NO_DATA;
         }
         trace("qvsClientProvWbxmlDecoderCharacter :: nId[0x%02x], nAttrId[0x%02x]", tag,
               open->attrId);
@@ -294,7 +293,8 @@ qvsResult readContent(qvsWbxmlDecoder *decoder, Open *open, bool *child)
         switch (tag) {
         case wbxml::kEnd:
             *child = false;
-            return qvsClientProvWbxmlDecoderReadElement(decoder, &tag);
+            (void)takeSeenTag(decoder);
+            return QVS_OK;
         case wbxml::kStrI:
             result = dropInlineString(decoder);
             break;
@@ -340,15 +340,15 @@ qvsResult addSibling(qvsList **list, Node *node)
 qvsResult hasNextSibling(qvsWbxmlDecoder *decoder, bool *next)
 {
     uint8_t tag = 0;
-    if (qvsResult result = qvsClientProvWbxmlDecoderCurElement(decoder, &tag)) {
-        return result;
+    if (!peekTag(decoder, &tag)) {
+        return QVS_ERROR_WBXML_NO_DATA;
     }
     if (tag == wbxml::kStrI) {
         if (qvsResult result = dropInlineString(decoder)) {
             return result;
         }
-        if (qvsResult result = qvsClientProvWbxmlDecoderCurElement(decoder, &tag)) {
-            return result;
+        if (!peekTag(decoder, &tag)) {
+            return QVS_ERROR_WBXML_NO_DATA;
         }
     }
     *next = tag != wbxml::kEnd;
@@ -429,13 +429,15 @@ qvsResult qvsClientProvWbxmlDecoderWbxmlBody(qvsWbxmlDecoder *decoder, qvsWapDoc
         return QVS_ERROR_FAILED;
     }
     uint8_t tag = 0;
-    qvsResult result = qvsClientProvWbxmlDecoderCurElement(decoder, &tag);
-    if (result == QVS_OK && tag == wbxml::kEnd) {
+    const bool present = peekTag(decoder, &tag);
+    if (present && tag == wbxml::kEnd) {
         // kept[body-end]: success without a document.
         (void)qvsClientProvWbxmlDeleteWapDoc(built);
-        return qvsClientProvWbxmlDecoderReadElement(decoder, &tag);
+        (void)takeSeenTag(decoder);
+        return QVS_OK;
     }
-    if (result == QVS_OK) {
+    qvsResult result = QVS_ERROR_WBXML_NO_DATA;
+    if (present) {
         result = readDocument(decoder, tag, built);
         if (result != QVS_OK) {
             trace("WBXML Decode Error[%x]", result);
@@ -468,13 +470,14 @@ qvsResult qvsClientProvWbxmlDecoderWapDocVersion(qvsWbxmlDecoder *decoder, qvsWa
     }
     for (;;) {
         uint8_t tag = 0;
-        if (qvsResult result = qvsClientProvWbxmlDecoderCurElement(decoder, &tag)) {
-            return result;
+        if (!peekTag(decoder, &tag)) {
+            return QVS_ERROR_WBXML_NO_DATA;
         }
         qvsResult result = QVS_OK;
         switch (tag) {
         case wbxml::kEnd:
-            return qvsClientProvWbxmlDecoderReadElement(decoder, &tag);
+            (void)takeSeenTag(decoder);
+            return QVS_OK;
         case wbxml::kStrI:
             result = dropInlineString(decoder);
             break;
@@ -536,19 +539,19 @@ qvsResult qvsClientProvWbxmlDecoderCharacterAttribute(qvsWbxmlDecoder *decoder,
     ScopedText type;
     for (;;) {
         uint8_t token = 0;
-        qvsResult result = qvsClientProvWbxmlDecoderCurAttr(decoder, &token);
-        if (result != QVS_OK) {
-            return result;
+        if (!peekByte(decoder, &token)) {
+            return QVS_ERROR_WBXML_NO_DATA;
         }
         if (token == wbxml::kEnd) {
-            result = qvsClientProvWbxmlDecoderReadAttr(decoder, &token);
+            (void)takeByte(decoder, &token);
             *codePage = decoder->nCodePage;
             *name = type.take();
-            return result;
+            return QVS_OK;
         }
         // kept[attr-last-token]: whatever comes last is the TYPE, so that a page switch behind it
         // leaves none.
         *attrId = token;
+        qvsResult result = QVS_OK;
         if (token == wbxml::kSwitchPage) {
             result = qvsClientProvWbxmlDecoderCheckCodePage(decoder);
         } else if (token == attr::kType) {

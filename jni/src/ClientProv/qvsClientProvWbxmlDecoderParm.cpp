@@ -1,11 +1,134 @@
-// The loop that reads a parm element by the table of its characteristic, and of any characteristic
-// the parameters whose name is given as text.
+// One parm element: the loop that reads it by the table of its characteristic, and its value, which
+// is a text or one more item of a list of texts.
 #include "qvsParm.h"
-#include "qvsstring.h"
 
 using namespace qvs;
 
 namespace {
+
+constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
+
+// ---- Values
+
+// Reads NAME and VALUE of one parameter onto `text`, step by step.
+qvsResult readAnyPair(qvsWbxmlDecoder *decoder, Text *text, uint8_t token)
+{
+    if (qvsResult result = checkAttr(decoder, token)) {
+        return result;
+    }
+    uint8_t next = 0;
+    qvsResult result = QVS_ERROR_WBXML_NO_DATA;
+    if (peekByte(decoder, &next)) {
+        result = QVS_OK;
+        switch (next) {
+        case wbxml::kEnd:
+            text->before = nullptr;
+            trace("DecoderParam : Value is NULL\n");
+            break;
+        case wbxml::kSwitchPage:
+            (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
+            result = paramValue(decoder, text);
+            break;
+        case attr::kValue:
+            result = paramValue(decoder, text);
+            break;
+        default:
+            trace("DecoderParam : Tag Code [%d] = QVS_ERROR_WBXML_UNKNOWN_ELEMENT\n", next);
+            result = QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+            break;
+        }
+    }
+    trace("qvsClientProvWbxmlDecoderParamString Error Code:%d", static_cast<int>(result));
+    return result;
+}
+
+constexpr uint32_t kPlainStart = 3; // NAME, VALUE, STR_I
+
+// The text of a usual parameter, which is NAME, VALUE and one inline string with END behind it, and
+// the bytes of it with its NUL. Null for any other, and for one that has something to trace or
+// comes near the limit of text.
+const uint8_t *plainText(const qvsWbxmlDecoder *decoder, uint8_t token, uint32_t *size)
+{
+    const uint32_t left = bytesLeft(decoder);
+    if (left <= kPlainStart || traceSink) {
+        return nullptr;
+    }
+    const uint8_t *read = decoder->ptBuffer->pHead;
+    if (read[0] != token || read[1] != attr::kValue || read[2] != wbxml::kStrI) {
+        return nullptr;
+    }
+    const uint8_t *text = read + kPlainStart;
+    const auto *nul = static_cast<const uint8_t *>(memchr(text, '\0', left - kPlainStart));
+    if (!nul || nul + 1 == read + left || nul[1] != wbxml::kEnd) {
+        return nullptr;
+    }
+    *size = static_cast<uint32_t>(nul + 1 - text);
+    return decoder->nTextRead + *size <= kTextAlways ? text : nullptr;
+}
+
+// Reads NAME and VALUE of one parameter onto `text`. The usual ones are read in one go, in half the
+// instructions.
+qvsResult readPair(qvsWbxmlDecoder *decoder, Text *text, uint8_t token)
+{
+    uint32_t size = 0;
+    const uint8_t *plain = text->holdsText() ? nullptr : plainText(decoder, token, &size);
+    if (!plain) {
+        return readAnyPair(decoder, text, token);
+    }
+    text->data = static_cast<char *>(qvsMemAlloc_debug(size, kModule, __LINE__));
+    if (!text->data) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    memcpy(text->data, plain, size);
+    text->length = size - 1;
+    text->capacity = size;
+    decoder->nTextRead += size - 1;
+    decoder->ptBuffer->pHead += kPlainStart + size;
+    return QVS_OK;
+}
+
+// Adds a text to a list of texts, which is made when there is none. A null text adds nothing.
+// The list takes the text over.
+qvsResult addText(qvsList **list, char *text)
+{
+    if (!*list) {
+        if (qvsListCreate(list, text) == QVS_OK) {
+            return QVS_OK;
+        }
+        trace("[Error] [qvsClientProvWbxmlDecoderParamListString] ptTmpList NULL");
+    } else if (!text || qvsListAddNodeLast(*list, text) == QVS_OK) {
+        return QVS_OK;
+    }
+    qvsMemFree_debug(text);
+    return QVS_ERROR_FAILED;
+}
+
+// Reads the pairs up to END into `*list`. A later pair of the same element continues the text of
+// the one before it in an item of its own.
+qvsResult readPairs(qvsWbxmlDecoder *decoder, qvsList **list)
+{
+    const char *last = nullptr;
+    for (;;) {
+        uint8_t token = 0;
+        if (!peekByte(decoder, &token)) {
+            return QVS_ERROR_WBXML_NO_DATA;
+        }
+        if (token == wbxml::kEnd) {
+            return QVS_OK;
+        }
+        Text text;
+        text.before = last;
+        if (qvsResult result = readPair(decoder, &text, token)) {
+            return result;
+        }
+        last = text.data ? text.data : text.before;
+        if (qvsResult result = addText(list, text.take())) {
+            return result;
+        }
+    }
+}
+
+// ---- The loop
 
 // The token the loop decides on next, behind page switches if there are any.
 qvsResult nextToken(qvsWbxmlDecoder *decoder, const ParmTable &table, uint8_t *token)
@@ -51,7 +174,7 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, void *record, const ParmTable &tabl
     if (!parm) {
         return refuse(table, token);
     }
-    if (parm->label) {
+    if (traceSink && parm->label) {
         trace("%s", parm->label);
     }
     switch (parm->type) {
@@ -67,15 +190,38 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, void *record, const ParmTable &tabl
 
 } // namespace
 
+qvsResult qvsClientProvWbxmlDecoderParamString(qvsWbxmlDecoder *decoder, char **text, uint8_t token)
+{
+    Text read;
+    if (qvsResult result = readPair(decoder, &read, token)) {
+        return result;
+    }
+    *text = read.take(); // kept[repeated-parm]: the text that was there stays allocated.
+    return QVS_OK;
+}
+
+qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvsList **list,
+                                                   uint8_t /*token*/)
+{
+    qvsList *built = *list;
+    const qvsResult result = readPairs(decoder, &built);
+    if (result == QVS_OK) {
+        *list = built;
+    } else if (!*list) {
+        (void)qvsListDeleteNodeAllAndList(built, nullptr);
+    }
+    return result;
+}
+
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
 {
-    if (table.entered) {
+    if (traceSink && table.entered) {
         trace("%s", table.entered);
     }
     if (!record) {
         return QVS_ERROR_BAD_ARGUMENT;
     }
-    if (qvsResult result = qvsClientProvWbxmlDecoderCheckElement(decoder, tag::kParm)) {
+    if (qvsResult result = checkElement(decoder, tag::kParm)) {
         return result;
     }
     for (;;) {
@@ -84,62 +230,20 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable
             return result;
         }
         const bool end = token == wbxml::kEnd;
-        const qvsResult result = end ? qvsClientProvWbxmlDecoderReadElement(decoder, &token)
-                                     : readParm(decoder, record, table, token);
-        if (table.onToken) {
+        qvsResult result = QVS_OK;
+        if (end) {
+            (void)takeSeenTag(decoder);
+        } else {
+            result = readParm(decoder, record, table, token);
+        }
+        if (traceSink && table.onToken) {
             table.onToken(token);
         }
         if (end || result != QVS_OK) {
-            if (table.onEnd) {
+            if (traceSink && table.onEnd) {
                 table.onEnd(token, result);
             }
             return result;
         }
     }
-}
-
-qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, uint8_t tag, const char *label,
-                            bool mayBeEmpty, ParmName *name)
-{
-    trace("[%s] nTagID [0x%x]", label, tag);
-    if (qvsResult result = qvsClientProvWbxmlDecoderCheckAttr(decoder, tag)) {
-        return result;
-    }
-    qvsResult result = content(decoder, &name->text);
-    if (result == QVS_OK && !mayBeEmpty && name->text.length == 0) {
-        result = QVS_ERROR_FAILED;
-    }
-    if (result != QVS_OK) {
-        // Silent where not even a part of a name was read.
-        if (mayBeEmpty || name->text.data || result == QVS_ERROR_FAILED) {
-            trace("[%s] pszName NULL", label);
-        }
-        return result;
-    }
-    trace("[%s] pszName [%s]", label, name->text.data ? name->text.data : "");
-    result = qvsClientProvWbxmlDecoderCurAttr(decoder, &name->next);
-    if (result == QVS_OK) {
-        trace("[%s] nID [0x%x]", label, name->next);
-    }
-    return result;
-}
-
-qvsResult qvs::readParmValue(qvsWbxmlDecoder *decoder, char **field)
-{
-    Text value;
-    if (qvsResult result = paramValue(decoder, &value)) {
-        return result;
-    }
-    *field = value.take();
-    return QVS_OK;
-}
-
-char **qvs::findNamed(void *record, const Rows<NamedParm> &names, const char *name)
-{
-    for (const NamedParm &known : names) {
-        if (qvsStrcmp(name, known.name) == 0) {
-            return textAt(record, known.field.number);
-        }
-    }
-    return nullptr;
 }

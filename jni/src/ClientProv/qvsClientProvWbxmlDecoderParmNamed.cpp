@@ -1,6 +1,7 @@
-// The parameters of the characteristics that are named by text, ROAMING, WI-FI and Vodafone VoWiFi.
-// They are all named by text themselves.
+// Parameters whose name is given as text, and the characteristics that have no others and are named
+// by text themselves: ROAMING, WI-FI and Vodafone VoWiFi.
 #include "qvsParm.h"
+#include "qvsstring.h"
 
 using namespace qvs;
 
@@ -87,6 +88,52 @@ qvsResult readNamed(qvsWbxmlDecoder *decoder, void *record, uint8_t tag,
 }
 
 } // namespace
+
+qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, uint8_t tag, const char *label,
+                            bool mayBeEmpty, ParmName *name)
+{
+    trace("[%s] nTagID [0x%x]", label, tag);
+    if (qvsResult result = qvsClientProvWbxmlDecoderCheckAttr(decoder, tag)) {
+        return result;
+    }
+    qvsResult result = content(decoder, &name->text);
+    if (result == QVS_OK && !mayBeEmpty && name->text.length == 0) {
+        result = QVS_ERROR_FAILED;
+    }
+    if (result != QVS_OK) {
+        // Silent where not even a part of a name was read.
+        if (mayBeEmpty || name->text.data || result == QVS_ERROR_FAILED) {
+            trace("[%s] pszName NULL", label);
+        }
+        return result;
+    }
+    trace("[%s] pszName [%s]", label, name->text.data ? name->text.data : "");
+    if (!peekByte(decoder, &name->next)) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    trace("[%s] nID [0x%x]", label, name->next);
+    return QVS_OK;
+}
+
+qvsResult qvs::readParmValue(qvsWbxmlDecoder *decoder, char **field)
+{
+    Text value;
+    if (qvsResult result = paramValue(decoder, &value)) {
+        return result;
+    }
+    *field = value.take();
+    return QVS_OK;
+}
+
+char **qvs::findNamed(void *record, const Rows<NamedParm> &names, const char *name)
+{
+    for (const NamedParm &known : names) {
+        if (qvsStrcmp(name, known.name) == 0) {
+            return textAt(record, known.field.number);
+        }
+    }
+    return nullptr;
+}
 
 constexpr ParmTable qvs::kRoamingParms = {
     .name = kRefusedBy,

@@ -16,12 +16,6 @@ constexpr uint32_t kUnreadTable = 0xFFFFFFFF;
 constexpr uint32_t kLongestTable = 0xFFFFFFFD;
 constexpr uint32_t kMultiByteMax = 5; // bytes of an mb_u_int32
 
-// hardened: a string-table reference costs two bytes and copies a whole string, so 64 KiB could ask
-// for gigabytes. A message may be decoded to this many bytes of text whatever its length, and
-// beyond to this many times its length.
-constexpr uint64_t kTextAlways = 8U << 20U;
-constexpr uint64_t kTextPerByte = 100;
-
 // Counts text that is read or appended. False once there is too much of it.
 bool countText(qvsWbxmlDecoder *decoder, uint32_t count)
 {

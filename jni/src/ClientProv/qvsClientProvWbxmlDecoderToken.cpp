@@ -44,7 +44,7 @@ qvsResult unknownValue(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
 qvsResult readData(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
 {
     if (wbxml::isString(token)) {
-        return getString(decoder, text) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+        return getString(decoder, token, text) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
     }
     uint32_t length = 0;
     return getStrExtension(decoder, token, text, &length) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
@@ -84,14 +84,9 @@ qvsResult skipValue(qvsWbxmlDecoder *decoder, uint8_t token)
 
 } // namespace
 
-bool qvs::getString(qvsWbxmlDecoder *decoder, Text *text)
+bool qvs::getString(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
 {
-    stepBack(decoder);
-    for (;;) {
-        uint8_t token = 0;
-        if (!takeByte(decoder, &token)) {
-            return false;
-        }
+    do {
         bool joined = false;
         switch (token) {
         case wbxml::kStrI:
@@ -111,7 +106,17 @@ bool qvs::getString(qvsWbxmlDecoder *decoder, Text *text)
         if (!joined) {
             return false;
         }
+    } while (takeByte(decoder, &token));
+    return false;
+}
+
+qvsResult qvs::noElement(const qvsWbxmlDecoder *decoder)
+{
+    if (!decoder) {
+        trace("[Error] [qvsClientProvWbxmlDecoderCheckElement] ptWbxmlDecoder NULL");
+        return QVS_ERROR_FAILED;
     }
+    return QVS_ERROR_WBXML_NO_DATA;
 }
 
 qvsResult qvs::content(qvsWbxmlDecoder *decoder, Text *text)
@@ -121,14 +126,7 @@ qvsResult qvs::content(qvsWbxmlDecoder *decoder, Text *text)
 
 qvsResult qvsClientProvWbxmlDecoderReadElement(qvsWbxmlDecoder *decoder, uint8_t *tag)
 {
-    uint8_t byte = 0;
-    if (!takeByte(decoder, &byte)) {
-        return QVS_ERROR_WBXML_NO_DATA;
-    }
-    decoder->nHasContent = (byte & wbxml::kHasContent) ? 1 : 0;
-    decoder->nHasAttr = (byte & wbxml::kHasAttr) ? 1 : 0;
-    *tag = byte & wbxml::kTagMask;
-    return QVS_OK;
+    return takeTag(decoder, tag) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
 }
 
 qvsResult qvsClientProvWbxmlDecoderCurElement(qvsWbxmlDecoder *decoder, uint8_t *tag)
@@ -148,23 +146,7 @@ qvsResult qvsClientProvWbxmlDecoderCurElementNotAND(qvsWbxmlDecoder *decoder, ui
 
 qvsResult qvsClientProvWbxmlDecoderCheckElement(qvsWbxmlDecoder *decoder, uint8_t tag)
 {
-    if (!decoder) {
-        trace("[Error] [qvsClientProvWbxmlDecoderCheckElement] ptWbxmlDecoder NULL");
-        return QVS_ERROR_FAILED;
-    }
-    uint8_t read = 0;
-    if (qvsResult result = qvsClientProvWbxmlDecoderReadElement(decoder, &read)) {
-        return result;
-    }
-    if (read != tag) {
-        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
-    }
-    uint8_t next = 0;
-    if (!decoder->nHasContent && peekByte(decoder, &next) &&
-        (next & wbxml::kTagMask) == wbxml::kEnd) {
-        (void)takeByte(decoder, &next);
-    }
-    return QVS_OK;
+    return checkElement(decoder, tag);
 }
 
 qvsResult qvsClientProvWbxmlDecoderElement(qvsWbxmlDecoder *decoder, uint8_t tag, char **text)
@@ -195,22 +177,14 @@ qvsResult qvsClientProvWbxmlDecoderCurAttr(qvsWbxmlDecoder *decoder, uint8_t *by
 
 qvsResult qvsClientProvWbxmlDecoderCheckAttr(qvsWbxmlDecoder *decoder, uint8_t token)
 {
-    uint8_t read = 0;
-    if (qvsResult result = qvsClientProvWbxmlDecoderReadAttr(decoder, &read)) {
-        return result;
-    }
-    if (read != token) {
-        trace("nId:%x, nTemp:%x", token, read);
-        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
-    }
-    return QVS_OK;
+    return checkAttr(decoder, token);
 }
 
 qvsResult qvsClientProvWbxmlDecoderCheckAttrVersion(qvsWbxmlDecoder *decoder)
 {
     uint8_t read = 0;
-    if (qvsResult result = qvsClientProvWbxmlDecoderReadAttr(decoder, &read)) {
-        return result;
+    if (!takeByte(decoder, &read)) {
+        return QVS_ERROR_WBXML_NO_DATA;
     }
     if (read != attr::kVersion && read != attr::kVersion10) {
         trace("[Error] [qvsClientProvWbxmlDecoderCheckAttrVersion] nId [0x%x]", read);
@@ -225,8 +199,8 @@ qvsResult qvsClientProvWbxmlDecoderAttributeWapDocVersion(qvsWbxmlDecoder *decod
         return result;
     }
     uint8_t next = 0;
-    if (qvsResult result = qvsClientProvWbxmlDecoderCurElement(decoder, &next)) {
-        return result;
+    if (!peekTag(decoder, &next)) {
+        return QVS_ERROR_WBXML_NO_DATA;
     }
     if (next != wbxml::kEnd && next != wbxml::kStrI) {
         trace("Tag Code = QVS_ERROR_WBXML_UNKNOWN_ELEMENT");
@@ -253,8 +227,7 @@ qvsResult qvsClientProvWbxmlDecoderCheckCodePage(qvsWbxmlDecoder *decoder)
     // kept[page-masked]: both bytes are read as element tokens: the first is not verified, the page
     // is masked, and the flags of the decoder become those of the page byte.
     uint8_t page = 0;
-    if (qvsClientProvWbxmlDecoderReadElement(decoder, &page) != QVS_OK ||
-        qvsClientProvWbxmlDecoderReadElement(decoder, &page) != QVS_OK) {
+    if (!takeTag(decoder, &page) || !takeTag(decoder, &page)) {
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
     switch (page) {
@@ -282,8 +255,13 @@ qvsResult qvsClientProvWbxmlDecoderContent(qvsWbxmlDecoder *decoder, char **text
 
 uint32_t qvsClientProvWbxmlDecoderGetString(qvsWbxmlDecoder *decoder, char **text)
 {
+    uint8_t token = 0;
+    stepBack(decoder);
+    if (!takeByte(decoder, &token)) {
+        return 0;
+    }
     Text built(*text);
-    const bool read = getString(decoder, &built);
+    const bool read = getString(decoder, token, &built);
     *text = built.take();
     return read ? 1 : 0;
 }

@@ -1,5 +1,5 @@
-// The values of parameters: the value tokens and how their texts join, a single value, a list of
-// values, and the comma join. Tokens are those of the OMA Client Provisioning content.
+// The values of parameters: the value tokens, how their texts join, and the comma join. Tokens are
+// those of the OMA Client Provisioning content.
 #include "qvsClientProvWbxmlDecoder.h"
 #include "qvsText.h"
 #include "qvsTokens.h"
@@ -119,78 +119,6 @@ bool joinText(qvsWbxmlDecoder *decoder, Text *text, const char *added, Join join
     return true;
 }
 
-// Reads NAME and VALUE of one parameter onto `text`.
-qvsResult readPair(qvsWbxmlDecoder *decoder, Text *text, uint8_t token)
-{
-    if (qvsResult result = qvsClientProvWbxmlDecoderCheckAttr(decoder, token)) {
-        return result;
-    }
-    uint8_t next = 0;
-    qvsResult result = qvsClientProvWbxmlDecoderCurAttr(decoder, &next);
-    if (result == QVS_OK) {
-        switch (next) {
-        case wbxml::kEnd:
-            text->before = nullptr;
-            trace("DecoderParam : Value is NULL\n");
-            break;
-        case wbxml::kSwitchPage:
-            (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
-            result = paramValue(decoder, text);
-            break;
-        case attr::kValue:
-            result = paramValue(decoder, text);
-            break;
-        default:
-            trace("DecoderParam : Tag Code [%d] = QVS_ERROR_WBXML_UNKNOWN_ELEMENT\n", next);
-            result = QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
-            break;
-        }
-    }
-    trace("qvsClientProvWbxmlDecoderParamString Error Code:%d", static_cast<int>(result));
-    return result;
-}
-
-// Adds a text to a list of texts, which is made when there is none. A null text adds nothing.
-// The list takes the text over.
-qvsResult addText(qvsList **list, char *text)
-{
-    if (!*list) {
-        if (qvsListCreate(list, text) == QVS_OK) {
-            return QVS_OK;
-        }
-        trace("[Error] [qvsClientProvWbxmlDecoderParamListString] ptTmpList NULL");
-    } else if (!text || qvsListAddNodeLast(*list, text) == QVS_OK) {
-        return QVS_OK;
-    }
-    qvsMemFree_debug(text);
-    return QVS_ERROR_FAILED;
-}
-
-// Reads the pairs up to END into `*list`. A later pair of the same element continues the text of
-// the one before it in an item of its own.
-qvsResult readPairs(qvsWbxmlDecoder *decoder, qvsList **list)
-{
-    const char *last = nullptr;
-    for (;;) {
-        uint8_t token = 0;
-        if (qvsResult result = qvsClientProvWbxmlDecoderCurElementNotAND(decoder, &token)) {
-            return result;
-        }
-        if (token == wbxml::kEnd) {
-            return QVS_OK;
-        }
-        Text text;
-        text.before = last;
-        if (qvsResult result = readPair(decoder, &text, token)) {
-            return result;
-        }
-        last = text.data ? text.data : text.before;
-        if (qvsResult result = addText(list, text.take())) {
-            return result;
-        }
-    }
-}
-
 } // namespace
 
 qvsResult qvs::getParamTokenVal(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
@@ -210,17 +138,21 @@ qvsResult qvs::getParamTokenVal(qvsWbxmlDecoder *decoder, uint8_t token, Text *t
 
 qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, Text *text)
 {
-    if (qvsResult result = qvsClientProvWbxmlDecoderCheckAttr(decoder, attr::kValue)) {
+    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
         return result;
     }
     uint8_t next = 0;
-    qvsResult result = qvsClientProvWbxmlDecoderCurAttr(decoder, &next);
-    if (result == QVS_OK && next == wbxml::kSwitchPage) {
+    bool present = peekByte(decoder, &next);
+    if (present && next == wbxml::kSwitchPage) {
         (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
-        result = qvsClientProvWbxmlDecoderCurElement(decoder, &next);
+        present = peekByte(decoder, &next);
+        next &= wbxml::kTagMask;
     }
-    if (result != QVS_OK || next == wbxml::kEnd) {
-        return result;
+    if (!present) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    if (next == wbxml::kEnd) {
+        return QVS_OK;
     }
     return content(decoder, text);
 }
@@ -238,29 +170,6 @@ qvsResult qvsClientProvWbxmlDecoderParamValue(qvsWbxmlDecoder *decoder, char **t
     Text built(*text);
     const qvsResult result = paramValue(decoder, &built);
     *text = built.take();
-    return result;
-}
-
-qvsResult qvsClientProvWbxmlDecoderParamString(qvsWbxmlDecoder *decoder, char **text, uint8_t token)
-{
-    Text read;
-    if (qvsResult result = readPair(decoder, &read, token)) {
-        return result;
-    }
-    *text = read.take(); // kept[repeated-parm]: the text that was there stays allocated.
-    return QVS_OK;
-}
-
-qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvsList **list,
-                                                   uint8_t /*token*/)
-{
-    qvsList *built = *list;
-    const qvsResult result = readPairs(decoder, &built);
-    if (result == QVS_OK) {
-        *list = built;
-    } else if (!*list) {
-        (void)qvsListDeleteNodeAllAndList(built, nullptr);
-    }
     return result;
 }
 

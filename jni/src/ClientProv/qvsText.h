@@ -3,14 +3,22 @@
 #define QVSTEXT_H
 
 #include "qvsClientProvWbxml.h"
+#include "qvsTokens.h"
 #include "qvsmemory.h"
 #include "qvsstring.h"
+#include "qvstrace.h"
 
 #include <stddef.h>
 #include <stdint.h>
 #include <string.h>
 
 namespace [[gnu::visibility("hidden")]] qvs {
+
+// hardened: a string-table reference costs two bytes and copies a whole string, so 64 KiB could ask
+// for gigabytes. A message may be decoded to this many bytes of text whatever its length, and
+// beyond to this many times its length.
+constexpr uint64_t kTextAlways = 8U << 20U;
+constexpr uint64_t kTextPerByte = 100;
 
 // A text that grows at its end. Its block is exactly as long as the text until the second append,
 // from then on it doubles, so that a text made of many pieces costs no more than its length.
@@ -31,7 +39,12 @@ struct Text {
     }
     Text(const Text &) = delete;
     Text &operator=(const Text &) = delete;
-    ~Text() { qvsMemFree_debug(data); }
+    ~Text()
+    {
+        if (data) {
+            qvsMemFree_debug(data);
+        }
+    }
 
     [[nodiscard]] char *take()
     {
@@ -81,10 +94,14 @@ inline uint32_t bytesLeft(const qvsWbxmlDecoder *decoder)
 
 inline bool peekByte(const qvsWbxmlDecoder *decoder, uint8_t *byte)
 {
-    if (bytesLeft(decoder) == 0) {
+    if (!decoder || !decoder->ptBuffer) {
         return false;
     }
-    *byte = *decoder->ptBuffer->pHead;
+    const smlBuffer *buffer = decoder->ptBuffer;
+    if (static_cast<size_t>(buffer->pHead - buffer->pStorage) >= buffer->nSize) {
+        return false;
+    }
+    *byte = *buffer->pHead;
     return true;
 }
 
@@ -95,6 +112,67 @@ inline bool takeByte(qvsWbxmlDecoder *decoder, uint8_t *byte)
     }
     ++decoder->ptBuffer->pHead;
     return true;
+}
+
+// Looks at an element token, without its flags.
+inline bool peekTag(const qvsWbxmlDecoder *decoder, uint8_t *tag)
+{
+    const bool present = peekByte(decoder, tag);
+    *tag &= wbxml::kTagMask;
+    return present;
+}
+
+// Takes the element token that was seen, whose flags the decoder keeps.
+inline uint8_t takeSeenTag(qvsWbxmlDecoder *decoder)
+{
+    const uint8_t byte = *decoder->ptBuffer->pHead++;
+    decoder->nHasContent = (byte & wbxml::kHasContent) ? 1 : 0;
+    decoder->nHasAttr = (byte & wbxml::kHasAttr) ? 1 : 0;
+    return byte & wbxml::kTagMask;
+}
+
+// Takes an element token.
+inline bool takeTag(qvsWbxmlDecoder *decoder, uint8_t *tag)
+{
+    if (!peekByte(decoder, tag)) {
+        return false;
+    }
+    *tag = takeSeenTag(decoder);
+    return true;
+}
+
+// Why there is no element token to take.
+qvsResult noElement(const qvsWbxmlDecoder *decoder);
+
+// Takes an element token, which has to be `tag`, and the END behind an element without content.
+inline qvsResult checkElement(qvsWbxmlDecoder *decoder, uint8_t tag)
+{
+    uint8_t read = 0;
+    if (!takeTag(decoder, &read)) {
+        return noElement(decoder);
+    }
+    if (read != tag) {
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    uint8_t next = 0;
+    if (!decoder->nHasContent && peekTag(decoder, &next) && next == wbxml::kEnd) {
+        ++decoder->ptBuffer->pHead;
+    }
+    return QVS_OK;
+}
+
+// Takes an attribute start, which has to be `token`.
+inline qvsResult checkAttr(qvsWbxmlDecoder *decoder, uint8_t token)
+{
+    uint8_t read = 0;
+    if (!takeByte(decoder, &read)) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    if (read != token) {
+        trace("nId:%x, nTemp:%x", token, read);
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    return QVS_OK;
 }
 
 // Gives the byte read last back.
@@ -111,7 +189,7 @@ inline void stepBack(qvsWbxmlDecoder *decoder)
 bool getStr(qvsWbxmlDecoder *decoder, Text *text);
 bool getStrTable(qvsWbxmlDecoder *decoder, Text *text);
 bool getStrExtension(qvsWbxmlDecoder *decoder, uint8_t token, Text *text, uint32_t *length);
-bool getString(qvsWbxmlDecoder *decoder, Text *text);
+bool getString(qvsWbxmlDecoder *decoder, uint8_t token, Text *text); // from `token` on, just read
 qvsResult content(qvsWbxmlDecoder *decoder, Text *text);
 qvsResult getParamTokenVal(qvsWbxmlDecoder *decoder, uint8_t token, Text *text);
 qvsResult paramValue(qvsWbxmlDecoder *decoder, Text *text);

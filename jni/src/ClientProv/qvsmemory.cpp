@@ -23,8 +23,6 @@ static_assert(sizeof(void *) != 4 || kEntries * sizeof(Entry) == 32000);
 // four bytes behind the terminator.
 constexpr size_t kSpareZeros = 4;
 
-constexpr uint32_t kClearedByHand = 512;
-
 Entry *entries; // null while tracking is off
 
 // Free entries are those of the address null.
@@ -58,32 +56,51 @@ void forget(const void *block)
     *entry = {};
 }
 
-// The block, remembered if there is one and tracking is on.
-template <class T>
-T *tracked(T *block, uint32_t size, const char *file, int line)
+// The block, remembered if there is one.
+void *remembered(void *block, uint32_t size, const char *file, int line)
 {
-    if (entries && block) {
+    if (block) {
         remember(block, size, file, line);
+    }
+    return block;
+}
+
+// Blocks up to this size come from a cache of the C library's that calloc passes by.
+constexpr uint32_t kClearedByHand = 512;
+
+void *cleared(uint32_t size)
+{
+    if (size > kClearedByHand) {
+        return calloc(1, size);
+    }
+    void *block = malloc(size);
+    asm("" : "+r"(block)); // keeps a compiler from making a calloc of the two
+    return block ? memset(block, 0, size) : nullptr;
+}
+
+char *copyOf(const char *str, size_t length)
+{
+    char *block = static_cast<char *>(malloc(length + 1 + kSpareZeros));
+    if (block) {
+        memcpy(block, str, length);
+        // hardened: four zero bytes follow the terminator.
+        memset(block + length, 0, 1 + kSpareZeros);
     }
     return block;
 }
 
 } // namespace
 
+// Without tracking each of these is the C library's function and one test.
+
 void *qvsMemAlloc_debug(uint32_t size, const char *file, int line)
 {
-    return tracked(malloc(size), size, file, line);
+    return entries ? remembered(malloc(size), size, file, line) : malloc(size);
 }
 
 void *qvsMemAllocSetZero_debug(uint32_t size, const char *file, int line)
 {
-    // Small blocks come from a cache of the C library's that calloc passes by.
-    if (size <= kClearedByHand) {
-        void *block = malloc(size);
-        asm("" : "+r"(block)); // keeps a compiler from making a calloc of the two
-        return tracked(block ? memset(block, 0, size) : nullptr, size, file, line);
-    }
-    return tracked(calloc(1, size), size, file, line);
+    return entries ? remembered(cleared(size), size, file, line) : cleared(size);
 }
 
 uint16_t *qvsMemAllocW_debug(uint32_t count, const char *file, int line)
@@ -92,9 +109,9 @@ uint16_t *qvsMemAllocW_debug(uint32_t count, const char *file, int line)
     if (count > UINT32_MAX / sizeof(uint16_t)) {
         return nullptr;
     }
-    uint16_t *block = static_cast<uint16_t *>(malloc(count * sizeof(uint16_t)));
+    void *block = malloc(count * sizeof(uint16_t));
     // kept[memcheck-unit-count]: the size that is remembered is the count of units, not of bytes.
-    return tracked(block, count, file, line);
+    return static_cast<uint16_t *>(entries ? remembered(block, count, file, line) : block);
 }
 
 char *qvsStrdup_debug(const char *str, const char *file, int line)
@@ -104,15 +121,12 @@ char *qvsStrdup_debug(const char *str, const char *file, int line)
         return nullptr;
     }
     const size_t length = strlen(str);
-    char *block = static_cast<char *>(malloc(length + 1 + kSpareZeros));
-    if (!block) {
-        return nullptr;
+    if (!entries) {
+        return copyOf(str, length);
     }
-    memcpy(block, str, length);
-    // hardened: four zero bytes follow the terminator.
-    memset(block + length, 0, 1 + kSpareZeros);
     // kept[memcheck-text-length]: the size that is remembered leaves the terminator out.
-    return tracked(block, static_cast<uint32_t>(length), file, line);
+    return static_cast<char *>(
+        remembered(copyOf(str, length), static_cast<uint32_t>(length), file, line));
 }
 
 void *qvsMemDup_debug(const void *src, uint32_t size, const char *file, int line)
@@ -127,7 +141,7 @@ void *qvsMemDup_debug(const void *src, uint32_t size, const char *file, int line
         return nullptr;
     }
     memcpy(block, src, size);
-    return tracked(block, size, file, line);
+    return entries ? remembered(block, size, file, line) : block;
 }
 
 void *qvsMemReAlloc_debug(void *old, uint32_t newsize, const char *file, int line)

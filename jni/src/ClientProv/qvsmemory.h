@@ -78,7 +78,12 @@ struct ScopedText {
     ScopedText() = default;
     ScopedText(const ScopedText &) = delete;
     ScopedText &operator=(const ScopedText &) = delete;
-    ~ScopedText() { qvsMemFree_debug(text); }
+    ~ScopedText()
+    {
+        if (text) {
+            qvsMemFree_debug(text);
+        }
+    }
 
     char *take()
     {

@@ -40,6 +40,12 @@ bool holdsItsData(const smlBuffer *buffer)
     return offset <= buffer->nCapacity && buffer->nSize <= buffer->nCapacity - offset;
 }
 
+// What a buffer grows by when `wanted` bytes are.
+uint32_t grownBy(uint32_t wanted)
+{
+    return wanted > kLeastGrowth ? wanted : kLeastGrowth;
+}
+
 void place(smlBuffer *buffer, uint32_t offset, uint32_t size)
 {
     buffer->pHead = buffer->pStorage + offset;
@@ -79,6 +85,22 @@ void move(uint8_t *to, const uint8_t *from, uint32_t count)
 }
 
 } // namespace
+
+qvsResult qvs::makeBuffer(smlBuffer **buffer, const uint8_t *data, uint32_t length)
+{
+    // As an empty buffer of this length would have grown for the data.
+    if (length > UINT32_MAX / 2 - kAppendSpare) {
+        *buffer = nullptr;
+        return QVS_ERROR_NO_MEMORY;
+    }
+    const uint32_t growth = grownBy(length + kAppendSpare);
+    if (qvsResult result = smlBufferCreate(buffer, length ? length + growth : 0)) {
+        return result;
+    }
+    move((*buffer)->pStorage, data, length);
+    place(*buffer, 0, length);
+    return QVS_OK;
+}
 
 qvsResult smlBufferCreate(smlBuffer **buffer, uint32_t capacity)
 {
@@ -173,7 +195,7 @@ qvsResult smlBufferRealloc(smlBuffer *buffer, uint32_t wanted)
     if (buffer->bOutside) {
         return QVS_ERROR_BUFFER_OUTSIDE;
     }
-    const uint32_t growth = wanted > kLeastGrowth ? wanted : kLeastGrowth;
+    const uint32_t growth = grownBy(wanted);
     // hardened: a capacity beyond 32 bits cannot be had.
     if (growth > UINT32_MAX - buffer->nCapacity) {
         return QVS_ERROR_NO_MEMORY;

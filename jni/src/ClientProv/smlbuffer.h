@@ -91,4 +91,15 @@ QVS_API uint32_t smlBufferGetRemainSize(const smlBuffer *buffer);
 
 QVS_END_DECLS
 
+#ifdef __cplusplus
+namespace [[gnu::visibility("hidden")]] qvs {
+
+// Makes a buffer, which the caller owns, that holds `length` bytes of `data` as if they had been
+// appended to an empty one of that capacity, with one block instead of two. QVS_ERROR_NO_MEMORY
+// with *buffer null without memory.
+QVS_NODISCARD qvsResult makeBuffer(smlBuffer **buffer, const uint8_t *data, uint32_t length);
+
+} // namespace qvs
+#endif
+
 #endif
