@@ -3,6 +3,7 @@
 #include "qvsClientProvWbxmlDecoder.h"
 #include "qvsmemory.h"
 #include "qvspushhandler.h"
+#include "qvstrace.h"
 
 #include <gtest/gtest.h>
 
@@ -54,7 +55,31 @@ TEST_F(Library, ExportsEveryListedName)
     for (std::string name; std::getline(names, name); ++count) {
         EXPECT_NE(find(name.c_str()), nullptr) << name;
     }
-    EXPECT_EQ(count, 243U);
+    EXPECT_EQ(count, 244U);
+}
+
+std::vector<std::string> traced;
+
+TEST_F(Library, HandsItsTracesToASinkUntilThatIsTakenAway)
+{
+    const auto setSink = EXPORTED(qvcTraceSetSink);
+    const auto decode = EXPORTED(qvsClinetProvWbxmlDecoderMain);
+    const uint8_t body[] = {3, 11, 0x6A, 0, 0x04};
+    traced.clear();
+    EXPECT_EQ(decode(body, sizeof body), nullptr);
+    EXPECT_TRUE(traced.empty());
+    setSink([](const char *text, uint32_t length) { traced.emplace_back(text, length); });
+    EXPECT_EQ(decode(body, sizeof body), nullptr);
+    setSink(nullptr);
+    EXPECT_EQ(decode(body, sizeof body), nullptr);
+    const std::vector<std::string> once = {
+        "Unknown Element[4]\n",
+        "WBXML Decode Error[1005]\n",
+        "[Syncml] ERROR : DM = fffff005\n",
+        "ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlDecoder[0x1005]\n\n",
+        "[Syncml] ERROR : 2\n",
+    };
+    EXPECT_EQ(traced, once);
 }
 
 TEST_F(Library, KeepsTheNativeMethodsToItself)

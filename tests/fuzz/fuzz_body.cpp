@@ -75,9 +75,9 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size)
     const BodyReading expected = readBody(data, size);
     decode(input, expected);
     const std::string first = makeContext(input, expected);
-    qvs::traceSink = checkTrace;
+    qvcTraceSetSink(checkTrace);
     const std::string second = makeContext(input, expected);
-    qvs::traceSink = nullptr;
+    qvcTraceSetSink(nullptr);
     check(first == second, "what was accepted says the same when parsed again", first, "\n\n",
           second);
     input.checkUnchanged(Input(data, size));

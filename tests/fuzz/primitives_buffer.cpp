@@ -185,7 +185,7 @@ void checkTrace(const char *text, uint32_t length)
 
 void traces(const std::string &text, const Bytes &bytes, uint32_t code)
 {
-    qvs::traceSink = checkTrace;
+    qvcTraceSetSink(checkTrace);
     qvcTrace("%s length:%d", text.c_str(), static_cast<int>(bytes.size()));
     qvcTraceError(code);
     qvcTraceFunction(text.c_str());
@@ -197,7 +197,7 @@ void traces(const std::string &text, const Bytes &bytes, uint32_t code)
     check(strlen(_szBuffer) ==
               4 * bytes.size() + (bytes.empty() ? 0 : 5 * ((bytes.size() - 1) / 16)),
           "a dump has a place for every byte");
-    qvs::traceSink = nullptr;
+    qvcTraceSetSink(nullptr);
 }
 
 } // namespace

@@ -13,16 +13,16 @@ public:
     Traces() : before(qvs::traceSink), outer(current)
     {
         current = this;
-        qvs::traceSink = [](const char *text, uint32_t length) {
+        qvcTraceSetSink([](const char *text, uint32_t length) {
             current->texts.emplace_back(text, length);
             current->terminated = current->terminated && std::strlen(text) == length;
-        };
+        });
     }
     Traces(const Traces &) = delete;
     Traces &operator=(const Traces &) = delete;
     ~Traces()
     {
-        qvs::traceSink = before;
+        qvcTraceSetSink(before);
         current = outer;
     }
 
@@ -41,7 +41,7 @@ public:
 
 private:
     static inline Traces *current = nullptr;
-    qvs::TraceSink before;
+    qvcTraceSink before;
     Traces *outer;
 };
 

@@ -8,15 +8,36 @@ using namespace qvs;
 
 namespace {
 
-struct ReleaseKind;
+// The kinds of record, and of what a field owns: a text, or the chain of a kind.
+enum Kind : uint8_t {
+    kStrNode,
+    kPort,
+    kNapAuthInfo,
+    kValidity,
+    kAppAddr,
+    kAppAuth,
+    kResource,
+    kPxAuthInfo,
+    kPxPhysical,
+    kAccess,
+    kApplication,
+    kBootstrap,
+    kNapDef,
+    kPxLogical,
+    kVendorConfig,
+    kWifi,
+    kVoWifi,
+    kClientIdent,
+    kContext,
+    kText,
+};
 
-// A field that a record owns: a text, or the head of a chain of records of a kind.
 struct ReleaseRow {
-    consteval ReleaseRow(TextField f) : field(f.number) {}
-    consteval ReleaseRow(RecordField f, const ReleaseKind &k) : field(f.number), chain(&k) {}
+    consteval ReleaseRow(TextField f) : field(f.number), owns(kText) {}
+    consteval ReleaseRow(RecordField f, Kind chain) : field(f.number), owns(chain) {}
 
     uint8_t field;
-    const ReleaseKind *chain = nullptr;
+    Kind owns;
 };
 
 // One kind of record: what it owns, in the order in which that is released.
@@ -45,7 +66,7 @@ namespace port {
 using R = qvsCtxPort;
 constexpr ReleaseRow kRows[] = {
     {QVS_FIELD(R, pszPortNbr)},
-    {QVS_FIELD(R, ptService), strNode::kRelease},
+    {QVS_FIELD(R, ptService), kStrNode},
 };
 constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 } // namespace port
@@ -57,7 +78,7 @@ constexpr ReleaseRow kRows[] = {
     {QVS_FIELD(R, pszAuthName)},
     {QVS_FIELD(R, pszAuthSecret)},
     {QVS_FIELD(R, pszReserved)},
-    {QVS_FIELD(R, ptAuthEntity), strNode::kRelease},
+    {QVS_FIELD(R, ptAuthEntity), kStrNode},
 };
 constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 } // namespace napAuthInfo
@@ -76,7 +97,7 @@ using R = qvsCtxAppAddr;
 constexpr ReleaseRow kRows[] = {
     {QVS_FIELD(R, pszAddr)},
     {QVS_FIELD(R, pszAddrType)},
-    {QVS_FIELD(R, ptPort), port::kRelease},
+    {QVS_FIELD(R, ptPort), kPort},
 };
 constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 } // namespace appAddr
@@ -113,16 +134,11 @@ constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 namespace pxPhysical {
 using R = qvsCtxPxPhysical;
 constexpr ReleaseRow kRows[] = {
-    {QVS_FIELD(R, pszPhysicalProxyId)},
-    {QVS_FIELD(R, pszPxAddr)},
-    {QVS_FIELD(R, pszPxAddrType)},
-    {QVS_FIELD(R, pszPxAddrFqdn)},
-    {QVS_FIELD(R, pszWspVersion)},
-    {QVS_FIELD(R, pszPushEnabled)},
-    {QVS_FIELD(R, pszPullEnabled)},
-    {QVS_FIELD(R, ptToNapId), strNode::kRelease},
-    {QVS_FIELD(R, ptDomain), strNode::kRelease},
-    {QVS_FIELD(R, ptPort), port::kRelease},
+    {QVS_FIELD(R, pszPhysicalProxyId)}, {QVS_FIELD(R, pszPxAddr)},
+    {QVS_FIELD(R, pszPxAddrType)},      {QVS_FIELD(R, pszPxAddrFqdn)},
+    {QVS_FIELD(R, pszWspVersion)},      {QVS_FIELD(R, pszPushEnabled)},
+    {QVS_FIELD(R, pszPullEnabled)},     {QVS_FIELD(R, ptToNapId), kStrNode},
+    {QVS_FIELD(R, ptDomain), kStrNode}, {QVS_FIELD(R, ptPort), kPort},
 };
 constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 } // namespace pxPhysical
@@ -130,9 +146,9 @@ constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 namespace access {
 using R = qvsCtxAccess;
 constexpr ReleaseRow kRows[] = {
-    {QVS_FIELD(R, ptAppId), strNode::kRelease},   {QVS_FIELD(R, ptDomain), strNode::kRelease},
-    {QVS_FIELD(R, ptPortNbr), strNode::kRelease}, {QVS_FIELD(R, ptRule), strNode::kRelease},
-    {QVS_FIELD(R, ptToNapId), strNode::kRelease}, {QVS_FIELD(R, ptToProxy), strNode::kRelease},
+    {QVS_FIELD(R, ptAppId), kStrNode},   {QVS_FIELD(R, ptDomain), kStrNode},
+    {QVS_FIELD(R, ptPortNbr), kStrNode}, {QVS_FIELD(R, ptRule), kStrNode},
+    {QVS_FIELD(R, ptToNapId), kStrNode}, {QVS_FIELD(R, ptToProxy), kStrNode},
 };
 constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 } // namespace access
@@ -147,12 +163,12 @@ constexpr ReleaseRow kRows[] = {
     {QVS_FIELD(R, pszProviderId)},
     {QVS_FIELD(R, pszFrom)},
     {QVS_FIELD(R, pszInternet)},
-    {QVS_FIELD(R, ptToAddr), strNode::kRelease},
-    {QVS_FIELD(R, ptToNapId), strNode::kRelease},
-    {QVS_FIELD(R, ptToProxy), strNode::kRelease},
-    {QVS_FIELD(R, ptAppAddr), appAddr::kRelease},
-    {QVS_FIELD(R, ptAppAuth), appAuth::kRelease},
-    {QVS_FIELD(R, ptResource), resource::kRelease},
+    {QVS_FIELD(R, ptToAddr), kStrNode},
+    {QVS_FIELD(R, ptToNapId), kStrNode},
+    {QVS_FIELD(R, ptToProxy), kStrNode},
+    {QVS_FIELD(R, ptAppAddr), kAppAddr},
+    {QVS_FIELD(R, ptAppAuth), kAppAuth},
+    {QVS_FIELD(R, ptResource), kResource},
 };
 // kept[context-application-left]: the XCAP texts and the ROAMING records stay allocated.
 constexpr ReleaseKind kRelease =
@@ -167,8 +183,8 @@ constexpr ReleaseRow kRows[] = {
     {QVS_FIELD(R, pszCountry)},
     {QVS_FIELD(R, pszName)},
     {QVS_FIELD(R, pszProvUrl)},
-    {QVS_FIELD(R, ptNetwork), strNode::kRelease},
-    {QVS_FIELD(R, ptProxyId), strNode::kRelease},
+    {QVS_FIELD(R, ptNetwork), kStrNode},
+    {QVS_FIELD(R, ptProxyId), kStrNode},
 };
 constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 } // namespace bootstrap
@@ -203,10 +219,10 @@ constexpr ReleaseRow kRows[] = {
     {QVS_FIELD(R, pszFirstRetryTimeout)},
     {QVS_FIELD(R, pszReregThreshold)},
     {QVS_FIELD(R, pszTBit)},
-    {QVS_FIELD(R, ptDnsAddr), strNode::kRelease},
-    {QVS_FIELD(R, ptBearer), strNode::kRelease},
-    {QVS_FIELD(R, ptNapAuthInfo), napAuthInfo::kRelease},
-    {QVS_FIELD(R, ptValidity), validity::kRelease},
+    {QVS_FIELD(R, ptDnsAddr), kStrNode},
+    {QVS_FIELD(R, ptBearer), kStrNode},
+    {QVS_FIELD(R, ptNapAuthInfo), kNapAuthInfo},
+    {QVS_FIELD(R, ptValidity), kValidity},
 };
 // kept[context-init-left]: the copy of INIT stays allocated.
 constexpr ReleaseKind kRelease = releaseOf<R>(kRows, leave(&R::pszInit));
@@ -228,10 +244,10 @@ constexpr ReleaseRow kRows[] = {
     {QVS_FIELD(R, pszReserved3)},
     {QVS_FIELD(R, pszReserved4)},
     {QVS_FIELD(R, pszReserved5)},
-    {QVS_FIELD(R, ptDomain), strNode::kRelease},
-    {QVS_FIELD(R, ptPort), port::kRelease},
-    {QVS_FIELD(R, ptPxAuthInfo), pxAuthInfo::kRelease},
-    {QVS_FIELD(R, ptPxPhysical), pxPhysical::kRelease},
+    {QVS_FIELD(R, ptDomain), kStrNode},
+    {QVS_FIELD(R, ptPort), kPort},
+    {QVS_FIELD(R, ptPxAuthInfo), kPxAuthInfo},
+    {QVS_FIELD(R, ptPxPhysical), kPxPhysical},
 };
 constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 } // namespace pxLogical
@@ -276,14 +292,14 @@ constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 namespace context {
 using R = qvsClientProvCtx;
 constexpr ReleaseRow kRows[] = {
-    {QVS_FIELD(R, ptAccess), access::kRelease},
-    {QVS_FIELD(R, ptApplication), application::kRelease},
-    {QVS_FIELD(R, ptBootstrap), bootstrap::kRelease},
-    {QVS_FIELD(R, ptClientIdent), clientIdent::kRelease},
-    {QVS_FIELD(R, ptNapDef), napDef::kRelease},
-    {QVS_FIELD(R, ptPxLogical), pxLogical::kRelease},
-    {QVS_FIELD(R, ptVendorConfig), vendorConfig::kRelease},
-    {QVS_FIELD(R, ptVoWifi), voWifi::kRelease},
+    {QVS_FIELD(R, ptAccess), kAccess},
+    {QVS_FIELD(R, ptApplication), kApplication},
+    {QVS_FIELD(R, ptBootstrap), kBootstrap},
+    {QVS_FIELD(R, ptClientIdent), kClientIdent},
+    {QVS_FIELD(R, ptNapDef), kNapDef},
+    {QVS_FIELD(R, ptPxLogical), kPxLogical},
+    {QVS_FIELD(R, ptVendorConfig), kVendorConfig},
+    {QVS_FIELD(R, ptVoWifi), kVoWifi},
 };
 // kept[context-wifi-left]: the WIFI records stay allocated when the context is gone.
 // kept[context-napdef-skipped]: NAPDEF records before the one that ptNapDef was moved to stay
@@ -291,7 +307,17 @@ constexpr ReleaseRow kRows[] = {
 constexpr ReleaseKind kRelease = releaseOf<R>(kRows, leave(&R::ptWifi));
 } // namespace context
 
-void releaseChain(void *first, const ReleaseKind &kind);
+// In the order of Kind.
+constexpr ReleaseKind kReleases[] = {
+    strNode::kRelease,    port::kRelease,        napAuthInfo::kRelease,  validity::kRelease,
+    appAddr::kRelease,    appAuth::kRelease,     resource::kRelease,     pxAuthInfo::kRelease,
+    pxPhysical::kRelease, access::kRelease,      application::kRelease,  bootstrap::kRelease,
+    napDef::kRelease,     pxLogical::kRelease,   vendorConfig::kRelease, wifi::kRelease,
+    voWifi::kRelease,     clientIdent::kRelease, context::kRelease,
+};
+static_assert(sizeof kReleases / sizeof *kReleases == kText);
+
+void releaseChain(void *first, Kind of);
 
 // Releases what a record owns. Kinds do not nest in themselves, so this goes a few levels deep.
 void releaseRows(void *record, const ReleaseKind &kind)
@@ -301,10 +327,10 @@ void releaseRows(void *record, const ReleaseKind &kind)
         if (!owned) {
             continue;
         }
-        if (row.chain) {
-            releaseChain(owned, *row.chain);
+        if (row.owns == kText) {
+            freeBlock(owned);
         } else {
-            qvsMemFree_debug(owned);
+            releaseChain(owned, row.owns);
         }
     }
 }
@@ -312,15 +338,16 @@ void releaseRows(void *record, const ReleaseKind &kind)
 // Releases the records of a chain with what they own.
 // Strips every record from the first to the last, then releases the records from the
 // last to the first. The links, turned round on the way there, lead the way back.
-void releaseChain(void *first, const ReleaseKind &kind)
+void releaseChain(void *first, Kind of)
 {
+    const ReleaseKind &kind = kReleases[of];
     if (!first) {
         traceError(QVS_ERROR_BAD_ARGUMENT);
         return;
     }
     if (kind.link == kNoField) {
         releaseRows(first, kind);
-        qvsMemFree_debug(first);
+        freeBlock(first);
         return;
     }
     void *stripped = nullptr;
@@ -334,7 +361,7 @@ void releaseChain(void *first, const ReleaseKind &kind)
     while (stripped) {
         void *record = stripped;
         stripped = pointerAt(record, kind.link);
-        qvsMemFree_debug(record);
+        freeBlock(record);
     }
 }
 
@@ -354,155 +381,155 @@ qvsClientProvCtx *qvsClientProvCtxMakeContext(qvsWapDoc *document)
 
 void qvsClientProvCtxDelectContext(qvsClientProvCtx *root)
 {
-    releaseChain(root, context::kRelease);
+    releaseChain(root, kContext);
 }
 
 void qvsClientProvCtxDelectContextRuleList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextAppIdList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextPortNbrList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextDomainList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextToNapIdList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextToProxyList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextToAddrList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextServiceList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextNetworkList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextProxyIdList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextDnsAddrList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextBearerList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextAuthEntityList(qvsCtxStrNode *node)
 {
-    releaseChain(node, strNode::kRelease);
+    releaseChain(node, kStrNode);
 }
 
 void qvsClientProvCtxDelectContextPort(qvsCtxPort *record)
 {
-    releaseChain(record, port::kRelease);
+    releaseChain(record, kPort);
 }
 
 void qvsClientProvCtxDelectContextNapAuthInfo(qvsCtxNapAuthInfo *record)
 {
-    releaseChain(record, napAuthInfo::kRelease);
+    releaseChain(record, kNapAuthInfo);
 }
 
 void qvsClientProvCtxDelectContextValidity(qvsCtxValidity *record)
 {
-    releaseChain(record, validity::kRelease);
+    releaseChain(record, kValidity);
 }
 
 void qvsClientProvCtxDelectContextAppAddr(qvsCtxAppAddr *record)
 {
-    releaseChain(record, appAddr::kRelease);
+    releaseChain(record, kAppAddr);
 }
 
 void qvsClientProvCtxDelectContextAppAuth(qvsCtxAppAuth *record)
 {
-    releaseChain(record, appAuth::kRelease);
+    releaseChain(record, kAppAuth);
 }
 
 void qvsClientProvCtxDelectContextResource(qvsCtxResource *record)
 {
-    releaseChain(record, resource::kRelease);
+    releaseChain(record, kResource);
 }
 
 void qvsClientProvCtxDelectContextPxAuthInfo(qvsCtxPxAuthInfo *record)
 {
-    releaseChain(record, pxAuthInfo::kRelease);
+    releaseChain(record, kPxAuthInfo);
 }
 
 void qvsClientProvCtxDelectContextPxPhysical(qvsCtxPxPhysical *record)
 {
-    releaseChain(record, pxPhysical::kRelease);
+    releaseChain(record, kPxPhysical);
 }
 
 void qvsClientProvCtxDelectContextAccess(qvsCtxAccess *record)
 {
-    releaseChain(record, access::kRelease);
+    releaseChain(record, kAccess);
 }
 
 void qvsClientProvCtxDelectContextApplication(qvsCtxApplication *record)
 {
-    releaseChain(record, application::kRelease);
+    releaseChain(record, kApplication);
 }
 
 void qvsClientProvCtxDelectContextBootstrap(qvsCtxBootstrap *record)
 {
-    releaseChain(record, bootstrap::kRelease);
+    releaseChain(record, kBootstrap);
 }
 
 void qvsClientProvCtxDelectContextClientIdent(qvsCtxClientIdent *record)
 {
-    releaseChain(record, clientIdent::kRelease);
+    releaseChain(record, kClientIdent);
 }
 
 void qvsClientProvCtxDelectContextNapDef(qvsCtxNapDef *record)
 {
-    releaseChain(record, napDef::kRelease);
+    releaseChain(record, kNapDef);
 }
 
 void qvsClientProvCtxDelectContextPxLogical(qvsCtxPxLogical *record)
 {
-    releaseChain(record, pxLogical::kRelease);
+    releaseChain(record, kPxLogical);
 }
 
 void qvsClientProvCtxDelectContextVenderConfig(qvsCtxVendorConfig *record)
 {
-    releaseChain(record, vendorConfig::kRelease);
+    releaseChain(record, kVendorConfig);
 }
 
 void qvsClientProvCtxDelectContextWifi(qvsCtxWifi *record)
 {
-    releaseChain(record, wifi::kRelease);
+    releaseChain(record, kWifi);
 }
 
 void qvsClientProvCtxDelectContextVoWifi(qvsCtxVoWifi *record)
 {
-    releaseChain(record, voWifi::kRelease);
+    releaseChain(record, kVoWifi);
 }

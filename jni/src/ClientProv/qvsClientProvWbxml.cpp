@@ -301,7 +301,7 @@ void releaseFields(void *record, const ReleaseKind &kind)
             // Items go as texts do; only a list that is not there is refused.
             (void)qvsListDeleteNodeAllAndList(static_cast<qvsList *>(owned), nullptr);
         } else {
-            qvsMemFree_debug(owned);
+            freeBlock(owned);
         }
     }
 }
@@ -319,7 +319,7 @@ void closeRecord(void *record, const ReleaseKind &kind)
     if (kind.childList != kNoField) {
         releaseList(listAt(record, kind.childList));
     }
-    qvsMemFree_debug(record);
+    freeBlock(record);
 }
 
 // Releases the records of a node in the order of its slots. Stops at a record with children, which
@@ -373,8 +373,8 @@ void releaseNodes(qvsList *list)
         }
         qvsListNode *done = pending;
         pending = done->ptNext;
-        qvsMemFree_debug(node);
-        qvsMemFree_debug(done);
+        freeBlock(node);
+        freeBlock(done);
     }
 }
 
@@ -421,9 +421,9 @@ qvsResult qvsClientProvWbxmlDeleteDecoder(qvsWbxmlDecoder *decoder)
     if (!decoder) {
         return QVS_ERROR_BAD_ARGUMENT;
     }
-    qvsMemFree_debug(decoder->pStringTable);
+    freeBlock(decoder->pStringTable);
     (void)smlBufferDelete(decoder->ptBuffer); // refuses only a buffer that is not there
-    qvsMemFree_debug(decoder);
+    freeBlock(decoder);
     return QVS_OK;
 }
 
@@ -434,7 +434,7 @@ qvsResult qvsClientProvWbxmlDeleteWapDoc(qvsWapDoc *document)
     }
     releaseNodes(document->ptCharacterList);
     releaseList(&document->ptCharacterList);
-    qvsMemFree_debug(document);
+    freeBlock(document);
     return kReleased;
 }
 
@@ -446,7 +446,7 @@ qvsResult qvsClientProvWbxmlDeleteCharacter(qvsWapCharacter *node)
     while (qvsList *children = releaseSlots(node)) {
         releaseNodes(children);
     }
-    qvsMemFree_debug(node);
+    freeBlock(node);
     return kReleased;
 }
 

@@ -11,8 +11,6 @@ using namespace qvs;
 
 namespace {
 
-constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
-
 using Node = qvsWapCharacter;
 
 // ---- The kinds of characteristic
@@ -133,7 +131,7 @@ const Kind *findKind(uint8_t token, uint8_t page, const char *name)
 qvsResult create(Node *node, const Kind &kind)
 {
     constexpr uint32_t kFieldSize = sizeof(void *);
-    void *record = qvsMemAllocSetZero_debug(kind.fields * kFieldSize, kModule, __LINE__);
+    void *record = qvsMemAllocSetZero_debug(kind.fields * kFieldSize, kDecoderModule, __LINE__);
     if (!record) {
         return QVS_ERROR_FAILED;
     }
@@ -220,7 +218,7 @@ qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)
         return QVS_OK;
     }
     const bool hasAttributes = decoder->nHasAttr;
-    auto *open = newRecord<Open>(kModule);
+    auto *open = newRecord<Open>(kDecoderModule);
     if (!open) {
         return QVS_ERROR_FAILED;
     }
@@ -423,7 +421,7 @@ qvsResult qvsClientProvWbxmlDecoderWbxmlBody(qvsWbxmlDecoder *decoder, qvsWapDoc
     if (!decoder || !decoder->ptBuffer) {
         return QVS_ERROR_WBXML_NO_BUFFER;
     }
-    auto *built = newRecord<qvsWapDoc>(kModule);
+    auto *built = newRecord<qvsWapDoc>(kDecoderModule);
     if (!built) {
         trace("[Error] [qvsClientProvWbxmlDecoderWbxmlBody] ptTmpWapDoc NULL");
         return QVS_ERROR_FAILED;

@@ -6,8 +6,6 @@ using namespace qvs;
 
 namespace {
 
-constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
-
 // ---- Values
 
 // Reads NAME and VALUE of one parameter onto `text`, step by step.
@@ -75,7 +73,7 @@ qvsResult readPair(qvsWbxmlDecoder *decoder, Text *text, uint8_t token)
     if (!plain) {
         return readAnyPair(decoder, text, token);
     }
-    text->data = static_cast<char *>(qvsMemAlloc_debug(size, kModule, __LINE__));
+    text->data = static_cast<char *>(newBlock(size, kDecoderModule));
     if (!text->data) {
         return QVS_ERROR_WBXML_NO_DATA;
     }
@@ -133,7 +131,7 @@ qvsResult readPairs(qvsWbxmlDecoder *decoder, qvsList **list)
 // The token the loop decides on next, behind page switches if there are any.
 qvsResult nextToken(qvsWbxmlDecoder *decoder, const ParmTable &table, uint8_t *token)
 {
-    bool present = peekByte(decoder, token);
+    bool present = peekByte(decoder->ptBuffer, token);
     while (present && *token == wbxml::kSwitchPage) {
         // kept[parm-switch-ignored]: a switch to an unknown page is no failure by itself.
         (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
@@ -174,8 +172,8 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, void *record, const ParmTable &tabl
     if (!parm) {
         return refuse(table, token);
     }
-    if (traceSink && parm->label) {
-        trace("%s", parm->label);
+    if (traceSink && table.onParm) {
+        table.onParm(token);
     }
     switch (parm->type) {
     case ParmType::kText:

@@ -5,13 +5,45 @@ using namespace qvs;
 
 namespace {
 
-constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
-
 void traceToken(uint8_t token)
 {
     if (token != wbxml::kEnd) {
         trace("DecoderParam : nId = [0x%02x]", token);
     }
+}
+
+// The parameters of APPLICATION and RESOURCE are traced by the name of their token.
+constexpr struct {
+    uint8_t token;
+    char name[12];
+} kTokenNames[] = {
+    {page1::kName, "NAME"},
+    {page1::kInternet, "INTERNET"},
+    {page1::kStartPage, "STARTPAGE"},
+    {page1::kToNapId, "TO_NAPID"},
+    {page1::kAAccept, "AACCEPT"},
+    {page1::kAAuthData, "AAUTHDATA"},
+    {page1::kAAuthName, "AAUTHNAME"},
+    {page1::kAAuthSecret, "AAUTHSECRET"},
+    {page1::kAAuthType, "AAUTHTYPE"},
+    {page1::kAddr, "ADDR"},
+    {page1::kAppId, "APPID"},
+    {page1::kAProtocol, "APROTOCOL"},
+    {page1::kProviderId, "PROVIDER_ID"},
+    {page1::kToProxy, "TO_PROXY"},
+    {page1::kUri, "URI"},
+};
+
+void traceParm(uint8_t token)
+{
+    const char *name = "";
+    for (const auto &known : kTokenNames) {
+        if (known.token == token) {
+            name = known.name;
+        }
+    }
+    // The NAME that is given as text stands by itself.
+    trace("SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME%s%s", *name ? "_" : "", name);
 }
 
 qvsResult readAppNamed(qvsWbxmlDecoder *decoder, void *record)
@@ -37,7 +69,7 @@ qvsResult readStartPage(qvsWbxmlDecoder *decoder, void *record)
         return result;
     }
     if (!*page) {
-        *page = qvsStrdup_debug("startpage", kModule, __LINE__);
+        *page = qvsStrdup_debug("startpage", kDecoderModule, __LINE__);
     }
     return QVS_OK;
 }
@@ -45,18 +77,16 @@ qvsResult readStartPage(qvsWbxmlDecoder *decoder, void *record)
 namespace application {
 using R = qvsWapApplication;
 constexpr Parm kParms[] = {
-    {attr::kName, kByReader, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME"},
-    {page1::kName, QVS_FIELD(R, pszName), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_NAME"},
-    {page1::kInternet, QVS_FIELD(R, pszInternet), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_INTERNET"},
-    {page1::kToNapId, QVS_FIELD(R, ptToNapIdList), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_TO_NAPID"},
-    {page1::kAAccept, QVS_FIELD(R, pszAAccept), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AACCEPT"},
-    {page1::kAddr, QVS_FIELD(R, ptAddrList), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_ADDR"},
-    {page1::kAppId, QVS_FIELD(R, pszAppId), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_APPID"},
-    {page1::kAProtocol, QVS_FIELD(R, pszAProtocol),
-     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_APROTOCOL"},
-    {page1::kProviderId, QVS_FIELD(R, pszProviderId),
-     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_PROVIDER_ID"},
-    {page1::kToProxy, QVS_FIELD(R, ptToProxyList), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_TO_PROXY"},
+    {attr::kName, kByReader},
+    {page1::kName, QVS_FIELD(R, pszName)},
+    {page1::kInternet, QVS_FIELD(R, pszInternet)},
+    {page1::kToNapId, QVS_FIELD(R, ptToNapIdList)},
+    {page1::kAAccept, QVS_FIELD(R, pszAAccept)},
+    {page1::kAddr, QVS_FIELD(R, ptAddrList)},
+    {page1::kAppId, QVS_FIELD(R, pszAppId)},
+    {page1::kAProtocol, QVS_FIELD(R, pszAProtocol)},
+    {page1::kProviderId, QVS_FIELD(R, pszProviderId)},
+    {page1::kToProxy, QVS_FIELD(R, ptToProxyList)},
 };
 
 // Parameters whose name is given as text.
@@ -93,18 +123,14 @@ constexpr Parm kParms[] = {
 namespace resource {
 using R = qvsWapResource;
 constexpr Parm kParms[] = {
-    {page1::kName, QVS_FIELD(R, pszName), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_NAME"},
-    {page1::kStartPage, kByReader, "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_STARTPAGE"},
-    {page1::kAAccept, QVS_FIELD(R, pszAAccept), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AACCEPT"},
-    {page1::kAAuthData, QVS_FIELD(R, pszAAuthData),
-     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHDATA"},
-    {page1::kAAuthName, QVS_FIELD(R, pszAAuthName),
-     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHNAME"},
-    {page1::kAAuthSecret, QVS_FIELD(R, pszAAuthSecret),
-     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHSECRET"},
-    {page1::kAAuthType, QVS_FIELD(R, pszAAuthType),
-     "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_AAUTHTYPE"},
-    {page1::kUri, QVS_FIELD(R, pszUri), "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_URI"},
+    {page1::kName, QVS_FIELD(R, pszName)},
+    {page1::kStartPage, kByReader},
+    {page1::kAAccept, QVS_FIELD(R, pszAAccept)},
+    {page1::kAAuthData, QVS_FIELD(R, pszAAuthData)},
+    {page1::kAAuthName, QVS_FIELD(R, pszAAuthName)},
+    {page1::kAAuthSecret, QVS_FIELD(R, pszAAuthSecret)},
+    {page1::kAAuthType, QVS_FIELD(R, pszAAuthType)},
+    {page1::kUri, QVS_FIELD(R, pszUri)},
 };
 } // namespace resource
 
@@ -114,6 +140,7 @@ constexpr ParmTable qvs::kApplicationParms = {
     .name = "qvsClientProvWbxmlDecoderParamApplication",
     .rows = application::kParms,
     .reader = readAppNamed,
+    .onParm = traceParm,
     .onToken = traceToken,
 };
 
@@ -134,6 +161,7 @@ constexpr ParmTable qvs::kResourceParms = {
     .rows = resource::kParms,
     .reader = readStartPage,
     .freshTokenAfterSwitch = true,
+    .onParm = traceParm,
 };
 
 qvsResult qvsClientProvWbxmlDecoderParamApplication(qvsWbxmlDecoder *decoder,

@@ -9,7 +9,6 @@ using namespace qvs;
 
 namespace {
 
-constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
 constexpr char kNoMemory[] = "[Error] [qvsClientProvWbxmlDecoderGetStr] pszData NULL";
 
 constexpr uint32_t kUnreadTable = 0xFFFFFFFF;
@@ -48,8 +47,8 @@ bool grow(Text *text, uint32_t start, uint64_t needed)
     if (capacity > UINT32_MAX) {
         return false;
     }
-    char *block =
-        static_cast<char *>(qvsMemAlloc_debug(static_cast<uint32_t>(capacity), kModule, __LINE__));
+    char *block = static_cast<char *>(
+        qvsMemAlloc_debug(static_cast<uint32_t>(capacity), kDecoderModule, __LINE__));
     if (!block) {
         return false;
     }
@@ -211,7 +210,8 @@ int32_t qvsClientProvWbxmlDecoderMakeStrTable(qvsWbxmlDecoder *decoder, char **t
     // hardened: the block is as long as the data warrants, whatever length is claimed.
     const uint32_t left = bytesLeft(decoder);
     const uint32_t present = length < left ? length : left;
-    char *block = static_cast<char *>(qvsMemAllocSetZero_debug(present + 2, kModule, __LINE__));
+    char *block =
+        static_cast<char *>(qvsMemAllocSetZero_debug(present + 2, kDecoderModule, __LINE__));
     if (!block) {
         trace(kNoMemory);
         return -1;

@@ -9,8 +9,6 @@ using namespace qvs;
 
 namespace {
 
-constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
-
 // The byte in front of the one read last; 0 in front of the first.
 uint8_t byteBefore(const qvsWbxmlDecoder *decoder)
 {
@@ -26,7 +24,7 @@ qvsResult unknownValue(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
         stepBack(decoder);
         return qvsClientProvWbxmlDecoderSkipElement(decoder);
     }
-    char *block = static_cast<char *>(qvsMemAlloc_debug(2, kModule, __LINE__));
+    char *block = static_cast<char *>(qvsMemAlloc_debug(2, kDecoderModule, __LINE__));
     if (!block) {
         return QVS_ERROR_WBXML_NO_DATA;
     }

@@ -9,8 +9,6 @@ using namespace qvs;
 
 namespace {
 
-constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
-
 // How a token's text joins a text that is already there.
 enum class Join : uint8_t {
     kDirect, // right behind it
@@ -72,8 +70,8 @@ constexpr ValueTable kTables[] = {
 
 // What a token stands for: a row of a table, counted from 1; row 0 for nothing.
 struct Meaning {
-    uint8_t table;
-    uint8_t row;
+    uint8_t table : 2;
+    uint8_t row : 4;
 };
 
 struct Meanings {
@@ -91,7 +89,8 @@ consteval Meanings firstHits()
             if (row < kTables[t].count) {
                 Meaning &meaning = meanings.of[kTables[t].rows[row].token];
                 if (meaning.row == 0) {
-                    meaning = {t, static_cast<uint8_t>(row + 1)};
+                    meaning.table = t & 3;
+                    meaning.row = (row + 1) & 15;
                 }
             }
         }
@@ -130,8 +129,8 @@ qvsResult qvs::getParamTokenVal(qvsWbxmlDecoder *decoder, uint8_t token, Text *t
     const ValueTable &table = kTables[meaning.table];
     if (!joinText(decoder, text, table.rows[meaning.row - 1].text, table.join)) {
         // kept[lookup-without-memory]: the text stays as it was and the token counts as read.
-        traceException("[Error] [qvsClientProvWbxmlDecoderGetParamTokenVal] pszData NULL", kModule,
-                       __LINE__);
+        traceException("[Error] [qvsClientProvWbxmlDecoderGetParamTokenVal] pszData NULL",
+                       kDecoderModule, __LINE__);
     }
     return QVS_OK;
 }
@@ -193,7 +192,7 @@ qvsResult qvsCommaAdd(qvsWbxmlDecoder *decoder, char **text)
             result = content(decoder, &joined);
         } else {
             traceException("[Error] [qvsClientProvWbxmlDecoderGetParamTokenVal] pszData NULL",
-                           kModule, __LINE__);
+                           kDecoderModule, __LINE__);
             result = QVS_ERROR_NO_MEMORY;
         }
     } else {

@@ -52,4 +52,24 @@ jobjectArray stringArray(JNIEnv *env, const char *const *texts, jsize shown, jsi
     return result;
 }
 
+Shown::Shown(const void *record, const Cells &cells, const Naming &naming)
+    : length(static_cast<jsize>(cells.count) + 1)
+{
+    for (uint8_t i = 0; i < cells.count; ++i) {
+        const uint8_t field = cells.fields[i].number;
+        const char *value = static_cast<const char *>(pointerAt(record, field));
+        texts[i] = value && field == naming.field.number ? naming.nameOf(value) : value;
+    }
+    texts[cells.count] = nullptr;
+}
+
+jobjectArray array(JNIEnv *env, const void *record, const Cells &cells, const Naming &naming)
+{
+    if (!record) {
+        return nullptr;
+    }
+    const Shown shown(record, cells, naming);
+    return stringArray(env, shown.texts, shown.length, shown.length);
+}
+
 } // namespace qvs

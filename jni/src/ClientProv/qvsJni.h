@@ -4,6 +4,7 @@
 #define QVSJNI_H
 
 #include "qvsClientProvCtx.h"
+#include "qvsFields.h"
 #include "qvsJniParser.h"
 #include "qvspushhandler.h"
 
@@ -97,44 +98,37 @@ jstring text(JNIEnv *env, const Record *record, char *Record::*field)
 // behind them stay empty strings.
 jobjectArray stringArray(JNIEnv *env, const char *const *texts, jsize shown, jsize length);
 
-// One element of a String[]: a field, shown as it is or under a name made from it.
-template <class Record>
-struct Cell {
-    constexpr Cell(char *Record::*f, const char *(*n)(const char *) = nullptr) : field(f), nameOf(n)
+// The fields that a String[] shows of a record, one element each.
+struct Cells {
+    static constexpr size_t kMost = 28;
+
+    template <size_t N>
+    consteval Cells(const TextField (&rows)[N]) : fields(rows), count(N)
     {
+        static_assert(N <= kMost);
     }
 
-    const char *shownBy(const Record *record) const
-    {
-        const char *value = record->*field;
-        return value && nameOf ? nameOf(value) : value;
-    }
-
-    char *Record::*field;
-    const char *(*nameOf)(const char *value);
+    const TextField *fields;
+    uint8_t count;
 };
 
-// Writes what the cells show of a record to texts[0..N-1] and ends it with a null.
-template <class Record, size_t N>
-void show(const Record *record, const Cell<Record> (&cells)[N], const char *(&texts)[N + 1])
-{
-    for (size_t i = 0; i < N; ++i) {
-        texts[i] = cells[i].shownBy(record);
-    }
-    texts[N] = nullptr; // kept[last-element-null]: an array ends with an element that is null.
-}
+// A field that is shown under a name made from it; null for a text that has none.
+struct Naming {
+    TextField field = {kNoField};
+    const char *(*nameOf)(const char *value) = nullptr;
+};
+
+// What an array shows: its texts, and a null behind them.
+// kept[last-element-null]: an array ends with an element that is null.
+struct Shown {
+    Shown(const void *record, const Cells &cells, const Naming &naming = {});
+
+    const char *texts[Cells::kMost + 1];
+    jsize length;
+};
 
 // The record as a String[], one element per cell and the last one; null for a missing record.
-template <class Record, size_t N>
-jobjectArray array(JNIEnv *env, const Record *record, const Cell<Record> (&cells)[N])
-{
-    if (!record) {
-        return nullptr;
-    }
-    const char *texts[N + 1];
-    show(record, cells, texts);
-    return stringArray(env, texts, N + 1, N + 1);
-}
+jobjectArray array(JNIEnv *env, const void *record, const Cells &cells, const Naming &naming = {});
 
 // ---- Registration
 

@@ -43,35 +43,36 @@ const char *authLevelName(const char *level)
 
 // ---- Arrays
 
-constexpr Cell<Application> kApplicationCells[] = {
-    &Application::pszAppId,        &Application::pszProviderId,     &Application::pszFrom,
-    &Application::pszName,         &Application::pszAAccept,        &Application::pszAProtocol,
-    &Application::pszInternet,     &Application::pszXcapAuidDcs,    &Application::pszXcapAuidPms,
-    &Application::pszXcapAuidCdms, &Application::pszXcapImeiHeader, &Application::pszXcapTidHeader,
+constexpr TextField kApplicationCells[] = {
+    QVS_FIELD(Application, pszAppId),          QVS_FIELD(Application, pszProviderId),
+    QVS_FIELD(Application, pszFrom),           QVS_FIELD(Application, pszName),
+    QVS_FIELD(Application, pszAAccept),        QVS_FIELD(Application, pszAProtocol),
+    QVS_FIELD(Application, pszInternet),       QVS_FIELD(Application, pszXcapAuidDcs),
+    QVS_FIELD(Application, pszXcapAuidPms),    QVS_FIELD(Application, pszXcapAuidCdms),
+    QVS_FIELD(Application, pszXcapImeiHeader), QVS_FIELD(Application, pszXcapTidHeader),
 };
 
-constexpr Cell<qvsCtxAppAddr> kAppAddrCells[] = {
-    &qvsCtxAppAddr::pszAddr,
-    &qvsCtxAppAddr::pszAddrType,
+constexpr TextField kAppAddrCells[] = {
+    QVS_FIELD(qvsCtxAppAddr, pszAddr),
+    QVS_FIELD(qvsCtxAppAddr, pszAddrType),
 };
 
-constexpr Cell<qvsCtxAppAuth> kAppAuthCells[] = {
-    {&qvsCtxAppAuth::pszAAuthLevel, authLevelName},
-    &qvsCtxAppAuth::pszAAuthType,
-    &qvsCtxAppAuth::pszAAuthName,
-    &qvsCtxAppAuth::pszAAuthSecret,
-    &qvsCtxAppAuth::pszAAuthData,
+constexpr TextField kAppAuthCells[] = {
+    QVS_FIELD(qvsCtxAppAuth, pszAAuthLevel), QVS_FIELD(qvsCtxAppAuth, pszAAuthType),
+    QVS_FIELD(qvsCtxAppAuth, pszAAuthName),  QVS_FIELD(qvsCtxAppAuth, pszAAuthSecret),
+    QVS_FIELD(qvsCtxAppAuth, pszAAuthData),
 };
 
-constexpr Cell<qvsCtxResource> kResourceCells[] = {
-    &qvsCtxResource::pszUri,       &qvsCtxResource::pszName,      &qvsCtxResource::pszAAccept,
-    &qvsCtxResource::pszAAuthType, &qvsCtxResource::pszAAuthName, &qvsCtxResource::pszAAuthSecret,
-    &qvsCtxResource::pszAAuthData, &qvsCtxResource::pszStartPage,
+constexpr TextField kResourceCells[] = {
+    QVS_FIELD(qvsCtxResource, pszUri),       QVS_FIELD(qvsCtxResource, pszName),
+    QVS_FIELD(qvsCtxResource, pszAAccept),   QVS_FIELD(qvsCtxResource, pszAAuthType),
+    QVS_FIELD(qvsCtxResource, pszAAuthName), QVS_FIELD(qvsCtxResource, pszAAuthSecret),
+    QVS_FIELD(qvsCtxResource, pszAAuthData), QVS_FIELD(qvsCtxResource, pszStartPage),
 };
 
-constexpr Cell<qvsCtxRoaming> kRoamingCells[] = {
-    &qvsCtxRoaming::pszSyncAllowed,
-    &qvsCtxRoaming::pszSyncDefault,
+constexpr TextField kRoamingCells[] = {
+    QVS_FIELD(qvsCtxRoaming, pszSyncAllowed),
+    QVS_FIELD(qvsCtxRoaming, pszSyncDefault),
 };
 
 // ---- Natives
@@ -148,7 +149,8 @@ jint qvomacp_GetPxAppAuthCount(JNIEnv *, jobject, jint a)
 
 jobjectArray qvomacp_GetPxAppAuthData(JNIEnv *env, jobject, jint a, jint r)
 {
-    return array(env, nth(chainOf(application(a), &Application::ptAppAuth), r), kAppAuthCells);
+    return array(env, nth(chainOf(application(a), &Application::ptAppAuth), r), kAppAuthCells,
+                 {QVS_FIELD(qvsCtxAppAuth, pszAAuthLevel), authLevelName});
 }
 
 jint qvomacp_GetPxResourceCount(JNIEnv *, jobject, jint a)

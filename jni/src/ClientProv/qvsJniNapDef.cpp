@@ -100,47 +100,48 @@ const char *authTypeName(const char *type)
 
 constexpr size_t kAddrTypeElement = 4;
 
-constexpr Cell<NapDef> kNapDefCells[] = {
-    &NapDef::pszNapId,
-    &NapDef::pszName,
-    &NapDef::pszInternet,
-    &NapDef::pszNapAddress,
-    {&NapDef::pszNapAddrType, addrTypeCode}, // element kAddrTypeElement
-    &NapDef::pszCallType,
-    &NapDef::pszLocalAddr,
-    &NapDef::pszLocalAddrType,
-    &NapDef::pszLinkSpeed,
-    &NapDef::pszDnLinkSpeed,
-    &NapDef::pszLinger,
-    &NapDef::pszDeliveryErrSdu,
-    &NapDef::pszDeliveryOrder,
-    &NapDef::pszTrafficClass,
-    &NapDef::pszMaxSduSize,
-    &NapDef::pszMaxBitrateUplink,
-    &NapDef::pszMaxBitrateDnlink,
-    &NapDef::pszReserved1,
-    &NapDef::pszReserved2,
-    &NapDef::pszReserved3,
-    &NapDef::pszReserved4,
-    &NapDef::pszReserved5,
-    &NapDef::pszReserved6,
-    &NapDef::pszMaxNumRetry,
-    &NapDef::pszFirstRetryTimeout,
-    &NapDef::pszReregThreshold,
-    &NapDef::pszTBit,
-    &NapDef::pszInit,
+constexpr TextField kNapDefCells[] = {
+    QVS_FIELD(NapDef, pszNapId),
+    QVS_FIELD(NapDef, pszName),
+    QVS_FIELD(NapDef, pszInternet),
+    QVS_FIELD(NapDef, pszNapAddress),
+    QVS_FIELD(NapDef, pszNapAddrType), // element kAddrTypeElement
+    QVS_FIELD(NapDef, pszCallType),
+    QVS_FIELD(NapDef, pszLocalAddr),
+    QVS_FIELD(NapDef, pszLocalAddrType),
+    QVS_FIELD(NapDef, pszLinkSpeed),
+    QVS_FIELD(NapDef, pszDnLinkSpeed),
+    QVS_FIELD(NapDef, pszLinger),
+    QVS_FIELD(NapDef, pszDeliveryErrSdu),
+    QVS_FIELD(NapDef, pszDeliveryOrder),
+    QVS_FIELD(NapDef, pszTrafficClass),
+    QVS_FIELD(NapDef, pszMaxSduSize),
+    QVS_FIELD(NapDef, pszMaxBitrateUplink),
+    QVS_FIELD(NapDef, pszMaxBitrateDnlink),
+    QVS_FIELD(NapDef, pszReserved1),
+    QVS_FIELD(NapDef, pszReserved2),
+    QVS_FIELD(NapDef, pszReserved3),
+    QVS_FIELD(NapDef, pszReserved4),
+    QVS_FIELD(NapDef, pszReserved5),
+    QVS_FIELD(NapDef, pszReserved6),
+    QVS_FIELD(NapDef, pszMaxNumRetry),
+    QVS_FIELD(NapDef, pszFirstRetryTimeout),
+    QVS_FIELD(NapDef, pszReregThreshold),
+    QVS_FIELD(NapDef, pszTBit),
+    QVS_FIELD(NapDef, pszInit),
 };
 
-constexpr Cell<qvsCtxNapAuthInfo> kNapAuthInfoCells[] = {
-    {&qvsCtxNapAuthInfo::pszAuthType, authTypeName},
-    &qvsCtxNapAuthInfo::pszAuthName,
-    &qvsCtxNapAuthInfo::pszAuthSecret,
-    &qvsCtxNapAuthInfo::pszReserved,
+constexpr TextField kNapAuthInfoCells[] = {
+    QVS_FIELD(qvsCtxNapAuthInfo, pszAuthType),
+    QVS_FIELD(qvsCtxNapAuthInfo, pszAuthName),
+    QVS_FIELD(qvsCtxNapAuthInfo, pszAuthSecret),
+    QVS_FIELD(qvsCtxNapAuthInfo, pszReserved),
 };
 
-constexpr Cell<qvsCtxValidity> kValidityCells[] = {
-    &qvsCtxValidity::pszCountry, &qvsCtxValidity::pszNetwork,    &qvsCtxValidity::pszSid,
-    &qvsCtxValidity::pszSoc,     &qvsCtxValidity::pszValidUntil,
+constexpr TextField kValidityCells[] = {
+    QVS_FIELD(qvsCtxValidity, pszCountry),    QVS_FIELD(qvsCtxValidity, pszNetwork),
+    QVS_FIELD(qvsCtxValidity, pszSid),        QVS_FIELD(qvsCtxValidity, pszSoc),
+    QVS_FIELD(qvsCtxValidity, pszValidUntil),
 };
 
 // ---- Natives
@@ -194,7 +195,8 @@ jint qvomacp_GetPxNapAuthInfoCount(JNIEnv *, jobject, jint n)
 
 jobjectArray qvomacp_GetPxNapAuthInfoData(JNIEnv *env, jobject, jint n, jint a)
 {
-    return array(env, napAuthInfo(n, a), kNapAuthInfoCells);
+    return array(env, napAuthInfo(n, a), kNapAuthInfoCells,
+                 {QVS_FIELD(qvsCtxNapAuthInfo, pszAuthType), authTypeName});
 }
 
 jint qvomacp_GetPxNapAuthEntityCount(JNIEnv *, jobject, jint n, jint a)
@@ -219,22 +221,21 @@ jobjectArray qvomacp_GetPxValidityData(JNIEnv *env, jobject, jint n, jint a)
 
 jobjectArray qvomacp_GetPxNapDefData(JNIEnv *env, jobject, jint n)
 {
-    constexpr jsize kLength = countOf(kNapDefCells) + 1;
     const NapDef *record = napDef(n);
     if (!record) {
         return nullptr;
     }
-    const char *texts[kLength];
-    show(record, kNapDefCells, texts);
-    jsize shown = kLength;
-    if (record->pszNapAddrType && !texts[kAddrTypeElement]) {
+    Shown shown(record, kNapDefCells, {QVS_FIELD(NapDef, pszNapAddrType), addrTypeCode});
+    const jsize length = shown.length;
+    const char **typeElement = shown.texts + kAddrTypeElement;
+    if (record->pszNapAddrType && !*typeElement) {
         // kept[napdef-shift]: an address type that is no token takes no element; those behind it
         // move down by one, and the last one of the array stays an empty string.
-        --shown;
-        memmove(texts + kAddrTypeElement, texts + kAddrTypeElement + 1,
-                (static_cast<size_t>(shown) - kAddrTypeElement) * sizeof *texts);
+        --shown.length;
+        memmove(typeElement, typeElement + 1,
+                (static_cast<size_t>(shown.length) - kAddrTypeElement) * sizeof *typeElement);
     }
-    return stringArray(env, texts, shown, kLength);
+    return stringArray(env, shown.texts, shown.length, length);
 }
 
 } // namespace

@@ -22,28 +22,30 @@ Access *access(jint n)
 
 // ---- Arrays
 
-constexpr Cell<qvsCtxBootstrap> kBootstrapCells[] = {
-    &qvsCtxBootstrap::pszName,
-    &qvsCtxBootstrap::pszCountry,
-    &qvsCtxBootstrap::pszProvUrl,
-    &qvsCtxBootstrap::pszContextAllow,
+constexpr TextField kBootstrapCells[] = {
+    QVS_FIELD(qvsCtxBootstrap, pszName),
+    QVS_FIELD(qvsCtxBootstrap, pszCountry),
+    QVS_FIELD(qvsCtxBootstrap, pszProvUrl),
+    QVS_FIELD(qvsCtxBootstrap, pszContextAllow),
 };
 
-constexpr Cell<qvsCtxVendorConfig> kVendorConfigCells[] = {
-    &qvsCtxVendorConfig::pszName,
-    &qvsCtxVendorConfig::pszParamName,
-    &qvsCtxVendorConfig::pszParamValue,
+constexpr TextField kVendorConfigCells[] = {
+    QVS_FIELD(qvsCtxVendorConfig, pszName),
+    QVS_FIELD(qvsCtxVendorConfig, pszParamName),
+    QVS_FIELD(qvsCtxVendorConfig, pszParamValue),
 };
 
-constexpr Cell<qvsCtxWifi> kWifiCells[] = {
-    &qvsCtxWifi::pszNetSsid,  &qvsCtxWifi::pszSecMode,       &qvsCtxWifi::pszEapMethod,
-    &qvsCtxWifi::pszEapType,  &qvsCtxWifi::pszUserName,      &qvsCtxWifi::pszAnonUserName,
-    &qvsCtxWifi::pszPassword, &qvsCtxWifi::pszCaCert,        &qvsCtxWifi::pszUserCert,
-    &qvsCtxWifi::pszPhase1,   &qvsCtxWifi::pszAuthAlgorithm, &qvsCtxWifi::pszPriority,
+constexpr TextField kWifiCells[] = {
+    QVS_FIELD(qvsCtxWifi, pszNetSsid),       QVS_FIELD(qvsCtxWifi, pszSecMode),
+    QVS_FIELD(qvsCtxWifi, pszEapMethod),     QVS_FIELD(qvsCtxWifi, pszEapType),
+    QVS_FIELD(qvsCtxWifi, pszUserName),      QVS_FIELD(qvsCtxWifi, pszAnonUserName),
+    QVS_FIELD(qvsCtxWifi, pszPassword),      QVS_FIELD(qvsCtxWifi, pszCaCert),
+    QVS_FIELD(qvsCtxWifi, pszUserCert),      QVS_FIELD(qvsCtxWifi, pszPhase1),
+    QVS_FIELD(qvsCtxWifi, pszAuthAlgorithm), QVS_FIELD(qvsCtxWifi, pszPriority),
 };
 
-constexpr Cell<qvsCtxVoWifi> kVoWifiCells[] = {
-    &qvsCtxVoWifi::pszEpdgFqdn,
+constexpr TextField kVoWifiCells[] = {
+    QVS_FIELD(qvsCtxVoWifi, pszEpdgFqdn),
 };
 
 // ---- Natives: bootstrap, client identity, vendor configuration

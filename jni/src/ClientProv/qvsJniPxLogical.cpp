@@ -64,28 +64,27 @@ const char *addrTypeName(const char *type)
 
 // ---- Arrays
 
-constexpr Cell<Logical> kLogicalCells[] = {
-    &Logical::pszProxyId,         &Logical::pszProxyPw,   &Logical::pszPpgAuthType,
-    &Logical::pszProxyProviderId, &Logical::pszName,      &Logical::pszTrust,
-    &Logical::pszMaster,          &Logical::pszStartPage, &Logical::pszReserved1,
-    &Logical::pszReserved2,       &Logical::pszReserved3, &Logical::pszReserved4,
-    &Logical::pszReserved5,
+constexpr TextField kLogicalCells[] = {
+    QVS_FIELD(Logical, pszProxyId),     QVS_FIELD(Logical, pszProxyPw),
+    QVS_FIELD(Logical, pszPpgAuthType), QVS_FIELD(Logical, pszProxyProviderId),
+    QVS_FIELD(Logical, pszName),        QVS_FIELD(Logical, pszTrust),
+    QVS_FIELD(Logical, pszMaster),      QVS_FIELD(Logical, pszStartPage),
+    QVS_FIELD(Logical, pszReserved1),   QVS_FIELD(Logical, pszReserved2),
+    QVS_FIELD(Logical, pszReserved3),   QVS_FIELD(Logical, pszReserved4),
+    QVS_FIELD(Logical, pszReserved5),
 };
 
-constexpr Cell<qvsCtxPxAuthInfo> kAuthInfoCells[] = {
-    &qvsCtxPxAuthInfo::pszPxAuthType,
-    &qvsCtxPxAuthInfo::pszPxAuthId,
-    &qvsCtxPxAuthInfo::pszPxAuthPw,
+constexpr TextField kAuthInfoCells[] = {
+    QVS_FIELD(qvsCtxPxAuthInfo, pszPxAuthType),
+    QVS_FIELD(qvsCtxPxAuthInfo, pszPxAuthId),
+    QVS_FIELD(qvsCtxPxAuthInfo, pszPxAuthPw),
 };
 
-constexpr Cell<Physical> kPhysicalCells[] = {
-    &Physical::pszPhysicalProxyId,
-    &Physical::pszPxAddr,
-    {&Physical::pszPxAddrType, addrTypeName},
-    &Physical::pszPxAddrFqdn,
-    &Physical::pszWspVersion,
-    &Physical::pszPushEnabled,
-    &Physical::pszPullEnabled,
+constexpr TextField kPhysicalCells[] = {
+    QVS_FIELD(Physical, pszPhysicalProxyId), QVS_FIELD(Physical, pszPxAddr),
+    QVS_FIELD(Physical, pszPxAddrType),      QVS_FIELD(Physical, pszPxAddrFqdn),
+    QVS_FIELD(Physical, pszWspVersion),      QVS_FIELD(Physical, pszPushEnabled),
+    QVS_FIELD(Physical, pszPullEnabled),
 };
 
 // ---- Natives: logical proxies
@@ -156,7 +155,8 @@ jint qvomacp_GetPxPhysicalCount(JNIEnv *, jobject, jint p)
 
 jobjectArray qvomacp_GetPxPhysicalData(JNIEnv *env, jobject, jint p, jint h)
 {
-    return array(env, physical(p, h), kPhysicalCells);
+    return array(env, physical(p, h), kPhysicalCells,
+                 {QVS_FIELD(Physical, pszPxAddrType), addrTypeName});
 }
 
 jint qvomacp_GetPxPhysicalDomainCount(JNIEnv *, jobject, jint p, jint h)

@@ -21,23 +21,13 @@ constexpr OtherField kByReader;
 
 // One parameter of a characteristic: the NAME token that announces it and the field it fills.
 struct Parm {
-    consteval Parm(uint8_t t, TextField f, const char *l = nullptr)
-        : token(t), type(ParmType::kText), field(f.number), label(l)
-    {
-    }
-    consteval Parm(uint8_t t, ListField f, const char *l = nullptr)
-        : token(t), type(ParmType::kList), field(f.number), label(l)
-    {
-    }
-    consteval Parm(uint8_t t, OtherField, const char *l = nullptr)
-        : token(t), type(ParmType::kOther), field(kNoField), label(l)
-    {
-    }
+    consteval Parm(uint8_t t, TextField f) : token(t), type(ParmType::kText), field(f.number) {}
+    consteval Parm(uint8_t t, ListField f) : token(t), type(ParmType::kList), field(f.number) {}
+    consteval Parm(uint8_t t, OtherField) : token(t), type(ParmType::kOther), field(kNoField) {}
 
     uint8_t token;
     ParmType type;
     uint8_t field;
-    const char *label; // traced before the parameter is read
 };
 
 // The parameters of one kind of characteristic. But for the rows, the reader and the way past a
@@ -46,8 +36,9 @@ struct ParmTable {
     const char *name; // named in the trace of a refused token
     Rows<Parm> rows;
     qvsResult (*reader)(qvsWbxmlDecoder *decoder, void *record) = nullptr; // of kByReader
-    bool freshTokenAfterSwitch = false; // read it again instead of peeking at it masked
-    const char *entered = nullptr;      // traced before anything is read
+    bool freshTokenAfterSwitch = false;      // read it again instead of peeking at it masked
+    const char *entered = nullptr;           // traced before anything is read
+    void (*onParm)(uint8_t token) = nullptr; // before a parameter of the table is read
     void (*onToken)(uint8_t token) = nullptr;
     void (*onRefused)(uint8_t token) = nullptr; // in place of the usual two lines
     void (*onEnd)(uint8_t token, qvsResult result) = nullptr;

@@ -14,6 +14,9 @@
 
 namespace [[gnu::visibility("hidden")]] qvs {
 
+// The source that the blocks of the decoder are asked for under.
+inline constexpr char kDecoderModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
+
 // hardened: a string-table reference costs two bytes and copies a whole string, so 64 KiB could ask
 // for gigabytes. A message may be decoded to this many bytes of text whatever its length, and
 // beyond to this many times its length.
@@ -42,7 +45,7 @@ struct Text {
     ~Text()
     {
         if (data) {
-            qvsMemFree_debug(data);
+            freeBlock(data);
         }
     }
 
@@ -92,17 +95,18 @@ inline uint32_t bytesLeft(const qvsWbxmlDecoder *decoder)
     return consumed < buffer->nSize ? static_cast<uint32_t>(buffer->nSize - consumed) : 0;
 }
 
-inline bool peekByte(const qvsWbxmlDecoder *decoder, uint8_t *byte)
+inline bool peekByte(const smlBuffer *buffer, uint8_t *byte)
 {
-    if (!decoder || !decoder->ptBuffer) {
-        return false;
-    }
-    const smlBuffer *buffer = decoder->ptBuffer;
     if (static_cast<size_t>(buffer->pHead - buffer->pStorage) >= buffer->nSize) {
         return false;
     }
     *byte = *buffer->pHead;
     return true;
+}
+
+inline bool peekByte(const qvsWbxmlDecoder *decoder, uint8_t *byte)
+{
+    return decoder && decoder->ptBuffer && peekByte(decoder->ptBuffer, byte);
 }
 
 inline bool takeByte(qvsWbxmlDecoder *decoder, uint8_t *byte)

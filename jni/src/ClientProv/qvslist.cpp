@@ -24,7 +24,7 @@ void releaseItem(void *item, qvsListFree freeItem)
     if (freeItem) {
         freeItem(item);
     } else {
-        qvsMemFree_debug(item);
+        qvs::freeBlock(item);
     }
 }
 
@@ -184,7 +184,7 @@ qvsResult qvsListDeleteNodeAll(qvsList *list, qvsListFree freeItem)
     while (node) {
         qvsListNode *next = node->ptNext;
         releaseItem(node->pItem, freeItem);
-        qvsMemFree_debug(node);
+        qvs::freeBlock(node);
         node = next;
     }
     *list = {};
@@ -194,7 +194,7 @@ qvsResult qvsListDeleteNodeAll(qvsList *list, qvsListFree freeItem)
 qvsResult qvsListDeleteNodeAllAndList(qvsList *list, qvsListFree freeItem)
 {
     const qvsResult result = qvsListDeleteNodeAll(list, freeItem);
-    qvsMemFree_debug(list);
+    qvs::freeBlock(list);
     return result;
 }
 

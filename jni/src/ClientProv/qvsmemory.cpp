@@ -5,6 +5,8 @@
 #include <stdlib.h>
 #include <string.h>
 
+bool qvs::tracking = false;
+
 namespace {
 
 // One block in use; free while the address is null.
@@ -95,12 +97,12 @@ char *copyOf(const char *str, size_t length)
 
 void *qvsMemAlloc_debug(uint32_t size, const char *file, int line)
 {
-    return entries ? remembered(malloc(size), size, file, line) : malloc(size);
+    return qvs::tracking ? remembered(malloc(size), size, file, line) : malloc(size);
 }
 
 void *qvsMemAllocSetZero_debug(uint32_t size, const char *file, int line)
 {
-    return entries ? remembered(cleared(size), size, file, line) : cleared(size);
+    return qvs::tracking ? remembered(cleared(size), size, file, line) : cleared(size);
 }
 
 uint16_t *qvsMemAllocW_debug(uint32_t count, const char *file, int line)
@@ -111,7 +113,7 @@ uint16_t *qvsMemAllocW_debug(uint32_t count, const char *file, int line)
     }
     void *block = malloc(count * sizeof(uint16_t));
     // kept[memcheck-unit-count]: the size that is remembered is the count of units, not of bytes.
-    return static_cast<uint16_t *>(entries ? remembered(block, count, file, line) : block);
+    return static_cast<uint16_t *>(qvs::tracking ? remembered(block, count, file, line) : block);
 }
 
 char *qvsStrdup_debug(const char *str, const char *file, int line)
@@ -121,7 +123,7 @@ char *qvsStrdup_debug(const char *str, const char *file, int line)
         return nullptr;
     }
     const size_t length = strlen(str);
-    if (!entries) {
+    if (!qvs::tracking) {
         return copyOf(str, length);
     }
     // kept[memcheck-text-length]: the size that is remembered leaves the terminator out.
@@ -141,7 +143,7 @@ void *qvsMemDup_debug(const void *src, uint32_t size, const char *file, int line
         return nullptr;
     }
     memcpy(block, src, size);
-    return entries ? remembered(block, size, file, line) : block;
+    return qvs::tracking ? remembered(block, size, file, line) : block;
 }
 
 void *qvsMemReAlloc_debug(void *old, uint32_t newsize, const char *file, int line)
@@ -160,7 +162,7 @@ void *qvsMemReAlloc_debug(void *old, uint32_t newsize, const char *file, int lin
 
 void qvsMemFree_debug(void *ptr)
 {
-    if (entries && ptr) {
+    if (qvs::tracking && ptr) {
         forget(ptr);
     }
     free(ptr);
@@ -175,6 +177,7 @@ void qvsMemStartMemCheck(void)
     }
     // hardened: without a table tracking stays off.
     entries = static_cast<Entry *>(calloc(kEntries, sizeof(Entry)));
+    qvs::tracking = entries != nullptr;
 }
 
 void qvsMemEndMemCheck(void)
@@ -192,6 +195,7 @@ void qvsMemEndMemCheck(void)
     }
     free(entries);
     entries = nullptr;
+    qvs::tracking = false;
 }
 
 void *qvsMemSet(void *dst, int byte, uint32_t n)

@@ -7,6 +7,7 @@
 #include "qvsresult.h"
 
 #include <stdint.h>
+#include <stdlib.h>
 
 QVS_BEGIN_DECLS
 
@@ -64,6 +65,25 @@ QVS_END_DECLS
 
 #ifdef __cplusplus
 namespace [[gnu::visibility("hidden")]] qvs {
+
+// Whether blocks are tracked.
+extern bool tracking;
+
+// qvsMemAlloc_debug and qvsMemFree_debug where a parse spends its time: with one test of tracking,
+// and no call but the C library's.
+inline void *newBlock(uint32_t size, const char *module, int line = __builtin_LINE())
+{
+    return tracking ? qvsMemAlloc_debug(size, module, line) : malloc(size);
+}
+
+inline void freeBlock(void *block)
+{
+    if (tracking) {
+        qvsMemFree_debug(block);
+    } else {
+        free(block);
+    }
+}
 
 // Zero-filled record with `spare` bytes behind it, tracked under the module that asked for it and
 // the line it asked on. Null without memory.

@@ -7,7 +7,7 @@
 #include <stdarg.h>
 #include <stdio.h>
 
-qvs::TraceSink qvs::traceSink = nullptr;
+qvcTraceSink qvs::traceSink = nullptr;
 
 char _szBuffer[QVC_TRACE_DUMP_SIZE];
 
@@ -66,6 +66,11 @@ __attribute__((format(printf, 2, 3))) void send(const Block &block, const char *
 }
 
 } // namespace
+
+void qvcTraceSetSink(qvcTraceSink sink)
+{
+    qvs::traceSink = sink;
+}
 
 void qvcTrace(const char *fmt, ...)
 {

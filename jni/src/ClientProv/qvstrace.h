@@ -11,6 +11,14 @@ QVS_BEGIN_DECLS
 
 #define QVC_TRACE_DUMP_SIZE 32000
 
+// Takes each message, NUL-terminated, with its length in bytes; the text is gone after the call. It
+// is called on the thread that traces and must not trace itself.
+typedef void (*qvcTraceSink)(const char *text, uint32_t length);
+
+// qvcTraceSetSink has every message handed to `sink` from now on; null, as at the start, ends that,
+// and messages are not even formed. One sink for the process, to be set while nothing is parsed.
+QVS_API void qvcTraceSetSink(qvcTraceSink sink);
+
 // What qvcTraceDump22 wrote last.
 extern QVS_API char _szBuffer[QVC_TRACE_DUMP_SIZE];
 
@@ -43,12 +51,9 @@ QVS_END_DECLS
 #ifdef __cplusplus
 namespace [[gnu::visibility("hidden")]] qvs {
 
-// Takes each message, NUL-terminated, with its length in bytes; the text is gone after the call.
-using TraceSink = void (*)(const char *text, uint32_t length);
-
-// Null at the start. While it is, nobody can see a message, and this one test is all that tracing
-// costs.
-extern TraceSink traceSink;
+// What qvcTraceSetSink was given. While it is null nobody can see a message, and this one test is
+// all that tracing costs.
+extern qvcTraceSink traceSink;
 
 // The trace functions as the library calls them.
 template <class... Args>
