@@ -29,8 +29,8 @@ struct ReleaseRow {
 // One kind of record: what it owns, in the order in which that is released, and where its children
 // are.
 struct ReleaseKind {
-    Rows<ReleaseRow> rows;
-    uint8_t childList; // kNoField for a kind in which nothing nests
+    Rows<ReleaseRow> rows = {};
+    uint8_t childList = kNoField; // none for a kind in which nothing nests
 };
 
 template <class Record, size_t N, size_t L = 0>
@@ -238,11 +238,12 @@ constexpr ReleaseKind kRelease = releaseOf<R>(kRows);
 
 // A slot of a node and the kind of record in it.
 struct SlotRow {
-    consteval SlotRow(RecordField s, const ReleaseKind &k) : slot(s.number), kind(&k) {}
-    consteval SlotRow(RecordField s) : slot(s.number) {}
+    consteval SlotRow(RecordField s, const ReleaseKind &k) : kind(k), slot(s.number), left(false) {}
+    consteval SlotRow(RecordField s) : kind(), slot(s.number), left(true) {}
 
+    ReleaseKind kind;
     uint8_t slot;
-    const ReleaseKind *kind = nullptr; // null for a record that is left
+    bool left; // stays allocated
 };
 
 // The slots of a node in their order, which is also that of the release.
@@ -329,15 +330,15 @@ qvsList *releaseSlots(qvsWapCharacter *node)
 {
     for (uint8_t slot = 0; slot < kFieldsOf<qvsWapCharacter>; ++slot) {
         void *record = pointerAt(node, slot);
-        const ReleaseKind *kind = record ? kSlots[slot].kind : nullptr;
-        if (!kind) {
+        if (!record || kSlots[slot].left) {
             continue;
         }
-        releaseFields(record, *kind);
-        if (qvsList *children = childrenOf(record, *kind)) {
+        const ReleaseKind &kind = kSlots[slot].kind;
+        releaseFields(record, kind);
+        if (qvsList *children = childrenOf(record, kind)) {
             return children;
         }
-        closeRecord(record, *kind);
+        closeRecord(record, kind);
         setPointer(node, slot, nullptr);
     }
     return nullptr;
@@ -378,9 +379,10 @@ void releaseNodes(qvsList *list)
     }
 }
 
-// Releases a record with everything nested in it.
-qvsResult releaseRecord(void *record, const ReleaseKind &kind)
+// Releases a record, of the kind that is kept in `slot`, with everything nested in it.
+qvsResult releaseRecord(void *record, RecordField slot)
 {
+    const ReleaseKind &kind = kSlots[slot.number].kind;
     if (!record) {
         return kNothing;
     }
@@ -452,85 +454,85 @@ qvsResult qvsClientProvWbxmlDeleteCharacter(qvsWapCharacter *node)
 
 qvsResult qvsClientProvWbxmlDeletePxlogical(qvsWapPxLogical *record)
 {
-    return releaseRecord(record, pxLogical::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptPxLogical));
 }
 
 qvsResult qvsClientProvWbxmlDeletePxAuthInfo(qvsWapPxAuthInfo *record)
 {
-    return releaseRecord(record, pxAuthInfo::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptPxAuthInfo));
 }
 
 qvsResult qvsClientProvWbxmlDeletePort(qvsWapPort *record)
 {
-    return releaseRecord(record, port::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptPort));
 }
 
 qvsResult qvsClientProvWbxmlDeletePxphysical(qvsWapPxPhysical *record)
 {
-    return releaseRecord(record, pxPhysical::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptPxPhysical));
 }
 
 qvsResult qvsClientProvWbxmlDeleteNapDef(qvsWapNapDef *record)
 {
-    return releaseRecord(record, napDef::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptNapDef));
 }
 
 qvsResult qvsClientProvWbxmlDeleteNapAuthInfo(qvsWapNapAuthInfo *record)
 {
-    return releaseRecord(record, napAuthInfo::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptNapAuthInfo));
 }
 
 qvsResult qvsClientProvWbxmlDeleteValidity(qvsWapValidity *record)
 {
-    return releaseRecord(record, validity::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptValidity));
 }
 
 qvsResult qvsClientProvWbxmlDeleteAppAddr(qvsWapAppAddr *record)
 {
-    return releaseRecord(record, appAddr::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptAppAddr));
 }
 
 qvsResult qvsClientProvWbxmlDeleteResource(qvsWapResource *record)
 {
-    return releaseRecord(record, resource::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptResource));
 }
 
 qvsResult qvsClientProvWbxmlDeleteAppAuth(qvsWapAppAuth *record)
 {
-    return releaseRecord(record, appAuth::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptAppAuth));
 }
 
 qvsResult qvsClientProvWbxmlDeleteApplication(qvsWapApplication *record)
 {
-    return releaseRecord(record, application::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptApplication));
 }
 
 qvsResult qvsClientProvWbxmlDeleteBootstrap(qvsWapBootstrap *record)
 {
-    return releaseRecord(record, bootstrap::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptBootstrap));
 }
 
 qvsResult qvsClientProvWbxmlDeleteVendorConfig(qvsWapVendorConfig *record)
 {
-    return releaseRecord(record, vendorConfig::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptVendorConfig));
 }
 
 qvsResult qvsClientProvWbxmlDeleteClientIdentity(qvsWapClientIdentity *record)
 {
-    return releaseRecord(record, clientIdentity::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptClientIdentity));
 }
 
 qvsResult qvsClientProvWbxmlDeleteAccess(qvsWapAccess *record)
 {
-    return releaseRecord(record, access::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptAccess));
 }
 
 qvsResult qvsClientProvWbxmlDeleteWifi(qvsWapWifi *record)
 {
-    return releaseRecord(record, wifi::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptWifi));
 }
 
 qvsResult qvsClientProvWbxmlDeleteVoWifi(qvsWapVoWifi *record)
 {
-    return releaseRecord(record, voWifi::kRelease);
+    return releaseRecord(record, QVS_FIELD(qvsWapCharacter, ptVoWifi));
 }

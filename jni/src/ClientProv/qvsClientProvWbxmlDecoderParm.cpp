@@ -160,7 +160,7 @@ qvsResult refuse(const ParmTable &table, uint8_t token)
         table.onRefused(token);
     } else {
         trace("Tag Code = QVS_ERROR_WBXML_UNKNOWN_ELEMENT");
-        trace("%s[%x]", table.name, token);
+        trace("qvsClientProvWbxmlDecoderParam%s[%x]", table.name, token);
     }
     return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
 }
@@ -214,7 +214,7 @@ qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvs
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
 {
     if (traceSink && table.entered) {
-        trace("%s", table.entered);
+        trace("qvsClientProvWbxmlDecoderParam%s", table.entered);
     }
     if (!record) {
         return QVS_ERROR_BAD_ARGUMENT;

@@ -137,7 +137,7 @@ constexpr Parm kParms[] = {
 } // namespace
 
 constexpr ParmTable qvs::kApplicationParms = {
-    .name = "qvsClientProvWbxmlDecoderParamApplication",
+    .name = "Application",
     .rows = application::kParms,
     .reader = readAppNamed,
     .onParm = traceParm,
@@ -145,19 +145,19 @@ constexpr ParmTable qvs::kApplicationParms = {
 };
 
 constexpr ParmTable qvs::kAppAddrParms = {
-    .name = "qvsClientProvWbxmlDecoderParamAppAddr",
+    .name = "AppAddr",
     .rows = appAddr::kParms,
 };
 
 constexpr ParmTable qvs::kAppAuthParms = {
-    .name = "qvsClientProvWbxmlDecoderParamAppAuth",
+    .name = "AppAuth",
     .rows = appAuth::kParms,
     .reader = readComma,
     .freshTokenAfterSwitch = true,
 };
 
 constexpr ParmTable qvs::kResourceParms = {
-    .name = "qvsClientProvWbxmlDecoderParamResource",
+    .name = "Resource",
     .rows = resource::kParms,
     .reader = readStartPage,
     .freshTokenAfterSwitch = true,

@@ -8,7 +8,7 @@ using namespace qvs;
 namespace {
 
 // kept[named-refusal]: a refused token is traced under the ACCESS decoder's name.
-constexpr char kRefusedBy[] = "qvsClientProvWbxmlDecoderParamAccess";
+constexpr char kRefusedBy[] = "Access";
 
 // The NAME is all that the loop knows of these characteristics.
 constexpr Parm kNameAlone[] = {
@@ -139,21 +139,21 @@ constexpr ParmTable qvs::kRoamingParms = {
     .name = kRefusedBy,
     .rows = kNameAlone,
     .reader = roaming::read,
-    .entered = "qvsClientProvWbxmlDecoderParamRoming",
+    .entered = "Roming",
 };
 
 constexpr ParmTable qvs::kWifiParms = {
     .name = kRefusedBy,
     .rows = kNameAlone,
     .reader = wifi::read,
-    .entered = "qvsClientProvWbxmlDecoderParamWifi",
+    .entered = "Wifi",
 };
 
 constexpr ParmTable qvs::kVoWifiParms = {
     .name = kRefusedBy,
     .rows = kNameAlone,
     .reader = voWifi::read,
-    .entered = "qvsClientProvWbxmlDecoderParamVoWifi",
+    .entered = "VoWifi",
 };
 
 qvsResult qvsClientProvWbxmlDecoderParamRoaming(qvsWbxmlDecoder *decoder, qvsWapRoaming *record)

@@ -75,19 +75,19 @@ constexpr Parm kParms[] = {
 } // namespace
 
 constexpr ParmTable qvs::kNapDefParms = {
-    .name = "qvsClientProvWbxmlDecoderParamNapDef",
+    .name = "NapDef",
     .rows = napDef::kParms,
     .reader = readNapNamed,
     .onRefused = napDef::traceRefused,
 };
 
 constexpr ParmTable qvs::kNapAuthInfoParms = {
-    .name = "qvsClientProvWbxmlDecoderParamNapAuthInfo",
+    .name = "NapAuthInfo",
     .rows = napAuthInfo::kParms,
 };
 
 constexpr ParmTable qvs::kValidityParms = {
-    .name = "qvsClientProvWbxmlDecoderParamValidity",
+    .name = "Validity",
     .rows = validity::kParms,
 };
 

@@ -51,23 +51,23 @@ constexpr Parm kParms[] = {
 } // namespace
 
 constexpr ParmTable qvs::kBootstrapParms = {
-    .name = "qvsClientProvWbxmlDecoderParamBootstrap",
+    .name = "Bootstrap",
     .rows = bootstrap::kParms,
 };
 
 constexpr ParmTable qvs::kClientIdentityParms = {
-    .name = "qvsClientProvWbxmlDecoderParamClientIdentity",
+    .name = "ClientIdentity",
     .rows = clientIdentity::kParms,
 };
 
 constexpr ParmTable qvs::kVendorConfigParms = {
-    .name = "qvsClientProvWbxmlDecoderParamVendorConfig",
+    .name = "VendorConfig",
     .rows = vendorConfig::kParms,
     .reader = readVendorNamed,
 };
 
 constexpr ParmTable qvs::kAccessParms = {
-    .name = "qvsClientProvWbxmlDecoderParamAccess",
+    .name = "Access",
     .rows = access::kParms,
 };
 

@@ -82,25 +82,25 @@ constexpr Parm kParms[] = {
 } // namespace
 
 constexpr ParmTable qvs::kPxLogicalParms = {
-    .name = "qvsClientProvWbxmlDecoderParamPxlogical",
+    .name = "Pxlogical",
     .rows = pxLogical::kParms,
     .onEnd = pxLogical::traceResult,
 };
 
 constexpr ParmTable qvs::kPxAuthInfoParms = {
-    .name = "qvsClientProvWbxmlDecoderParamPxAuthInfo",
+    .name = "PxAuthInfo",
     .rows = pxAuthInfo::kParms,
     .onToken = pxAuthInfo::traceToken,
     .onEnd = pxAuthInfo::traceEnd,
 };
 
 constexpr ParmTable qvs::kPortParms = {
-    .name = "qvsClientProvWbxmlDecoderParamPort",
+    .name = "Port",
     .rows = port::kParms,
 };
 
 constexpr ParmTable qvs::kPxPhysicalParms = {
-    .name = "qvsClientProvWbxmlDecoderParamPxPhysical",
+    .name = "PxPhysical",
     .rows = pxPhysical::kParms,
     .reader = readPhysicalDomain,
 };

@@ -74,8 +74,10 @@ struct Meaning {
     uint8_t row : 4;
 };
 
+// Of the tokens from kFirstValue on; those before it stand for nothing.
+constexpr uint8_t kFirstValue = 0x80;
 struct Meanings {
-    Meaning of[256];
+    Meaning of[256 - kFirstValue];
 };
 
 // Row 0 of every table is compared first, then row 1 of every table, and so on.
@@ -87,7 +89,7 @@ consteval Meanings firstHits()
     for (uint8_t row = 0; row < 9; ++row) {
         for (uint8_t t = 0; t < 4; ++t) {
             if (row < kTables[t].count) {
-                Meaning &meaning = meanings.of[kTables[t].rows[row].token];
+                Meaning &meaning = meanings.of[kTables[t].rows[row].token - kFirstValue];
                 if (meaning.row == 0) {
                     meaning.table = t & 3;
                     meaning.row = (row + 1) & 15;
@@ -122,7 +124,7 @@ bool joinText(qvsWbxmlDecoder *decoder, Text *text, const char *added, Join join
 
 qvsResult qvs::getParamTokenVal(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
 {
-    const Meaning meaning = kMeanings.of[token];
+    const Meaning meaning = token < kFirstValue ? Meaning{} : kMeanings.of[token - kFirstValue];
     if (meaning.row == 0) {
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }

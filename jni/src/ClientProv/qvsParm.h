@@ -33,11 +33,11 @@ struct Parm {
 // The parameters of one kind of characteristic. But for the rows, the reader and the way past a
 // page switch all of it is wording.
 struct ParmTable {
-    const char *name; // named in the trace of a refused token
+    const char *name; // of its decoder, in the trace of a refused token
     Rows<Parm> rows;
     qvsResult (*reader)(qvsWbxmlDecoder *decoder, void *record) = nullptr; // of kByReader
     bool freshTokenAfterSwitch = false;      // read it again instead of peeking at it masked
-    const char *entered = nullptr;           // traced before anything is read
+    const char *entered = nullptr;           // name of its decoder, traced before anything is read
     void (*onParm)(uint8_t token) = nullptr; // before a parameter of the table is read
     void (*onToken)(uint8_t token) = nullptr;
     void (*onRefused)(uint8_t token) = nullptr; // in place of the usual two lines

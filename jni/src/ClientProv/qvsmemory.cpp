@@ -48,7 +48,7 @@ void remember(void *block, uint32_t size, const char *file, int line)
     *entry = {block, size, file, line};
 }
 
-void forget(const void *block)
+[[gnu::cold, gnu::noinline]] void forget(const void *block)
 {
     Entry *entry = findEntry(block);
     if (!entry) {
@@ -58,8 +58,9 @@ void forget(const void *block)
     *entry = {};
 }
 
-// The block, remembered if there is one.
-void *remembered(void *block, uint32_t size, const char *file, int line)
+// The block, remembered if there is one. Apart, since a host tracks rarely.
+[[gnu::cold, gnu::noinline]] void *remembered(void *block, uint32_t size, const char *file,
+                                              int line)
 {
     if (block) {
         remember(block, size, file, line);

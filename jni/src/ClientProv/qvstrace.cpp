@@ -89,6 +89,11 @@ void qvcTrace(const char *fmt, ...)
     qvs::traceSink(lineBuffer, length + 1);
 }
 
+void qvs::traceText(const char *text)
+{
+    qvcTrace("%s", text);
+}
+
 void qvcTraceError(qvsResult code)
 {
     if (!qvs::traceSink || code == QVS_OK || code >= kEndOfDmCodes) {

@@ -55,13 +55,16 @@ namespace [[gnu::visibility("hidden")]] qvs {
 // all that tracing costs.
 extern qvcTraceSink traceSink;
 
+// Traces a text as it stands.
+void traceText(const char *text);
+
 // The trace functions as the library calls them.
 template <class... Args>
 inline void trace(const char *format, Args... args)
 {
     if (traceSink) [[unlikely]] {
         if constexpr (sizeof...(args) == 0) {
-            qvcTrace("%s", format);
+            traceText(format);
         } else {
             qvcTrace(format, args...);
         }
