@@ -1,0 +1,91 @@
+// counted LIBRARY header|parse|floor FILE COUNT: for a tool that counts instructions. Parses the
+// header of the message FILE, or decodes its body into a context and releases it, COUNT times with
+// a library; or replays the floor's steps in FILE so often. Nothing else is done between.
+#include "floor.h"
+
+#include "qvsClientProvWbxmlDecoder.h"
+#include "qvspushhandler.h"
+
+#include <dlfcn.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <fstream>
+#include <iterator>
+#include <vector>
+
+namespace {
+
+template <class Function>
+Function *function(void *library, const char *name)
+{
+    void *symbol = library ? dlsym(library, name) : nullptr;
+    if (!symbol) {
+        fprintf(stderr, "counted: %s\n", dlerror());
+        exit(1);
+    }
+    return reinterpret_cast<Function *>(symbol);
+}
+
+[[noreturn]] void refused(const char *file)
+{
+    fprintf(stderr, "counted: %s is refused\n", file);
+    exit(1);
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    if (argc != 5) {
+        fputs("usage: counted LIBRARY header|parse|floor FILE COUNT\n", stderr);
+        return 2;
+    }
+    const char *what = argv[2], *name = argv[3];
+    const long count = atol(argv[4]);
+    if (strcmp(what, "floor") == 0) {
+        bench::Floor floor(name);
+        for (long i = 0; i < count; i++) {
+            floor.replay();
+        }
+        return 0;
+    }
+
+    std::ifstream file(name, std::ios::binary);
+    const std::vector<char> bytes(std::istreambuf_iterator<char>(file), {});
+    const auto *message = reinterpret_cast<const uint8_t *>(bytes.data());
+    const auto length = static_cast<uint32_t>(bytes.size());
+
+    void *library = dlopen(argv[1], RTLD_NOW);
+    auto *header =
+        function<decltype(smlpushHdlrParsingWSPHeader)>(library, "smlpushHdlrParsingWSPHeader");
+    auto *decode =
+        function<decltype(qvsClinetProvWbxmlDecoderMain)>(library, "qvsClinetProvWbxmlDecoderMain");
+    auto *release =
+        function<decltype(qvsClientProvCtxDelectContext)>(library, "qvsClientProvCtxDelectContext");
+
+    if (strcmp(what, "header") == 0) {
+        for (long i = 0; i < count; i++) {
+            smlpushHdlrInfo *info = header(message, length);
+            if (!info) {
+                refused(name);
+            }
+            free(info->pBody);
+            free(info);
+        }
+        return 0;
+    }
+    const smlpushHdlrInfo *info = header(message, length);
+    if (!info) {
+        refused(name);
+    }
+    for (long i = 0; i < count; i++) {
+        qvsClientProvCtx *context = decode(info->pBody, info->nBodyLen);
+        if (!context) {
+            refused(name);
+        }
+        release(context);
+    }
+    return 0;
+}
