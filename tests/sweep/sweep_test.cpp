@@ -9,7 +9,10 @@
 
 #include <gtest/gtest.h>
 
+#include <malloc.h>
+
 #include <algorithm>
+#include <climits>
 #include <cstdlib>
 #include <set>
 #include <string>
@@ -144,8 +147,17 @@ size_t sweepCalls(const Document &document, fuzz::Random *random, size_t parts)
 
 using Try = size_t (*)(const Document &document, fuzz::Random *random, size_t parts);
 
+// Takes no memory back from the C library between sessions, which for the largest would take longer
+// than the sessions.
+void keepHeap()
+{
+    mallopt(M_TRIM_THRESHOLD, INT_MAX);
+    mallopt(M_MMAP_MAX, 0);
+}
+
 void tryAll(const std::vector<Document> &documents, Try attempt)
 {
+    keepHeap();
     const Choice chosen = choice();
     fuzz::Random random(chosen.seed);
     size_t tried = 0;
