@@ -28,18 +28,12 @@ Function *function(void *library, const char *name)
     return reinterpret_cast<Function *>(symbol);
 }
 
-[[noreturn]] void refused(const char *file)
-{
-    fprintf(stderr, "counted: %s is refused\n", file);
-    exit(1);
-}
-
 } // namespace
 
 int main(int argc, char **argv)
 {
     if (argc != 5) {
-        fputs("usage: counted LIBRARY header|parse|floor FILE COUNT\n", stderr);
+        fputs("usage: counted LIBRARY header|parse|message|floor FILE COUNT\n", stderr);
         return 2;
     }
     const char *what = argv[2], *name = argv[3];
@@ -65,27 +59,25 @@ int main(int argc, char **argv)
     auto *release =
         function<decltype(qvsClientProvCtxDelectContext)>(library, "qvsClientProvCtxDelectContext");
 
-    if (strcmp(what, "header") == 0) {
-        for (long i = 0; i < count; i++) {
-            smlpushHdlrInfo *info = header(message, length);
-            if (!info) {
-                refused(name);
-            }
+    const bool each = strcmp(what, "parse") != 0;
+    const bool body = strcmp(what, "header") != 0;
+    smlpushHdlrInfo *info = each ? nullptr : header(message, length);
+    for (long i = 0; i < count; i++) {
+        if (each) {
+            info = header(message, length);
+        }
+        qvsClientProvCtx *context = info && body ? decode(info->pBody, info->nBodyLen) : nullptr;
+        if (!info || (body && !context)) {
+            fprintf(stderr, "counted: %s is refused\n", name);
+            return 1;
+        }
+        if (context) {
+            release(context);
+        }
+        if (each) {
             free(info->pBody);
             free(info);
         }
-        return 0;
-    }
-    const smlpushHdlrInfo *info = header(message, length);
-    if (!info) {
-        refused(name);
-    }
-    for (long i = 0; i < count; i++) {
-        qvsClientProvCtx *context = decode(info->pBody, info->nBodyLen);
-        if (!context) {
-            refused(name);
-        }
-        release(context);
     }
     return 0;
 }

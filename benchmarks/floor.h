@@ -1,5 +1,6 @@
 // The floor: what the records of a document cost on the heap, and nothing else. It replays the
-// steps that benchmarks/blocks has written for the document with plain malloc, calloc, memcpy and free.
+// steps that benchmarks/blocks has written for the document with plain malloc, calloc, memcpy and
+// free.
 #ifndef BENCH_FLOOR_H
 #define BENCH_FLOOR_H
 
