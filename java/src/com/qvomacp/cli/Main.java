@@ -83,13 +83,15 @@ public final class Main implements Runnable {
      * @param arguments what the command line gives
      */
     public static void main(String[] arguments) {
+        // Nobody types a message.
+        boolean helpless = arguments.length == 0 && Terminal.isTerminal(0);
         System.exit(
                 run(
                         new FileInputStream(FileDescriptor.in),
                         new FileOutputStream(FileDescriptor.out),
                         new FileOutputStream(FileDescriptor.err),
                         Terminal.ofProcess(System.getenv()),
-                        arguments));
+                        helpless ? new String[] {"--help"} : arguments));
     }
 
     /**

@@ -52,7 +52,7 @@ final class Terminal {
     }
 
     /** Whether a descriptor is a terminal; Java itself only tells it of all of them together. */
-    private static boolean isTerminal(int descriptor) {
+    static boolean isTerminal(int descriptor) {
         try {
             Path link = Files.readSymbolicLink(Paths.get("/proc/self/fd/" + descriptor));
             return link.startsWith("/dev/pts") || link.toString().startsWith("/dev/tty");
