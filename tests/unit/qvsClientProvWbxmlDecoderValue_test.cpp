@@ -5,6 +5,8 @@
 
 #include <cstring>
 #include <map>
+#include <optional>
+#include <string>
 
 using decoding::Bytes;
 using decoding::Decoder;
@@ -179,6 +181,86 @@ TEST(Kept, lookup_without_memory)
     }
     ASSERT_EQ(traces.texts.size(), 6U);
     EXPECT_EQ(traces.texts[0].find(kLookupWithoutMemory), 0U);
+}
+
+// What reading one parameter came to: result, text or items, and how far it read.
+std::string readAs(const Bytes &bytes, bool list)
+{
+    Decoder decoder(bytes);
+    std::string read;
+    if (list) {
+        qvsList *items = nullptr;
+        read = std::to_string(qvsClientProvWbxmlDecoderParamListString(decoder, &items, 0x15));
+        void *item = nullptr;
+        for (uint32_t i = 0; items && qvsListGetItemIndex(items, &item, i) == QVS_OK; ++i) {
+            read += " " + std::string(static_cast<const char *>(item));
+        }
+        (void)qvsListDeleteNodeAllAndList(items, nullptr);
+    } else {
+        OwnText text;
+        read = std::to_string(qvsClientProvWbxmlDecoderParamString(decoder, &text, 0x15));
+        read += " " + text.str();
+    }
+    return read + " @" + std::to_string(decoder.position());
+}
+
+// The usual parameters are read in one go, and step by step while somebody listens to the traces.
+TEST_F(ParamString, ReadsInOneGoWhatItReadsStepByStep)
+{
+    const Bytes parameters[] = {
+        {0x15, 0x06, 0x03, 'a', 'b', 0, 0x01},
+        {0x15, 0x06, 0x03, 0, 0x01},
+        {0x15, 0x06, 0x03, 'a', 0},
+        {0x15, 0x06, 0x03, 'a', 'b'},
+        {0x15, 0x06, 0x03},
+        {0x15, 0x06, 0x03, 'a', 0, 0x06, 0x03, 'b', 0, 0x01},
+        {0x15, 0x06, 0x03, 'a', 0, 0x03, 'b', 0, 0x01},
+        {0x15, 0x06, 0x03, 'a', 0, 0x15, 0x06, 0x03, 'b', 0, 0x01},
+        {0x15, 0x06, 0x85, 0x01},
+        {0x15, 0x06, 0x85},
+        {0x15, 0x06, 0x85, 0x86, 0x01},
+        {0x15, 0x06, 0x94, 0x01},
+        {0x15, 0x06, 0xF0, 0x01},
+        {0x15, 0x06, 0x04, 0x01},
+        {0x15, 0x06, 0x01, 0x01},
+        {0x15, 0x06, 0x00, 0x01, 0x03, 'a', 0, 0x01},
+        {0x15, 0x06, 0xC3, 0x01, 'a', 0x01},
+        {0x15, 0x01},
+        {0x15, 0x03, 'a', 0, 0x01},
+        {0x16, 0x06, 0x03, 'a', 0, 0x01},
+        {0x15},
+    };
+    for (const bool list : {false, true}) {
+        for (const Bytes &bytes : parameters) {
+            blocks::BlockCheck check;
+            const std::string inOneGo = readAs(bytes, list);
+            Traces traces;
+            EXPECT_EQ(inOneGo, readAs(bytes, list)) << testing::PrintToString(bytes);
+        }
+    }
+}
+
+TEST_F(ParamString, WithoutMemoryFailsForAStringAndGoesOnBehindAToken)
+{
+    for (const bool traced : {false, true}) {
+        std::optional<Traces> traces;
+        if (traced) {
+            traces.emplace();
+        }
+        blocks::BlockCheck check;
+        Decoder string({0x15, 0x06, 0x03, 'a', 0, 0x01});
+        Decoder token({0x15, 0x06, 0x85, 0x01});
+        OwnText text;
+        blocks::failAt = 0;
+        EXPECT_EQ(qvsClientProvWbxmlDecoderParamString(string, &text, 0x15),
+                  QVS_ERROR_WBXML_NO_DATA);
+        EXPECT_EQ(string.position(), 3U);
+        blocks::failAt = 0;
+        EXPECT_EQ(qvsClientProvWbxmlDecoderParamString(token, &text, 0x15), QVS_OK);
+        EXPECT_EQ(token.position(), 3U);
+        blocks::reset();
+        EXPECT_TRUE(text.isNull());
+    }
 }
 
 TEST_F(ParamValue, ReadsTheValueBehindItsToken)

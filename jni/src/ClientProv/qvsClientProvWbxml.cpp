@@ -323,6 +323,15 @@ void closeRecord(void *record, const ReleaseKind &kind)
     freeBlock(record);
 }
 
+// Added to the pointer in a slot while the record's fields are gone and its children still go:
+// blocks begin at even addresses.
+constexpr uintptr_t kEmptied = 1;
+
+bool isEmptied(const void *record)
+{
+    return reinterpret_cast<uintptr_t>(record) & kEmptied;
+}
+
 // Releases the records of a node in the order of its slots. Stops at a record with children, which
 // have to go first, and answers their list; does the rest when called again. Null when nothing is
 // left but the node itself.
@@ -334,9 +343,14 @@ qvsList *releaseSlots(qvsWapCharacter *node)
             continue;
         }
         const ReleaseKind &kind = kSlots[slot].kind;
-        releaseFields(record, kind);
-        if (qvsList *children = childrenOf(record, kind)) {
-            return children;
+        if (isEmptied(record)) {
+            record = static_cast<char *>(record) - kEmptied;
+        } else {
+            releaseFields(record, kind);
+            if (qvsList *children = childrenOf(record, kind)) {
+                setPointer(node, slot, static_cast<char *>(record) + kEmptied);
+                return children;
+            }
         }
         closeRecord(record, kind);
         setPointer(node, slot, nullptr);
@@ -348,7 +362,7 @@ qvsList *releaseSlots(qvsWapCharacter *node)
 qvsListNode *takeNodes(qvsList *list, qvsListNode *chain)
 {
     qvsListNode *first = list->ptFirst;
-    qvsListNode *last = first;
+    qvsListNode *last = list->ptTail ? list->ptTail : first;
     while (last->ptNext) {
         last = last->ptNext;
     }

@@ -162,8 +162,7 @@ qvsResult refuseAttribute(uint8_t token)
 // A TYPE given as text. Other names than the three known ones make no record.
 qvsResult readNamedType(qvsWbxmlDecoder *decoder, Node *node, ScopedText *name)
 {
-    uint8_t token = 0;
-    (void)takeByte(decoder, &token);
+    ++decoder->ptBuffer->pHead; // behind the attribute start
     Text read;
     const qvsResult result = content(decoder, &read);
     qvsMemFree_debug(name->take());
@@ -187,8 +186,35 @@ qvsResult readType(qvsWbxmlDecoder *decoder, Node *node, uint8_t token)
     if (qvsResult result = create(node, *kind)) {
         return result;
     }
-    (void)takeByte(decoder, &token);
+    ++decoder->ptBuffer->pHead;
     return QVS_OK;
+}
+
+// Reads the attributes of a characteristic and the END behind them.
+qvsResult readAttributes(qvsWbxmlDecoder *decoder, Node *node, uint8_t *attrId, ScopedText *name)
+{
+    uint8_t token = 0;
+    while (peekByte(decoder, &token)) {
+        if (token == wbxml::kEnd) {
+            ++decoder->ptBuffer->pHead;
+            return QVS_OK;
+        }
+        // kept[attr-last-token]: whatever comes last is the TYPE, so that a page switch behind it
+        // leaves none.
+        *attrId = token;
+        qvsResult result = QVS_OK;
+        if (token == wbxml::kSwitchPage) {
+            result = qvsClientProvWbxmlDecoderCheckCodePage(decoder);
+        } else if (token == attr::kType) {
+            result = readNamedType(decoder, node, name);
+        } else {
+            result = readType(decoder, node, token);
+        }
+        if (result != QVS_OK) {
+            return result;
+        }
+    }
+    return QVS_ERROR_WBXML_NO_DATA;
 }
 
 // ---- Open elements
@@ -224,14 +250,12 @@ qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)
     }
     if (hasAttributes) {
         ScopedText name;
-        uint8_t page = 0;
-        if (qvsResult result = qvsClientProvWbxmlDecoderCharacterAttribute(
-                decoder, &open->node, &open->attrId, &page, &name.text)) {
+        if (qvsResult result = readAttributes(decoder, &open->node, &open->attrId, &name)) {
             // hardened: what a characteristic that fails has read is released with it.
             releaseNode(&open->node);
             return result;
         }
-        open->kind = findKind(open->attrId, page, name.text);
+        open->kind = findKind(open->attrId, decoder->nCodePage, name.text);
     }
     open->parent = *innermost;
     *innermost = open;
@@ -535,30 +559,10 @@ qvsResult qvsClientProvWbxmlDecoderCharacterAttribute(qvsWbxmlDecoder *decoder,
                                                       uint8_t *codePage, char **name)
 {
     ScopedText type;
-    for (;;) {
-        uint8_t token = 0;
-        if (!peekByte(decoder, &token)) {
-            return QVS_ERROR_WBXML_NO_DATA;
-        }
-        if (token == wbxml::kEnd) {
-            (void)takeByte(decoder, &token);
-            *codePage = decoder->nCodePage;
-            *name = type.take();
-            return QVS_OK;
-        }
-        // kept[attr-last-token]: whatever comes last is the TYPE, so that a page switch behind it
-        // leaves none.
-        *attrId = token;
-        qvsResult result = QVS_OK;
-        if (token == wbxml::kSwitchPage) {
-            result = qvsClientProvWbxmlDecoderCheckCodePage(decoder);
-        } else if (token == attr::kType) {
-            result = readNamedType(decoder, node, &type);
-        } else {
-            result = readType(decoder, node, token);
-        }
-        if (result != QVS_OK) {
-            return result;
-        }
+    if (qvsResult result = readAttributes(decoder, node, attrId, &type)) {
+        return result;
     }
+    *codePage = decoder->nCodePage;
+    *name = type.take();
+    return QVS_OK;
 }

@@ -1,6 +1,7 @@
 // One parm element: the loop that reads it by the table of its characteristic, and its value, which
 // is a text or one more item of a list of texts.
 #include "qvsParm.h"
+#include "qvsstring.h"
 
 using namespace qvs;
 
@@ -9,7 +10,8 @@ namespace {
 // ---- Values
 
 // Reads NAME and VALUE of one parameter onto `text`, step by step.
-qvsResult readAnyPair(qvsWbxmlDecoder *decoder, Text *text, uint8_t token)
+[[gnu::noinline, gnu::cold]] qvsResult readAnyPair(qvsWbxmlDecoder *decoder, Text *text,
+                                                   uint8_t token)
 {
     if (qvsResult result = checkAttr(decoder, token)) {
         return result;
@@ -40,49 +42,74 @@ qvsResult readAnyPair(qvsWbxmlDecoder *decoder, Text *text, uint8_t token)
     return result;
 }
 
-constexpr uint32_t kPlainStart = 3; // NAME, VALUE, STR_I
+constexpr uint32_t kPlainStart = 3; // NAME, VALUE, STR_I or a value token
 
-// The text of a usual parameter, which is NAME, VALUE and one inline string with END behind it, and
-// the bytes of it with its NUL. Null for any other, and for one that has something to trace or
-// comes near the limit of text.
-const uint8_t *plainText(const qvsWbxmlDecoder *decoder, uint8_t token, uint32_t *size)
+// The usual parameter: NAME and VALUE, of one inline string or one value token, and END.
+struct Plain {
+    const void *text; // null for any other parameter
+    uint32_t size;    // bytes of it, with its NUL
+    uint32_t read;    // bytes of the parameter up to the END
+};
+
+// Other parameters are read step by step, and so is one that has something to trace or comes near
+// the limit of text.
+Plain findPlain(const qvsWbxmlDecoder *decoder, uint8_t token)
 {
     const uint32_t left = bytesLeft(decoder);
     if (left <= kPlainStart || traceSink) {
-        return nullptr;
+        return {};
     }
     const uint8_t *read = decoder->ptBuffer->pHead;
-    if (read[0] != token || read[1] != attr::kValue || read[2] != wbxml::kStrI) {
-        return nullptr;
+    if (read[0] != token || read[1] != attr::kValue) {
+        return {};
+    }
+    if (read[2] != wbxml::kStrI) {
+        const char *text = read[kPlainStart] == wbxml::kEnd ? valueText(read[2]) : nullptr;
+        return {text, text ? qvsStrlen(text) + 1 : 0, kPlainStart};
     }
     const uint8_t *text = read + kPlainStart;
     const auto *nul = static_cast<const uint8_t *>(memchr(text, '\0', left - kPlainStart));
     if (!nul || nul + 1 == read + left || nul[1] != wbxml::kEnd) {
-        return nullptr;
+        return {};
     }
-    *size = static_cast<uint32_t>(nul + 1 - text);
-    return decoder->nTextRead + *size <= kTextAlways ? text : nullptr;
+    const auto size = static_cast<uint32_t>(nul + 1 - text);
+    return {decoder->nTextRead + size <= kTextAlways ? text : nullptr, size, kPlainStart + size};
 }
 
-// Reads NAME and VALUE of one parameter onto `text`. The usual ones are read in one go, in half the
-// instructions.
-qvsResult readPair(qvsWbxmlDecoder *decoder, Text *text, uint8_t token)
+// Reads the usual parameter into `*text`, which the caller owns.
+qvsResult takePlain(qvsWbxmlDecoder *decoder, const Plain &plain, char **text)
 {
-    uint32_t size = 0;
-    const uint8_t *plain = text->holdsText() ? nullptr : plainText(decoder, token, &size);
-    if (!plain) {
-        return readAnyPair(decoder, text, token);
-    }
-    text->data = static_cast<char *>(newBlock(size, kDecoderModule));
-    if (!text->data) {
+    auto *block = static_cast<char *>(newBlock(plain.size, kDecoderModule));
+    if (block) {
+        memcpy(block, plain.text, plain.size);
+    } else if (plain.read > kPlainStart) {
+        decoder->ptBuffer->pHead += kPlainStart;
         return QVS_ERROR_WBXML_NO_DATA;
     }
-    memcpy(text->data, plain, size);
-    text->length = size - 1;
-    text->capacity = size;
-    decoder->nTextRead += size - 1;
-    decoder->ptBuffer->pHead += kPlainStart + size;
+    // kept[lookup-without-memory]: a value token counts as read also without memory for its text.
+    decoder->nTextRead += plain.size - 1;
+    decoder->ptBuffer->pHead += plain.read;
+    *text = block;
     return QVS_OK;
+}
+
+[[gnu::noinline, gnu::cold]] qvsResult readAnyText(qvsWbxmlDecoder *decoder, char **text,
+                                                   uint8_t token)
+{
+    Text read;
+    if (qvsResult result = readAnyPair(decoder, &read, token)) {
+        return result;
+    }
+    *text = read.take();
+    return QVS_OK;
+}
+
+// Reads NAME and VALUE of one parameter into `*text`. The usual ones are read in one go, in half
+// the instructions. kept[repeated-parm]: the text that was there stays allocated.
+inline qvsResult readText(qvsWbxmlDecoder *decoder, char **text, uint8_t token)
+{
+    const Plain plain = findPlain(decoder, token);
+    return plain.text ? takePlain(decoder, plain, text) : readAnyText(decoder, text, token);
 }
 
 // Adds a text to a list of texts, which is made when there is none. A null text adds nothing.
@@ -101,47 +128,62 @@ qvsResult addText(qvsList **list, char *text)
     return QVS_ERROR_FAILED;
 }
 
-// Reads the pairs up to END into `*list`. A later pair of the same element continues the text of
-// the one before it in an item of its own.
-qvsResult readPairs(qvsWbxmlDecoder *decoder, qvsList **list)
+// Reads one pair onto the list. `*last` is the text of the pair before it in the same element,
+// which a later pair continues in an item of its own.
+qvsResult readItem(qvsWbxmlDecoder *decoder, qvsList **list, uint8_t token, const char **last)
+{
+    char *item = nullptr;
+    if (!*last) {
+        if (qvsResult result = readText(decoder, &item, token)) {
+            return result;
+        }
+        *last = item;
+    } else {
+        Text text;
+        text.before = *last;
+        if (qvsResult result = readAnyPair(decoder, &text, token)) {
+            return result;
+        }
+        *last = text.data ? text.data : text.before;
+        item = text.take();
+    }
+    return addText(list, item);
+}
+
+// Reads the pairs up to END into `*list`.
+qvsResult readItems(qvsWbxmlDecoder *decoder, qvsList **list)
 {
     const char *last = nullptr;
-    for (;;) {
-        uint8_t token = 0;
-        if (!peekByte(decoder, &token)) {
-            return QVS_ERROR_WBXML_NO_DATA;
-        }
+    uint8_t token = 0;
+    while (peekByte(decoder, &token)) {
         if (token == wbxml::kEnd) {
             return QVS_OK;
         }
-        Text text;
-        text.before = last;
-        if (qvsResult result = readPair(decoder, &text, token)) {
-            return result;
-        }
-        last = text.data ? text.data : text.before;
-        if (qvsResult result = addText(list, text.take())) {
+        if (qvsResult result = readItem(decoder, list, token, &last)) {
             return result;
         }
     }
+    return QVS_ERROR_WBXML_NO_DATA;
 }
 
 // ---- The loop
 
-// The token the loop decides on next, behind page switches if there are any.
-qvsResult nextToken(qvsWbxmlDecoder *decoder, const ParmTable &table, uint8_t *token)
+// The token behind page switches. False at the end of the data.
+[[gnu::noinline, gnu::cold]] bool skipSwitches(qvsWbxmlDecoder *decoder, const ParmTable &table,
+                                               uint8_t *token)
 {
-    bool present = peekByte(decoder->ptBuffer, token);
-    while (present && *token == wbxml::kSwitchPage) {
+    do {
         // kept[parm-switch-ignored]: a switch to an unknown page is no failure by itself.
         (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
-        present = peekByte(decoder, token);
+        if (!peekByte(decoder->ptBuffer, token)) {
+            return false;
+        }
         if (!table.freshTokenAfterSwitch) {
             // kept[parm-switch-masked]: behind a switch the token is seen without its top bits.
             *token &= wbxml::kTagMask;
         }
-    }
-    return present ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+    } while (*token == wbxml::kSwitchPage);
+    return true;
 }
 
 const Parm *findParm(const ParmTable &table, uint8_t token)
@@ -154,7 +196,7 @@ const Parm *findParm(const ParmTable &table, uint8_t token)
     return nullptr;
 }
 
-qvsResult refuse(const ParmTable &table, uint8_t token)
+[[gnu::noinline, gnu::cold]] qvsResult refuse(const ParmTable &table, uint8_t token)
 {
     if (table.onRefused) {
         table.onRefused(token);
@@ -163,6 +205,18 @@ qvsResult refuse(const ParmTable &table, uint8_t token)
         trace("qvsClientProvWbxmlDecoderParam%s[%x]", table.name, token);
     }
     return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+}
+
+// What a decoder traces of its own behind a parameter and at the end.
+[[gnu::noinline, gnu::cold]] void traceStep(const ParmTable &table, uint8_t token, bool end,
+                                            qvsResult result)
+{
+    if (table.onToken) {
+        table.onToken(token);
+    }
+    if (table.onEnd && (end || result != QVS_OK)) {
+        table.onEnd(token, result);
+    }
 }
 
 // Reads the parameter that `token` announces into its field.
@@ -177,7 +231,7 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, void *record, const ParmTable &tabl
     }
     switch (parm->type) {
     case ParmType::kText:
-        return qvsClientProvWbxmlDecoderParamString(decoder, textAt(record, parm->field), token);
+        return readText(decoder, textAt(record, parm->field), token);
     case ParmType::kList:
         return qvsClientProvWbxmlDecoderParamListString(decoder, listAt(record, parm->field),
                                                         token);
@@ -190,19 +244,14 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, void *record, const ParmTable &tabl
 
 qvsResult qvsClientProvWbxmlDecoderParamString(qvsWbxmlDecoder *decoder, char **text, uint8_t token)
 {
-    Text read;
-    if (qvsResult result = readPair(decoder, &read, token)) {
-        return result;
-    }
-    *text = read.take(); // kept[repeated-parm]: the text that was there stays allocated.
-    return QVS_OK;
+    return readText(decoder, text, token);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvsList **list,
                                                    uint8_t /*token*/)
 {
     qvsList *built = *list;
-    const qvsResult result = readPairs(decoder, &built);
+    const qvsResult result = readItems(decoder, &built);
     if (result == QVS_OK) {
         *list = built;
     } else if (!*list) {
@@ -222,26 +271,24 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable
     if (qvsResult result = checkElement(decoder, tag::kParm)) {
         return result;
     }
-    for (;;) {
-        uint8_t token = 0;
-        if (qvsResult result = nextToken(decoder, table, &token)) {
-            return result;
+    uint8_t token = 0;
+    while (peekByte(decoder->ptBuffer, &token)) {
+        if (token == wbxml::kSwitchPage && !skipSwitches(decoder, table, &token)) {
+            break;
         }
-        const bool end = token == wbxml::kEnd;
         qvsResult result = QVS_OK;
+        const bool end = token == wbxml::kEnd;
         if (end) {
             (void)takeSeenTag(decoder);
         } else {
             result = readParm(decoder, record, table, token);
         }
-        if (traceSink && table.onToken) {
-            table.onToken(token);
+        if (traceSink) {
+            traceStep(table, token, end, result);
         }
         if (end || result != QVS_OK) {
-            if (traceSink && table.onEnd) {
-                table.onEnd(token, result);
-            }
             return result;
         }
     }
+    return QVS_ERROR_WBXML_NO_DATA;
 }

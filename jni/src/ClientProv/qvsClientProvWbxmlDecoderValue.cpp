@@ -102,6 +102,11 @@ consteval Meanings firstHits()
 
 constexpr Meanings kMeanings = firstHits();
 
+Meaning meaningOf(uint8_t token)
+{
+    return token < kFirstValue ? Meaning{} : kMeanings.of[token - kFirstValue];
+}
+
 bool joinText(qvsWbxmlDecoder *decoder, Text *text, const char *added, Join join)
 {
     const uint32_t length = qvsStrlen(added);
@@ -122,9 +127,15 @@ bool joinText(qvsWbxmlDecoder *decoder, Text *text, const char *added, Join join
 
 } // namespace
 
+const char *qvs::valueText(uint8_t token)
+{
+    const Meaning meaning = meaningOf(token);
+    return meaning.row ? kTables[meaning.table].rows[meaning.row - 1].text : nullptr;
+}
+
 qvsResult qvs::getParamTokenVal(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
 {
-    const Meaning meaning = token < kFirstValue ? Meaning{} : kMeanings.of[token - kFirstValue];
+    const Meaning meaning = meaningOf(token);
     if (meaning.row == 0) {
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }

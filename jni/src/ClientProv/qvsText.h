@@ -198,6 +198,9 @@ qvsResult content(qvsWbxmlDecoder *decoder, Text *text);
 qvsResult getParamTokenVal(qvsWbxmlDecoder *decoder, uint8_t token, Text *text);
 qvsResult paramValue(qvsWbxmlDecoder *decoder, Text *text);
 
+// What a value token stands for; null for a token that stands for no text.
+const char *valueText(uint8_t token);
+
 // Reads an inline string at the read position, the byte there included, and drops it.
 qvsResult dropInlineString(qvsWbxmlDecoder *decoder);
 
