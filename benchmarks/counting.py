@@ -15,8 +15,8 @@ SOURCES = ROOT / "jni" / "src" / "ClientProv"
 # The documents, and how often each is parsed in the two runs whose difference counts. What only the
 # first rounds cost is in both.
 ROUNDS = {
-    "160": (10, 60), "300": (10, 60), "547": (10, 60), "2k": (5, 25), "8k": (4, 12), "29k": (3, 7),
-    "200k": (2, 8), "1m": (2, 5),
+    "160": (50, 250), "300": (50, 250), "547": (50, 250), "2k": (20, 120), "8k": (10, 40),
+    "29k": (4, 14), "200k": (2, 8), "1m": (2, 6),
 }
 
 # A repeated string instruction counts once for each byte that it moves, which says nothing of what
@@ -78,33 +78,52 @@ def program(bits):
 
 
 class Counts:
-    """What callgrind has counted: instructions, and calls that ask for a heap block."""
+    """What callgrind has counted: instructions, calls that ask for a heap block, and the instructions
+    by (file, function)."""
 
-    def __init__(self, instructions, blocks):
+    def __init__(self, instructions, blocks, functions):
         self.instructions = instructions
         self.blocks = blocks
+        self.functions = functions
 
-    def __sub__(self, other):
-        return Counts(self.instructions - other.instructions, self.blocks - other.blocks)
-
-    def __truediv__(self, count):
-        return Counts(self.instructions / count, self.blocks / count)
+    def per_round(self, fewer, rounds):
+        """What a round costs when there were so many more than in the other run."""
+        functions = {name: (cost - fewer.functions.get(name, 0)) / rounds
+                     for name, cost in self.functions.items()}
+        return Counts((self.instructions - fewer.instructions) / rounds,
+                      (self.blocks - fewer.blocks) / rounds, functions)
 
 
 def read_counts(profile):
     """The counts in a profile that callgrind has written."""
-    names, called = {}, None
+    names, images = {}, {}
+    image = function = called = ""
     instructions = blocks = 0
+    functions = {}
+    of_call = False  # the next line of costs is that of a call
     for line in profile.splitlines():
-        if found := re.match(r"c?fn=\((\d+)\)(?: (.*))?$", line):
-            if found[2]:
-                names[found[1]] = found[2]
-            called = names[found[1]]
-        elif line.startswith("calls=") and called in ALLOCATORS:
-            blocks += int(line[6:].split()[0])
+        if found := re.match(r"(c?)(fn|ob)=\((\d+)\)(?: (.*))?$", line):
+            is_called, what, number, name = found.groups()
+            known = names if what == "fn" else images
+            name = known.setdefault(number, name)
+            if what == "ob":
+                image = image if is_called else Path(name).name
+            elif is_called:
+                called = name
+            else:
+                function = name
+        elif line.startswith("calls="):
+            of_call = True
+            if called in ALLOCATORS:
+                blocks += int(line[6:].split()[0])
         elif found := re.match(r"(?:summary|totals): (\d+)", line):
             instructions = int(found[1])
-    return Counts(instructions, blocks)
+        elif found := re.match(r"[+*-]?\d* (\d+)$", line):
+            if not of_call:
+                key = image, function.split("'")[0]
+                functions[key] = functions.get(key, 0) + int(found[1])
+            of_call = False
+    return Counts(instructions, blocks, functions)
 
 
 def run(bits, library, what, name, count):
@@ -121,5 +140,5 @@ def run(bits, library, what, name, count):
 def count(bits, library, what, path, rounds):
     """What one round costs: "header", "parse", "message" or "floor", see counted.cpp."""
     few, many = rounds
-    runs = [run(bits, library, what, path, times) for times in (many, few)]
-    return (runs[0] - runs[1]) / (many - few)
+    fewer, more = (run(bits, library, what, path, times) for times in rounds)
+    return more.per_round(fewer, many - few)
