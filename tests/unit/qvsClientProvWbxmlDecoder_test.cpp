@@ -4,6 +4,9 @@
 #include "message.h"
 #include "traces.h"
 
+#include <cstring>
+#include <string>
+
 using decoding::Bytes;
 using decoding::Decoder;
 
@@ -238,11 +241,38 @@ TEST_F(DecoderMain, LeavesTheBytesAloneAndKeepsNoPointerIntoThem)
     qvsClientProvCtxDelectContext(context);
 }
 
+// A reader of modified UTF-8 may look at four bytes behind the terminator of a cut sequence.
+TEST_F(DecoderMain, EndsEveryTextOfTheContextWithSpareZeros)
+{
+    const message::Value texts[] = {
+        "plain",
+        message::Value("two") + "pieces",
+        message::token(0x85),
+        message::Value("hidden") + message::token(0x94), // a call type joins behind the terminator
+        message::opaque({'c', 'u', 't', 0, 'h', 'i', 'd', 'd', 'e', 'n'}),
+        message::token(0xF0), // no text of its own: the token alone
+    };
+    for (const message::Value &text : texts) {
+        message::Body body;
+        body.characteristic(message::kNapDef, [&] {
+            body.parm(message::kNapAddress, text).parm(message::kBearer, text);
+        });
+        qvsClientProvCtx *context = decodeMain(message::document(body));
+        ASSERT_NE(context, nullptr);
+        for (const char *shown :
+             {context->ptNapDef->pszNapAddress, context->ptNapDef->ptBearer->pszValue}) {
+            EXPECT_EQ(std::string(shown + std::strlen(shown), 5), std::string(5, '\0')) << shown;
+        }
+        qvsClientProvCtxDelectContext(context);
+    }
+}
+
 TEST_F(DecoderMain, SurvivesEveryFailingAllocation)
 {
     message::Body body;
     body.characteristic(message::kPxLogical, [&] {
         body.parm(message::kProxyId, "p1").parm(message::kDomain, "d1");
+        body.parm(message::kName, "n1").parm(message::kStartPage, "s1");
         body.characteristic(message::kPort, [&] { body.parm(message::kPortNbr, "80"); });
     });
     const Bytes bytes = message::document(body);

@@ -1,4 +1,4 @@
-// The provisioning context from outside: made from a document tree, and released chain by chain.
+// The releases of the provisioning context, chain by chain.
 #include "qvsClientProvCtx.h"
 #include "qvsFields.h"
 #include "qvsmemory.h"
@@ -366,18 +366,6 @@ void releaseChain(void *first, Kind of)
 }
 
 } // namespace
-
-qvsClientProvCtx *qvsClientProvCtxMakeContext(qvsWapDoc *document)
-{
-    if (!document) {
-        traceError(QVS_ERROR_BAD_ARGUMENT);
-        return nullptr;
-    }
-    qvsClientProvCtx *root = nullptr;
-    const qvsResult result = qvsClientProvCtxVerifyContext(document->ptCharacterList, &root);
-    traceError(result);
-    return root;
-}
 
 void qvsClientProvCtxDelectContext(qvsClientProvCtx *root)
 {

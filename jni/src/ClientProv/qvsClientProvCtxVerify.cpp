@@ -24,6 +24,13 @@ char *copyOf(const char *text)
     return qvsStrdup_debug(text, kModule, __LINE__);
 }
 
+// The text of the tree, with the zero bytes behind it that those of a context have.
+char *withSpareZeros(char *text)
+{
+    memset(text + qvsStrlen(text) + 1, 0, kSpareZeros);
+    return text;
+}
+
 // The item under the cursor of a list, which moves on; null behind the last one.
 void *nextItem(qvsList *list)
 {
@@ -91,18 +98,18 @@ struct Chains {
 };
 
 // Copies the record of a tree node that `row` is about, if the node carries one.
-bool copySlot(const qvsWapCharacter &node, const ChildRow &row, ChainEnd *chain)
+bool copySlot(const qvsWapCharacter &node, const ChildRow &row, ChainEnd *chain, Texts texts)
 {
     void *record = pointerAt(&node, row.slot);
     if (!record) {
         return false;
     }
-    chain->append(copyRecord(record, *row.kind));
+    chain->append(copyRecord(record, *row.kind, texts));
     return true;
 }
 
 // Copies every record of a node at the top of the document.
-void copyNode(const qvsWapCharacter &node, Chains *chains)
+void copyNode(const qvsWapCharacter &node, Chains *chains, Texts texts)
 {
     ChainEnd *chain = chains->ends;
     for (const ChildRow &row : kRootRows) {
@@ -110,27 +117,27 @@ void copyNode(const qvsWapCharacter &node, Chains *chains)
             trace("[WARNING] Already Have ClientIdent Context");
             return;
         }
-        copySlot(node, row, chain++);
+        copySlot(node, row, chain++, texts);
     }
 }
 
 // Copies the first record of a child that the parent accepts; false when it accepts none.
-bool copyChild(const qvsWapCharacter &node, const Rows<ChildRow> &rows, Chains *chains)
+bool copyChild(const qvsWapCharacter &node, const Rows<ChildRow> &rows, Chains *chains, Texts texts)
 {
     ChainEnd *chain = chains->ends;
     for (const ChildRow &row : rows) {
-        if (copySlot(node, row, chain++)) {
+        if (copySlot(node, row, chain++, texts)) {
             return true;
         }
     }
     return false;
 }
 
-qvsResult walkChildren(qvsList *children, void *parent, const Rows<ChildRow> &rows)
+qvsResult walkChildren(qvsList *children, void *parent, const Rows<ChildRow> &rows, Texts texts)
 {
     Chains chains(parent, rows);
     for (void *item = firstItem(children); item; item = nextItem(children)) {
-        if (!copyChild(*static_cast<const qvsWapCharacter *>(item), rows, &chains)) {
+        if (!copyChild(*static_cast<const qvsWapCharacter *>(item), rows, &chains, texts)) {
             // kept[context-misfit-ends-walk]: the children behind one that does not fit are lost.
             trace("[WARNING] Not Support Context");
             return QVS_ERROR_FAILED;
@@ -139,75 +146,8 @@ qvsResult walkChildren(qvsList *children, void *parent, const Rows<ChildRow> &ro
     return QVS_OK;
 }
 
-} // namespace
-
-qvsCtxStrNode *qvs::copyTexts(qvsList *texts)
-{
-    if (!texts) {
-        traceError(QVS_ERROR_LIST_ARGUMENT);
-        return nullptr;
-    }
-    qvsCtxStrNode *head = nullptr;
-    qvsCtxStrNode **end = &head;
-    const void *text = firstItem(texts);
-    for (; text; text = nextItem(texts)) {
-        auto *node = static_cast<qvsCtxStrNode *>(newCtxRecord(kFieldsOf<qvsCtxStrNode>));
-        if (!node) {
-            break;
-        }
-        *end = node;
-        end = &node->ptNext;
-        node->pszValue = copyOf(static_cast<const char *>(text));
-    }
-    return head;
-}
-
-qvsResult qvs::copyChildren(qvsList *children, void *parent, const CopyKind &kind)
-{
-    qvsResult result = QVS_OK;
-    if (!parent) {
-        // hardened: nothing can be attached to a parent that is not there.
-        result = QVS_ERROR_BAD_ARGUMENT;
-    } else if (!children) {
-        result = QVS_ERROR_LIST_ARGUMENT;
-    } else {
-        result = walkChildren(children, parent, kind.children);
-    }
-    traceError(result);
-    return result;
-}
-
-void *qvs::copyRecord(void *record, const CopyKind &kind)
-{
-    if (!record) {
-        traceError(QVS_ERROR_BAD_ARGUMENT);
-        return nullptr;
-    }
-    void *copy = newCtxRecord(kind.fields);
-    if (!copy) {
-        return nullptr;
-    }
-    for (const CopyRow &row : kind.rows) {
-        void *field = pointerAt(record, row.from);
-        if (row.list) {
-            setPointer(copy, row.to, copyTexts(static_cast<qvsList *>(field)));
-        } else if (field) {
-            setPointer(copy, row.to, copyOf(static_cast<const char *>(field)));
-        }
-    }
-    if (kind.onCopied) {
-        kind.onCopied(copy);
-    }
-    if (kind.childList.number != kNoField) {
-        const qvsResult result = copyChildren(*listAt(record, kind.childList.number), copy, kind);
-        if (kind.refusalTraced) {
-            traceError(result);
-        }
-    }
-    return copy;
-}
-
-qvsResult qvsClientProvCtxVerifyContext(qvsList *list, qvsClientProvCtx **root)
+// The context of the characteristics in a list, which the caller owns.
+qvsResult makeRoot(qvsList *list, qvsClientProvCtx **root, Texts texts)
 {
     // hardened: without a place to put it no context is made.
     if (!list || !root) {
@@ -223,8 +163,116 @@ qvsResult qvsClientProvCtxVerifyContext(qvsList *list, qvsClientProvCtx **root)
     }
     Chains chains(made, kRootRows);
     for (; item; item = nextItem(list)) {
-        copyNode(*static_cast<const qvsWapCharacter *>(item), &chains);
+        copyNode(*static_cast<const qvsWapCharacter *>(item), &chains, texts);
     }
     *root = static_cast<qvsClientProvCtx *>(made);
     return QVS_OK;
+}
+
+qvsClientProvCtx *makeContext(qvsWapDoc *document, Texts texts)
+{
+    if (!document) {
+        traceError(QVS_ERROR_BAD_ARGUMENT);
+        return nullptr;
+    }
+    qvsClientProvCtx *root = nullptr;
+    traceError(makeRoot(document->ptCharacterList, &root, texts));
+    return root;
+}
+
+} // namespace
+
+qvsCtxStrNode *qvs::copyTexts(qvsList *list, Texts texts)
+{
+    if (!list) {
+        traceError(QVS_ERROR_LIST_ARGUMENT);
+        return nullptr;
+    }
+    qvsCtxStrNode *head = nullptr;
+    qvsCtxStrNode **end = &head;
+    list->ptCursor = list->ptFirst;
+    while (list->ptCursor && list->ptCursor->pItem) {
+        auto *node = static_cast<qvsCtxStrNode *>(newCtxRecord(kFieldsOf<qvsCtxStrNode>));
+        if (!node) {
+            break;
+        }
+        *end = node;
+        end = &node->ptNext;
+        auto *text = static_cast<char *>(list->ptCursor->pItem);
+        if (texts == Texts::kTaken) {
+            list->ptCursor->pItem = nullptr;
+            node->pszValue = withSpareZeros(text);
+        } else {
+            node->pszValue = copyOf(text);
+        }
+        list->ptCursor = list->ptCursor->ptNext;
+    }
+    return head;
+}
+
+qvsResult qvs::copyChildren(qvsList *children, void *parent, const CopyKind &kind, Texts texts)
+{
+    qvsResult result = QVS_OK;
+    if (!parent) {
+        // hardened: nothing can be attached to a parent that is not there.
+        result = QVS_ERROR_BAD_ARGUMENT;
+    } else if (!children) {
+        result = QVS_ERROR_LIST_ARGUMENT;
+    } else {
+        result = walkChildren(children, parent, kind.children, texts);
+    }
+    traceError(result);
+    return result;
+}
+
+void *qvs::copyRecord(void *record, const CopyKind &kind, Texts texts)
+{
+    if (!record) {
+        traceError(QVS_ERROR_BAD_ARGUMENT);
+        return nullptr;
+    }
+    void *copy = newCtxRecord(kind.fields);
+    if (!copy) {
+        return nullptr;
+    }
+    for (const CopyRow &row : kind.rows) {
+        void *field = pointerAt(record, row.from);
+        if (row.type == CopyRow::kList) {
+            setPointer(copy, row.to, copyTexts(static_cast<qvsList *>(field), texts));
+        } else if (field) {
+            auto *text = static_cast<char *>(field);
+            if (texts == Texts::kTaken && row.type == CopyRow::kText) {
+                setPointer(record, row.from, nullptr);
+                setPointer(copy, row.to, withSpareZeros(text));
+            } else {
+                setPointer(copy, row.to, copyOf(text));
+            }
+        }
+    }
+    if (kind.onCopied) {
+        kind.onCopied(copy);
+    }
+    if (kind.childList.number != kNoField) {
+        const qvsResult result =
+            copyChildren(*listAt(record, kind.childList.number), copy, kind, texts);
+        if (kind.refusalTraced) {
+            traceError(result);
+        }
+    }
+    return copy;
+}
+
+qvsClientProvCtx *qvs::takeContext(qvsWapDoc *document)
+{
+    return makeContext(document, Texts::kTaken);
+}
+
+qvsClientProvCtx *qvsClientProvCtxMakeContext(qvsWapDoc *document)
+{
+    return makeContext(document, Texts::kCopied);
+}
+
+qvsResult qvsClientProvCtxVerifyContext(qvsList *list, qvsClientProvCtx **root)
+{
+    return makeRoot(list, root, Texts::kCopied);
 }

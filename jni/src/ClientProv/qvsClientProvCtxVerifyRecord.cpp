@@ -148,7 +148,7 @@ constexpr CopyRow kRows[] = {
     {QVS_FIELD(W, pszInternet), QVS_FIELD(C, pszInternet)},
     {QVS_FIELD(W, pszNapAddress), QVS_FIELD(C, pszNapAddress)},
     {QVS_FIELD(W, pszNapAddrType), QVS_FIELD(C, pszNapAddrType)},
-    {QVS_FIELD(W, pszInit), QVS_FIELD(C, pszInit)},
+    {QVS_FIELD(W, pszInit), QVS_FIELD(C, pszInit), CopyRow::kKeptText},
     {QVS_FIELD(W, pszCallType), QVS_FIELD(C, pszCallType)},
     {QVS_FIELD(W, pszLocalAddr), QVS_FIELD(C, pszLocalAddr)},
     {QVS_FIELD(W, pszLocalAddrType), QVS_FIELD(C, pszLocalAddrType)},
@@ -191,8 +191,8 @@ namespace roaming {
 using C = qvsCtxRoaming;
 using W = qvsWapRoaming;
 constexpr CopyRow kRows[] = {
-    {QVS_FIELD(W, pszSyncAllowed), QVS_FIELD(C, pszSyncAllowed)},
-    {QVS_FIELD(W, pszSyncDefault), QVS_FIELD(C, pszSyncDefault)},
+    {QVS_FIELD(W, pszSyncAllowed), QVS_FIELD(C, pszSyncAllowed), CopyRow::kKeptText},
+    {QVS_FIELD(W, pszSyncDefault), QVS_FIELD(C, pszSyncDefault), CopyRow::kKeptText},
 };
 constexpr CopyKind kCopy = {
     .fields = kFieldsOf<C>,
@@ -260,18 +260,18 @@ using W = qvsWapApplication;
 constexpr CopyRow kRows[] = {
     {QVS_FIELD(W, pszAppId), QVS_FIELD(C, pszAppId)},
     {QVS_FIELD(W, pszProviderId), QVS_FIELD(C, pszProviderId)},
-    {QVS_FIELD(W, pszFrom), QVS_FIELD(C, pszFrom)},
+    {QVS_FIELD(W, pszFrom), QVS_FIELD(C, pszFrom), CopyRow::kKeptText},
     {QVS_FIELD(W, pszName), QVS_FIELD(C, pszName)},
     {QVS_FIELD(W, pszAAccept), QVS_FIELD(C, pszAAccept)},
     {QVS_FIELD(W, pszAProtocol), QVS_FIELD(C, pszAProtocol)},
     {QVS_FIELD(W, pszInternet), QVS_FIELD(C, pszInternet)},
-    {QVS_FIELD(W, pszXcapAuidDcs), QVS_FIELD(C, pszXcapAuidDcs)},
-    {QVS_FIELD(W, pszXcapAuidPms), QVS_FIELD(C, pszXcapAuidPms)},
-    {QVS_FIELD(W, pszXcapAuidCdms), QVS_FIELD(C, pszXcapAuidCdms)},
-    {QVS_FIELD(W, pszXcapImeiHeader), QVS_FIELD(C, pszXcapImeiHeader)},
-    {QVS_FIELD(W, pszXcapTidHeader), QVS_FIELD(C, pszXcapTidHeader)},
+    {QVS_FIELD(W, pszXcapAuidDcs), QVS_FIELD(C, pszXcapAuidDcs), CopyRow::kKeptText},
+    {QVS_FIELD(W, pszXcapAuidPms), QVS_FIELD(C, pszXcapAuidPms), CopyRow::kKeptText},
+    {QVS_FIELD(W, pszXcapAuidCdms), QVS_FIELD(C, pszXcapAuidCdms), CopyRow::kKeptText},
+    {QVS_FIELD(W, pszXcapImeiHeader), QVS_FIELD(C, pszXcapImeiHeader), CopyRow::kKeptText},
+    {QVS_FIELD(W, pszXcapTidHeader), QVS_FIELD(C, pszXcapTidHeader), CopyRow::kKeptText},
     // kept[context-from-twice]: FROM is copied once more, and the first copy stays allocated.
-    {QVS_FIELD(W, pszFrom), QVS_FIELD(C, pszFrom)},
+    {QVS_FIELD(W, pszFrom), QVS_FIELD(C, pszFrom), CopyRow::kKeptText},
     {QVS_FIELD(W, ptToProxyList), QVS_FIELD(C, ptToProxy)},
     {QVS_FIELD(W, ptToNapIdList), QVS_FIELD(C, ptToNapId)},
     {QVS_FIELD(W, ptAddrList), QVS_FIELD(C, ptToAddr)},
@@ -326,8 +326,8 @@ using C = qvsCtxVendorConfig;
 using W = qvsWapVendorConfig;
 constexpr CopyRow kRows[] = {
     {QVS_FIELD(W, pszName), QVS_FIELD(C, pszName)},
-    {QVS_FIELD(W, pszParamName), QVS_FIELD(C, pszParamName)},
-    {QVS_FIELD(W, pszParamValue), QVS_FIELD(C, pszParamValue)},
+    {QVS_FIELD(W, pszParamName), QVS_FIELD(C, pszParamName), CopyRow::kKeptText},
+    {QVS_FIELD(W, pszParamValue), QVS_FIELD(C, pszParamValue), CopyRow::kKeptText},
 };
 constexpr CopyKind kCopy = {
     .fields = kFieldsOf<C>,

@@ -1,5 +1,6 @@
 // The decoder's entry: the WBXML header, the document type, and the way from bytes to a context.
 #include "qvsClientProvWbxmlDecoder.h"
+#include "qvsCtxCopy.h"
 #include "qvsTokens.h"
 #include "qvsmemory.h"
 #include "qvsstring.h"
@@ -105,7 +106,7 @@ qvsClientProvCtx *qvsClinetProvWbxmlDecoderMain(const uint8_t *data, uint32_t le
     qvsWapDoc *document = nullptr;
     qvsClientProvCtx *context = nullptr;
     if (readDocument(data, length, &document) == QVS_OK) {
-        context = qvsClientProvCtxMakeContext(document);
+        context = takeContext(document);
         if (context) {
             trace("Success");
         } else {

@@ -79,7 +79,7 @@ Plain findPlain(const qvsWbxmlDecoder *decoder, uint8_t token)
 // Reads the usual parameter into `*text`, which the caller owns.
 qvsResult takePlain(qvsWbxmlDecoder *decoder, const Plain &plain, char **text)
 {
-    auto *block = static_cast<char *>(newBlock(plain.size, kDecoderModule));
+    auto *block = static_cast<char *>(newBlock(plain.size + kSpareZeros, kDecoderModule));
     if (block) {
         memcpy(block, plain.text, plain.size);
     } else if (plain.read > kPlainStart) {

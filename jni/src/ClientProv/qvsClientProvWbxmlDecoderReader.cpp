@@ -44,11 +44,11 @@ bool grow(Text *text, uint32_t start, uint64_t needed)
     if (text->data && capacity < uint64_t{text->capacity} * 2) {
         capacity = uint64_t{text->capacity} * 2;
     }
-    if (capacity > UINT32_MAX) {
+    if (capacity > UINT32_MAX - kSpareZeros) {
         return false;
     }
     char *block = static_cast<char *>(
-        qvsMemAlloc_debug(static_cast<uint32_t>(capacity), kDecoderModule, __LINE__));
+        qvsMemAlloc_debug(static_cast<uint32_t>(capacity) + kSpareZeros, kDecoderModule, __LINE__));
     if (!block) {
         return false;
     }

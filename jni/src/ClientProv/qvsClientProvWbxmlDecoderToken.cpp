@@ -24,7 +24,7 @@ qvsResult unknownValue(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
         stepBack(decoder);
         return qvsClientProvWbxmlDecoderSkipElement(decoder);
     }
-    char *block = static_cast<char *>(qvsMemAlloc_debug(2, kDecoderModule, __LINE__));
+    char *block = static_cast<char *>(qvsMemAlloc_debug(2 + kSpareZeros, kDecoderModule, __LINE__));
     if (!block) {
         return QVS_ERROR_WBXML_NO_DATA;
     }

@@ -10,18 +10,33 @@
 #include <stddef.h>
 #include <stdint.h>
 
+struct qvsClientProvCtx;
 struct qvsCtxStrNode;
+struct qvsWapDoc;
 
 namespace [[gnu::visibility("hidden")]] qvs {
 
+// What happens to the texts of the tree: a context is a copy of them, or takes them over when the
+// tree is released next. That changes nothing but the work.
+enum class Texts : uint8_t { kCopied, kTaken };
+
 // A text of a tree record and the text it is copied to, or a list and the chain made of it.
 struct CopyRow {
-    consteval CopyRow(TextField f, TextField t) : from(f.number), to(t.number), list(false) {}
-    consteval CopyRow(ListField f, RecordField t) : from(f.number), to(t.number), list(true) {}
+    enum Type : uint8_t {
+        kText,
+        kKeptText, // the tree keeps it, for it stays allocated when the tree is released
+        kList,
+    };
+
+    consteval CopyRow(TextField f, TextField t, Type is = kText)
+        : from(f.number), to(t.number), type(is)
+    {
+    }
+    consteval CopyRow(ListField f, RecordField t) : from(f.number), to(t.number), type(kList) {}
 
     uint8_t from;
     uint8_t to;
-    bool list;
+    Type type;
 };
 
 struct CopyKind;
@@ -58,15 +73,19 @@ constexpr size_t kMostChildRows = 9;
 
 // A copy of a tree record with its lists and accepted children, which the caller owns; null for a
 // null record or without memory.
-void *copyRecord(void *record, const CopyKind &kind);
+void *copyRecord(void *record, const CopyKind &kind, Texts texts = Texts::kCopied);
 
 // Copies the children of a list to the chains of a parent. QVS_ERROR_FAILED at the first one that
 // it does not accept, QVS_ERROR_BAD_ARGUMENT without a parent, QVS_ERROR_LIST_ARGUMENT without a
 // list.
-qvsResult copyChildren(qvsList *children, void *parent, const CopyKind &kind);
+qvsResult copyChildren(qvsList *children, void *parent, const CopyKind &kind,
+                       Texts texts = Texts::kCopied);
 
 // The texts of a list as a chain, up to the first one without memory; null when there are none.
-qvsCtxStrNode *copyTexts(qvsList *texts);
+qvsCtxStrNode *copyTexts(qvsList *list, Texts texts = Texts::kCopied);
+
+// qvsClientProvCtxMakeContext of a document that is released next, with its texts taken over.
+qvsClientProvCtx *takeContext(qvsWapDoc *document);
 
 } // namespace qvs
 

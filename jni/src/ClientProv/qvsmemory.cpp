@@ -21,10 +21,6 @@ constexpr uint32_t kEntries = 2000;
 
 static_assert(sizeof(void *) != 4 || kEntries * sizeof(Entry) == 32000);
 
-// A text handed to the Java VM may end in a cut multi-byte sequence, which leads its reader up to
-// four bytes behind the terminator.
-constexpr size_t kSpareZeros = 4;
-
 Entry *entries; // null while tracking is off
 
 // Free entries are those of the address null.
@@ -83,11 +79,11 @@ void *cleared(uint32_t size)
 
 char *copyOf(const char *str, size_t length)
 {
-    char *block = static_cast<char *>(malloc(length + 1 + kSpareZeros));
+    char *block = static_cast<char *>(malloc(length + 1 + qvs::kSpareZeros));
     if (block) {
         memcpy(block, str, length);
         // hardened: four zero bytes follow the terminator.
-        memset(block + length, 0, 1 + kSpareZeros);
+        memset(block + length, 0, 1 + qvs::kSpareZeros);
     }
     return block;
 }

@@ -66,6 +66,11 @@ QVS_END_DECLS
 #ifdef __cplusplus
 namespace [[gnu::visibility("hidden")]] qvs {
 
+// A text handed to the Java VM may end in a cut multi-byte sequence, which leads its reader up to
+// four bytes behind the terminator. They are zero in every text of a context; a text of a tree that
+// a session decodes has room for them.
+constexpr uint32_t kSpareZeros = 4;
+
 // Whether blocks are tracked.
 extern bool tracking;
 
