@@ -195,7 +195,12 @@ private:
 
 // ---- A thread with little stack
 
+#ifdef __aarch64__
+// The least that the C library takes there.
+inline constexpr size_t kSmallStack = 128 * 1024;
+#else
 inline constexpr size_t kSmallStack = 64 * 1024;
+#endif
 
 inline void onSmallStack(const std::function<void()> &work)
 {
