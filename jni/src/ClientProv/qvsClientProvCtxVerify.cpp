@@ -97,6 +97,9 @@ struct Chains {
     ChainEnd ends[kMostChildRows];
 };
 
+// The kinds of record nest a few levels deep, whatever a message holds.
+// NOLINTBEGIN(misc-no-recursion)
+
 // Copies the record of a tree node that `row` is about, if the node carries one.
 bool copySlot(const qvsWapCharacter &node, const ChildRow &row, ChainEnd *chain, Texts texts)
 {
@@ -261,6 +264,8 @@ void *qvs::copyRecord(void *record, const CopyKind &kind, Texts texts)
     }
     return copy;
 }
+
+// NOLINTEND(misc-no-recursion)
 
 qvsClientProvCtx *qvs::takeContext(qvsWapDoc *document)
 {

@@ -90,8 +90,9 @@ struct KindRows {
 consteval KindRows rowsByToken()
 {
     KindRows rows = {};
-    for (uint8_t row = 1; row <= sizeof kKinds / sizeof *kKinds; ++row) {
-        const Kind &kind = kKinds[row - 1];
+    uint8_t row = 0;
+    for (const Kind &kind : kKinds) {
+        ++row;
         for (uint8_t page = 0; page < 2; ++page) {
             if (kind.pages == kBothPages || kind.pages == page) {
                 rows.of[page][kind.token - attr::kType] = row;

@@ -30,17 +30,18 @@ constexpr uint8_t kFieldsOf = sizeof(Record) / sizeof(void *);
 
 // The number of ptNext, the last field of the records that form chains; kNoField for others.
 template <class Record>
-constexpr uint8_t kLinkOf = kNoField;
+inline constexpr uint8_t kLinkOf = kNoField;
 template <class Record>
-requires(sizeof(Record::ptNext) > 0) constexpr uint8_t kLinkOf<Record> = kFieldsOf<Record> - 1;
+requires(sizeof(Record::ptNext) > 0) inline constexpr uint8_t kLinkOf<Record> = kFieldsOf<Record> -
+                                                                                1;
 
 // The number of ptCharacterList, the last field of the records in which characteristics nest;
 // kNoField for others.
 template <class Record>
-constexpr uint8_t kChildListOf = kNoField;
+inline constexpr uint8_t kChildListOf = kNoField;
 template <class Record>
 requires(sizeof(Record::ptCharacterList) >
-         0) constexpr uint8_t kChildListOf<Record> = kFieldsOf<Record> - 1;
+         0) inline constexpr uint8_t kChildListOf<Record> = kFieldsOf<Record> - 1;
 
 // `offset` is where the member lies; the member itself is here for its type.
 template <class Record>
