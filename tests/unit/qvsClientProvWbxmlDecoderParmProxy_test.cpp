@@ -254,6 +254,21 @@ TEST_F(PxPhysicalParm, EndsAtADomainThatPassesTheLimitOfAllTexts)
     EXPECT_EQ(traces.texts.back(), "[ERROR] qvsClientProvWbxmlDecoderParamListString Fail\n");
 }
 
+TEST_F(PxPhysicalParm, EndsAtATextOrAValueTokenThatPassesTheLimitOfAllTexts)
+{
+    constexpr uint64_t kLimit = 8 * 1024 * 1024;
+    const Bytes four = parm(0x21, "four");
+    const Bytes token = parm(Bytes{0x21, 0x06, 0x85}); // IPV4
+    for (const Bytes &bytes : {four, token}) {
+        for (const uint64_t before : {kLimit - 5, kLimit - 4, kLimit - 3}) {
+            Reading<PxPhysical> run(bytes);
+            run.decoder->nTextRead = before;
+            EXPECT_EQ(run.read(), before <= kLimit - 4 ? 0U : 4111U);
+            EXPECT_EQ(run.decoder->nTextRead, before + 4);
+        }
+    }
+}
+
 TEST(Kept, parm_switch_ignored)
 {
     blocks::BlockCheck check;

@@ -65,7 +65,8 @@ Plain findPlain(const qvsWbxmlDecoder *decoder, uint8_t token)
     }
     if (read[2] != wbxml::kStrI) {
         const char *text = read[kPlainStart] == wbxml::kEnd ? valueText(read[2]) : nullptr;
-        return {text, text ? qvsStrlen(text) + 1 : 0, kPlainStart};
+        const uint32_t size = text ? qvsStrlen(text) + 1 : 0;
+        return {decoder->nTextRead + size <= kTextAlways ? text : nullptr, size, kPlainStart};
     }
     const uint8_t *text = read + kPlainStart;
     const auto *nul = static_cast<const uint8_t *>(memchr(text, '\0', left - kPlainStart));
