@@ -3,9 +3,9 @@
 #include "target.h"
 
 #include <csignal>
-#include <filesystem>
-#include <fstream>
-#include <iterator>
+#include <cstdio>
+#include <dirent.h>
+#include <memory>
 #include <string>
 #include <unistd.h>
 #include <vector>
@@ -15,6 +15,7 @@ extern "C" [[gnu::weak]] void __sanitizer_set_death_callback(void (*callback)())
 namespace {
 
 std::string current; // the input that is run
+size_t inputs = 0;   // that have been run
 
 void nameInput()
 {
@@ -22,16 +23,38 @@ void nameInput()
     (void)!write(STDERR_FILENO, line.data(), line.size());
 }
 
-bool run(const std::filesystem::path &file)
+// One file. Of C's library alone, which the memory sanitizer knows.
+bool runFile(const std::string &name)
 {
-    std::ifstream stream(file, std::ios::binary);
-    const std::vector<char> bytes((std::istreambuf_iterator<char>(stream)), {});
-    if (!stream.is_open()) {
-        fprintf(stderr, "%s cannot be read\n", file.c_str());
+    const std::unique_ptr<FILE, int (*)(FILE *)> stream(fopen(name.c_str(), "rb"), fclose);
+    if (!stream) {
+        fprintf(stderr, "%s cannot be read\n", name.c_str());
         return false;
     }
-    current = file;
-    (void)LLVMFuzzerTestOneInput(reinterpret_cast<const uint8_t *>(bytes.data()), bytes.size());
+    std::vector<uint8_t> bytes;
+    uint8_t part[4096];
+    for (size_t got = 1; got != 0;) {
+        got = fread(part, 1, sizeof part, stream.get());
+        bytes.insert(bytes.end(), part, part + got);
+    }
+    current = name;
+    (void)LLVMFuzzerTestOneInput(bytes.data(), bytes.size());
+    ++inputs;
+    return true;
+}
+
+// A file, or a folder with all it holds.
+bool run(const std::string &name)
+{
+    const std::unique_ptr<DIR, int (*)(DIR *)> folder(opendir(name.c_str()), closedir);
+    if (!folder) {
+        return runFile(name);
+    }
+    while (const dirent *entry = readdir(folder.get())) {
+        if (entry->d_name[0] != '.' && !run(name + '/' + entry->d_name)) {
+            return false;
+        }
+    }
     return true;
 }
 
@@ -43,22 +66,9 @@ int main(int argc, char **argv)
         __sanitizer_set_death_callback(nameInput);
     }
     signal(SIGABRT, [](int) { nameInput(); });
-    size_t inputs = 0;
     for (int i = 1; i < argc; ++i) {
-        if (!std::filesystem::is_directory(argv[i])) {
-            if (!run(argv[i])) {
-                return 2;
-            }
-            ++inputs;
-            continue;
-        }
-        for (const auto &entry : std::filesystem::recursive_directory_iterator(argv[i])) {
-            if (entry.is_regular_file()) {
-                if (!run(entry.path())) {
-                    return 2;
-                }
-                ++inputs;
-            }
+        if (!run(argv[i])) {
+            return 2;
         }
     }
     printf("%zu inputs replayed\n", inputs);
