@@ -240,6 +240,23 @@ TEST_F(ParamString, ReadsInOneGoWhatItReadsStepByStep)
     }
 }
 
+TEST_F(ParamString, IsReadStepByStepAtTheLimitOfText)
+{
+    constexpr uint64_t kLimit = 8U << 20U;
+    const Bytes usual[] = {{0x15, 0x06, 0x03, 'a', 'b', 0, 0x01}, {0x15, 0x06, 0x85, 0x01}};
+    for (const Bytes &bytes : usual) {
+        const uint64_t length = bytes[2] == 0x03 ? 2 : 4;
+        for (const uint64_t beyond : {0, 1}) {
+            Decoder decoder(bytes);
+            decoder->nTextRead = kLimit - length + beyond;
+            OwnText text;
+            EXPECT_EQ(qvsClientProvWbxmlDecoderParamString(decoder, &text, 0x15),
+                      beyond ? QVS_ERROR_NO_MEMORY : QVS_OK);
+            EXPECT_EQ(decoder->bTextLimit, beyond);
+        }
+    }
+}
+
 TEST_F(ParamString, WithoutMemoryFailsForAStringAndGoesOnBehindAToken)
 {
     for (const bool traced : {false, true}) {

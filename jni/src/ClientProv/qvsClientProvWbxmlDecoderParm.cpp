@@ -51,8 +51,7 @@ struct Plain {
     uint32_t read;    // bytes of the parameter up to the END
 };
 
-// Other parameters are read step by step, and so is one that has something to trace or comes near
-// the limit of text.
+// Other parameters are read step by step, and so are all that have something to trace.
 Plain findPlain(const qvsWbxmlDecoder *decoder, uint8_t token)
 {
     const uint32_t left = bytesLeft(decoder);
@@ -66,7 +65,7 @@ Plain findPlain(const qvsWbxmlDecoder *decoder, uint8_t token)
     if (read[2] != wbxml::kStrI) {
         const char *text = read[kPlainStart] == wbxml::kEnd ? valueText(read[2]) : nullptr;
         const uint32_t size = text ? qvsStrlen(text) + 1 : 0;
-        return {decoder->nTextRead + size <= kTextAlways ? text : nullptr, size, kPlainStart};
+        return {text, size, kPlainStart};
     }
     const uint8_t *text = read + kPlainStart;
     const auto *nul = static_cast<const uint8_t *>(memchr(text, '\0', left - kPlainStart));
@@ -74,10 +73,11 @@ Plain findPlain(const qvsWbxmlDecoder *decoder, uint8_t token)
         return {};
     }
     const auto size = static_cast<uint32_t>(nul + 1 - text);
-    return {decoder->nTextRead + size <= kTextAlways ? text : nullptr, size, kPlainStart + size};
+    return {text, size, kPlainStart + size};
 }
 
 // Reads the usual parameter into `*text`, which the caller owns.
+// kept[repeated-parm]: the text that was there stays allocated.
 qvsResult takePlain(qvsWbxmlDecoder *decoder, const Plain &plain, char **text)
 {
     auto *block = static_cast<char *>(newBlock(plain.size + kSpareZeros, kDecoderModule));
@@ -106,11 +106,14 @@ qvsResult takePlain(qvsWbxmlDecoder *decoder, const Plain &plain, char **text)
 }
 
 // Reads NAME and VALUE of one parameter into `*text`. The usual ones are read in one go, in half
-// the instructions. kept[repeated-parm]: the text that was there stays allocated.
+// the instructions. What comes near the limit of text is read step by step too.
 inline qvsResult readText(qvsWbxmlDecoder *decoder, char **text, uint8_t token)
 {
     const Plain plain = findPlain(decoder, token);
-    return plain.text ? takePlain(decoder, plain, text) : readAnyText(decoder, text, token);
+    if (!plain.text || decoder->nTextRead + plain.size > kTextAlways) {
+        return readAnyText(decoder, text, token);
+    }
+    return takePlain(decoder, plain, text);
 }
 
 // Adds a text to a list of texts, which is made when there is none. A null text adds nothing.
