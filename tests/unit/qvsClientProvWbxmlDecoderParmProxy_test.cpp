@@ -1,6 +1,8 @@
 // The parameters of proxies: PXLOGICAL, PXAUTHINFO, PORT, PXPHYSICAL.
 #include "parm_suite.h"
 
+#include <algorithm>
+
 using namespace parms;
 
 namespace {
@@ -259,14 +261,32 @@ TEST_F(PxPhysicalParm, EndsAtATextOrAValueTokenThatPassesTheLimitOfAllTexts)
     constexpr uint64_t kLimit = 8 * 1024 * 1024;
     const Bytes four = parm(0x21, "four");
     const Bytes token = parm(Bytes{0x21, 0x06, 0x85}); // IPV4
-    for (const Bytes &bytes : {four, token}) {
-        for (const uint64_t before : {kLimit - 5, kLimit - 4, kLimit - 3}) {
-            Reading<PxPhysical> run(bytes);
-            run.decoder->nTextRead = before;
-            EXPECT_EQ(run.read(), before <= kLimit - 4 ? 0U : 4111U);
-            EXPECT_EQ(run.decoder->nTextRead, before + 4);
+    for (Bytes bytes : {four, token}) {
+        // In a message so long that 100 times its length is more, and in a short one.
+        for (const size_t size : {bytes.size(), size_t{100000}}) {
+            bytes.resize(size, 0x55);
+            const uint64_t limit = std::max(kLimit, uint64_t{100} * size);
+            for (const uint64_t before : {limit - 5, limit - 4, limit - 3}) {
+                Reading<PxPhysical> run(bytes);
+                run.decoder->nTextRead = before;
+                EXPECT_EQ(run.read(), before <= limit - 4 ? 0U : 4111U);
+                EXPECT_EQ(run.decoder->nTextRead, before + 4);
+            }
         }
     }
+}
+
+TEST_F(PxPhysicalParm, ReadsNothingBehindTheData)
+{
+    // What would be the END lies in the block, but behind the last byte of the data.
+    const Bytes bytes = parm(0x21, "x");
+    Reading<PxPhysical> run(bytes);
+    run.decoder->ptBuffer->nSize -= 1;
+    Reading<PxPhysical> cut(prefix(bytes, bytes.size() - 1));
+    EXPECT_EQ(run.read(), 4103U);
+    EXPECT_EQ(cut.read(), 4103U);
+    EXPECT_EQ(run.decoder.position(), cut.decoder.position());
+    EXPECT_EQ(shown(run.record->pszPxAddrType), shown(cut.record->pszPxAddrType));
 }
 
 TEST(Kept, parm_switch_ignored)

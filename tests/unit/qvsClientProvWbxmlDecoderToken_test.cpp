@@ -414,6 +414,18 @@ TEST_F(Content, FailsCleanlyWithoutMemory)
     }
 }
 
+TEST_F(Content, ReadsNothingWithoutADecoderOrABuffer)
+{
+    char *text = nullptr;
+    qvsWbxmlDecoder empty = {};
+    for (qvsWbxmlDecoder *decoder : {static_cast<qvsWbxmlDecoder *>(nullptr), &empty}) {
+        EXPECT_EQ(qvsClientProvWbxmlDecoderGetString(decoder, &text), 0U);
+        EXPECT_EQ(qvsClientProvWbxmlDecoderContent(decoder, &text), 4103U);
+        EXPECT_EQ(qvsClientProvWbxmlDecoderParamString(decoder, &text, 0x21), 4103U);
+        EXPECT_EQ(text, nullptr);
+    }
+}
+
 TEST_F(Content, GetStringStepsBackToTheTokenJustRead)
 {
     Decoder decoder({0x03, 'a', 0, 0x01});

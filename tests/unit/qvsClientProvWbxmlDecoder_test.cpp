@@ -227,6 +227,32 @@ TEST_F(DecoderMain, AnswersNullWithItsStepTraced)
     EXPECT_EQ(qvsClinetProvWbxmlDecoderMain(&byte, 0), nullptr);
 }
 
+TEST_F(DecoderMain, AsksForItsBlocksUnderTheSourceOfEach)
+{
+    message::Body body;
+    body.characteristic(message::kNapDef, [&] { body.parm(message::kNapId, "n1"); });
+    const Bytes bytes = message::document(body);
+    testing::internal::CaptureStdout();
+    qvsMemStartMemCheck();
+    qvsClientProvCtx *context = decodeMain(bytes);
+    qvsMemEndMemCheck();
+    const std::string report = testing::internal::GetCapturedStdout();
+    qvsClientProvCtxDelectContext(context);
+    // The context and its NAPDEF, and the text that the decoder read.
+    const auto blocksOf = [&](const std::string &module) {
+        const std::string line = "Filename:jni/src/ClientProv/" + module + " ";
+        size_t count = 0;
+        for (size_t at = report.find(line); at != std::string::npos;
+             at = report.find(line, at + 1)) {
+            ++count;
+        }
+        return count;
+    };
+    EXPECT_EQ(blocksOf("qvsClientProvCtx"), 2U) << report;
+    EXPECT_EQ(blocksOf("qvsClientProvWbxmlDecoder"), 1U) << report;
+    EXPECT_EQ(report.find("Not Found"), std::string::npos) << report;
+}
+
 TEST_F(DecoderMain, LeavesTheBytesAloneAndKeepsNoPointerIntoThem)
 {
     message::Body body;
