@@ -342,6 +342,8 @@ TEST(Numbers, LtoaWritesDigitsToABase)
     EXPECT_EQ(numberOf(-1, 10), "-1");
     EXPECT_EQ(numberOf(INT32_MIN, 10), "-2147483648");
     EXPECT_EQ(numberOf(INT32_MIN, 2), "-1" + std::string(31, '0'));
+    EXPECT_EQ(numberOf(9, 16), "9");
+    EXPECT_EQ(numberOf(10, 16), "a");
     EXPECT_EQ(numberOf(255, 16), "ff");
     EXPECT_EQ(numberOf(-255, 16), "-ff");
     EXPECT_EQ(numberOf(35, 36), "z");

@@ -800,6 +800,11 @@ TEST_F(Buffer, AnOverdrawnBufferIsEmptyToWhatChangesIt)
         smlBuffer *buffer = overdrawn(over);
         EXPECT_EQ(smlBufferCut(buffer, 0, 1), 4114U);
         drop(buffer);
+        buffer = overdrawn(over);
+        const uint8_t *head = buffer->pHead;
+        EXPECT_EQ(smlBufferPull(buffer, 100), QVS_OK);
+        EXPECT_EQ(buffer->pHead, head) << "nothing was there to be consumed";
+        drop(buffer);
     }
 }
 
