@@ -629,6 +629,19 @@ TEST_P(ContextList, GoesOnWithoutMemoryForAText)
     EXPECT_EQ(textsOf(copy), (Texts{"one", std::nullopt, "three"}));
 }
 
+TEST(ContextLists, EndAtAnItemWithoutAText)
+{
+    blocks::BlockCheck check;
+    qvsList *texts = list({"a", "b", "c"});
+    qvsMemFree_debug(texts->ptFirst->ptNext->pItem);
+    texts->ptFirst->ptNext->pItem = nullptr;
+    qvsCtxStrNode *copy = qvsClientProvCtxVerifyContextServiceList(texts);
+    ASSERT_EQ(textsOf(copy).size(), 1U);
+    EXPECT_EQ(textsOf(copy)[0], "a");
+    qvsClientProvCtxDelectContextServiceList(copy);
+    EXPECT_EQ(qvsListDeleteNodeAllAndList(texts, nullptr), QVS_OK);
+}
+
 TEST(ContextLists, TakeAnyLength)
 {
     blocks::BlockCheck check;
