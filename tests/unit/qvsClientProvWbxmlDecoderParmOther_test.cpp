@@ -221,6 +221,16 @@ TEST_F(VendorParm, ReadsBehindTheTokenThatItIsGiven)
     EXPECT_EQ(content.str(), "IPV4");
 }
 
+// A token below 0x80 stands for no text, and is skipped with what follows.
+TEST_F(VendorParm, TracesANameWithoutTextAsAnEmptyOne)
+{
+    Reading<VendorConfig> run({0x87, 0x05, 0x10, 0x01, 0x01});
+    Traces traces;
+    EXPECT_EQ(run.read(), 0U);
+    EXPECT_TRUE(traces.has(std::string(kLabel) + " pszName []\n"));
+    EXPECT_EQ(run.record->pszParamName, nullptr);
+}
+
 TEST_F(VendorParm, LeavesBothFieldsAloneWhereverTheDataEnds)
 {
     const Bytes whole = named("new", "new");

@@ -138,7 +138,7 @@ TEST(MakeBuffer, IsABufferThatWasCreatedAndAppendedTo)
 TEST(MakeBuffer, HasNoMemoryForALengthWhoseRoomCannotBeCounted)
 {
     const uint8_t data[1] = {};
-    for (uint32_t length : {UINT32_MAX / 2 - 255, UINT32_MAX}) {
+    for (uint32_t length : {UINT32_MAX / 2 - 255, 0x90000000U, UINT32_MAX}) {
         smlBuffer *made = nullptr;
         EXPECT_EQ(qvs::makeBuffer(&made, data, length), QVS_ERROR_NO_MEMORY);
         EXPECT_EQ(made, nullptr);
