@@ -127,6 +127,7 @@ def read_counts(profile):
 
 
 def run(bits, library, what, name, count):
+    BUILD.mkdir(parents=True, exist_ok=True)
     with tempfile.NamedTemporaryFile(dir=BUILD) as profile:
         command = ["valgrind", "-q", "--tool=callgrind", f"--callgrind-out-file={profile.name}",
                    program(bits), library, what, name, count]
