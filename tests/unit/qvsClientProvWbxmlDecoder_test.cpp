@@ -293,16 +293,50 @@ TEST_F(DecoderMain, EndsEveryTextOfTheContextWithSpareZeros)
     }
 }
 
-TEST_F(DecoderMain, SurvivesEveryFailingAllocation)
+// Proxies with characteristics and lists in them, so many that their tree takes blocks.
+Bytes manyProxies()
 {
     message::Body body;
-    body.characteristic(message::kPxLogical, [&] {
-        body.parm(message::kProxyId, "p1").parm(message::kDomain, "d1");
-        body.parm(message::kName, "n1").parm(message::kStartPage, "s1");
-        body.characteristic(message::kPort, [&] { body.parm(message::kPortNbr, "80"); });
+    for (int i = 0; i < 20; ++i) {
+        body.characteristic(message::kPxLogical, [&] {
+            body.parm(message::kProxyId, "p1").parm(message::kDomain, "d1");
+            body.parm(message::kDomain, "d2").parm(message::kStartPage, "s1");
+            body.characteristic(message::kPort, [&] { body.parm(message::kPortNbr, "80"); });
+            body.characteristic(message::kPort, [&] { body.parm(message::kPortNbr, "81"); });
+        });
+    }
+    return message::document(body);
+}
+
+TEST_F(DecoderMain, SurvivesEveryFailingAllocation)
+{
+    const Bytes bytes = manyProxies();
+    const auto attempt = [&] { qvsClientProvCtxDelectContext(decodeMain(bytes)); };
+    EXPECT_GT(blocks::failEach(attempt), 200);
+    EXPECT_GT(blocks::failEachFrom(attempt), 200);
+}
+
+TEST_F(DecoderMain, LeavesNoBlockOfAMessageCutAnywhere)
+{
+    Bytes bytes = manyProxies();
+    for (; !bytes.empty(); bytes.pop_back()) {
+        SCOPED_TRACE(bytes.size());
+        blocks::BlockCheck check;
+        qvsClientProvCtxDelectContext(decodeMain(bytes));
+    }
+}
+
+TEST_F(DecoderMain, TakesBlocksForRecordsAndTextsAlone)
+{
+    message::Body body;
+    body.characteristic(message::kNapDef, [&] {
+        body.parm(message::kNapId, "n").parm(message::kBearer, "b1").parm(message::kBearer, "b2");
     });
     const Bytes bytes = message::document(body);
-    const auto attempt = [&] { qvsClientProvCtxDelectContext(decodeMain(bytes)); };
-    EXPECT_GT(blocks::failEach(attempt), 20);
-    EXPECT_GT(blocks::failEachFrom(attempt), 20);
+    blocks::startCounting();
+    qvsClientProvCtx *context = decodeMain(bytes);
+    // The string table; a record of the tree and its three texts; context, record and the nodes of
+    // its bearers.
+    EXPECT_EQ(blocks::allocations(), 1U + 4U + 4U);
+    qvsClientProvCtxDelectContext(context);
 }

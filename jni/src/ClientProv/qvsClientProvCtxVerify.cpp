@@ -48,88 +48,83 @@ void *firstItem(qvsList *list)
     return nextItem(list);
 }
 
-// The end of a chain that is appended to; remembered, so that building costs one step per record.
-struct ChainEnd {
-    // Goes on behind what the parent's chain already holds.
-    void startAt(void *parent, const ChildRow &row)
-    {
-        holder = parent;
-        field = row.chain;
-        link = row.kind->single ? kNoField : static_cast<uint8_t>(row.kind->fields - 1);
-        while (void *next = link == kNoField ? nullptr : pointerAt(holder, field)) {
-            holder = next;
-            field = link;
-        }
-    }
-
-    // Whether the one record that there may be is there.
-    [[nodiscard]] bool isTaken() const { return link == kNoField && pointerAt(holder, field); }
-
+// The chains of one parent. What was appended last to each is remembered, so that building costs
+// one step per record.
+struct Chains {
     // kept[context-null-linked]: a builder that answered null has added nothing, and the chain goes
     // on behind it.
-    void append(void *record)
+    void append(const ChildRow &row, size_t number, void *record)
     {
         if (!record) {
             return;
         }
-        setPointer(holder, field, record);
-        if (link != kNoField) {
-            holder = record;
-            field = link;
-        }
+        void *holder = last[number] ? last[number] : lastOf(row);
+        setPointer(holder, holder == parent ? row.chain : linkOf(row), record);
+        last[number] = record;
     }
 
-    void *holder;  // the record whose field the next record is put into
-    uint8_t field; // of the holder
-    uint8_t link;  // the last field of the records, ptNext
-};
-
-// The chains of one parent, in the order of its rows.
-struct Chains {
-    Chains(void *parent, const Rows<ChildRow> &rows)
+    // The record that a parent may have one of.
+    [[nodiscard]] bool isTaken(const ChildRow &row) const
     {
-        ChainEnd *chain = ends;
-        for (const ChildRow &row : rows) {
-            chain++->startAt(parent, row);
-        }
+        return row.kind->single && pointerAt(parent, row.chain);
     }
 
-    ChainEnd ends[kMostChildRows];
+    static uint8_t linkOf(const ChildRow &row)
+    {
+        return static_cast<uint8_t>(row.kind->fields - 1);
+    }
+
+    // The end of what the parent's chain holds before anything is appended: a record of it, or the
+    // parent.
+    [[nodiscard]] void *lastOf(const ChildRow &row) const
+    {
+        void *holder = parent;
+        uint8_t field = row.chain;
+        while (void *next = pointerAt(holder, field)) {
+            holder = next;
+            field = linkOf(row);
+        }
+        return holder;
+    }
+
+    void *parent;
+    void *last[kMostChildRows] = {}; // null: nothing was appended
 };
 
 // The kinds of record nest a few levels deep, whatever a message holds.
 // NOLINTBEGIN(misc-no-recursion)
 
 // Copies the record of a tree node that `row` is about, if the node carries one.
-bool copySlot(const qvsWapCharacter &node, const ChildRow &row, ChainEnd *chain, Texts texts)
+bool copySlot(const qvsWapCharacter &node, const ChildRow &row, size_t number, Chains *chains,
+              Texts texts)
 {
     void *record = pointerAt(&node, row.slot);
     if (!record) {
         return false;
     }
-    chain->append(copyRecord(record, *row.kind, texts));
+    chains->append(row, number, copyRecord(record, *row.kind, texts));
     return true;
 }
 
 // Copies every record of a node at the top of the document.
 void copyNode(const qvsWapCharacter &node, Chains *chains, Texts texts)
 {
-    ChainEnd *chain = chains->ends;
+    size_t number = 0;
     for (const ChildRow &row : kRootRows) {
-        if (pointerAt(&node, row.slot) && chain->isTaken()) {
+        if (pointerAt(&node, row.slot) && chains->isTaken(row)) {
             trace("[WARNING] Already Have ClientIdent Context");
             return;
         }
-        copySlot(node, row, chain++, texts);
+        copySlot(node, row, number++, chains, texts);
     }
 }
 
 // Copies the first record of a child that the parent accepts; false when it accepts none.
 bool copyChild(const qvsWapCharacter &node, const Rows<ChildRow> &rows, Chains *chains, Texts texts)
 {
-    ChainEnd *chain = chains->ends;
+    size_t number = 0;
     for (const ChildRow &row : rows) {
-        if (copySlot(node, row, chain++, texts)) {
+        if (copySlot(node, row, number++, chains, texts)) {
             return true;
         }
     }
@@ -138,7 +133,7 @@ bool copyChild(const qvsWapCharacter &node, const Rows<ChildRow> &rows, Chains *
 
 qvsResult walkChildren(qvsList *children, void *parent, const Rows<ChildRow> &rows, Texts texts)
 {
-    Chains chains(parent, rows);
+    Chains chains = {parent};
     for (void *item = firstItem(children); item; item = nextItem(children)) {
         if (!copyChild(*static_cast<const qvsWapCharacter *>(item), rows, &chains, texts)) {
             // kept[context-misfit-ends-walk]: the children behind one that does not fit are lost.
@@ -164,7 +159,7 @@ qvsResult makeRoot(qvsList *list, qvsClientProvCtx **root, Texts texts)
         traceError(QVS_ERROR_FAILED);
         return QVS_ERROR_FAILED;
     }
-    Chains chains(made, kRootRows);
+    Chains chains = {made};
     for (; item; item = nextItem(list)) {
         copyNode(*static_cast<const qvsWapCharacter *>(item), &chains, texts);
     }
@@ -172,7 +167,7 @@ qvsResult makeRoot(qvsList *list, qvsClientProvCtx **root, Texts texts)
     return QVS_OK;
 }
 
-qvsClientProvCtx *makeContext(qvsWapDoc *document, Texts texts)
+[[gnu::noinline]] qvsClientProvCtx *makeContext(qvsWapDoc *document, Texts texts)
 {
     if (!document) {
         traceError(QVS_ERROR_BAD_ARGUMENT);

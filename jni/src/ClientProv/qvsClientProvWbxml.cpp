@@ -2,6 +2,7 @@
 // one loop for all that is nested in a record.
 #include "qvsClientProvWbxml.h"
 #include "qvsFields.h"
+#include "qvsTree.h"
 #include "qvslist.h"
 #include "qvsmemory.h"
 #include "qvstrace.h"
@@ -281,16 +282,8 @@ consteval bool everySlotHasItsRow()
 }
 static_assert(everySlotHasItsRow());
 
-void releaseList(qvsList **field)
-{
-    if (*field) {
-        (void)qvsListDeleteNodeAllAndList(*field, nullptr); // refuses only a list that is not there
-        *field = nullptr;
-    }
-}
-
 // Releases the fields of a record and clears them. Harmless when it was done before.
-void releaseFields(void *record, const ReleaseKind &kind)
+void releaseFields(qvsArena *arena, void *record, const ReleaseKind &kind)
 {
     for (const ReleaseRow &row : kind.rows) {
         void *owned = pointerAt(record, row.field);
@@ -299,8 +292,7 @@ void releaseFields(void *record, const ReleaseKind &kind)
         }
         setPointer(record, row.field, nullptr);
         if (row.list) {
-            // Items go as texts do; only a list that is not there is refused.
-            (void)qvsListDeleteNodeAllAndList(static_cast<qvsList *>(owned), nullptr);
+            releaseTexts(arena, static_cast<qvsList *>(owned));
         } else {
             freeBlock(owned);
         }
@@ -315,10 +307,12 @@ qvsList *childrenOf(void *record, const ReleaseKind &kind)
 }
 
 // Releases a record whose fields and children are gone.
-void closeRecord(void *record, const ReleaseKind &kind)
+void closeRecord(qvsArena *arena, void *record, const ReleaseKind &kind)
 {
     if (kind.childList != kNoField) {
-        releaseList(listAt(record, kind.childList));
+        if (qvsList *children = *listAt(record, kind.childList); children && !arena) {
+            freeBlock(children); // empty by now
+        }
     }
     freeBlock(record);
 }
@@ -335,7 +329,7 @@ bool isEmptied(const void *record)
 // Releases the records of a node in the order of its slots. Stops at a record with children, which
 // have to go first, and answers their list; does the rest when called again. Null when nothing is
 // left but the node itself.
-qvsList *releaseSlots(qvsWapCharacter *node)
+qvsList *releaseSlots(qvsArena *arena, qvsWapCharacter *node)
 {
     for (uint8_t slot = 0; slot < kFieldsOf<qvsWapCharacter>; ++slot) {
         void *record = pointerAt(node, slot);
@@ -346,13 +340,13 @@ qvsList *releaseSlots(qvsWapCharacter *node)
         if (isEmptied(record)) {
             record = static_cast<char *>(record) - kEmptied;
         } else {
-            releaseFields(record, kind);
+            releaseFields(arena, record, kind);
             if (qvsList *children = childrenOf(record, kind)) {
                 setPointer(node, slot, static_cast<char *>(record) + kEmptied);
                 return children;
             }
         }
-        closeRecord(record, kind);
+        closeRecord(arena, record, kind);
         setPointer(node, slot, nullptr);
     }
     return nullptr;
@@ -373,7 +367,7 @@ qvsListNode *takeNodes(qvsList *list, qvsListNode *chain)
 
 // Releases the characteristics of a list, which is left empty. Children are put in front of the
 // nodes that wait for them, so the nodes themselves remember how deep the release is.
-void releaseNodes(qvsList *list)
+void releaseChildren(qvsArena *arena, qvsList *list)
 {
     if (!list || !list->ptFirst) {
         return;
@@ -381,32 +375,71 @@ void releaseNodes(qvsList *list)
     qvsListNode *pending = takeNodes(list, nullptr);
     while (pending) {
         qvsWapCharacter *node = static_cast<qvsWapCharacter *>(pending->pItem);
-        qvsList *children = node ? releaseSlots(node) : nullptr;
+        qvsList *children = node ? releaseSlots(arena, node) : nullptr;
         if (children) {
             pending = takeNodes(children, pending);
             continue;
         }
         qvsListNode *done = pending;
         pending = done->ptNext;
-        freeBlock(node);
-        freeBlock(done);
+        if (!arena) {
+            freeBlock(node);
+            freeBlock(done);
+        }
+    }
+}
+
+// Releases the records of a node with everything nested in them.
+[[gnu::noinline]] void emptyNode(qvsArena *arena, qvsWapCharacter *node)
+{
+    while (qvsList *children = releaseSlots(arena, node)) {
+        releaseChildren(arena, children);
     }
 }
 
 // Releases a record, of the kind that is kept in `slot`, with everything nested in it.
-qvsResult releaseRecord(void *record, RecordField slot)
+[[gnu::noinline]] qvsResult releaseRecord(void *record, RecordField slot)
 {
-    const ReleaseKind &kind = kSlots[slot.number].kind;
     if (!record) {
         return kNothing;
     }
-    releaseFields(record, kind);
-    releaseNodes(childrenOf(record, kind));
-    closeRecord(record, kind);
+    qvsWapCharacter node = {};
+    setPointer(&node, slot.number, record);
+    emptyNode(nullptr, &node);
     return kReleased;
 }
 
 } // namespace
+
+[[gnu::noinline]] void qvs::releaseNode(qvsArena *arena, qvsWapCharacter *node)
+{
+    if (!node) {
+        return;
+    }
+    emptyNode(arena, node);
+    if (!arena) {
+        freeBlock(node);
+    }
+}
+
+[[gnu::noinline]] void qvs::releaseNodes(qvsArena *arena, qvsList *list)
+{
+    releaseChildren(arena, list);
+    if (!arena) {
+        freeBlock(list);
+    }
+}
+
+[[gnu::noinline]] void qvs::releaseDocument(qvsArena *arena, qvsWapDoc *document)
+{
+    if (!document) {
+        return;
+    }
+    releaseNodes(arena, document->ptCharacterList);
+    if (!arena) {
+        freeBlock(document);
+    }
+}
 
 qvsResult qvsClientProvWbxmlInitDecoder(qvsWbxmlDecoder **decoder, const uint8_t *data,
                                         uint32_t length)
@@ -445,25 +478,14 @@ qvsResult qvsClientProvWbxmlDeleteDecoder(qvsWbxmlDecoder *decoder)
 
 qvsResult qvsClientProvWbxmlDeleteWapDoc(qvsWapDoc *document)
 {
-    if (!document) {
-        return kNothing;
-    }
-    releaseNodes(document->ptCharacterList);
-    releaseList(&document->ptCharacterList);
-    freeBlock(document);
-    return kReleased;
+    releaseDocument(nullptr, document);
+    return document ? kReleased : kNothing;
 }
 
 qvsResult qvsClientProvWbxmlDeleteCharacter(qvsWapCharacter *node)
 {
-    if (!node) {
-        return kNothing;
-    }
-    while (qvsList *children = releaseSlots(node)) {
-        releaseNodes(children);
-    }
-    freeBlock(node);
-    return kReleased;
+    releaseNode(nullptr, node);
+    return node ? kReleased : kNothing;
 }
 
 qvsResult qvsClientProvWbxmlDeletePxlogical(qvsWapPxLogical *record)

@@ -29,10 +29,11 @@ typedef struct qvsWbxmlDecoder {
     smlBuffer *ptBuffer;  // head is the read position, storage the start, size the data length
 
     // Private to the decoder.
-    uint32_t nTableBlock;    // bytes of the block at pStringTable that were read for it
-    uint32_t bTextLimit;     // 1 when the texts of the message passed their limit
-    uint64_t nTextRead;      // bytes of all texts read or appended so far
-    qvsJoinedText *ptJoined; // of the APPAUTH being read by the body; null outside it
+    uint32_t nTableBlock;     // bytes of the block at pStringTable that were read for it
+    uint32_t bTextLimit;      // 1 when the texts of the message passed their limit
+    uint64_t nTextRead;       // bytes of all texts read or appended so far
+    qvsJoinedText *ptJoined;  // of the APPAUTH being read by the body; null outside it
+    struct qvsArena *ptArena; // of nodes and lists; null: each is a block of its own
 } qvsWbxmlDecoder;
 
 // All fields of the tree are pointers, null when absent. A record owns its texts and lists; the

@@ -2,6 +2,7 @@
 #include "qvsClientProvWbxmlDecoder.h"
 #include "qvsCtxCopy.h"
 #include "qvsTokens.h"
+#include "qvsTree.h"
 #include "qvsmemory.h"
 #include "qvsstring.h"
 #include "qvstrace.h"
@@ -9,6 +10,9 @@
 using namespace qvs;
 
 namespace {
+
+// What the trees of short messages take needs no block at all.
+constexpr size_t kTreeRoom = 2048;
 
 constexpr char kDocumentType[] = "-//WAPFORUM//DTD PROV 1.0//EN";
 
@@ -52,7 +56,7 @@ smlBuffer bufferOver(const uint8_t *data, uint32_t length)
 
 // The document of a body; null with its failure traced. The decoder lives here, over the caller's
 // bytes: a copy of them and a block for each record would cost more than reading a short message.
-qvsResult readDocument(const uint8_t *data, uint32_t length, qvsWapDoc **document)
+qvsResult readDocument(const uint8_t *data, uint32_t length, qvsArena *arena, qvsWapDoc **document)
 {
     if (!data) {
         trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlInitDecoder[0x%x]\n",
@@ -62,6 +66,7 @@ qvsResult readDocument(const uint8_t *data, uint32_t length, qvsWapDoc **documen
     smlBuffer buffer = bufferOver(data, length);
     qvsWbxmlDecoder decoder = {};
     decoder.ptBuffer = &buffer;
+    decoder.ptArena = arena;
     const qvsResult result = qvsClientProvWbxmlDecoder(&decoder, document);
     if (result != QVS_OK) {
         trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlDecoder[0x%x]\n", result);
@@ -105,7 +110,9 @@ qvsClientProvCtx *qvsClinetProvWbxmlDecoderMain(const uint8_t *data, uint32_t le
 {
     qvsWapDoc *document = nullptr;
     qvsClientProvCtx *context = nullptr;
-    if (readDocument(data, length, &document) == QVS_OK) {
+    alignas(void *) char room[kTreeRoom];
+    qvsArena arena = {room, room + sizeof room};
+    if (readDocument(data, length, &arena, &document) == QVS_OK) {
         context = takeContext(document);
         if (context) {
             trace("Success");
@@ -113,7 +120,8 @@ qvsClientProvCtx *qvsClinetProvWbxmlDecoderMain(const uint8_t *data, uint32_t le
             trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvCtxMakeContext[0x%x]\n", 0);
         }
     }
-    (void)qvsClientProvWbxmlDeleteWapDoc(document);
+    releaseDocument(&arena, document);
+    releaseArena(&arena);
     if (!context) {
         qvsClientProvCtxDelectContext(nullptr);
     }

@@ -5,6 +5,7 @@
 #include "qvsParm.h"
 #include "qvsText.h"
 #include "qvsTokens.h"
+#include "qvsTree.h"
 #include "qvstrace.h"
 
 using namespace qvs;
@@ -230,11 +231,6 @@ struct Open {
     qvsJoinedText joined;
 };
 
-void releaseNode(void *node)
-{
-    (void)qvsClientProvWbxmlDeleteCharacter(static_cast<Node *>(node));
-}
-
 // Reads the start of a characteristic. One with content becomes the innermost open one.
 qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)
 {
@@ -245,7 +241,7 @@ qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)
         return QVS_OK;
     }
     const bool hasAttributes = decoder->nHasAttr;
-    auto *open = newRecord<Open>(kDecoderModule);
+    auto *open = static_cast<Open *>(newPiece(decoder->ptArena, sizeof(Open), kDecoderModule));
     if (!open) {
         return QVS_ERROR_FAILED;
     }
@@ -253,7 +249,7 @@ qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)
         ScopedText name;
         if (qvsResult result = readAttributes(decoder, &open->node, &open->attrId, &name)) {
             // hardened: what a characteristic that fails has read is released with it.
-            releaseNode(&open->node);
+            releaseNode(decoder->ptArena, &open->node);
             return result;
         }
         open->kind = findKind(open->attrId, decoder->nCodePage, name.text);
@@ -345,17 +341,15 @@ qvsResult readContent(qvsWbxmlDecoder *decoder, Open *open, bool *child)
 
 // Appends a node to a run, whose list is made when there is none. An element without content (a
 // null node) adds nothing to a list. The list takes the node over, also when it fails.
-qvsResult addSibling(qvsList **list, Node *node)
+qvsResult addSibling(qvsWbxmlDecoder *decoder, qvsList **list, Node *node)
 {
-    if (!*list) {
-        if (qvsListCreate(list, node) == QVS_OK) {
-            return QVS_OK;
-        }
-        trace("[Error] [qvsClientProvWbxmlDecoderCharacterList] ptTmpList NULL");
-    } else if (!node || qvsListAddNodeLast(*list, node) == QVS_OK) {
+    if (addItem(decoder->ptArena, list, node) == QVS_OK) {
         return QVS_OK;
     }
-    releaseNode(node);
+    if (!*list) {
+        trace("[Error] [qvsClientProvWbxmlDecoderCharacterList] ptTmpList NULL");
+    }
+    releaseNode(decoder->ptArena, node);
     return QVS_ERROR_FAILED;
 }
 
@@ -409,7 +403,7 @@ qvsResult readSubtree(qvsWbxmlDecoder *decoder, Open **innermost, Node **root)
             return QVS_OK;
         }
         qvsList **siblings = childrenOf(&(*innermost)->node, *(*innermost)->kind);
-        if (qvsResult result = addSibling(siblings, complete)) {
+        if (qvsResult result = addSibling(decoder, siblings, complete)) {
             return result;
         }
         if (qvsResult result = hasNextSibling(decoder, &atStart)) {
@@ -446,7 +440,8 @@ qvsResult qvsClientProvWbxmlDecoderWbxmlBody(qvsWbxmlDecoder *decoder, qvsWapDoc
     if (!decoder || !decoder->ptBuffer) {
         return QVS_ERROR_WBXML_NO_BUFFER;
     }
-    auto *built = newRecord<qvsWapDoc>(kDecoderModule);
+    auto *built =
+        static_cast<qvsWapDoc *>(newPiece(decoder->ptArena, sizeof(qvsWapDoc), kDecoderModule));
     if (!built) {
         trace("[Error] [qvsClientProvWbxmlDecoderWbxmlBody] ptTmpWapDoc NULL");
         return QVS_ERROR_FAILED;
@@ -455,7 +450,7 @@ qvsResult qvsClientProvWbxmlDecoderWbxmlBody(qvsWbxmlDecoder *decoder, qvsWapDoc
     const bool present = peekTag(decoder, &tag);
     if (present && tag == wbxml::kEnd) {
         // kept[body-end]: success without a document.
-        (void)qvsClientProvWbxmlDeleteWapDoc(built);
+        releaseDocument(decoder->ptArena, built);
         (void)takeSeenTag(decoder);
         return QVS_OK;
     }
@@ -467,7 +462,7 @@ qvsResult qvsClientProvWbxmlDecoderWbxmlBody(qvsWbxmlDecoder *decoder, qvsWapDoc
         }
     }
     if (result != QVS_OK) {
-        (void)qvsClientProvWbxmlDeleteWapDoc(built);
+        releaseDocument(decoder->ptArena, built);
         return result;
     }
     *document = built;
@@ -529,7 +524,7 @@ qvsResult qvsClientProvWbxmlDecoderCharacterList(qvsWbxmlDecoder *decoder, qvsLi
         Node *node = nullptr;
         result = qvsClientProvWbxmlDecoderCharacter(decoder, &node);
         if (result == QVS_OK) {
-            result = addSibling(&run, node);
+            result = addSibling(decoder, &run, node);
         }
         if (result == QVS_OK) {
             result = hasNextSibling(decoder, &next);
@@ -538,7 +533,7 @@ qvsResult qvsClientProvWbxmlDecoderCharacterList(qvsWbxmlDecoder *decoder, qvsLi
     if (result == QVS_OK) {
         *list = run;
     } else if (!*list && run) {
-        (void)qvsListDeleteNodeAllAndList(run, releaseNode);
+        releaseNodes(decoder->ptArena, run);
     }
     return result;
 }
@@ -549,7 +544,7 @@ qvsResult qvsClientProvWbxmlDecoderCharacter(qvsWbxmlDecoder *decoder, qvsWapCha
     const qvsResult result = readSubtree(decoder, &innermost, node);
     while (innermost) {
         Open *parent = innermost->parent;
-        releaseNode(&innermost->node);
+        releaseNode(decoder->ptArena, &innermost->node);
         innermost = parent;
     }
     return result;

@@ -1,6 +1,7 @@
 // One parm element: the loop that reads it by the table of its characteristic, and its value, which
 // is a text or one more item of a list of texts.
 #include "qvsParm.h"
+#include "qvsTree.h"
 #include "qvsstring.h"
 
 using namespace qvs;
@@ -116,17 +117,14 @@ inline qvsResult readText(qvsWbxmlDecoder *decoder, char **text, uint8_t token)
     return takePlain(decoder, plain, text);
 }
 
-// Adds a text to a list of texts, which is made when there is none. A null text adds nothing.
-// The list takes the text over.
-qvsResult addText(qvsList **list, char *text)
+// Adds a text to a list of texts, which takes it over. A null text adds nothing.
+qvsResult addText(qvsWbxmlDecoder *decoder, qvsList **list, char *text)
 {
-    if (!*list) {
-        if (qvsListCreate(list, text) == QVS_OK) {
-            return QVS_OK;
-        }
-        trace("[Error] [qvsClientProvWbxmlDecoderParamListString] ptTmpList NULL");
-    } else if (!text || qvsListAddNodeLast(*list, text) == QVS_OK) {
+    if (addItem(decoder->ptArena, list, text) == QVS_OK) {
         return QVS_OK;
+    }
+    if (!*list) {
+        trace("[Error] [qvsClientProvWbxmlDecoderParamListString] ptTmpList NULL");
     }
     qvsMemFree_debug(text);
     return QVS_ERROR_FAILED;
@@ -151,7 +149,7 @@ qvsResult readItem(qvsWbxmlDecoder *decoder, qvsList **list, uint8_t token, cons
         *last = text.data ? text.data : text.before;
         item = text.take();
     }
-    return addText(list, item);
+    return addText(decoder, list, item);
 }
 
 // Reads the pairs up to END into `*list`.
@@ -258,8 +256,8 @@ qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvs
     const qvsResult result = readItems(decoder, &built);
     if (result == QVS_OK) {
         *list = built;
-    } else if (!*list) {
-        (void)qvsListDeleteNodeAllAndList(built, nullptr);
+    } else if (!*list && built) {
+        releaseTexts(decoder->ptArena, built);
     }
     return result;
 }

@@ -5,7 +5,7 @@ namespace [[gnu::visibility("hidden")]] qvs {
 
 namespace {
 
-constexpr PaddedText kBlank = "";
+constexpr PaddedText<5> kBlank = "";
 
 // An array of empty strings; null with an exception pending.
 jobjectArray blankArray(JNIEnv *env, jsize length)

@@ -63,8 +63,10 @@ jint count(const Node *node)
 
 // ---- Answers. Each is a new local reference, or null; with an exception pending it is null.
 
-// Constant text for the virtual machine, with the four zero bytes behind it that stand behind
-// every text of the context too: a multi-byte sequence cut off at the end is never read past them.
+// Constant text for the virtual machine in `Room` bytes, with the four zero bytes behind it that
+// stand behind every text of the context too: a multi-byte sequence cut off at the end is never
+// read past them.
+template <size_t Room>
 struct PaddedText {
     consteval PaddedText(const char *text)
     {
@@ -75,7 +77,7 @@ struct PaddedText {
     }
 
     static constexpr size_t kZeroes = 5; // the terminator is one of them
-    char bytes[26] = {};
+    char bytes[Room] = {};
 };
 
 inline jstring text(JNIEnv *env, const char *value)

@@ -27,8 +27,8 @@ qvsCtxPort *port(jint a, jint r, jint t)
 
 // ---- Names
 
-constexpr PaddedText kAppSrv = "APPSRV";
-constexpr PaddedText kClient = "CLIENT";
+constexpr PaddedText<11> kAppSrv = "APPSRV";
+constexpr PaddedText<11> kClient = "CLIENT";
 constexpr uint8_t kAppSrvToken = 0x8D;
 
 // kept[aauthlevel-name]: APPSRV is known by its token or its exact text, CLIENT by its text in any

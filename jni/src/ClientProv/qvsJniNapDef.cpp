@@ -25,7 +25,7 @@ qvsCtxNapAuthInfo *napAuthInfo(jint n, jint a)
 
 // The names of the bearers, by value token; the last one stands for every other.
 constexpr uint8_t kFirstBearer = 0xA2;
-constexpr PaddedText kBearers[] = {
+constexpr PaddedText<26> kBearers[] = {
     "GSM-USSD",
     "GSM-SMS",
     "ANSI-136-GUTS",
@@ -66,7 +66,7 @@ const char *bearerName(uint8_t token)
 
 // The address type codes, by value token: IPV4, IPV6, E164, ALPHA, APN, SCODE, TETRA-ITSI, MAN.
 constexpr uint8_t kFirstAddrType = 0x85;
-constexpr PaddedText kAddrTypeCodes[] = {
+constexpr PaddedText<9> kAddrTypeCodes[] = {
     "0x85", "0x86", "0x87", "0x88", "0x89", "0x8a", "0x8b", "0x8c",
 };
 
@@ -79,12 +79,12 @@ const char *addrTypeCode(const char *type)
 
 constexpr struct {
     uint8_t token;
-    PaddedText name;
+    PaddedText<16> name;
 } kAuthTypes[] = {
     {0x9A, "PAP"},         {0x9B, "CHAP"},    {0x9C, "HTTP-BASIC"},
     {0x9D, "HTTP-DIGEST"}, {0x9E, "WTLS-SS"}, {0x9F, "MD5"},
 };
-constexpr PaddedText kNoAuthType = "NONE";
+constexpr PaddedText<9> kNoAuthType = "NONE";
 
 const char *authTypeName(const char *type)
 {

@@ -33,7 +33,7 @@ qvsCtxPort *port(jint p, jint h, jint t)
 // ---- Names
 
 // The services in the order of their value tokens, 0xCA to 0xD3, and the one for all others.
-constexpr PaddedText kServices[] = {
+constexpr PaddedText<20> kServices[] = {
     "CL-WSP",      "CO-WSP",          "CL-SEC-WSP",     "CO-SEC-WSP",
     "CL-SEC-WTA",  "CO-SEC-WTA",      "OTA-HTTP-TO",    "OTA-HTTP-TLS-TO",
     "OTA-HTTP-PO", "OTA-HTTP-TLS-PO", "Unkown Service",
@@ -51,8 +51,8 @@ jstring serviceName(JNIEnv *env, const qvsCtxPort *owner, jint s)
     return row < countOf(kServices) ? text(env, kServices[row].bytes) : nullptr;
 }
 
-constexpr PaddedText kIpv4 = "NET_ADDR_IPV4";
-constexpr PaddedText kIpv6 = "NET_ADDR_IPV6";
+constexpr PaddedText<18> kIpv4 = "NET_ADDR_IPV4";
+constexpr PaddedText<18> kIpv6 = "NET_ADDR_IPV6";
 constexpr uint8_t kIpv6Token = 0x86;
 
 // kept[pxaddrtype-ipv4]: every type that is not IPV6 is named NET_ADDR_IPV4.

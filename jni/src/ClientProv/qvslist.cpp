@@ -1,15 +1,16 @@
 // The list: every walk is a loop, and the last node is remembered.
 #include "qvslist.h"
 
+#include "qvsTree.h"
 #include "qvsmemory.h"
 
 namespace {
 
 constexpr char kModule[] = "jni/src/ClientProv/qvslist";
 
-qvsListNode *newNode(void *item)
+qvsListNode *newNode(qvsArena *arena, void *item)
 {
-    qvsListNode *node = qvs::newRecord<qvsListNode>(kModule);
+    auto *node = static_cast<qvsListNode *>(qvs::newPiece(arena, sizeof(qvsListNode), kModule));
     if (node) {
         node->pItem = item;
     }
@@ -79,31 +80,9 @@ qvsListNode *nodeAt(const qvsList *list, uint32_t index)
     return node;
 }
 
-} // namespace
-
-qvsResult qvsListCreate(qvsList **list, void *item)
+qvsResult addLast(qvsArena *arena, qvsList *list, void *item)
 {
-    *list = nullptr;
-    qvsList *made = qvs::newRecord<qvsList>(kModule);
-    if (!made) {
-        return QVS_ERROR_LIST_NO_MEMORY;
-    }
-    if (item) {
-        if (qvsResult result = qvsListAddNodeLast(made, item)) {
-            qvsMemFree_debug(made);
-            return result;
-        }
-    }
-    *list = made;
-    return QVS_OK;
-}
-
-qvsResult qvsListAddNodeLast(qvsList *list, void *item)
-{
-    if (!list || !item) {
-        return QVS_ERROR_LIST_ARGUMENT;
-    }
-    qvsListNode *node = newNode(item);
+    qvsListNode *node = newNode(arena, item);
     if (!node) {
         return QVS_ERROR_LIST_NO_MEMORY;
     }
@@ -118,12 +97,68 @@ qvsResult qvsListAddNodeLast(qvsList *list, void *item)
     return QVS_OK;
 }
 
+qvsResult create(qvsArena *arena, qvsList **list, void *item)
+{
+    *list = nullptr;
+    auto *made = static_cast<qvsList *>(qvs::newPiece(arena, sizeof(qvsList), kModule));
+    if (!made) {
+        return QVS_ERROR_LIST_NO_MEMORY;
+    }
+    if (item) {
+        if (qvsResult result = addLast(arena, made, item)) {
+            if (!arena) {
+                qvsMemFree_debug(made);
+            }
+            return result;
+        }
+    }
+    *list = made;
+    return QVS_OK;
+}
+
+} // namespace
+
+qvsResult qvs::addItem(qvsArena *arena, qvsList **list, void *item)
+{
+    if (!*list) {
+        return create(arena, list, item);
+    }
+    if (!item) {
+        return QVS_OK;
+    }
+    return addLast(arena, *list, item);
+}
+
+void qvs::releaseTexts(qvsArena *arena, qvsList *list)
+{
+    if (!arena) {
+        (void)qvsListDeleteNodeAllAndList(list, nullptr); // refuses only a list that is not there
+        return;
+    }
+    for (qvsListNode *node = list->ptFirst; node; node = node->ptNext) {
+        freeBlock(node->pItem);
+    }
+}
+
+qvsResult qvsListCreate(qvsList **list, void *item)
+{
+    return create(nullptr, list, item);
+}
+
+qvsResult qvsListAddNodeLast(qvsList *list, void *item)
+{
+    if (!list || !item) {
+        return QVS_ERROR_LIST_ARGUMENT;
+    }
+    return addLast(nullptr, list, item);
+}
+
 qvsResult qvsListAddNodeFirst(qvsList *list, void *item)
 {
     if (!list || !item) {
         return QVS_ERROR_LIST_ARGUMENT;
     }
-    qvsListNode *node = newNode(item);
+    qvsListNode *node = newNode(nullptr, item);
     if (!node) {
         return QVS_ERROR_LIST_NO_MEMORY;
     }

@@ -1,0 +1,55 @@
+// Pieces of a tree and the blocks that they share.
+#include "qvsTree.h"
+
+#include "qvsmemory.h"
+
+#include <stddef.h>
+#include <string.h>
+
+namespace [[gnu::visibility("hidden")]] qvs {
+
+namespace {
+
+constexpr char kModule[] = "jni/src/ClientProv/qvsTree";
+
+// From 1 KB on the C library joins its free small blocks for each that it is asked for.
+constexpr uint32_t kBlockSize = 960;
+
+// Makes room in a new block. False without memory.
+bool addBlock(qvsArena *arena)
+{
+    auto *block = static_cast<char *>(newBlock(kBlockSize, kModule));
+    if (!block) {
+        return false;
+    }
+    memcpy(block, &arena->blocks, sizeof arena->blocks);
+    arena->blocks = block;
+    arena->next = block + sizeof arena->blocks;
+    arena->end = block + kBlockSize;
+    return true;
+}
+
+} // namespace
+
+void *newPiece(qvsArena *arena, uint32_t size, const char *module, int line)
+{
+    if (!arena) {
+        return qvsMemAllocSetZero_debug(size, module, line);
+    }
+    if (arena->end - arena->next < static_cast<ptrdiff_t>(size) && !addBlock(arena)) {
+        return nullptr;
+    }
+    char *piece = arena->next;
+    arena->next += size;
+    return memset(piece, 0, size);
+}
+
+void releaseArena(qvsArena *arena)
+{
+    while (void *block = arena->blocks) {
+        memcpy(&arena->blocks, block, sizeof arena->blocks);
+        freeBlock(block);
+    }
+}
+
+} // namespace qvs
