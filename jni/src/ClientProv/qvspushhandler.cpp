@@ -143,7 +143,7 @@ bool copyBody(const Rest &body, smlpushHdlrInfo *info)
     if (!info->pBody) {
         return false;
     }
-    memcpy(info->pBody, body.at, body.length);
+    qvsMemCpy(info->pBody, body.at, body.length); // no loop in place, as memcpy is in small code
     info->pBody[body.length] = 0;
     info->nBodyLen = body.length;
     return true;
