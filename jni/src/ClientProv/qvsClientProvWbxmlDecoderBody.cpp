@@ -154,7 +154,7 @@ qvsList **childrenOf(Node *node, const Kind &kind)
 
 // ---- Attributes of a characteristic
 
-qvsResult refuseAttribute(uint8_t token)
+[[gnu::noinline, gnu::cold]] qvsResult refuseAttribute(uint8_t token)
 {
     trace("Tag Code = QVS_ERROR_WBXML_UNKNOWN_ELEMENT");
     trace("qvsClientProvWbxmlDecoderCharacterAttribute[%x]", token);
@@ -162,7 +162,7 @@ qvsResult refuseAttribute(uint8_t token)
 }
 
 // A TYPE given as text. Other names than the three known ones make no record.
-qvsResult readNamedType(qvsWbxmlDecoder *decoder, Node *node, ScopedText *name)
+[[gnu::noinline, gnu::cold]] qvsResult readNamedType(qvsWbxmlDecoder *decoder, Node *node, ScopedText *name)
 {
     ++decoder->ptBuffer->pHead; // behind the attribute start
     Text read;
