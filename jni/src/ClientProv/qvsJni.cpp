@@ -52,7 +52,7 @@ jobjectArray stringArray(JNIEnv *env, const char *const *texts, jsize shown, jsi
     return result;
 }
 
-Shown::Shown(const void *record, const Cells &cells, const Naming &naming)
+Shown::Shown(const void *record, Cells cells, Naming naming)
     : length(static_cast<jsize>(cells.count) + 1)
 {
     for (uint8_t i = 0; i < cells.count; ++i) {
@@ -63,7 +63,7 @@ Shown::Shown(const void *record, const Cells &cells, const Naming &naming)
     texts[cells.count] = nullptr;
 }
 
-jobjectArray array(JNIEnv *env, const void *record, const Cells &cells, const Naming &naming)
+jobjectArray array(JNIEnv *env, const void *record, Cells cells, Naming naming)
 {
     if (!record) {
         return nullptr;

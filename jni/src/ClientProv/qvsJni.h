@@ -123,14 +123,14 @@ struct Naming {
 // What an array shows: its texts, and a null behind them.
 // kept[last-element-null]: an array ends with an element that is null.
 struct Shown {
-    Shown(const void *record, const Cells &cells, const Naming &naming = {});
+    Shown(const void *record, Cells cells, Naming naming = {});
 
     const char *texts[Cells::kMost + 1];
     jsize length;
 };
 
 // The record as a String[], one element per cell and the last one; null for a missing record.
-jobjectArray array(JNIEnv *env, const void *record, const Cells &cells, const Naming &naming = {});
+jobjectArray array(JNIEnv *env, const void *record, Cells cells, Naming naming = {});
 
 // ---- Registration
 
