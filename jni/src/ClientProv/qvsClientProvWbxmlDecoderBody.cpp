@@ -162,7 +162,8 @@ qvsList **childrenOf(Node *node, const Kind &kind)
 }
 
 // A TYPE given as text. Other names than the three known ones make no record.
-[[gnu::noinline, gnu::cold]] qvsResult readNamedType(qvsWbxmlDecoder *decoder, Node *node, ScopedText *name)
+[[gnu::noinline, gnu::cold]] qvsResult readNamedType(qvsWbxmlDecoder *decoder, Node *node,
+                                                     ScopedText *name)
 {
     ++decoder->ptBuffer->pHead; // behind the attribute start
     Text read;
