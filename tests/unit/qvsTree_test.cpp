@@ -155,6 +155,16 @@ TEST_F(Arena, LeavesAListAsItWasWithoutMemory)
     EXPECT_EQ(list->ptFirst->ptNext, nullptr);
 }
 
+TEST_F(Arena, MakesNoListWithoutMemoryForItsFirstNode)
+{
+    char item = 0;
+    qvsList *list = nullptr;
+    arena.end = room + sizeof(qvsList);
+    blocks::failAt = 0;
+    EXPECT_EQ(qvs::addItem(&arena, &list, &item), QVS_ERROR_LIST_NO_MEMORY);
+    EXPECT_EQ(list, nullptr);
+}
+
 TEST_F(Piece, IsABlockOfItsOwnWithoutAnArena)
 {
     void *made = qvs::newPiece(nullptr, kSize, kModule);

@@ -307,7 +307,7 @@ qvsList *childrenOf(void *record, const ReleaseKind &kind)
 }
 
 // Releases a record whose fields and children are gone.
-void closeRecord(qvsArena *arena, void *record, const ReleaseKind &kind)
+void closeRecord(const qvsArena *arena, void *record, const ReleaseKind &kind)
 {
     if (kind.childList != kNoField) {
         if (qvsList *children = *listAt(record, kind.childList); children && !arena) {
