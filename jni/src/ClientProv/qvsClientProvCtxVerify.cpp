@@ -53,14 +53,14 @@ void *firstItem(qvsList *list)
 struct Chains {
     // kept[context-null-linked]: a builder that answered null has added nothing, and the chain goes
     // on behind it.
-    void append(const ChildRow &row, size_t number, void *record)
+    void append(const ChildRow &row, size_t number, void *added)
     {
-        if (!record) {
+        if (!added) {
             return;
         }
         void *holder = last[number] ? last[number] : lastOf(row);
-        setPointer(holder, holder == parent ? row.chain : linkOf(row), record);
-        last[number] = record;
+        setPointer(holder, holder == parent ? row.chain : linkOf(row), added);
+        last[number] = added;
     }
 
     // The record that a parent may have one of.
