@@ -2,8 +2,13 @@
 // into calloc.
 #include "blocks.h"
 
+#include <sys/mman.h>
+#include <unistd.h>
+
 #include <algorithm>
 #include <cstdint>
+#include <cstdlib>
+#include <cstring>
 #include <unordered_map>
 
 extern "C" {
@@ -21,6 +26,12 @@ std::function<void(const void *block)> onRelease;
 
 namespace {
 
+// What a fenced block lies in.
+struct Pages {
+    void *start;
+    std::size_t size;
+};
+
 // What is counted. Never destroyed: blocks are released until the very end of the program.
 struct Heap {
     std::unordered_map<void *, std::size_t> sizes;
@@ -29,6 +40,8 @@ struct Heap {
     std::size_t calls = 0;
     std::size_t total = 0;
     bool failing = false;
+    bool fencing = false;
+    std::unordered_map<void *, Pages> fenced;
 };
 
 Heap &heap()
@@ -58,6 +71,36 @@ void *added(void *block, std::size_t size)
     return block;
 }
 
+// A block whose last byte is that of a page, in front of one that cannot be touched.
+void *fencedBlock(std::size_t size)
+{
+    const std::size_t page = static_cast<std::size_t>(sysconf(_SC_PAGESIZE));
+    const std::size_t room = (size / page + 1) * page;
+    void *start =
+        mmap(nullptr, room + page, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0);
+    if (start == MAP_FAILED) {
+        return nullptr;
+    }
+    char *end = static_cast<char *>(start) + room;
+    if (mprotect(end, page, PROT_NONE) != 0) {
+        std::abort();
+    }
+    heap().fenced[end - size] = {start, room + page};
+    return end - size;
+}
+
+bool isFenced(void *block)
+{
+    return heap().fenced.count(block) != 0;
+}
+
+void releaseFenced(void *block)
+{
+    const auto known = heap().fenced.find(block);
+    munmap(known->second.start, known->second.size);
+    heap().fenced.erase(known);
+}
+
 // A block that was allocated elsewhere is none of ours.
 void removed(void *block)
 {
@@ -72,6 +115,16 @@ void removed(void *block)
 }
 
 } // namespace
+
+Fence::Fence() : before(heap().fencing)
+{
+    heap().fencing = true;
+}
+
+Fence::~Fence()
+{
+    heap().fencing = before;
+}
 
 void reset()
 {
@@ -126,18 +179,30 @@ extern "C" {
 
 void *__wrap_malloc(std::size_t size)
 {
-    return blocks::fails() ? nullptr : blocks::added(__real_malloc(size), size);
+    if (blocks::fails()) {
+        return nullptr;
+    }
+    return blocks::added(blocks::heap().fencing ? blocks::fencedBlock(size) : __real_malloc(size),
+                         size);
 }
 
 void *__wrap_calloc(std::size_t count, std::size_t size)
 {
-    return blocks::fails() ? nullptr : blocks::added(__real_calloc(count, size), count * size);
+    if (blocks::fails()) {
+        return nullptr;
+    }
+    void *block = blocks::heap().fencing ? blocks::fencedBlock(count * size) // pages are zero
+                                         : __real_calloc(count, size);
+    return blocks::added(block, count * size);
 }
 
 void *__wrap_realloc(void *block, std::size_t size)
 {
     if (blocks::fails()) {
         return nullptr;
+    }
+    if (blocks::heap().fencing || blocks::isFenced(block)) {
+        std::abort(); // nothing in the library moves a block
     }
     blocks::removed(block);
     return blocks::added(__real_realloc(block, size), size);
@@ -146,6 +211,10 @@ void *__wrap_realloc(void *block, std::size_t size)
 void __wrap_free(void *block)
 {
     blocks::removed(block);
-    __real_free(block);
+    if (blocks::isFenced(block)) {
+        blocks::releaseFenced(block);
+    } else {
+        __real_free(block);
+    }
 }
 }

@@ -36,6 +36,20 @@ std::set<void *> all();
 // Called with every live block before it is released, unless it is empty.
 extern std::function<void(const void *block)> onRelease;
 
+// While one lives, every block ends where its memory does, so that the first byte behind it can be
+// neither read nor written, and no byte of it once it is released. It takes pages, so it is for few
+// blocks at a time; they may outlive it.
+class Fence {
+public:
+    Fence();
+    Fence(const Fence &) = delete;
+    Fence &operator=(const Fence &) = delete;
+    ~Fence();
+
+private:
+    bool before;
+};
+
 // Fails the test when more or fewer blocks are live at the end of the scope than at its start.
 class BlockCheck {
 public:

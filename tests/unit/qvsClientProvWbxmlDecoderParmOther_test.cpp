@@ -169,8 +169,10 @@ TEST_F(VendorParm, StoresAVALUEThatCarriesNothing)
     EXPECT_EQ(run.read(), 0U);
     char *name = run.record->pszParamName;
     char *value = run.record->pszParamValue;
+    Traces traces;
     EXPECT_EQ(run.read(), 0U);
     EXPECT_EQ(run.record->pszParamValue, nullptr);
+    EXPECT_EQ(traces.texts.back(), "--------------------------[]\n");
     records::release({name, value});
 }
 

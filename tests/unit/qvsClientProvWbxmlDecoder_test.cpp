@@ -2,9 +2,13 @@
 #include "blocks.h"
 #include "decoding.h"
 #include "message.h"
+#include "qvspushhandler.h"
 #include "traces.h"
 
 #include <cstring>
+#include <fstream>
+#include <iterator>
+#include <set>
 #include <string>
 
 using decoding::Bytes;
@@ -227,6 +231,29 @@ TEST_F(DecoderMain, AnswersNullWithItsStepTraced)
     EXPECT_EQ(qvsClinetProvWbxmlDecoderMain(&byte, 0), nullptr);
 }
 
+// A context that was not made is released all the same, which is traced as a failure of its own.
+TEST_F(DecoderMain, EndsItsTracesWithTheReleaseOfNoContext)
+{
+    const Bytes refused[] = {
+        {0x03, 0x0B, 0x6A, 0x00, 0x45, 0x47}, // not decoded
+        {0x03, 0x0B, 0x6A, 0x00, 0x45, 0x01}, // without a context
+    };
+    for (const Bytes &bytes : refused) {
+        Traces traces;
+        EXPECT_EQ(decodeMain(bytes), nullptr);
+        EXPECT_EQ(traces.texts.back(), "[Syncml] ERROR : 2\n");
+        EXPECT_NE(*(traces.texts.end() - 2), traces.texts.back());
+    }
+    message::Body body;
+    body.characteristic(message::kNapDef, [&] { body.parm(message::kNapId, "n1"); });
+    Traces traces;
+    qvsClientProvCtx *context = decodeMain(message::document(body));
+    EXPECT_EQ(traces.texts.back(), "Success\n");
+    ASSERT_NE(context, nullptr);
+    EXPECT_STREQ(context->ptNapDef->pszNapId, "n1");
+    qvsClientProvCtxDelectContext(context);
+}
+
 TEST_F(DecoderMain, AsksForItsBlocksUnderTheSourceOfEach)
 {
     message::Body body;
@@ -314,6 +341,81 @@ TEST_F(DecoderMain, SurvivesEveryFailingAllocation)
     const auto attempt = [&] { qvsClientProvCtxDelectContext(decodeMain(bytes)); };
     EXPECT_GT(blocks::failEach(attempt), 200);
     EXPECT_GT(blocks::failEachFrom(attempt), 200);
+}
+
+// The body of a message in which every characteristic and parameter is.
+Bytes everything()
+{
+    std::ifstream file(OMACP_SAMPLES_DIR "/everything.push", std::ios::binary);
+    const Bytes message(std::istreambuf_iterator<char>(file), {});
+    smlpushHdlrInfo *header =
+        smlpushHdlrParsingWSPHeader(message.data(), static_cast<uint32_t>(message.size()));
+    if (!header) {
+        ADD_FAILURE();
+        return {};
+    }
+    const Bytes body(header->pBody, header->pBody + header->nBodyLen);
+    qvs::releasePushHeader(header);
+    return body;
+}
+
+// The bytes in a block that ends where they do.
+struct FencedBytes {
+    explicit FencedBytes(const Bytes &bytes) : size(static_cast<uint32_t>(bytes.size()))
+    {
+        const blocks::Fence fence;
+        data = static_cast<uint8_t *>(qvsMemDup_debug(bytes.data(), size, "test", __LINE__));
+    }
+    FencedBytes(const FencedBytes &) = delete;
+    FencedBytes &operator=(const FencedBytes &) = delete;
+    ~FencedBytes() { qvsMemFree_debug(data); }
+
+    uint8_t *data;
+    uint32_t size;
+};
+
+// Releases what a message leaves allocated on purpose, such as the first of two texts.
+struct Rest {
+    Rest() = default;
+    Rest(const Rest &) = delete;
+    Rest &operator=(const Rest &) = delete;
+    ~Rest()
+    {
+        for (void *block : blocks::all()) {
+            if (!before.count(block)) {
+                qvsMemFree_debug(block);
+            }
+        }
+    }
+
+    std::set<void *> before = blocks::all();
+};
+
+TEST_F(DecoderMain, TouchesNoByteOutsideOfItsBlocks)
+{
+    const Rest rest;
+    const FencedBytes bytes(everything());
+    const blocks::Fence fence;
+    qvsClientProvCtx *context = qvsClinetProvWbxmlDecoderMain(bytes.data, bytes.size);
+    EXPECT_NE(context, nullptr);
+    qvsClientProvCtxDelectContext(context);
+
+    // The same with records and lists that are blocks.
+    qvsWbxmlDecoder *decoder = nullptr;
+    ASSERT_EQ(qvsClientProvWbxmlInitDecoder(&decoder, bytes.data, bytes.size), QVS_OK);
+    qvsWapDoc *document = nullptr;
+    EXPECT_EQ(qvsClientProvWbxmlDecoder(decoder, &document), QVS_OK);
+    qvsClientProvWbxmlDeleteDecoder(decoder);
+    EXPECT_EQ(qvsClientProvWbxmlDeleteWapDoc(document), 1U);
+}
+
+TEST_F(DecoderMain, ReadsNoByteBehindAMessageCutAnywhere)
+{
+    for (Bytes bytes = everything(); !bytes.empty(); bytes.pop_back()) {
+        const Rest rest;
+        const FencedBytes cut(bytes);
+        qvsClientProvCtxDelectContext(qvsClinetProvWbxmlDecoderMain(cut.data, cut.size));
+    }
 }
 
 TEST_F(DecoderMain, LeavesNoBlockOfAMessageCutAnywhere)

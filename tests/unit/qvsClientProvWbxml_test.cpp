@@ -2,6 +2,7 @@
 #include "qvsClientProvWbxml.h"
 
 #include "support/blocks.h"
+#include "support/memcheck.h"
 #include "support/records.h"
 #include "support/traces.h"
 
@@ -144,6 +145,7 @@ TEST_P(TreeRelease, AnswersNothingForNull)
 TEST_P(TreeRelease, FollowsItsTable)
 {
     blocks::BlockCheck check;
+    blocks::Fence fence;
     const Kind &kind = GetParam();
     Names names;
     void *record = names("record", blank(kind.fields));
@@ -178,6 +180,7 @@ TEST_P(TreeRelease, FollowsItsTable)
 TEST_P(TreeRelease, TakesPartlyFilledRecords)
 {
     blocks::BlockCheck check;
+    blocks::Fence fence;
     const Kind &kind = GetParam();
     const Numbers children = kind.children ? Numbers{kind.children} : Numbers{};
     for (size_t field : join({kind.texts, kind.lists, children})) {
@@ -217,6 +220,7 @@ TEST_P(TreeRelease, TakesListsWithoutItems)
 TEST_P(TreeRelease, ServesItsSlot)
 {
     blocks::BlockCheck check;
+    blocks::Fence fence;
     const Kind &kind = GetParam();
     Names names;
     void *record = names("record", blank(kind.fields));
@@ -564,6 +568,18 @@ TEST(DecoderCreation, CopiesTheBody)
     EXPECT_EQ(decoder->ptBuffer->nSize, sizeof expected);
     EXPECT_EQ(decoder->ptBuffer->pHead, decoder->ptBuffer->pStorage);
     EXPECT_EQ(memcmp(decoder->ptBuffer->pHead, expected, sizeof expected), 0);
+    EXPECT_EQ(qvsClientProvWbxmlDeleteDecoder(decoder), QVS_OK);
+}
+
+TEST(DecoderCreation, AsksForItsBlocksUnderTheSourceOfEach)
+{
+    blocks::BlockCheck check;
+    const uint8_t byte = 3;
+    qvsWbxmlDecoder *decoder = nullptr;
+    EXPECT_EQ(memcheck::filesOf(
+                  [&] { EXPECT_EQ(qvsClientProvWbxmlInitDecoder(&decoder, &byte, 1), QVS_OK); }),
+              (Strings{"jni/src/ClientProv/qvsClientProvWbxml", "jni/src/ClientProv/smlbuffer",
+                       "jni/src/ClientProv/smlbuffer"}));
     EXPECT_EQ(qvsClientProvWbxmlDeleteDecoder(decoder), QVS_OK);
 }
 

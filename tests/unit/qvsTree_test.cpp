@@ -1,11 +1,13 @@
 // Pieces of a tree: blocks of their own, or parts of an arena that is released as a whole.
 #include "blocks.h"
+#include "memcheck.h"
 #include "qvsTree.h"
 #include "qvsmemory.h"
 
 #include <algorithm>
 #include <cstring>
 #include <set>
+#include <string>
 #include <vector>
 
 namespace {
@@ -80,6 +82,14 @@ TEST_F(Arena, TakesABlockForManyPieces)
     EXPECT_LT(blocks::live() - before, 400U * kSize / 900 + 2);
     qvs::releaseArena(&arena);
     EXPECT_EQ(blocks::live(), before);
+}
+
+TEST_F(Arena, AsksForItsBlocksUnderItsSource)
+{
+    piece();
+    piece();
+    const auto files = memcheck::filesOf([&] { piece(); });
+    EXPECT_EQ(files, std::vector<std::string>{"jni/src/ClientProv/qvsTree"});
 }
 
 TEST_F(Arena, AsksForBlocksThatTheCLibraryTakesForSmall)

@@ -3,6 +3,7 @@
 #include "qvspushhandler.h"
 
 #include "blocks.h"
+#include "memcheck.h"
 #include "qvsmemory.h"
 
 #include <gtest/gtest.h>
@@ -102,6 +103,14 @@ TEST_F(Push, ReadsAMessageWithoutLengthQuoteAndParameters)
     EXPECT_EQ(header->nMacLen, 0U);
     EXPECT_EQ(std::string(header->szMac, sizeof(header->szMac)), std::string(44, '\0'));
     EXPECT_EQ(bodyOf(header), "body");
+}
+
+TEST_F(Push, AsksForItsBlocksUnderItsSource)
+{
+    const std::string file = "jni/src/ClientProv/qvspushhandler";
+    Header header;
+    const auto files = memcheck::filesOf([&] { header = parsedHeaders("\xB6\xAF\x80"); });
+    EXPECT_EQ(files, (std::vector<std::string>{file, file}));
 }
 
 TEST_F(Push, RefusesNull)

@@ -2,6 +2,7 @@
 #include "qvstrace.h"
 
 #include "blocks.h"
+#include "memcheck.h"
 #include "qvsmemory.h"
 #include "traces.h"
 
@@ -285,6 +286,16 @@ TEST_F(Trace, NothingIsFormedWithoutASink)
     traceAll();
     EXPECT_EQ(testing::internal::GetCapturedStdout(), "");
     EXPECT_EQ(blocks::allocations(), 0U);
+}
+
+TEST_F(Trace, FormsAMessageInABlockUnderItsSource)
+{
+    const auto files = memcheck::filesOf([] {
+        qvcTraceSetSink([](const char *, uint32_t) { qvsMemEndMemCheck(); });
+        qvcTraceFunction("f");
+        qvcTraceSetSink(nullptr);
+    });
+    EXPECT_EQ(files, Texts{"jni/src/ClientProv/qvstrace"});
 }
 
 TEST_F(Trace, NothingIsPrintedWithASink)

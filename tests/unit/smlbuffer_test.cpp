@@ -3,6 +3,7 @@
 #include "smlbuffer.h"
 
 #include "blocks.h"
+#include "memcheck.h"
 #include "qvsmemory.h"
 
 #include <gtest/gtest.h>
@@ -161,6 +162,22 @@ TEST_F(Buffer, IsCreatedEmptyAndZeroed)
     EXPECT_EQ(text(buffer->pStorage, 11), zeros(11));
     expectInStep(buffer);
     drop(buffer);
+}
+
+TEST_F(Buffer, IsAskedForUnderItsSource)
+{
+    const std::string file = "jni/src/ClientProv/smlbuffer";
+    smlBuffer *buffer = nullptr;
+    smlBuffer *outside = nullptr;
+    uint8_t storage[4] = {};
+    EXPECT_EQ(memcheck::filesOf([&] { EXPECT_EQ(smlBufferCreate(&buffer, 4), QVS_OK); }),
+              (std::vector<std::string>{file, file}));
+    EXPECT_EQ(memcheck::filesOf([&] {
+                  EXPECT_EQ(smlBufferCreateOutsideBuf(&outside, storage, sizeof storage), QVS_OK);
+              }),
+              std::vector<std::string>{file});
+    drop(buffer);
+    drop(outside);
 }
 
 TEST_F(Buffer, MayHaveNoCapacity)
