@@ -92,8 +92,8 @@ size_t textsOf(const Record *record, size_t fields)
         std::count_if(field, field + fields, [](const char *text) { return text; }));
 }
 
-// What a context does not let go of: WI-FI and ROAMING records, the texts of XCAP, and the copy of
-// FROM that was replaced.
+} // namespace
+
 size_t keptBy(const qvsClientProvCtx *context)
 {
     size_t kept = 0;
@@ -108,8 +108,6 @@ size_t keptBy(const qvsClientProvCtx *context)
     }
     return kept;
 }
-
-} // namespace
 
 const std::vector<Call> &calls()
 {

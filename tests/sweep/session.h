@@ -2,6 +2,7 @@
 // the delete; a parse, every query, the choice of an access point, the delete.
 #pragma once
 
+#include "qvsClientProvCtx.h"
 #include "support/fakevm.h"
 
 #include <cstddef>
@@ -26,6 +27,10 @@ const std::vector<Call> &calls();
 
 // Whether an answer holds nothing.
 bool saysNothing(const fakevm::Answer &answer);
+
+// How many blocks a context does not let go of: those of WI-FI and ROAMING records, the texts of
+// XCAP, and the copies of FROM that were replaced.
+size_t keptBy(const qvsClientProvCtx *context);
 
 class Session {
 public:

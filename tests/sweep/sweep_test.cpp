@@ -1,5 +1,6 @@
 // Whole sessions with an allocation, or a call of the virtual machine, that fails: each in turn.
 // Nothing may be lost that is not lost without a failure, and the next session works.
+#include "choice.h"
 #include "documents.h"
 #include "losses.h"
 #include "session.h"
@@ -20,25 +21,6 @@
 namespace sweep {
 
 namespace {
-
-// Which failures are tried: those that a number in the environment chooses, as OMACP_SWEEP=325; all
-// of them without.
-struct Choice {
-    uint64_t seed = 0;
-    size_t parts = 1; // of which one is tried
-};
-
-#if defined(__SANITIZE_ADDRESS__)
-constexpr size_t kParts = 12; // a session takes ten times as long
-#else
-constexpr size_t kParts = 4;
-#endif
-
-Choice choice()
-{
-    const char *seed = getenv("OMACP_SWEEP");
-    return seed ? Choice{strtoull(seed, nullptr, 10), kParts} : Choice{};
-}
 
 // A session as it goes when nothing fails.
 struct Expected {
