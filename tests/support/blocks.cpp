@@ -71,7 +71,8 @@ void *added(void *block, std::size_t size)
     return block;
 }
 
-// A block whose last byte is that of a page, in front of one that cannot be touched.
+// A block that ends with a page, in front of one that cannot be touched. It is aligned for
+// pointers.
 void *fencedBlock(std::size_t size)
 {
     const std::size_t page = static_cast<std::size_t>(sysconf(_SC_PAGESIZE));
@@ -85,8 +86,9 @@ void *fencedBlock(std::size_t size)
     if (mprotect(end, page, PROT_NONE) != 0) {
         std::abort();
     }
-    heap().fenced[end - size] = {start, room + page};
-    return end - size;
+    char *block = end - (size + alignof(void *) - 1) / alignof(void *) * alignof(void *);
+    heap().fenced[block] = {start, room + page};
+    return block;
 }
 
 bool isFenced(void *block)

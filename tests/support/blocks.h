@@ -36,9 +36,9 @@ std::set<void *> all();
 // Called with every live block before it is released, unless it is empty.
 extern std::function<void(const void *block)> onRelease;
 
-// While one lives, every block ends where its memory does, so that the first byte behind it can be
-// neither read nor written, and no byte of it once it is released. It takes pages, so it is for few
-// blocks at a time; they may outlive it.
+// While one lives, every block ends where its memory does, so far as its alignment lets it, so that
+// the first byte behind it can be neither read nor written, and no byte of it once it is released.
+// It takes pages, so it is for few blocks at a time; they may outlive it.
 class Fence {
 public:
     Fence();

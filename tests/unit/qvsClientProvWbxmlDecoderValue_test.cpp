@@ -621,6 +621,23 @@ TEST_F(CommaAdd, GoesOnWithALengthItAlreadyKnows)
 }
 
 // A table of one megabyte, and references to it until the texts pass their limit.
+// Three strings of one letter: the block of the first is doubled once, and then just long enough.
+TEST_F(ParamString, MovesATextOnlyWhereItsBlockIsTooShort)
+{
+    const auto blocksFor = [](const Bytes &bytes) {
+        Decoder decoder(bytes);
+        OwnText text;
+        blocks::startCounting();
+        EXPECT_EQ(qvsClientProvWbxmlDecoderParamString(decoder, &text, 0x15), QVS_OK);
+        return std::to_string(blocks::allocations()) + " for " + text.str();
+    };
+    EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x01}), "1 for a");
+    EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x03, 'b', 0, 0x01}), "2 for ab");
+    EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x03, 'b', 0, 0x03, 'c', 0, 0x01}), "2 for abc");
+    EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x03, 'b', 0, 0x03, 'c', 0, 0x03, 'd', 0, 0x01}),
+              "3 for abcd");
+}
+
 TEST_F(TextLimit, EndsTheDecodeWith4111BeyondBothItsBounds)
 {
     constexpr uint32_t kEntry = 1024 * 1024;

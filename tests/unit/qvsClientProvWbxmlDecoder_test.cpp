@@ -364,12 +364,16 @@ struct FencedBytes {
     explicit FencedBytes(const Bytes &bytes) : size(static_cast<uint32_t>(bytes.size()))
     {
         const blocks::Fence fence;
-        data = static_cast<uint8_t *>(qvsMemDup_debug(bytes.data(), size, "test", __LINE__));
+        const uint32_t front = (8 - size % 8) % 8; // its end is that of an aligned block
+        block = static_cast<uint8_t *>(qvsMemAlloc_debug(front + size, "test", __LINE__));
+        data = block + front;
+        std::memcpy(data, bytes.data(), size);
     }
     FencedBytes(const FencedBytes &) = delete;
     FencedBytes &operator=(const FencedBytes &) = delete;
-    ~FencedBytes() { qvsMemFree_debug(data); }
+    ~FencedBytes() { qvsMemFree_debug(block); }
 
+    uint8_t *block;
     uint8_t *data;
     uint32_t size;
 };
