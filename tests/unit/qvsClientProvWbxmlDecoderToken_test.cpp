@@ -1,6 +1,7 @@
 // The token layer: elements, attributes, code pages, values in any encoding, skipping.
 #include "blocks.h"
 #include "decoding.h"
+#include "qvsText.h"
 #include "traces.h"
 
 #include <cstring>
@@ -353,6 +354,18 @@ TEST(Kept, unknown_token_replaces)
     EXPECT_EQ(text.str(), "\xFE");
     EXPECT_STREQ(before, "abc") << "stays allocated";
     qvsMemFree_debug(before);
+}
+
+TEST_F(Content, KnowsTheLengthOfAnUnknownToken)
+{
+    Decoder decoder({0xFE, 0x03, 'x', 0, 0x01});
+    qvs::Text text;
+    ASSERT_EQ(qvs::content(decoder, &text), QVS_OK);
+    EXPECT_EQ(text.length, 1U);
+    EXPECT_EQ(text.capacity, 2U);
+    // What is read next is joined to it.
+    ASSERT_EQ(qvs::content(decoder, &text), QVS_OK);
+    EXPECT_STREQ(text.data, "\xFEx");
 }
 
 TEST_F(Content, SkipsFromAnUnknownLowToken)

@@ -620,7 +620,6 @@ TEST_F(CommaAdd, GoesOnWithALengthItAlreadyKnows)
     decoder->ptJoined = nullptr;
 }
 
-// A table of one megabyte, and references to it until the texts pass their limit.
 // Three strings of one letter: the block of the first is doubled once, and then just long enough.
 TEST_F(ParamString, MovesATextOnlyWhereItsBlockIsTooShort)
 {
@@ -638,6 +637,7 @@ TEST_F(ParamString, MovesATextOnlyWhereItsBlockIsTooShort)
               "3 for abcd");
 }
 
+// A table of one megabyte, and references to it until the texts pass their limit.
 TEST_F(TextLimit, EndsTheDecodeWith4111BeyondBothItsBounds)
 {
     constexpr uint32_t kEntry = 1024 * 1024;
