@@ -23,7 +23,6 @@ namespace {
         result = QVS_OK;
         switch (next) {
         case wbxml::kEnd:
-            text->before = nullptr;
             trace("DecoderParam : Value is NULL\n");
             break;
         case wbxml::kSwitchPage:
