@@ -463,6 +463,7 @@ TEST_F(SkipElement, PassesOverStringsOpaqueDataAndPageSwitches)
     EXPECT_EQ(skip({0x07, 0x83, 0x00, 0x01}), (Outcome{0, "", 3}));
     EXPECT_EQ(skip({0x07, 0xC3, 0x02, 0x01, 0x01, 0x01}), (Outcome{0, "", 5}));
     EXPECT_EQ(skip({0x07, 0x00, 0x01, 0x01}), (Outcome{0, "", 3})) << "0x01 is a page";
+    EXPECT_EQ(skip({0x07, 0x00, 0x00, 0x01}), (Outcome{0, "", 3})) << "neither byte is a level";
 }
 
 TEST_F(SkipElement, WithoutItsEndIs4103AndTraced)

@@ -218,6 +218,9 @@ TEST_F(DecoderMain, AnswersNullWithItsStepTraced)
         EXPECT_TRUE(traces.has(
             "ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlDecoder[0x1005]\n\n"))
             << "a parm outside a characteristic";
+        EXPECT_FALSE(traces.has(
+            "ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvCtxMakeContext[0x0]\n\n"))
+            << "of what was not decoded no context is tried";
     }
     {
         // A document without a list of characteristics makes no context.
