@@ -231,6 +231,7 @@ struct Open {
     uint8_t attrId;
     qvsJoinedText joined;
 };
+static_assert(sizeof(Open) <= kLargestPiece);
 
 // Reads the start of a characteristic. One with content becomes the innermost open one.
 qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)

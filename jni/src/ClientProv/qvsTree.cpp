@@ -14,6 +14,7 @@ constexpr char kModule[] = "jni/src/ClientProv/qvsTree";
 
 // From 1 KB on the C library joins its free small blocks for each that it is asked for.
 constexpr uint32_t kBlockSize = 960;
+static_assert(kBlockSize >= sizeof(void *) + kLargestPiece);
 
 // Makes room in a new block. False without memory.
 bool addBlock(qvsArena *arena)

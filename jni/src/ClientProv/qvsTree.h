@@ -19,8 +19,11 @@ struct qvsArena {
 
 namespace [[gnu::visibility("hidden")]] qvs {
 
-// A cleared piece of `size` bytes: a multiple of the size of a pointer, and a few hundred at most.
-// One that is a block of its own is tracked under the module and the line that asked for it. Null
+// The largest piece that an arena gives, in bytes.
+constexpr uint32_t kLargestPiece = 512;
+
+// A cleared piece of `size` bytes: a multiple of the size of a pointer, kLargestPiece at most. One
+// that is a block of its own is tracked under the module and the line that asked for it. Null
 // without memory.
 void *newPiece(qvsArena *arena, uint32_t size, const char *module, int line = __builtin_LINE());
 
