@@ -2,44 +2,76 @@
 // hold what they answer, so that nothing is looked up.
 #include <jni.h>
 
-#include <stdlib.h>
-#include <string.h>
+#include <memory>
+#include <string>
+#include <vector>
 
 namespace {
 
-constexpr jsize kMost = 32;
+// The elements of a String[], the text of a String or the bytes of a byte[]. A null text is a null
+// pointer.
+struct Answer {
+    std::vector<std::unique_ptr<std::string>> texts;
+    std::vector<jbyte> bytes;
+};
 
 jint heldNumber;
-char *heldText;
-char *heldArray[kMost];
-jsize heldLength;
+std::vector<Answer> held;
 
-char *copied(JNIEnv *env, jstring text)
+std::unique_ptr<std::string> copied(JNIEnv *env, jstring text)
 {
     if (!text) {
         return nullptr;
     }
     const char *bytes = env->GetStringUTFChars(text, nullptr);
-    char *copy = strdup(bytes);
+    auto copy = std::make_unique<std::string>(bytes);
     env->ReleaseStringUTFChars(text, bytes);
     return copy;
+}
+
+bool isA(JNIEnv *env, jobject object, const char *type)
+{
+    jclass found = env->FindClass(type);
+    const bool is = env->IsInstanceOf(object, found);
+    env->DeleteLocalRef(found);
+    return is;
+}
+
+Answer answerOf(JNIEnv *env, jobject object)
+{
+    Answer answer;
+    if (!object) {
+        return answer;
+    }
+    if (isA(env, object, "[B")) {
+        auto array = static_cast<jbyteArray>(object);
+        answer.bytes.resize(static_cast<size_t>(env->GetArrayLength(array)));
+        env->GetByteArrayRegion(array, 0, env->GetArrayLength(array), answer.bytes.data());
+    } else if (isA(env, object, "java/lang/String")) {
+        answer.texts.push_back(copied(env, static_cast<jstring>(object)));
+    } else {
+        auto array = static_cast<jobjectArray>(object);
+        for (jsize i = 0; i < env->GetArrayLength(array); ++i) {
+            jobject element = env->GetObjectArrayElement(array, i);
+            answer.texts.push_back(copied(env, static_cast<jstring>(element)));
+            env->DeleteLocalRef(element);
+        }
+    }
+    return answer;
 }
 
 } // namespace
 
 extern "C" {
 
-JNIEXPORT void JNICALL Java_Bare_keep(JNIEnv *env, jobject, jint number, jstring text,
-                                      jobjectArray array)
+JNIEXPORT void JNICALL Java_Bare_hold(JNIEnv *env, jobject, jint number, jobjectArray answers)
 {
     heldNumber = number;
-    heldText = copied(env, text);
-    heldLength = env->GetArrayLength(array);
-    if (heldLength > kMost) {
-        abort();
-    }
-    for (jsize i = 0; i < heldLength; ++i) {
-        heldArray[i] = copied(env, static_cast<jstring>(env->GetObjectArrayElement(array, i)));
+    held.clear();
+    for (jsize i = 0; i < env->GetArrayLength(answers); ++i) {
+        jobject answer = env->GetObjectArrayElement(answers, i);
+        held.push_back(answerOf(env, answer));
+        env->DeleteLocalRef(answer);
     }
 }
 
@@ -48,26 +80,42 @@ JNIEXPORT jint JNICALL Java_Bare_number(JNIEnv *, jobject)
     return heldNumber;
 }
 
-JNIEXPORT jstring JNICALL Java_Bare_text(JNIEnv *env, jobject, jint)
+JNIEXPORT jobject JNICALL Java_Bare_nothing(JNIEnv *, jobject)
 {
-    return env->NewStringUTF(heldText);
+    return nullptr;
 }
 
-JNIEXPORT jobjectArray JNICALL Java_Bare_array(JNIEnv *env, jobject, jint)
+JNIEXPORT jstring JNICALL Java_Bare_text(JNIEnv *env, jobject, jint i)
 {
+    return env->NewStringUTF(held[static_cast<size_t>(i)].texts[0]->c_str());
+}
+
+JNIEXPORT jbyteArray JNICALL Java_Bare_bytes(JNIEnv *env, jobject, jint i)
+{
+    const std::vector<jbyte> &bytes = held[static_cast<size_t>(i)].bytes;
+    const auto length = static_cast<jsize>(bytes.size());
+    jbyteArray array = env->NewByteArray(length);
+    env->SetByteArrayRegion(array, 0, length, bytes.data());
+    return array;
+}
+
+JNIEXPORT jobjectArray JNICALL Java_Bare_array(JNIEnv *env, jobject, jint i)
+{
+    const Answer &answer = held[static_cast<size_t>(i)];
     jclass type = env->FindClass("java/lang/String");
     jstring empty = env->NewStringUTF("");
-    jobjectArray array = env->NewObjectArray(heldLength, type, empty);
+    jobjectArray array = env->NewObjectArray(static_cast<jsize>(answer.texts.size()), type, empty);
     env->DeleteLocalRef(empty);
     env->DeleteLocalRef(type);
-    for (jsize i = 0; i < heldLength; ++i) {
-        jstring text = heldArray[i] ? env->NewStringUTF(heldArray[i]) : nullptr;
-        env->SetObjectArrayElement(array, i, text);
+    jsize index = 0;
+    for (const auto &text : answer.texts) {
+        jstring element = text ? env->NewStringUTF(text->c_str()) : nullptr;
+        env->SetObjectArrayElement(array, index++, element);
         if (env->ExceptionCheck()) {
             return nullptr;
         }
-        if (text) {
-            env->DeleteLocalRef(text);
+        if (element) {
+            env->DeleteLocalRef(element);
         }
     }
     return array;
