@@ -213,6 +213,9 @@ void addParms(std::vector<Family> *all)
                     .open = kLogical + Bytes{message::kParm},
                     .unit = pair(message::kDomain, kByteToken),
                     .close = kElementEnd + kElementEnd});
+    all->push_back(list("lists-by-turns", start(message::kAccess),
+                        parm(message::kRule, kByteToken) + parm(message::kToNapId, kByteToken) +
+                            parm(message::kToProxy, kByteToken)));
     all->push_back(list("lists-services", kLogical + start(message::kPort),
                         parm(message::kService, kByteToken)));
     all->back().close = kElementEnd + kElementEnd;

@@ -94,11 +94,21 @@ inline void add(qvsList **list, void *item)
     EXPECT_EQ(qvsListAddNodeLast(*list, item), QVS_OK);
 }
 
+// For long lists: to add at the end is a walk each time.
+inline void addFirst(qvsList **list, void *item)
+{
+    if (!*list) {
+        *list = emptyList();
+    }
+    EXPECT_EQ(qvsListAddNodeFirst(*list, item), QVS_OK);
+}
+
+// The texts in their order.
 inline qvsList *list(const Strings &texts)
 {
     qvsList *made = emptyList();
-    for (const std::string &value : texts) {
-        add(&made, text(value));
+    for (auto value = texts.rbegin(); value != texts.rend(); ++value) {
+        addFirst(&made, text(*value));
     }
     return made;
 }

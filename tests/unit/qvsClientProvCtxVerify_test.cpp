@@ -546,12 +546,12 @@ TEST(LongChains, AreBuiltAndReleased)
     auto document = blank<qvsWapDoc>();
     auto logical = blank<qvsWapPxLogical>();
     for (size_t i = 0; i < kMany; ++i) {
-        add(&document->ptCharacterList, node(18, blank<qvsWapVoWifi>()));
+        addFirst(&document->ptCharacterList, node(18, blank<qvsWapVoWifi>()));
         if (i % 4 == 0) {
-            add(&logical->ptCharacterList, node(2, blank<qvsWapPxAuthInfo>()));
+            addFirst(&logical->ptCharacterList, node(2, blank<qvsWapPxAuthInfo>()));
         }
     }
-    add(&document->ptCharacterList, node(1, logical));
+    addFirst(&document->ptCharacterList, node(1, logical));
     onSmallStack([&] {
         qvsClientProvCtx *root = qvsClientProvCtxMakeContext(document);
         EXPECT_EQ(qvsClientProvWbxmlDeleteWapDoc(document), 1u);

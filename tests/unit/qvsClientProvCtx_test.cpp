@@ -186,6 +186,26 @@ TEST_P(ContextRelease, FollowsItsTable)
     release(left);
 }
 
+TEST_P(ContextRelease, ClearsTheTextsThatItReleases)
+{
+    blocks::BlockCheck check;
+    void *record = blank(kind.fields);
+    for (size_t field : kind.texts) {
+        set(record, field, text("value"));
+    }
+    size_t cleared = 0;
+    blocks::onRelease = [&](const void *block) {
+        if (block == record) {
+            for (size_t field : kind.texts) {
+                cleared += get(record, field) == nullptr;
+            }
+        }
+    };
+    kind.release(record);
+    blocks::onRelease = nullptr;
+    EXPECT_EQ(cleared, kind.texts.size());
+}
+
 TEST_P(ContextRelease, TakesPartlyFilledRecords)
 {
     blocks::BlockCheck check;

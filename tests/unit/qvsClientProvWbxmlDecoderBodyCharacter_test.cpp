@@ -1,4 +1,6 @@
 // Characteristics: types, their slots and parameters, attributes, and what stands between elements.
+#include "qvsDecoding.h"
+
 #include "kinds.h"
 
 using namespace parms;
@@ -344,7 +346,7 @@ TEST_F(Characteristic, FailsWithoutMemoryForItsNodeOrItsRecord)
 TEST_F(Characteristic, EndsAtAStringThatPassesTheLimitOfAllTexts)
 {
     decoding::Decoder decoder(characteristic({0x53}, {0x03, 'x', 0x00}));
-    decoder->nTextRead = 8 * 1024 * 1024;
+    qvs::stateOf(decoder)->textRead = 8 * 1024 * 1024;
     qvsWapCharacter *node = nullptr;
     EXPECT_EQ(qvsClientProvWbxmlDecoderCharacter(decoder, &node), 4111U);
     EXPECT_EQ(node, nullptr);
@@ -365,7 +367,7 @@ TEST_F(Characteristic, JoinsALongValueOfManyPieces)
     EXPECT_EQ(read.result, 0U);
     ASSERT_TRUE(read.node);
     EXPECT_EQ(read.node->ptAppAuth->pszAAuthType, expected + ",x,DIGEST");
-    EXPECT_EQ(read.decoder->ptJoined, nullptr) << "of no characteristic any more";
+    EXPECT_EQ(qvs::stateOf(read.decoder)->joined, nullptr) << "of no characteristic any more";
     // The text is not copied anew for each piece.
     EXPECT_LT(blocks::allocated(), 8 * expected.size());
 }

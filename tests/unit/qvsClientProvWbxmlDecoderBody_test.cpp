@@ -1,4 +1,6 @@
 // The document element, and what a body may be instead.
+#include "qvsDecoding.h"
+
 #include "kinds.h"
 
 using namespace parms;
@@ -133,7 +135,7 @@ TEST_F(DocumentElement, EndsAtAStringThatPassesTheLimitOfAllTexts)
     for (const Bytes &bytes :
          {Bytes{0x45, 0x03, 'x', 0x00, 0x01}, join({{0x45}, kLogical, {0x03, 'x', 0x00, 0x01}})}) {
         decoding::Decoder decoder(bytes);
-        decoder->nTextRead = 8 * 1024 * 1024;
+        qvs::stateOf(decoder)->textRead = 8 * 1024 * 1024;
         qvsWapDoc *document = nullptr;
         EXPECT_EQ(qvsClientProvWbxmlDecoderWbxmlBody(decoder, &document), 4111U);
         EXPECT_EQ(document, nullptr);

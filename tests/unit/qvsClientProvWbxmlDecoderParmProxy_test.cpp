@@ -1,4 +1,6 @@
 // The parameters of proxies: PXLOGICAL, PXAUTHINFO, PORT, PXPHYSICAL.
+#include "qvsDecoding.h"
+
 #include "parm_suite.h"
 
 #include <algorithm>
@@ -249,7 +251,7 @@ TEST_F(PxPhysicalParm, TakesADomainThatFoundNoMemoryForOneThatCannotBeRead)
 TEST_F(PxPhysicalParm, EndsAtADomainThatPassesTheLimitOfAllTexts)
 {
     Reading<PxPhysical> run(parm(0x17, "one more"));
-    run.decoder->nTextRead = 8 * 1024 * 1024;
+    qvs::stateOf(run.decoder)->textRead = 8 * 1024 * 1024;
     Traces traces;
     EXPECT_EQ(run.read(), 4111U);
     EXPECT_EQ(run.record->ptDomainList, nullptr);
@@ -268,9 +270,9 @@ TEST_F(PxPhysicalParm, EndsAtATextOrAValueTokenThatPassesTheLimitOfAllTexts)
             const uint64_t limit = std::max(kLimit, uint64_t{100} * size);
             for (const uint64_t before : {limit - 5, limit - 4, limit - 3}) {
                 Reading<PxPhysical> run(bytes);
-                run.decoder->nTextRead = before;
+                qvs::stateOf(run.decoder)->textRead = before;
                 EXPECT_EQ(run.read(), before <= limit - 4 ? 0U : 4111U);
-                EXPECT_EQ(run.decoder->nTextRead, before + 4);
+                EXPECT_EQ(qvs::stateOf(run.decoder)->textRead, before + 4);
             }
         }
     }

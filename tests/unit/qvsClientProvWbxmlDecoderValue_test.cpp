@@ -1,4 +1,6 @@
 // The value tokens and their joins, single values, lists of values, and the comma join.
+#include "qvsDecoding.h"
+
 #include "blocks.h"
 #include "decoding.h"
 #include "traces.h"
@@ -248,11 +250,11 @@ TEST_F(ParamString, IsReadStepByStepAtTheLimitOfText)
         const uint64_t length = bytes[2] == 0x03 ? 2 : 4;
         for (const uint64_t beyond : {0, 1}) {
             Decoder decoder(bytes);
-            decoder->nTextRead = kLimit - length + beyond;
+            qvs::stateOf(decoder)->textRead = kLimit - length + beyond;
             OwnText text;
             EXPECT_EQ(qvsClientProvWbxmlDecoderParamString(decoder, &text, 0x15),
                       beyond ? QVS_ERROR_NO_MEMORY : QVS_OK);
-            EXPECT_EQ(decoder->bTextLimit, beyond);
+            EXPECT_EQ(qvs::stateOf(decoder)->textLimit, beyond);
         }
     }
 }
@@ -607,17 +609,17 @@ TEST_F(CommaAdd, WithoutMemoryIs4111AndKeepsTheText)
 
 TEST_F(CommaAdd, GoesOnWithALengthItAlreadyKnows)
 {
-    qvsJoinedText known = {};
+    qvs::JoinedText known = {};
     Decoder decoder({0x90, 0x92, 0x90, 0x03, 'x', 0, 0x06});
-    decoder->ptJoined = &known;
+    qvs::stateOf(decoder)->joined = &known;
     OwnText text("HTTP");
     EXPECT_EQ(qvsCommaAdd(decoder, &text), QVS_OK);
-    EXPECT_EQ(known.pszText, text.text);
-    EXPECT_EQ(known.nLength, 10U);
+    EXPECT_EQ(known.text, text.text);
+    EXPECT_EQ(known.length, 10U);
     EXPECT_EQ(qvsCommaAdd(decoder, &text), QVS_OK);
     EXPECT_EQ(text.str(), "HTTP,BASIC,x");
-    EXPECT_EQ(known.nLength, 12U);
-    decoder->ptJoined = nullptr;
+    EXPECT_EQ(known.length, 12U);
+    qvs::stateOf(decoder)->joined = nullptr;
 }
 
 // Three strings of one letter: the block of the first is doubled once, and then just long enough.

@@ -268,7 +268,7 @@ TEST_F(DecoderMain, AsksForItsBlocksUnderTheSourceOfEach)
     qvsMemEndMemCheck();
     const std::string report = testing::internal::GetCapturedStdout();
     qvsClientProvCtxDelectContext(context);
-    // The context and its NAPDEF, and the text that the decoder read.
+    // The context, its NAPDEF and the copy of a text.
     const auto blocksOf = [&](const std::string &module) {
         const std::string line = "Filename:jni/src/ClientProv/" + module + " ";
         size_t count = 0;
@@ -278,8 +278,10 @@ TEST_F(DecoderMain, AsksForItsBlocksUnderTheSourceOfEach)
         }
         return count;
     };
-    EXPECT_EQ(blocksOf("qvsClientProvCtx"), 2U) << report;
-    EXPECT_EQ(blocksOf("qvsClientProvWbxmlDecoder"), 1U) << report;
+    EXPECT_EQ(blocksOf("qvsClientProvCtx"), 3U) << report;
+    EXPECT_NE(report.find(" Size:2 "), std::string::npos) << report;
+    EXPECT_EQ(blocksOf("qvsClientProvWbxmlDecoder"), 0U) << report;
+    EXPECT_EQ(blocksOf("qvslist"), 0U) << report;
     EXPECT_EQ(report.find("Not Found"), std::string::npos) << report;
 }
 

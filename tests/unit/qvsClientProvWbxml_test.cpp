@@ -322,7 +322,6 @@ TEST(TreeReleases, PassOverMissingItems)
     add(&document->ptCharacterList, node(18, blank<qvsWapVoWifi>()));
     qvsMemFree_debug(document->ptCharacterList->ptFirst->pItem);
     document->ptCharacterList->ptFirst->pItem = nullptr;
-    document->ptCharacterList->ptTail = nullptr;
     EXPECT_EQ(qvsClientProvWbxmlDeleteWapDoc(document), 1u);
 }
 
@@ -475,7 +474,7 @@ TEST(TreeReleases, TakeAnyWidth)
     blocks::BlockCheck check;
     auto document = blank<qvsWapDoc>();
     for (unsigned i = 0; i < kMany; ++i) {
-        add(&document->ptCharacterList, node(3, blank<qvsWapPort>()));
+        addFirst(&document->ptCharacterList, node(3, blank<qvsWapPort>()));
     }
     auto port = static_cast<qvsWapPort *>(get(document->ptCharacterList->ptFirst->pItem, 3));
     port->ptServiceList = list(Strings(kMany, "wsp"));

@@ -125,9 +125,10 @@ TEST_F(Arena, IsEmptyWhenItIsReleasedAgain)
 TEST_F(Arena, HoldsListsWhoseItemsAreBlocks)
 {
     qvsList *list = nullptr;
+    qvsListNode *last = nullptr;
     for (const char *text : {"a", "b", "c"}) {
         char *copy = qvsStrdup_debug(text, kModule, 1);
-        ASSERT_EQ(qvs::addItem(&arena, &list, copy), QVS_OK);
+        ASSERT_EQ(qvs::addItem(&arena, &list, copy, &last), QVS_OK);
     }
     ASSERT_NE(list, nullptr);
     EXPECT_EQ(list->nCount, 3U);
@@ -135,12 +136,46 @@ TEST_F(Arena, HoldsListsWhoseItemsAreBlocks)
     qvs::releaseTexts(&arena, list);
 }
 
+TEST_F(Arena, AppendsBehindTheNodeThatIsRememberedOrBehindTheLastOne)
+{
+    char items[] = "abcd";
+    qvsList *list = nullptr;
+    qvsListNode *last = nullptr;
+    const auto add = [&](size_t i) {
+        ASSERT_EQ(qvs::addItem(&arena, &list, items + i, &last), QVS_OK);
+        EXPECT_EQ(last->pItem, items + i);
+        EXPECT_EQ(last->ptNext, nullptr);
+    };
+    add(0);
+    add(1);
+    last = nullptr; // a list that somebody else has begun
+    add(2);
+    EXPECT_EQ(list->ptFirst->ptNext->ptNext, last);
+    // Without a walk: what is remembered is not looked for.
+    qvsListNode *const first = list->ptFirst;
+    list->ptFirst = nullptr;
+    add(3);
+    EXPECT_EQ(first->ptNext->ptNext->ptNext, last);
+}
+
+TEST_F(Arena, ForgetsTheLastNodeOfAListThatIsGone)
+{
+    char item = 0;
+    qvsListNode stale = {};
+    qvsList *list = nullptr;
+    qvsListNode *last = &stale;
+    ASSERT_EQ(qvs::addItem(&arena, &list, &item, &last), QVS_OK);
+    EXPECT_EQ(list->ptFirst, last);
+    EXPECT_EQ(stale.ptNext, nullptr);
+}
+
 TEST_F(Arena, MakesAnEmptyListOfNoItemAndAddsNoneToIt)
 {
     qvsList *list = nullptr;
-    ASSERT_EQ(qvs::addItem(&arena, &list, nullptr), QVS_OK);
+    qvsListNode *last = nullptr;
+    ASSERT_EQ(qvs::addItem(&arena, &list, nullptr, &last), QVS_OK);
     ASSERT_NE(list, nullptr);
-    EXPECT_EQ(qvs::addItem(&arena, &list, nullptr), QVS_OK);
+    EXPECT_EQ(qvs::addItem(&arena, &list, nullptr, &last), QVS_OK);
     EXPECT_EQ(list->ptFirst, nullptr);
 }
 
@@ -148,18 +183,19 @@ TEST_F(Arena, LeavesAListAsItWasWithoutMemory)
 {
     char item = 0;
     qvsList *list = nullptr;
+    qvsListNode *last = nullptr;
     piece();
     piece();
     blocks::failAt = 0;
-    EXPECT_EQ(qvs::addItem(&arena, &list, &item), QVS_ERROR_LIST_NO_MEMORY);
+    EXPECT_EQ(qvs::addItem(&arena, &list, &item, &last), QVS_ERROR_LIST_NO_MEMORY);
     EXPECT_EQ(list, nullptr);
 
-    ASSERT_EQ(qvs::addItem(&arena, &list, &item), QVS_OK);
+    ASSERT_EQ(qvs::addItem(&arena, &list, &item, &last), QVS_OK);
     while (arena.next + sizeof(qvsListNode) <= arena.end) {
         piece(sizeof(qvsListNode));
     }
     blocks::failAt = 0;
-    EXPECT_EQ(qvs::addItem(&arena, &list, &item), QVS_ERROR_LIST_NO_MEMORY);
+    EXPECT_EQ(qvs::addItem(&arena, &list, &item, &last), QVS_ERROR_LIST_NO_MEMORY);
     ASSERT_NE(list, nullptr);
     EXPECT_EQ(list->nCount, 1U);
     EXPECT_EQ(list->ptFirst->ptNext, nullptr);
@@ -169,9 +205,10 @@ TEST_F(Arena, MakesNoListWithoutMemoryForItsFirstNode)
 {
     char item = 0;
     qvsList *list = nullptr;
+    qvsListNode *last = nullptr;
     arena.end = room + sizeof(qvsList);
     blocks::failAt = 0;
-    EXPECT_EQ(qvs::addItem(&arena, &list, &item), QVS_ERROR_LIST_NO_MEMORY);
+    EXPECT_EQ(qvs::addItem(&arena, &list, &item, &last), QVS_ERROR_LIST_NO_MEMORY);
     EXPECT_EQ(list, nullptr);
 }
 

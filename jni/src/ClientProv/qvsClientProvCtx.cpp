@@ -332,6 +332,7 @@ void releaseRows(void *record, const ReleaseKind &kind)
         }
         if (row.owns == kText) {
             freeBlock(owned);
+            setPointer(record, row.field, nullptr);
         } else {
             releaseChain(owned, row.owns);
         }

@@ -1,6 +1,7 @@
 // Creation of the decoder, and the releases of the document tree: one table per kind of record, and
 // one loop for all that is nested in a record.
 #include "qvsClientProvWbxml.h"
+#include "qvsDecoding.h"
 #include "qvsFields.h"
 #include "qvsTree.h"
 #include "qvslist.h"
@@ -356,7 +357,7 @@ qvsList *releaseSlots(qvsArena *arena, qvsWapCharacter *node)
 qvsListNode *takeNodes(qvsList *list, qvsListNode *chain)
 {
     qvsListNode *first = list->ptFirst;
-    qvsListNode *last = list->ptTail ? list->ptTail : first;
+    qvsListNode *last = first;
     while (last->ptNext) {
         last = last->ptNext;
     }
@@ -452,16 +453,16 @@ qvsResult qvsClientProvWbxmlInitDecoder(qvsWbxmlDecoder **decoder, const uint8_t
     if (!data) {
         return QVS_ERROR_BAD_ARGUMENT;
     }
-    qvsWbxmlDecoder *made = static_cast<qvsWbxmlDecoder *>(
-        qvsMemAllocSetZero_debug(sizeof(qvsWbxmlDecoder), kModule, __LINE__));
+    auto *made = newRecord<Decoding>(kModule);
     if (!made) {
         trace("[Error] [qvsClientProvWbxmlInitDecoder] ptTmp NULL");
         return QVS_ERROR_BAD_ARGUMENT;
     }
     // kept[decoder-buffer-unchecked]: a decoder without a buffer, or with an empty one, is handed
     // out as a good one.
-    (void)makeBuffer(&made->ptBuffer, data, length);
-    *decoder = made;
+    (void)makeBuffer(&made->decoder.ptBuffer, data, length);
+    made->decoder.nMark = markOf(&made->decoder);
+    *decoder = &made->decoder;
     return QVS_OK;
 }
 
@@ -470,6 +471,7 @@ qvsResult qvsClientProvWbxmlDeleteDecoder(qvsWbxmlDecoder *decoder)
     if (!decoder) {
         return QVS_ERROR_BAD_ARGUMENT;
     }
+    unmark(decoder);
     freeBlock(decoder->pStringTable);
     (void)smlBufferDelete(decoder->ptBuffer); // refuses only a buffer that is not there
     freeBlock(decoder);

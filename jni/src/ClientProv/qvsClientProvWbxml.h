@@ -12,28 +12,15 @@
 
 QVS_BEGIN_DECLS
 
-// A text that grows by joins, with what a join would otherwise have to find out again.
-typedef struct qvsJoinedText {
-    const char *pszText; // the field's text while length and capacity are true of it
-    uint32_t nLength;    // bytes before the terminator
-    uint32_t nCapacity;  // bytes of the block
-} qvsJoinedText;
-
 // The state of one decode. Owns its copy of the body and of the string table.
 typedef struct qvsWbxmlDecoder {
     uint32_t nHasContent; // 1 when the last element token read had bit 0x40
     uint32_t nHasAttr;    // 1 when it had bit 0x80
     uint32_t nStrSize;    // bytes of the string table; 0xFFFFFFFF when it could not be read
     uint8_t nCodePage;    // 0 or 1
+    uint16_t nMark;       // private: not 0 when the library made the decoder
     char *pStringTable;   // private copy, NUL-terminated behind its last byte
     smlBuffer *ptBuffer;  // head is the read position, storage the start, size the data length
-
-    // Private to the decoder.
-    uint32_t nTableBlock;     // bytes of the block at pStringTable that were read for it
-    uint32_t bTextLimit;      // 1 when the texts of the message passed their limit
-    uint64_t nTextRead;       // bytes of all texts read or appended so far
-    qvsJoinedText *ptJoined;  // of the APPAUTH being read by the body; null outside it
-    struct qvsArena *ptArena; // of nodes and lists; null: each is a block of its own
 } qvsWbxmlDecoder;
 
 // All fields of the tree are pointers, null when absent. A record owns its texts and lists; the

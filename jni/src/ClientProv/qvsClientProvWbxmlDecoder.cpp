@@ -1,6 +1,7 @@
 // The decoder's entry: the WBXML header, the document type, and the way from bytes to a context.
 #include "qvsClientProvWbxmlDecoder.h"
 #include "qvsCtxCopy.h"
+#include "qvsDecoding.h"
 #include "qvsTokens.h"
 #include "qvsTree.h"
 #include "qvsmemory.h"
@@ -64,14 +65,17 @@ qvsResult readDocument(const uint8_t *data, uint32_t length, qvsArena *arena, qv
         return QVS_ERROR_BAD_ARGUMENT;
     }
     smlBuffer buffer = bufferOver(data, length);
-    qvsWbxmlDecoder decoder = {};
+    Decoding decoding = {};
+    qvsWbxmlDecoder &decoder = decoding.decoder;
     decoder.ptBuffer = &buffer;
-    decoder.ptArena = arena;
+    decoder.nMark = markOf(&decoder);
+    decoding.state.arena = arena;
     const qvsResult result = qvsClientProvWbxmlDecoder(&decoder, document);
     if (result != QVS_OK) {
         trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlDecoder[0x%x]\n", result);
     }
     qvsMemFree_debug(decoder.pStringTable);
+    unmark(&decoder);
     return result;
 }
 
@@ -111,17 +115,19 @@ qvsClientProvCtx *qvsClinetProvWbxmlDecoderMain(const uint8_t *data, uint32_t le
     qvsWapDoc *document = nullptr;
     qvsClientProvCtx *context = nullptr;
     alignas(void *) char room[kTreeRoom];
-    qvsArena arena = {room, room + sizeof room};
-    if (readDocument(data, length, &arena, &document) == QVS_OK) {
-        context = takeContext(document);
+    qvsArena pieces = {room, room + sizeof room};
+    // While blocks are tracked each is one of its own, listed under the module that made it.
+    qvsArena *arena = tracking ? nullptr : &pieces;
+    if (readDocument(data, length, arena, &document) == QVS_OK) {
+        context = arena ? takeContext(document) : qvsClientProvCtxMakeContext(document);
         if (context) {
             trace("Success");
         } else {
             trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvCtxMakeContext[0x%x]\n", 0);
         }
     }
-    releaseDocument(&arena, document);
-    releaseArena(&arena);
+    releaseDocument(arena, document);
+    releaseArena(&pieces);
     if (!context) {
         qvsClientProvCtxDelectContext(nullptr);
     }

@@ -229,12 +229,16 @@ struct Open {
     Open *parent;
     const Kind *kind; // null: nothing but strings and page switches is accepted
     uint8_t attrId;
-    qvsJoinedText joined;
+    JoinedText joined;
+    qvsListNode *last[kMostLists]; // of the lists of its record, by their places
 };
 static_assert(sizeof(Open) <= kLargestPiece);
 
+// The place of the list of what nests in a record: ptCharacterList is the last field.
+constexpr uint8_t kChildPlace = 0;
+
 // Reads the start of a characteristic. One with content becomes the innermost open one.
-qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)
+qvsResult enter(qvsWbxmlDecoder *decoder, const DecodeState *state, Open **innermost)
 {
     if (qvsResult result = checkElement(decoder, tag::kCharacteristic)) {
         return result;
@@ -243,7 +247,7 @@ qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)
         return QVS_OK;
     }
     const bool hasAttributes = decoder->nHasAttr;
-    auto *open = static_cast<Open *>(newPiece(decoder->ptArena, sizeof(Open), kDecoderModule));
+    auto *open = static_cast<Open *>(newPiece(arenaOf(state), sizeof(Open), kDecoderModule));
     if (!open) {
         return QVS_ERROR_FAILED;
     }
@@ -251,7 +255,7 @@ qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)
         ScopedText name;
         if (qvsResult result = readAttributes(decoder, &open->node, &open->attrId, &name)) {
             // hardened: what a characteristic that fails has read is released with it.
-            releaseNode(decoder->ptArena, &open->node);
+            releaseNode(arenaOf(state), &open->node);
             return result;
         }
         open->kind = findKind(open->attrId, decoder->nCodePage, name.text);
@@ -261,7 +265,7 @@ qvsResult enter(qvsWbxmlDecoder *decoder, Open **innermost)
     return QVS_OK;
 }
 
-qvsResult readParmElement(qvsWbxmlDecoder *decoder, Open *open)
+qvsResult readParmElement(qvsWbxmlDecoder *decoder, DecodeState *state, Open *open)
 {
     if (open->attrId == attr::kType) {
         trace("................NEW.................");
@@ -272,10 +276,16 @@ qvsResult readParmElement(qvsWbxmlDecoder *decoder, Open *open)
         }
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
-    decoder->ptJoined = &open->joined;
+    if (state) {
+        state->joined = &open->joined;
+        state->last = open->last;
+    }
     const qvsResult result =
-        readParms(decoder, pointerAt(&open->node, open->kind->slot), *open->kind->parms);
-    decoder->ptJoined = nullptr;
+        readParms(decoder, state, pointerAt(&open->node, open->kind->slot), *open->kind->parms);
+    if (state) {
+        state->joined = nullptr;
+        state->last = nullptr;
+    }
     return result;
 }
 
@@ -291,17 +301,8 @@ qvsResult acceptChild(Open *open)
     return childrenOf(&open->node, *open->kind) ? QVS_OK : QVS_ERROR_BAD_ARGUMENT;
 }
 
-// A SWITCH_PAGE between elements.
-// kept[element-switch]: it is read without effect on the code page.
-void dropPageSwitch(qvsWbxmlDecoder *decoder)
-{
-    uint8_t byte = 0;
-    (void)takeByte(decoder, &byte);
-    (void)takeByte(decoder, &byte);
-}
-
 // Reads on in an open characteristic up to a child that it accepts, or past its END.
-qvsResult readContent(qvsWbxmlDecoder *decoder, Open *open, bool *child)
+qvsResult readContent(qvsWbxmlDecoder *decoder, DecodeState *state, Open *open, bool *child)
 {
     for (;;) {
         uint8_t tag = 0;
@@ -326,7 +327,7 @@ qvsResult readContent(qvsWbxmlDecoder *decoder, Open *open, bool *child)
             *child = true;
             return acceptChild(open);
         case tag::kParm:
-            result = readParmElement(decoder, open);
+            result = readParmElement(decoder, state, open);
             break;
         default:
             trace("Tag Code = QVS_ERROR_WBXML_UNKNOWN_ELEMENT");
@@ -342,16 +343,17 @@ qvsResult readContent(qvsWbxmlDecoder *decoder, Open *open, bool *child)
 // ---- Runs of siblings
 
 // Appends a node to a run, whose list is made when there is none. An element without content (a
-// null node) adds nothing to a list. The list takes the node over, also when it fails.
-qvsResult addSibling(qvsWbxmlDecoder *decoder, qvsList **list, Node *node)
+// null node) adds nothing to a list. The list takes the node over, also when it fails. `*last` is
+// the list's last node.
+qvsResult addSibling(qvsArena *arena, qvsList **list, Node *node, qvsListNode **last)
 {
-    if (addItem(decoder->ptArena, list, node) == QVS_OK) {
+    if (addItem(arena, list, node, last) == QVS_OK) {
         return QVS_OK;
     }
     if (!*list) {
         trace("[Error] [qvsClientProvWbxmlDecoderCharacterList] ptTmpList NULL");
     }
-    releaseNode(decoder->ptArena, node);
+    releaseNode(arena, node);
     return QVS_ERROR_FAILED;
 }
 
@@ -377,13 +379,14 @@ qvsResult hasNextSibling(qvsWbxmlDecoder *decoder, bool *next)
 // Reads the characteristic at the read position with all that is nested in it. Open elements are
 // linked to their parents, so that depth costs no stack; on failure `*innermost` still leads to
 // those that are open.
-qvsResult readSubtree(qvsWbxmlDecoder *decoder, Open **innermost, Node **root)
+[[gnu::noinline]] qvsResult readSubtree(qvsWbxmlDecoder *decoder, DecodeState *state,
+                                        Open **innermost, Node **root)
 {
     for (bool atStart = true;;) {
         Node *complete = nullptr;
         if (atStart) {
             Open *const outer = *innermost;
-            if (qvsResult result = enter(decoder, innermost)) {
+            if (qvsResult result = enter(decoder, state, innermost)) {
                 return result;
             }
             if (*innermost != outer) {
@@ -391,7 +394,7 @@ qvsResult readSubtree(qvsWbxmlDecoder *decoder, Open **innermost, Node **root)
                 continue;
             }
         } else {
-            if (qvsResult result = readContent(decoder, *innermost, &atStart)) {
+            if (qvsResult result = readContent(decoder, state, *innermost, &atStart)) {
                 return result;
             }
             if (atStart) {
@@ -404,8 +407,10 @@ qvsResult readSubtree(qvsWbxmlDecoder *decoder, Open **innermost, Node **root)
             *root = complete;
             return QVS_OK;
         }
-        qvsList **siblings = childrenOf(&(*innermost)->node, *(*innermost)->kind);
-        if (qvsResult result = addSibling(decoder, siblings, complete)) {
+        Open *const parent = *innermost;
+        qvsList **siblings = childrenOf(&parent->node, *parent->kind);
+        if (qvsResult result =
+                addSibling(arenaOf(state), siblings, complete, parent->last + kChildPlace)) {
             return result;
         }
         if (qvsResult result = hasNextSibling(decoder, &atStart)) {
@@ -414,119 +419,19 @@ qvsResult readSubtree(qvsWbxmlDecoder *decoder, Open **innermost, Node **root)
     }
 }
 
-// ---- The document
-
-qvsResult readDocument(qvsWbxmlDecoder *decoder, uint8_t tag, qvsWapDoc *document)
-{
-    switch (tag) {
-    case tag::kWapProvisioningDoc:
-        return qvsClientProvWbxmlDecoderWapDocVersion(decoder, document);
-    case tag::kCharacteristic:
-        return qvsClientProvWbxmlDecoderCharacterList(decoder, &document->ptCharacterList);
-    case wbxml::kSwitchPage:
-        // kept[body-switch]: the document ends here, empty.
-        dropPageSwitch(decoder);
-        return QVS_OK;
-    case tag::kParm:
-        return QVS_OK; // kept[body-parm]: the document is empty, and nothing is read.
-    default:
-        trace("Unknown Element[%x]", tag);
-        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
-    }
-}
-
 } // namespace
-
-qvsResult qvsClientProvWbxmlDecoderWbxmlBody(qvsWbxmlDecoder *decoder, qvsWapDoc **document)
-{
-    if (!decoder || !decoder->ptBuffer) {
-        return QVS_ERROR_WBXML_NO_BUFFER;
-    }
-    auto *built =
-        static_cast<qvsWapDoc *>(newPiece(decoder->ptArena, sizeof(qvsWapDoc), kDecoderModule));
-    if (!built) {
-        trace("[Error] [qvsClientProvWbxmlDecoderWbxmlBody] ptTmpWapDoc NULL");
-        return QVS_ERROR_FAILED;
-    }
-    uint8_t tag = 0;
-    const bool present = peekTag(decoder, &tag);
-    if (present && tag == wbxml::kEnd) {
-        // kept[body-end]: success without a document.
-        releaseDocument(decoder->ptArena, built);
-        (void)takeSeenTag(decoder);
-        return QVS_OK;
-    }
-    qvsResult result = QVS_ERROR_WBXML_NO_DATA;
-    if (present) {
-        result = readDocument(decoder, tag, built);
-        if (result != QVS_OK) {
-            trace("WBXML Decode Error[%x]", result);
-        }
-    }
-    if (result != QVS_OK) {
-        releaseDocument(decoder->ptArena, built);
-        return result;
-    }
-    *document = built;
-    return QVS_OK;
-}
-
-qvsResult qvsClientProvWbxmlDecoderWapDocVersion(qvsWbxmlDecoder *decoder, qvsWapDoc *document)
-{
-    if (qvsResult result =
-            qvsClientProvWbxmlDecoderCheckElement(decoder, tag::kWapProvisioningDoc)) {
-        return result;
-    }
-    if (!decoder->nHasContent) {
-        return QVS_OK;
-    }
-    if (!document) {
-        return QVS_ERROR_BAD_ARGUMENT;
-    }
-    if (decoder->nHasAttr) {
-        if (qvsResult result = qvsClientProvWbxmlDecoderAttributeWapDocVersion(decoder)) {
-            return result;
-        }
-    }
-    for (;;) {
-        uint8_t tag = 0;
-        if (!peekTag(decoder, &tag)) {
-            return QVS_ERROR_WBXML_NO_DATA;
-        }
-        qvsResult result = QVS_OK;
-        switch (tag) {
-        case wbxml::kEnd:
-            (void)takeSeenTag(decoder);
-            return QVS_OK;
-        case wbxml::kStrI:
-            result = dropInlineString(decoder);
-            break;
-        case wbxml::kSwitchPage:
-            dropPageSwitch(decoder);
-            break;
-        case tag::kCharacteristic:
-            result = qvsClientProvWbxmlDecoderCharacterList(decoder, &document->ptCharacterList);
-            break;
-        default:
-            // hardened: a parm outside a characteristic is refused too; nobody would read it.
-            trace("Tag Code [%d] = QVS_ERROR_WBXML_UNKNOWN_ELEMENT\n", tag);
-            return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
-        }
-        if (result != QVS_OK) {
-            return result;
-        }
-    }
-}
 
 qvsResult qvsClientProvWbxmlDecoderCharacterList(qvsWbxmlDecoder *decoder, qvsList **list)
 {
+    qvsArena *arena = arenaOf(stateOf(decoder));
     qvsList *run = *list;
+    qvsListNode *last = nullptr;
     qvsResult result = QVS_OK;
     for (bool next = true; next && result == QVS_OK;) {
         Node *node = nullptr;
         result = qvsClientProvWbxmlDecoderCharacter(decoder, &node);
         if (result == QVS_OK) {
-            result = addSibling(decoder, &run, node);
+            result = addSibling(arena, &run, node, &last);
         }
         if (result == QVS_OK) {
             result = hasNextSibling(decoder, &next);
@@ -535,18 +440,20 @@ qvsResult qvsClientProvWbxmlDecoderCharacterList(qvsWbxmlDecoder *decoder, qvsLi
     if (result == QVS_OK) {
         *list = run;
     } else if (!*list && run) {
-        releaseNodes(decoder->ptArena, run);
+        releaseNodes(arena, run);
     }
     return result;
 }
 
 qvsResult qvsClientProvWbxmlDecoderCharacter(qvsWbxmlDecoder *decoder, qvsWapCharacter **node)
 {
+    DecodeState *state = stateOf(decoder);
+    qvsArena *arena = arenaOf(state);
     Open *innermost = nullptr;
-    const qvsResult result = readSubtree(decoder, &innermost, node);
+    const qvsResult result = readSubtree(decoder, state, &innermost, node);
     while (innermost) {
         Open *parent = innermost->parent;
-        releaseNode(decoder->ptArena, &innermost->node);
+        releaseNode(arena, &innermost->node);
         innermost = parent;
     }
     return result;

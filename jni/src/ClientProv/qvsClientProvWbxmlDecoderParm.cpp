@@ -78,7 +78,7 @@ Plain findPlain(const qvsWbxmlDecoder *decoder, uint8_t token)
 
 // Reads the usual parameter into `*text`, which the caller owns.
 // kept[repeated-parm]: the text that was there stays allocated.
-qvsResult takePlain(qvsWbxmlDecoder *decoder, const Plain &plain, char **text)
+qvsResult takePlain(qvsWbxmlDecoder *decoder, DecodeState *state, const Plain &plain, char **text)
 {
     auto *block = static_cast<char *>(newBlock(plain.size + kSpareZeros, kDecoderModule));
     if (block) {
@@ -88,7 +88,7 @@ qvsResult takePlain(qvsWbxmlDecoder *decoder, const Plain &plain, char **text)
         return QVS_ERROR_WBXML_NO_DATA;
     }
     // kept[lookup-without-memory]: a value token counts as read also without memory for its text.
-    decoder->nTextRead += plain.size - 1;
+    state->textRead += plain.size - 1;
     decoder->ptBuffer->pHead += plain.read;
     *text = block;
     return QVS_OK;
@@ -107,19 +107,20 @@ qvsResult takePlain(qvsWbxmlDecoder *decoder, const Plain &plain, char **text)
 
 // Reads NAME and VALUE of one parameter into `*text`. The usual ones are read in one go, in half
 // the instructions. What comes near the limit of text is read step by step too.
-inline qvsResult readText(qvsWbxmlDecoder *decoder, char **text, uint8_t token)
+inline qvsResult readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token)
 {
     const Plain plain = findPlain(decoder, token);
-    if (!plain.text || decoder->nTextRead + plain.size > kTextAlways) {
+    if (!state || !plain.text || state->textRead + plain.size > kTextAlways) {
         return readAnyText(decoder, text, token);
     }
-    return takePlain(decoder, plain, text);
+    return takePlain(decoder, state, plain, text);
 }
 
-// Adds a text to a list of texts, which takes it over. A null text adds nothing.
-qvsResult addText(qvsWbxmlDecoder *decoder, qvsList **list, char *text)
+// Adds a text to a list of texts, which takes it over. A null text adds nothing. `*end` is the
+// list's last node.
+qvsResult addText(const DecodeState *state, qvsList **list, char *text, qvsListNode **end)
 {
-    if (addItem(decoder->ptArena, list, text) == QVS_OK) {
+    if (addItem(arenaOf(state), list, text, end) == QVS_OK) {
         return QVS_OK;
     }
     if (!*list) {
@@ -131,11 +132,12 @@ qvsResult addText(qvsWbxmlDecoder *decoder, qvsList **list, char *text)
 
 // Reads one pair onto the list. `*last` is the text of the pair before it in the same element,
 // which a later pair continues in an item of its own.
-qvsResult readItem(qvsWbxmlDecoder *decoder, qvsList **list, uint8_t token, const char **last)
+qvsResult readItem(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list, uint8_t token,
+                   const char **last, qvsListNode **end)
 {
     char *item = nullptr;
     if (!*last) {
-        if (qvsResult result = readText(decoder, &item, token)) {
+        if (qvsResult result = readText(decoder, state, &item, token)) {
             return result;
         }
         *last = item;
@@ -148,11 +150,11 @@ qvsResult readItem(qvsWbxmlDecoder *decoder, qvsList **list, uint8_t token, cons
         *last = text.data ? text.data : text.before;
         item = text.take();
     }
-    return addText(decoder, list, item);
+    return addText(state, list, item, end);
 }
 
 // Reads the pairs up to END into `*list`.
-qvsResult readItems(qvsWbxmlDecoder *decoder, qvsList **list)
+qvsResult readItems(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list, qvsListNode **end)
 {
     const char *last = nullptr;
     uint8_t token = 0;
@@ -160,11 +162,25 @@ qvsResult readItems(qvsWbxmlDecoder *decoder, qvsList **list)
         if (token == wbxml::kEnd) {
             return QVS_OK;
         }
-        if (qvsResult result = readItem(decoder, list, token, &last)) {
+        if (qvsResult result = readItem(decoder, state, list, token, &last, end)) {
             return result;
         }
     }
     return QVS_ERROR_WBXML_NO_DATA;
+}
+
+// Reads one parameter into `*list`, whose last node is `*end`; null when it is not known.
+qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list, qvsListNode **end)
+{
+    qvsList *built = *list;
+    const qvsResult result = readItems(decoder, state, &built, end);
+    if (result == QVS_OK) {
+        *list = built;
+    } else if (!*list && built) {
+        releaseTexts(arenaOf(state), built);
+        *end = nullptr;
+    }
+    return result;
 }
 
 // ---- The loop
@@ -220,8 +236,17 @@ const Parm *findParm(const ParmTable &table, uint8_t token)
     }
 }
 
+// The same onto a list of a record.
+qvsResult readListOf(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, ListField list)
+{
+    qvsListNode *unknown = nullptr;
+    qvsListNode **end = state && state->last ? state->last + list.place : &unknown;
+    return readList(decoder, state, listAt(record, list.number), end);
+}
+
 // Reads the parameter that `token` announces into its field.
-qvsResult readParm(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table, uint8_t token)
+qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                   const ParmTable &table, uint8_t token)
 {
     const Parm *parm = findParm(table, token);
     if (!parm) {
@@ -232,10 +257,9 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, void *record, const ParmTable &tabl
     }
     switch (parm->type) {
     case ParmType::kText:
-        return readText(decoder, textAt(record, parm->field), token);
+        return readText(decoder, state, textAt(record, parm->field), token);
     case ParmType::kList:
-        return qvsClientProvWbxmlDecoderParamListString(decoder, listAt(record, parm->field),
-                                                        token);
+        return readListOf(decoder, state, record, {parm->field, parm->place});
     default:
         return table.reader(decoder, record);
     }
@@ -245,23 +269,28 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, void *record, const ParmTable &tabl
 
 qvsResult qvsClientProvWbxmlDecoderParamString(qvsWbxmlDecoder *decoder, char **text, uint8_t token)
 {
-    return readText(decoder, text, token);
+    return readText(decoder, stateOf(decoder), text, token);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvsList **list,
                                                    uint8_t /*token*/)
 {
-    qvsList *built = *list;
-    const qvsResult result = readItems(decoder, &built);
-    if (result == QVS_OK) {
-        *list = built;
-    } else if (!*list && built) {
-        releaseTexts(decoder->ptArena, built);
-    }
-    return result;
+    qvsListNode *unknown = nullptr;
+    return readList(decoder, stateOf(decoder), list, &unknown);
+}
+
+qvsResult qvs::readList(qvsWbxmlDecoder *decoder, void *record, ListField list)
+{
+    return readListOf(decoder, stateOf(decoder), record, list);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
+{
+    return readParms(decoder, stateOf(decoder), record, table);
+}
+
+qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                         const ParmTable &table)
 {
     if (traceSink && table.entered) {
         trace("qvsClientProvWbxmlDecoderParam%s", table.entered);
@@ -282,7 +311,7 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable
         if (end) {
             (void)takeSeenTag(decoder);
         } else {
-            result = readParm(decoder, record, table, token);
+            result = readParm(decoder, state, record, table, token);
         }
         if (traceSink) {
             traceStep(table, token, end, result);

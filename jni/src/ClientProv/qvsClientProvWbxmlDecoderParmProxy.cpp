@@ -8,11 +8,10 @@ namespace {
 // kept[pxphysical-domain]: a DOMAIN that cannot be read is traced and the parm goes on.
 qvsResult readPhysicalDomain(qvsWbxmlDecoder *decoder, void *record)
 {
-    qvsList **domains = &static_cast<qvsWapPxPhysical *>(record)->ptDomainList;
-    if (qvsClientProvWbxmlDecoderParamListString(decoder, domains, page0::kDomain) != QVS_OK) {
+    if (readList(decoder, record, QVS_FIELD(qvsWapPxPhysical, ptDomainList)) != QVS_OK) {
         trace("[ERROR] qvsClientProvWbxmlDecoderParamListString Fail");
     }
-    return decoder->bTextLimit ? QVS_ERROR_NO_MEMORY : QVS_OK;
+    return textLimitPassed(decoder) ? QVS_ERROR_NO_MEMORY : QVS_OK;
 }
 
 namespace pxLogical {

@@ -18,15 +18,16 @@ constexpr uint32_t kMultiByteMax = 5; // bytes of an mb_u_int32
 // Counts text that is read or appended. False once there is too much of it.
 bool countText(qvsWbxmlDecoder *decoder, uint32_t count)
 {
-    if (!decoder) {
+    DecodeState *state = stateOf(decoder);
+    if (!state) {
         return true;
     }
-    decoder->nTextRead += count;
-    if (decoder->nTextRead > kTextAlways &&
-        decoder->nTextRead > kTextPerByte * smlBufferGetDataSize(decoder->ptBuffer)) {
-        decoder->bTextLimit = 1;
+    state->textRead += count;
+    if (state->textRead > kTextAlways &&
+        state->textRead > kTextPerByte * smlBufferGetDataSize(decoder->ptBuffer)) {
+        state->textLimit = true;
     }
-    return decoder->bTextLimit == 0;
+    return !state->textLimit;
 }
 
 // Moves the read position, at most to the end of the storage.
@@ -56,6 +57,7 @@ bool grow(Text *text, uint32_t start, uint64_t needed)
         (void)qvsMemCpy(block, text->data ? text->data : text->before, start);
     }
     block[start] = '\0';
+    (void)qvsMemSetZero(block + capacity, kSpareZeros); // opaque data ends in more than one
     qvsMemFree_debug(text->data);
     text->data = block;
     text->length = start;
@@ -75,7 +77,11 @@ bool isInTable(const qvsWbxmlDecoder *decoder, uint32_t index)
         // hardened: an index behind that block fails.
         return index < 2;
     }
-    return decoder->nStrSize != kUnreadTable || index < decoder->nTableBlock;
+    if (decoder->nStrSize != kUnreadTable) {
+        return true;
+    }
+    const DecodeState *state = stateOf(decoder);
+    return state && index < state->tableBlock;
 }
 
 } // namespace
@@ -168,7 +174,7 @@ qvsResult qvs::dropInlineString(qvsWbxmlDecoder *decoder)
     if (getStr(decoder, &dropped)) {
         return QVS_OK;
     }
-    return decoder->bTextLimit ? QVS_ERROR_NO_MEMORY : QVS_ERROR_WBXML_NO_DATA;
+    return textLimitPassed(decoder) ? QVS_ERROR_NO_MEMORY : QVS_ERROR_WBXML_NO_DATA;
 }
 
 uint32_t qvsClientProvWbxmlDecoderDecodingSize(const qvsWbxmlDecoder *decoder)
@@ -218,7 +224,9 @@ int32_t qvsClientProvWbxmlDecoderMakeStrTable(qvsWbxmlDecoder *decoder, char **t
     }
     (void)qvsMemCpy(block, decoder->ptBuffer->pHead, present);
     skip(decoder, present);
-    decoder->nTableBlock = present + 2;
+    if (DecodeState *state = stateOf(decoder)) {
+        state->tableBlock = present + 2;
+    }
     *table = block;
     return present == length ? static_cast<int32_t>(length) : -1;
 }

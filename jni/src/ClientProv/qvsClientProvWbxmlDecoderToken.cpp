@@ -66,7 +66,7 @@ qvsResult readValue(qvsWbxmlDecoder *decoder, Text *text)
 // The result of reading a value, traced.
 qvsResult endOfContent(const qvsWbxmlDecoder *decoder, qvsResult result)
 {
-    if (decoder && decoder->bTextLimit) {
+    if (textLimitPassed(decoder)) {
         result = QVS_ERROR_NO_MEMORY;
     }
     trace("qvsClientProvWbxmlDecoderContent Error:%d", static_cast<int>(result));

@@ -198,7 +198,9 @@ qvsResult qvsCommaAdd(qvsWbxmlDecoder *decoder, char **text)
             return QVS_ERROR_WBXML_NO_DATA;
         }
     }
-    Text joined(*text, decoder->ptJoined);
+    const DecodeState *state = stateOf(decoder);
+    JoinedText *known = state ? state->joined : nullptr;
+    Text joined(*text, known);
     qvsResult result = QVS_OK;
     if (!behindSwitch && wbxml::isString(token)) {
         if (append(decoder, &joined, ",", 1)) {
@@ -212,8 +214,8 @@ qvsResult qvsCommaAdd(qvsWbxmlDecoder *decoder, char **text)
         // kept[comma-drops-unknown]: a token that stands for no text is dropped.
         (void)getParamTokenVal(decoder, token, &joined);
         (void)takeByte(decoder, &token);
-        result = decoder->bTextLimit ? QVS_ERROR_NO_MEMORY : QVS_OK;
+        result = textLimitPassed(decoder) ? QVS_ERROR_NO_MEMORY : QVS_OK;
     }
-    *text = joined.takeKnown(decoder->ptJoined);
+    *text = joined.takeKnown(known);
     return result;
 }

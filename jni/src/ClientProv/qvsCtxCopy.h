@@ -59,7 +59,7 @@ struct CopyKind {
     uint8_t fields; // of the context record, each a pointer
     Rows<CopyRow> rows;
     Rows<ChildRow> children = {};
-    ListField childList = {kNoField};             // of the tree record
+    ListField childList = {kNoField, 0};          // of the tree record
     bool refusalTraced = false;                   // when a child is not accepted
     bool single = false;                          // one of it, not a chain
     void (*onCopied)(const void *copy) = nullptr; // behind the rows

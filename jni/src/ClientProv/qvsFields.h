@@ -18,12 +18,18 @@ struct TextField {
 };
 struct ListField {
     uint8_t number;
+    uint8_t place; // 0 for the last field of the record
 };
 struct RecordField {
     uint8_t number;
 };
 
 constexpr uint8_t kNoField = 0xFF;
+
+// The lists of a record are its last fields. Their places are counted from the end; a list further
+// from it does not compile.
+constexpr uint8_t kMostLists = 6;
+constexpr uint8_t kListPlaces[kMostLists] = {0, 1, 2, 3, 4, 5};
 
 template <class Record>
 constexpr uint8_t kFieldsOf = sizeof(Record) / sizeof(void *);
@@ -53,7 +59,8 @@ consteval TextField fieldAt(char *Record::*, size_t offset)
 template <class Record>
 consteval ListField fieldAt(qvsList *Record::*, size_t offset)
 {
-    return {static_cast<uint8_t>(offset / sizeof(void *))};
+    const auto number = static_cast<uint8_t>(offset / sizeof(void *));
+    return {number, kListPlaces[kFieldsOf<Record> - 1 - number]};
 }
 
 template <class Record, class Pointee>

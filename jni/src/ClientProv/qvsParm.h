@@ -22,12 +22,16 @@ constexpr OtherField kByReader;
 // One parameter of a characteristic: the NAME token that announces it and the field it fills.
 struct Parm {
     consteval Parm(uint8_t t, TextField f) : token(t), type(ParmType::kText), field(f.number) {}
-    consteval Parm(uint8_t t, ListField f) : token(t), type(ParmType::kList), field(f.number) {}
+    consteval Parm(uint8_t t, ListField f)
+        : token(t), type(ParmType::kList), field(f.number), place(f.place)
+    {
+    }
     consteval Parm(uint8_t t, OtherField) : token(t), type(ParmType::kOther), field(kNoField) {}
 
     uint8_t token;
     ParmType type;
     uint8_t field;
+    uint8_t place = 0; // of a list
 };
 
 // The parameters of one kind of characteristic. But for the rows, the reader and the way past a
@@ -64,8 +68,14 @@ extern const ParmTable kWifiParms;
 extern const ParmTable kVoWifiParms;
 
 // Reads one parm element into `record`. Stops at the END of its attributes, which it consumes,
-// or at the first token that is refused or cannot be read.
+// or at the first token that is refused or cannot be read. `state` is that of the decoder.
+qvsResult readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                    const ParmTable &table);
 qvsResult readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table);
+
+// Reads one parameter onto a list of `record`. On failure the list is as it was, but for the items
+// that it has got.
+qvsResult readList(qvsWbxmlDecoder *decoder, void *record, ListField list);
 
 // ---- Parameters whose name is given as text
 

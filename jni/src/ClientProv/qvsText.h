@@ -3,6 +3,7 @@
 #define QVSTEXT_H
 
 #include "qvsClientProvWbxml.h"
+#include "qvsDecoding.h"
 #include "qvsTokens.h"
 #include "qvsmemory.h"
 #include "qvsstring.h"
@@ -30,11 +31,11 @@ struct Text {
     Text() = default;
     // Goes on with a text that already is a block of its own. `known` may tell its length and
     // capacity, so that a text joined again and again is not measured again and again.
-    explicit Text(char *block, const qvsJoinedText *known = nullptr) : data(block)
+    explicit Text(char *block, const JoinedText *known = nullptr) : data(block)
     {
-        if (block && known && known->pszText == block) {
-            length = known->nLength;
-            capacity = known->nCapacity;
+        if (block && known && known->text == block) {
+            length = known->length;
+            capacity = known->capacity;
         } else if (block) {
             length = qvsStrlen(block);
             capacity = length + 1;
@@ -57,7 +58,7 @@ struct Text {
     }
 
     // take(), with what the constructor may be told of the text.
-    [[nodiscard]] char *takeKnown(qvsJoinedText *known)
+    [[nodiscard]] char *takeKnown(JoinedText *known)
     {
         if (known) {
             *known = {data, length, capacity};
@@ -177,6 +178,15 @@ inline qvsResult checkAttr(qvsWbxmlDecoder *decoder, uint8_t token)
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
     return QVS_OK;
+}
+
+// A SWITCH_PAGE between elements.
+// kept[element-switch]: it is read without effect on the code page.
+inline void dropPageSwitch(qvsWbxmlDecoder *decoder)
+{
+    uint8_t byte = 0;
+    (void)takeByte(decoder, &byte);
+    (void)takeByte(decoder, &byte);
 }
 
 // Gives the byte read last back.

@@ -31,8 +31,9 @@ void *newPiece(qvsArena *arena, uint32_t size, const char *module, int line = __
 void releaseArena(qvsArena *arena);
 
 // Adds `item` behind the last one of `*list`, which is made when there is none. A null item adds
-// nothing to a list. QVS_ERROR_LIST_NO_MEMORY, with a list that was not there still null.
-QVS_NODISCARD qvsResult addItem(qvsArena *arena, qvsList **list, void *item);
+// nothing to a list. `*last` is the list's last node, which whoever builds it remembers; null when
+// it is not known. QVS_ERROR_LIST_NO_MEMORY, with a list that was not there still null.
+QVS_NODISCARD qvsResult addItem(qvsArena *arena, qvsList **list, void *item, qvsListNode **last);
 
 // Releases a list of texts.
 void releaseTexts(qvsArena *arena, qvsList *list);

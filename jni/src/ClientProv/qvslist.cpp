@@ -1,8 +1,10 @@
-// The list: every walk is a loop, and the last node is remembered.
+// The list: every walk is a loop.
 #include "qvslist.h"
 
 #include "qvsTree.h"
 #include "qvsmemory.h"
+
+using namespace qvs;
 
 namespace {
 
@@ -29,14 +31,11 @@ void releaseItem(void *item, qvsListFree freeItem)
     }
 }
 
-// The last node; null when the list is empty. The walk is for a list put together by hand.
+// The last node; null when the list is empty.
 qvsListNode *lastNode(const qvsList *list)
 {
-    if (!list->ptFirst) {
-        return nullptr;
-    }
-    qvsListNode *node = list->ptTail ? list->ptTail : list->ptFirst;
-    while (node->ptNext) {
+    qvsListNode *node = list->ptFirst;
+    while (node && node->ptNext) {
         node = node->ptNext;
     }
     return node;
@@ -50,9 +49,6 @@ void unlink(qvsList *list, qvsListNode *before, const qvsListNode *node)
         before->ptNext = node->ptNext;
     } else {
         list->ptFirst = node->ptNext;
-    }
-    if (!node->ptNext || list->ptTail == node) {
-        list->ptTail = before;
     }
 }
 
@@ -80,32 +76,36 @@ qvsListNode *nodeAt(const qvsList *list, uint32_t index)
     return node;
 }
 
-qvsResult addLast(qvsArena *arena, qvsList *list, void *item)
+// Adds `item` behind the node `*last`, which its own becomes; null when the last one is not known.
+qvsResult addLast(qvsArena *arena, qvsList *list, void *item, qvsListNode **last)
 {
     qvsListNode *node = newNode(arena, item);
     if (!node) {
         return QVS_ERROR_LIST_NO_MEMORY;
     }
-    if (qvsListNode *last = lastNode(list)) {
-        last->ptNext = node;
+    if (!*last) {
+        *last = lastNode(list);
+    }
+    if (*last) {
+        (*last)->ptNext = node;
         ++list->nCount;
     } else {
         list->ptFirst = node;
         list->nCount = 1;
     }
-    list->ptTail = node;
+    *last = node;
     return QVS_OK;
 }
 
-qvsResult create(qvsArena *arena, qvsList **list, void *item)
+qvsResult create(qvsArena *arena, qvsList **list, void *item, qvsListNode **last)
 {
-    *list = nullptr;
+    *last = nullptr;
     auto *made = static_cast<qvsList *>(qvs::newPiece(arena, sizeof(qvsList), kModule));
     if (!made) {
         return QVS_ERROR_LIST_NO_MEMORY;
     }
     if (item) {
-        if (qvsResult result = addLast(arena, made, item)) {
+        if (qvsResult result = addLast(arena, made, item, last)) {
             if (!arena) {
                 qvsMemFree_debug(made);
             }
@@ -118,15 +118,15 @@ qvsResult create(qvsArena *arena, qvsList **list, void *item)
 
 } // namespace
 
-qvsResult qvs::addItem(qvsArena *arena, qvsList **list, void *item)
+qvsResult qvs::addItem(qvsArena *arena, qvsList **list, void *item, qvsListNode **last)
 {
     if (!*list) {
-        return create(arena, list, item);
+        return create(arena, list, item, last);
     }
     if (!item) {
         return QVS_OK;
     }
-    return addLast(arena, *list, item);
+    return addLast(arena, *list, item, last);
 }
 
 void qvs::releaseTexts(qvsArena *arena, qvsList *list)
@@ -142,7 +142,9 @@ void qvs::releaseTexts(qvsArena *arena, qvsList *list)
 
 qvsResult qvsListCreate(qvsList **list, void *item)
 {
-    return create(nullptr, list, item);
+    *list = nullptr;
+    qvsListNode *last = nullptr;
+    return addItem(nullptr, list, item, &last);
 }
 
 qvsResult qvsListAddNodeLast(qvsList *list, void *item)
@@ -150,7 +152,8 @@ qvsResult qvsListAddNodeLast(qvsList *list, void *item)
     if (!list || !item) {
         return QVS_ERROR_LIST_ARGUMENT;
     }
-    return addLast(nullptr, list, item);
+    qvsListNode *last = nullptr;
+    return addItem(nullptr, &list, item, &last);
 }
 
 qvsResult qvsListAddNodeFirst(qvsList *list, void *item)
@@ -166,7 +169,6 @@ qvsResult qvsListAddNodeFirst(qvsList *list, void *item)
         node->ptNext = list->ptFirst;
         ++list->nCount;
     } else {
-        list->ptTail = node;
         list->nCount = 1;
     }
     list->ptFirst = node;
@@ -295,9 +297,6 @@ qvsResult qvsListGetItemNextAndDeleteNode(qvsList *list, void **item)
         before = list->ptFirst;
         while (before && before->ptNext != node) {
             before = before->ptNext;
-        }
-        if (!before) {
-            list->ptTail = nullptr;
         }
     }
     *item = node->pItem;

@@ -18,9 +18,6 @@ typedef struct qvsList {
     uint32_t nCount;
     qvsListNode *ptFirst;  // null when empty
     qvsListNode *ptCursor; // what qvsListGetItemNext gives next; null when there is no more
-
-    // Private to the list.
-    qvsListNode *ptTail; // a node from which the last one is not far; null when none is known
 } qvsList;
 
 // What a deleting function does with an item: null releases it with qvsMemFree_debug,
@@ -36,9 +33,9 @@ typedef void (*qvsListFree)(void *item);
 // cursor is null. QVS_ERROR_LIST_NO_MEMORY with *list null without memory.
 QVS_NODISCARD QVS_API qvsResult qvsListCreate(qvsList **list, void *item);
 
-// qvsListAddNodeLast and qvsListAddNodeFirst add `item` behind the last or before the first node;
-// the cursor stays. QVS_ERROR_LIST_ARGUMENT for a null item, QVS_ERROR_LIST_NO_MEMORY without
-// memory; the item is then still the caller's.
+// qvsListAddNodeLast and qvsListAddNodeFirst add `item` behind the last node, to which the first
+// walks, or before the first one; the cursor stays. QVS_ERROR_LIST_ARGUMENT for a null item,
+// QVS_ERROR_LIST_NO_MEMORY without memory; the item is then still the caller's.
 QVS_NODISCARD QVS_API qvsResult qvsListAddNodeLast(qvsList *list, void *item);
 QVS_NODISCARD QVS_API qvsResult qvsListAddNodeFirst(qvsList *list, void *item);
 
