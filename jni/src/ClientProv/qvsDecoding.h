@@ -41,8 +41,8 @@ inline uint16_t markOf(const qvsWbxmlDecoder *decoder)
     return static_cast<uint16_t>(reinterpret_cast<uintptr_t>(decoder) >> 4U | 1U);
 }
 
-// The state behind a decoder; null for a null one and for one that a host made: its texts are not
-// limited, its nodes and lists are blocks of their own.
+// The state behind a decoder; null for a null one and for one that a host made, whose single steps
+// do without: their texts are not limited, and each adds to a list with a walk.
 DecodeState *stateOf(const qvsWbxmlDecoder *decoder);
 
 // Where nodes and lists come from.
