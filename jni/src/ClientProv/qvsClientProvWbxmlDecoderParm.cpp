@@ -170,7 +170,7 @@ qvsResult readItems(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list
 }
 
 // Reads one parameter into `*list`, whose last node is `*end`; null when it is not known.
-qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list, qvsListNode **end)
+qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list, qvsListNode **end)
 {
     qvsList *built = *list;
     const qvsResult result = readItems(decoder, state, &built, end);
@@ -236,14 +236,6 @@ const Parm *findParm(const ParmTable &table, uint8_t token)
     }
 }
 
-// The same onto a list of a record.
-qvsResult readListOf(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, ListField list)
-{
-    qvsListNode *unknown = nullptr;
-    qvsListNode **end = state && state->last ? state->last + list.place : &unknown;
-    return readList(decoder, state, listAt(record, list.number), end);
-}
-
 // Reads the parameter that `token` announces into its field.
 qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
                    const ParmTable &table, uint8_t token)
@@ -259,7 +251,7 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
     case ParmType::kText:
         return readText(decoder, state, textAt(record, parm->field), token);
     case ParmType::kList:
-        return readListOf(decoder, state, record, {parm->field, parm->place});
+        return readList(decoder, state, record, ListField{parm->field, parm->place});
     default:
         return table.reader(decoder, record);
     }
@@ -276,12 +268,14 @@ qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvs
                                                    uint8_t /*token*/)
 {
     qvsListNode *unknown = nullptr;
-    return readList(decoder, stateOf(decoder), list, &unknown);
+    return readOnto(decoder, stateOf(decoder), list, &unknown);
 }
 
-qvsResult qvs::readList(qvsWbxmlDecoder *decoder, void *record, ListField list)
+qvsResult qvs::readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, ListField list)
 {
-    return readListOf(decoder, stateOf(decoder), record, list);
+    qvsListNode *unknown = nullptr;
+    qvsListNode **end = state && state->last ? state->last + list.place : &unknown;
+    return readOnto(decoder, state, listAt(record, list.number), end);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)

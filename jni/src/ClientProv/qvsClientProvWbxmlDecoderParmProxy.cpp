@@ -8,7 +8,8 @@ namespace {
 // kept[pxphysical-domain]: a DOMAIN that cannot be read is traced and the parm goes on.
 qvsResult readPhysicalDomain(qvsWbxmlDecoder *decoder, void *record)
 {
-    if (readList(decoder, record, QVS_FIELD(qvsWapPxPhysical, ptDomainList)) != QVS_OK) {
+    if (readList(decoder, stateOf(decoder), record, QVS_FIELD(qvsWapPxPhysical, ptDomainList)) !=
+        QVS_OK) {
         trace("[ERROR] qvsClientProvWbxmlDecoderParamListString Fail");
     }
     return textLimitPassed(decoder) ? QVS_ERROR_NO_MEMORY : QVS_OK;

@@ -74,8 +74,8 @@ qvsResult readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
 qvsResult readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table);
 
 // Reads one parameter onto a list of `record`. On failure the list is as it was, but for the items
-// that it has got.
-qvsResult readList(qvsWbxmlDecoder *decoder, void *record, ListField list);
+// that it has got. `state` is that of the decoder.
+qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, ListField list);
 
 // ---- Parameters whose name is given as text
 
