@@ -178,6 +178,12 @@ TEST_F(HostsDecoder, ReadsStepByStepWithinItsRecord)
         EXPECT_EQ(text.str(), "n");
     }
     {
+        const HostDecoder host({0x90, 0x92});
+        OwnText text("HTTP");
+        EXPECT_EQ(qvsCommaAdd(host, &text), 0U);
+        EXPECT_EQ(text.str(), "HTTP,BASIC");
+    }
+    {
         const HostDecoder host({'s', 0});
         OwnText text;
         EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(host, &text), 1U);

@@ -65,11 +65,10 @@ qvsResult readDocument(const uint8_t *data, uint32_t length, qvsArena *arena, qv
         return QVS_ERROR_BAD_ARGUMENT;
     }
     smlBuffer buffer = bufferOver(data, length);
-    Decoding decoding = {};
+    Decoding decoding = {.decoder = {}, .state = {.arena = arena}};
     qvsWbxmlDecoder &decoder = decoding.decoder;
     decoder.ptBuffer = &buffer;
     decoder.nMark = markOf(&decoder);
-    decoding.state.arena = arena;
     const qvsResult result = qvsClientProvWbxmlDecoder(&decoder, document);
     if (result != QVS_OK) {
         trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlDecoder[0x%x]\n", result);

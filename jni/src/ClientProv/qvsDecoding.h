@@ -20,12 +20,12 @@ struct JoinedText {
 };
 
 struct DecodeState {
-    uint64_t textRead;   // bytes of all texts read or appended so far
-    uint32_t tableBlock; // bytes of the block at pStringTable that were read for it
-    bool textLimit;      // the texts of the message passed their limit
-    JoinedText *joined;  // of the APPAUTH being read by the body; null outside it
-    qvsListNode **last;  // of the lists of the record being read by the body; null outside it
-    qvsArena *arena;     // of nodes and lists; null: each is a block of its own
+    uint64_t textRead = 0;        // bytes of all texts read or appended so far
+    uint32_t tableBlock = 0;      // bytes of the block at pStringTable that were read for it
+    bool textLimit = false;       // the texts of the message passed their limit
+    JoinedText *joined = nullptr; // of the APPAUTH being read by the body; null outside it
+    qvsListNode **last = nullptr; // of the lists of the record being read by the body; null outside
+    qvsArena *arena = nullptr;    // of nodes and lists; null: each is a block of its own
 };
 
 // The record that the library makes of a decoder.
