@@ -343,6 +343,24 @@ TEST_F(Characteristic, FailsWithoutMemoryForItsNodeOrItsRecord)
     }
 }
 
+TEST_F(Characteristic, FailsWithoutMemoryForTheRecordOfItsName)
+{
+    const Bytes bytes = {0xC6, 0x50, 0x03, 'W', 'I', '-', 'F', 'I', 0x00, 0x01, 0x01};
+    long failures = 0;
+    for (bool failed = true; failed; ++failures) {
+        decoding::Decoder decoder(bytes);
+        qvsWapCharacter *node = nullptr;
+        blocks::failAt = failures;
+        const qvsResult result = qvsClientProvWbxmlDecoderCharacter(decoder, &node);
+        failed = blocks::failAt < 0;
+        blocks::reset();
+        EXPECT_EQ(result != QVS_OK, failed) << failures;
+        EXPECT_EQ(node == nullptr, failed) << failures;
+        (void)qvsClientProvWbxmlDeleteCharacter(node);
+    }
+    EXPECT_EQ(failures, 4) << "the element, its name and its record, and none";
+}
+
 TEST_F(Characteristic, EndsAtAStringThatPassesTheLimitOfAllTexts)
 {
     decoding::Decoder decoder(characteristic({0x53}, {0x03, 'x', 0x00}));

@@ -4,6 +4,7 @@
 #include "traces.h"
 
 #include <cstring>
+#include <malloc.h>
 
 using decoding::Bytes;
 using decoding::Decoder;
@@ -300,6 +301,22 @@ TEST_F(StringReader, ReadsOpaqueDataWithItsLength)
     ASSERT_FALSE(text.isNull());
     EXPECT_EQ(memcmp(text.text, "a\0b\0", 4), 0);
     EXPECT_EQ(decoder.position(), 4U);
+}
+
+TEST_F(StringReader, EndsOpaqueDataInTwoZeroBytes)
+{
+    for (const size_t size : {0U, 1U, 2U, 7U, 40U}) {
+        Bytes bytes(size + 1, 'x');
+        bytes[0] = static_cast<uint8_t>(size);
+        Decoder decoder(bytes);
+        OwnText text;
+        uint32_t length = 0;
+        mallopt(M_PERTURB, 0x5A); // memory is what others have left in it
+        EXPECT_EQ(qvsClientProvWbxmlDecoderGetStrExtension(decoder, 0xC3, &text, &length), 1U);
+        mallopt(M_PERTURB, 0);
+        EXPECT_EQ(text.str(), std::string(size, 'x'));
+        EXPECT_EQ(text.text[size + 1], '\0');
+    }
 }
 
 TEST_F(StringReader, AppendsOpaqueDataToTheVisibleText)
