@@ -6,7 +6,9 @@
 #include "target.h"
 
 #include "qvsClientProvWbxmlDecoder.h"
+#include "qvsmemory.h"
 #include "qvstrace.h"
+#include "smlbuffer.h"
 
 #include <cstring>
 
@@ -14,12 +16,9 @@ namespace {
 
 using namespace fuzz;
 
-// Decodes the body into a document and lets it go again.
-void decode(const Input &input, const BodyReading &expected)
+// Reads a document with the decoder and lets it go again.
+void decodeWith(qvsWbxmlDecoder *decoder, const Input &input, const BodyReading &expected)
 {
-    qvsWbxmlDecoder *decoder = nullptr;
-    check(qvsClientProvWbxmlInitDecoder(&decoder, input.data(), input.size()) == QVS_OK,
-          "a decoder is made for any bytes");
     qvsWapDoc *document = nullptr;
     const qvsResult result = qvsClientProvWbxmlDecoder(decoder, &document);
     check(result == expected.result, "the decode ends with the result that the format gives",
@@ -27,10 +26,29 @@ void decode(const Input &input, const BodyReading &expected)
     check(result == QVS_OK || !document, "a failed decode hands out no document");
     check(qvsClientProvWbxmlDecoderDecodingSize(decoder) <= input.size() + 1,
           "no more is read than there is");
-    (void)qvsClientProvWbxmlDeleteDecoder(decoder);
     (void)qvsClientProvWbxmlDeleteWapDoc(document);
+}
+
+// Decodes the body into a document with a decoder of the library, and with one of a host.
+void decode(const Input &input, const BodyReading &expected)
+{
+    qvsWbxmlDecoder *decoder = nullptr;
+    check(qvsClientProvWbxmlInitDecoder(&decoder, input.data(), input.size()) == QVS_OK,
+          "a decoder is made for any bytes");
+    decodeWith(decoder, input, expected);
+    (void)qvsClientProvWbxmlDeleteDecoder(decoder);
     check(heap::live() == expected.kept, "a decode leaves no block but the kept ones", heap::live(),
           " blocks instead of ", expected.kept);
+    heap::releaseAll();
+
+    qvsWbxmlDecoder host = {};
+    (void)smlBufferCreate(&host.ptBuffer, input.size());
+    (void)smlBufferAppendTail(host.ptBuffer, input.data(), input.size());
+    decodeWith(&host, input, expected);
+    qvsMemFree_debug(host.pStringTable);
+    (void)smlBufferDelete(host.ptBuffer);
+    check(heap::live() == expected.kept, "a decode by a host's decoder leaves no block but these",
+          heap::live(), " blocks instead of ", expected.kept);
     heap::releaseAll();
 }
 

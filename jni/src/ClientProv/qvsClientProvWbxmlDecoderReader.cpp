@@ -77,11 +77,8 @@ bool isInTable(const qvsWbxmlDecoder *decoder, uint32_t index)
         // hardened: an index behind that block fails.
         return index < 2;
     }
-    if (decoder->nStrSize != kUnreadTable) {
-        return true;
-    }
     const DecodeState *state = stateOf(decoder);
-    return state && index < state->tableBlock;
+    return decoder->nStrSize != kUnreadTable || (state && index < state->tableBlock);
 }
 
 } // namespace
