@@ -18,7 +18,7 @@ typedef struct qvsWbxmlDecoder {
     uint32_t nHasAttr;    // 1 when it had bit 0x80
     uint32_t nStrSize;    // bytes of the string table; 0xFFFFFFFF when it could not be read
     uint8_t nCodePage;    // 0 or 1
-    uint16_t nMark;       // private: not 0 when the library made the decoder
+    uint16_t nMark;       // private: 0 but in a decoder that the library made
     char *pStringTable;   // private copy, NUL-terminated behind its last byte
     smlBuffer *ptBuffer;  // head is the read position, storage the start, size the data length
 } qvsWbxmlDecoder;
