@@ -1,5 +1,5 @@
-// The document: which characteristic a TYPE names, who reads its parameters, what may nest in it,
-// and the walk through elements of any depth in constant stack.
+// The characteristics: which one a TYPE names, who reads its parameters, what may nest in it, and
+// the walk through elements of any depth in constant stack.
 // Elements and types are those of the OMA Client Provisioning content.
 #include "qvsClientProvWbxmlDecoder.h"
 #include "qvsParm.h"

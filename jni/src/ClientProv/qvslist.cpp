@@ -4,8 +4,6 @@
 #include "qvsTree.h"
 #include "qvsmemory.h"
 
-using namespace qvs;
-
 namespace {
 
 constexpr char kModule[] = "jni/src/ClientProv/qvslist";
@@ -144,7 +142,7 @@ qvsResult qvsListCreate(qvsList **list, void *item)
 {
     *list = nullptr;
     qvsListNode *last = nullptr;
-    return addItem(nullptr, list, item, &last);
+    return qvs::addItem(nullptr, list, item, &last);
 }
 
 qvsResult qvsListAddNodeLast(qvsList *list, void *item)
@@ -153,7 +151,7 @@ qvsResult qvsListAddNodeLast(qvsList *list, void *item)
         return QVS_ERROR_LIST_ARGUMENT;
     }
     qvsListNode *last = nullptr;
-    return addItem(nullptr, &list, item, &last);
+    return qvs::addItem(nullptr, &list, item, &last);
 }
 
 qvsResult qvsListAddNodeFirst(qvsList *list, void *item)
