@@ -94,16 +94,12 @@ struct Chains {
 // The kinds of record nest a few levels deep, whatever a message holds.
 // NOLINTBEGIN(misc-no-recursion)
 
-// Copies the record of a tree node that `row` is about, if the node carries one.
-bool copySlot(const qvsWapCharacter &node, const ChildRow &row, size_t number, Chains *chains,
+// Copies the record of a tree node that `row` is about.
+void copySlot(const qvsWapCharacter &node, const ChildRow &row, size_t number, Chains *chains,
               Texts texts)
 {
     void *record = pointerAt(&node, row.slot);
-    if (!record) {
-        return false;
-    }
-    chains->append(row, number, copyRecord(record, *row.kind, texts));
-    return true;
+    chains->append(row, number, copyRecord(record, *row.kind, row.stays ? Texts::kCopied : texts));
 }
 
 // Copies every record of a node at the top of the document.
@@ -111,34 +107,45 @@ void copyNode(const qvsWapCharacter &node, Chains *chains, Texts texts)
 {
     size_t number = 0;
     for (const ChildRow &row : kRootRows) {
-        if (pointerAt(&node, row.slot) && chains->isTaken(row)) {
-            trace("[WARNING] Already Have ClientIdent Context");
-            return;
+        if (pointerAt(&node, row.slot)) {
+            if (chains->isTaken(row)) {
+                trace("[WARNING] Already Have ClientIdent Context");
+                return;
+            }
+            copySlot(node, row, number, chains, texts);
         }
-        copySlot(node, row, number++, chains, texts);
+        ++number;
     }
 }
 
-// Copies the first record of a child that the parent accepts; false when it accepts none.
-bool copyChild(const qvsWapCharacter &node, const Rows<ChildRow> &rows, Chains *chains, Texts texts)
+// Copies the first record of a child that the parent accepts.
+qvsResult copyChild(const qvsWapCharacter &node, const Rows<ChildRow> &rows, Chains *chains,
+                    Texts texts)
 {
     size_t number = 0;
     for (const ChildRow &row : rows) {
-        if (copySlot(node, row, number++, chains, texts)) {
-            return true;
+        if (pointerAt(&node, row.slot)) {
+            // hardened: nothing can be attached to a parent that is not there.
+            if (!chains->parent) {
+                return QVS_ERROR_BAD_ARGUMENT;
+            }
+            copySlot(node, row, number, chains, texts);
+            return QVS_OK;
         }
+        ++number;
     }
-    return false;
+    // kept[context-misfit-ends-walk]: the children behind one that does not fit are lost.
+    trace("[WARNING] Not Support Context");
+    return QVS_ERROR_FAILED;
 }
 
 qvsResult walkChildren(qvsList *children, void *parent, const Rows<ChildRow> &rows, Texts texts)
 {
     Chains chains = {parent};
     for (void *item = firstItem(children); item; item = nextItem(children)) {
-        if (!copyChild(*static_cast<const qvsWapCharacter *>(item), rows, &chains, texts)) {
-            // kept[context-misfit-ends-walk]: the children behind one that does not fit are lost.
-            trace("[WARNING] Not Support Context");
-            return QVS_ERROR_FAILED;
+        const auto &node = *static_cast<const qvsWapCharacter *>(item);
+        if (qvsResult result = copyChild(node, rows, &chains, texts)) {
+            return result;
         }
     }
     return QVS_OK;
@@ -189,36 +196,30 @@ qvsCtxStrNode *qvs::copyTexts(qvsList *list, Texts texts)
     qvsCtxStrNode *head = nullptr;
     qvsCtxStrNode **end = &head;
     list->ptCursor = list->ptFirst;
-    while (list->ptCursor && list->ptCursor->pItem) {
-        auto *node = static_cast<qvsCtxStrNode *>(newCtxRecord(kFieldsOf<qvsCtxStrNode>));
-        if (!node) {
+    while (qvsListNode *from = list->ptCursor) {
+        list->ptCursor = from->ptNext;
+        auto *text = static_cast<char *>(from->pItem);
+        void *made = text ? newCtxRecord(kFieldsOf<qvsCtxStrNode>) : nullptr;
+        if (!made) {
             break;
         }
+        auto *node = static_cast<qvsCtxStrNode *>(made);
         *end = node;
         end = &node->ptNext;
-        auto *text = static_cast<char *>(list->ptCursor->pItem);
         if (texts == Texts::kTaken) {
-            list->ptCursor->pItem = nullptr;
+            from->pItem = nullptr;
             node->pszValue = withSpareZeros(text);
         } else {
             node->pszValue = copyOf(text);
         }
-        list->ptCursor = list->ptCursor->ptNext;
     }
     return head;
 }
 
 qvsResult qvs::copyChildren(qvsList *children, void *parent, const CopyKind &kind, Texts texts)
 {
-    qvsResult result = QVS_OK;
-    if (!parent) {
-        // hardened: nothing can be attached to a parent that is not there.
-        result = QVS_ERROR_BAD_ARGUMENT;
-    } else if (!children) {
-        result = QVS_ERROR_LIST_ARGUMENT;
-    } else {
-        result = walkChildren(children, parent, kind.children, texts);
-    }
+    const qvsResult result = children ? walkChildren(children, parent, kind.children, texts)
+                                      : qvsResult{QVS_ERROR_LIST_ARGUMENT};
     traceError(result);
     return result;
 }
@@ -234,13 +235,13 @@ void *qvs::copyRecord(void *record, const CopyKind &kind, Texts texts)
         return nullptr;
     }
     for (const CopyRow &row : kind.rows) {
-        void *field = pointerAt(record, row.from);
+        void *field = pointerAt(record, row.field);
         if (row.type == CopyRow::kList) {
             setPointer(copy, row.to, copyTexts(static_cast<qvsList *>(field), texts));
         } else if (field) {
             auto *text = static_cast<char *>(field);
             if (texts == Texts::kTaken && row.type == CopyRow::kText) {
-                setPointer(record, row.from, nullptr);
+                setPointer(record, row.field, nullptr);
                 setPointer(copy, row.to, withSpareZeros(text));
             } else {
                 setPointer(copy, row.to, copyOf(text));
@@ -250,9 +251,8 @@ void *qvs::copyRecord(void *record, const CopyKind &kind, Texts texts)
     if (kind.onCopied) {
         kind.onCopied(copy);
     }
-    if (kind.childList.number != kNoField) {
-        const qvsResult result =
-            copyChildren(*listAt(record, kind.childList.number), copy, kind, texts);
+    if (kind.childList != kNoField) {
+        const qvsResult result = copyChildren(*listAt(record, kind.childList), copy, kind, texts);
         if (kind.refusalTraced) {
             traceError(result);
         }

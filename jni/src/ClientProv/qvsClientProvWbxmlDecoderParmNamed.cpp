@@ -11,65 +11,61 @@ namespace {
 constexpr char kRefusedBy[] = "Access";
 
 // The NAME is all that the loop knows of these characteristics.
-constexpr Parm kNameAlone[] = {
-    {attr::kName, kByReader},
-};
+template <class Record>
+constexpr auto kNameAlone = tableOf<Parm<Record>>({{attr::kName, kByReader}});
 
 namespace roaming {
 using R = qvsWapRoaming;
-constexpr NamedParm kNamed[] = {
-    {"SYNC-ALLOWED", QVS_FIELD(R, pszSyncAllowed)},
-    {"SYNC-DEFAULT", QVS_FIELD(R, pszSyncDefault)},
-};
+constexpr auto kNamed = tableOf<NamedParm<R>>({
+    {"SYNC-ALLOWED", &R::pszSyncAllowed},
+    {"SYNC-DEFAULT", &R::pszSyncDefault},
+});
 
-qvsResult read(qvsWbxmlDecoder *decoder, void *record)
+qvsResult read(qvsWbxmlDecoder *decoder, R *record)
 {
-    auto *typed = static_cast<R *>(record);
-    return qvsClientProvWbxmlDecoderParamRoamingNameString(decoder, &typed, attr::kName);
+    return qvsClientProvWbxmlDecoderParamRoamingNameString(decoder, &record, attr::kName);
 }
 } // namespace roaming
 
 namespace wifi {
 using R = qvsWapWifi;
-constexpr NamedParm kNamed[] = {
-    {"NETSSID", QVS_FIELD(R, pszNetSsid)},
-    {"SECMODE", QVS_FIELD(R, pszSecMode)},
-    {"EAPMETHOD", QVS_FIELD(R, pszEapMethod)},
-    {"EAPTYPE", QVS_FIELD(R, pszEapType)},
-    {"USERNAME", QVS_FIELD(R, pszUserName)},
-    {"ANONUSERNAME", QVS_FIELD(R, pszAnonUserName)},
-    {"PASSWORD", QVS_FIELD(R, pszPassword)},
-    {"CACERT", QVS_FIELD(R, pszCaCert)},
-    {"USERCERT", QVS_FIELD(R, pszUserCert)},
-    {"PHASE1", QVS_FIELD(R, pszPhase1)},
-    {"AUTHALGORITHM", QVS_FIELD(R, pszAuthAlgorithm)},
-    {"PRIORITY", QVS_FIELD(R, pszPriority)},
-};
+constexpr auto kNamed = tableOf<NamedParm<R>>({
+    {"NETSSID", &R::pszNetSsid},
+    {"SECMODE", &R::pszSecMode},
+    {"EAPMETHOD", &R::pszEapMethod},
+    {"EAPTYPE", &R::pszEapType},
+    {"USERNAME", &R::pszUserName},
+    {"ANONUSERNAME", &R::pszAnonUserName},
+    {"PASSWORD", &R::pszPassword},
+    {"CACERT", &R::pszCaCert},
+    {"USERCERT", &R::pszUserCert},
+    {"PHASE1", &R::pszPhase1},
+    {"AUTHALGORITHM", &R::pszAuthAlgorithm},
+    {"PRIORITY", &R::pszPriority},
+});
 
-qvsResult read(qvsWbxmlDecoder *decoder, void *record)
+qvsResult read(qvsWbxmlDecoder *decoder, R *record)
 {
-    auto *typed = static_cast<R *>(record);
-    return qvsClientProvWbxmlDecoderParamWifiNameString(decoder, &typed, attr::kName);
+    return qvsClientProvWbxmlDecoderParamWifiNameString(decoder, &record, attr::kName);
 }
 } // namespace wifi
 
 namespace voWifi {
 using R = qvsWapVoWifi;
-constexpr NamedParm kNamed[] = {
-    {"ePDG FQDN", QVS_FIELD(R, pszEpdgFqdn)},
-};
+constexpr auto kNamed = tableOf<NamedParm<R>>({
+    {"ePDG FQDN", &R::pszEpdgFqdn},
+});
 
-qvsResult read(qvsWbxmlDecoder *decoder, void *record)
+qvsResult read(qvsWbxmlDecoder *decoder, R *record)
 {
-    auto *typed = static_cast<R *>(record);
-    return qvsClientProvWbxmlDecoderParamVoWifiNameString(decoder, &typed, attr::kName);
+    return qvsClientProvWbxmlDecoderParamVoWifiNameString(decoder, &record, attr::kName);
 }
 } // namespace voWifi
 
 // Reads one named parameter of `record`. A name that is not listed leaves its value to the loop,
 // which refuses it.
-qvsResult readNamed(qvsWbxmlDecoder *decoder, void *record, uint8_t tag,
-                    const Rows<NamedParm> &names, const char *label)
+qvsResult readAnyNamed(qvsWbxmlDecoder *decoder, void *record, uint8_t tag,
+                       const Rows<NamedRow> &names, const char *label)
 {
     ParmName name;
     if (qvsResult result = readParmName(decoder, tag, label, false, &name)) {
@@ -85,6 +81,13 @@ qvsResult readNamed(qvsWbxmlDecoder *decoder, void *record, uint8_t tag,
     }
     trace("[%s] nID [0x%x]", label, name.next);
     return QVS_OK;
+}
+
+template <class Record, size_t N>
+qvsResult readNamed(qvsWbxmlDecoder *decoder, Record *record, uint8_t tag,
+                    const Table<Record, NamedRow, N> &names, const char *label)
+{
+    return readAnyNamed(decoder, record, tag, rowsFor<Record>(names), label);
 }
 
 } // namespace
@@ -125,36 +128,27 @@ qvsResult qvs::readParmValue(qvsWbxmlDecoder *decoder, char **field)
     return QVS_OK;
 }
 
-char **qvs::findNamed(void *record, const Rows<NamedParm> &names, const char *name)
+char **qvs::findNamed(void *record, const Rows<NamedRow> &names, const char *name)
 {
-    for (const NamedParm &known : names) {
+    for (const NamedRow &known : names) {
         if (qvsStrcmp(name, known.name) == 0) {
-            return textAt(record, known.field.number);
+            return textAt(record, known.field);
         }
     }
     return nullptr;
 }
 
-constexpr ParmTable qvs::kRoamingParms = {
-    .name = kRefusedBy,
-    .rows = kNameAlone,
-    .reader = roaming::read,
-    .entered = "Roming",
-};
+constexpr ParmsOf<qvsWapRoaming> qvs::kRoamingParms = {{.name = kRefusedBy, .entered = "Roming"},
+                                                       kNameAlone<qvsWapRoaming>,
+                                                       kReadBy<qvsWapRoaming, roaming::read>};
 
-constexpr ParmTable qvs::kWifiParms = {
-    .name = kRefusedBy,
-    .rows = kNameAlone,
-    .reader = wifi::read,
-    .entered = "Wifi",
-};
+constexpr ParmsOf<qvsWapWifi> qvs::kWifiParms = {{.name = kRefusedBy, .entered = "Wifi"},
+                                                 kNameAlone<qvsWapWifi>,
+                                                 kReadBy<qvsWapWifi, wifi::read>};
 
-constexpr ParmTable qvs::kVoWifiParms = {
-    .name = kRefusedBy,
-    .rows = kNameAlone,
-    .reader = voWifi::read,
-    .entered = "VoWifi",
-};
+constexpr ParmsOf<qvsWapVoWifi> qvs::kVoWifiParms = {{.name = kRefusedBy, .entered = "VoWifi"},
+                                                     kNameAlone<qvsWapVoWifi>,
+                                                     kReadBy<qvsWapVoWifi, voWifi::read>};
 
 qvsResult qvsClientProvWbxmlDecoderParamRoaming(qvsWbxmlDecoder *decoder, qvsWapRoaming *record)
 {
