@@ -12,11 +12,17 @@ namespace {
 constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvCtx";
 
 // One context record of `fields` pointers, all null; null without memory.
-void *newCtxRecord(uint32_t fields)
+void *newFields(uint32_t fields)
 {
     constexpr uint32_t kFieldSize = sizeof(void *);
     constexpr uint32_t kSpare = 1; // kept[context-spare-byte]: one byte more than the record.
     return qvsMemAllocSetZero_debug(fields * kFieldSize + kSpare, kModule, __LINE__);
+}
+
+template <class Record>
+Record *newCtxRecord()
+{
+    return static_cast<Record *>(newFields(kFieldsOf<Record>));
 }
 
 char *copyOf(const char *text)
@@ -161,7 +167,7 @@ qvsResult makeRoot(qvsList *list, qvsClientProvCtx **root, Texts texts)
         return result;
     }
     void *item = firstItem(list);
-    void *made = newCtxRecord(kFieldsOf<qvsClientProvCtx>);
+    auto *made = newCtxRecord<qvsClientProvCtx>();
     if (!made) {
         traceError(QVS_ERROR_FAILED);
         return QVS_ERROR_FAILED;
@@ -170,7 +176,7 @@ qvsResult makeRoot(qvsList *list, qvsClientProvCtx **root, Texts texts)
     for (; item; item = nextItem(list)) {
         copyNode(*static_cast<const qvsWapCharacter *>(item), &chains, texts);
     }
-    *root = static_cast<qvsClientProvCtx *>(made);
+    *root = made;
     return QVS_OK;
 }
 
@@ -199,11 +205,10 @@ qvsCtxStrNode *qvs::copyTexts(qvsList *list, Texts texts)
     while (qvsListNode *from = list->ptCursor) {
         list->ptCursor = from->ptNext;
         auto *text = static_cast<char *>(from->pItem);
-        void *made = text ? newCtxRecord(kFieldsOf<qvsCtxStrNode>) : nullptr;
-        if (!made) {
+        auto *node = text ? newCtxRecord<qvsCtxStrNode>() : nullptr;
+        if (!node) {
             break;
         }
-        auto *node = static_cast<qvsCtxStrNode *>(made);
         *end = node;
         end = &node->ptNext;
         if (texts == Texts::kTaken) {
@@ -230,7 +235,7 @@ void *qvs::copyRecord(void *record, const CopyKind &kind, Texts texts)
         traceError(QVS_ERROR_BAD_ARGUMENT);
         return nullptr;
     }
-    void *copy = newCtxRecord(kind.fields);
+    void *copy = newFields(kind.fields);
     if (!copy) {
         return nullptr;
     }

@@ -107,6 +107,8 @@ constexpr auto kAtTheTop = tableOf<Child<qvsClientProvCtx>>({
     // kept[context-top-level-dropped]: the kinds that are not named here are left out silently.
 });
 
+static_assert(countOf(kAtTheTop.rows) <= kMostChildRows);
+
 } // namespace
 
 constexpr Rows<ChildRow> qvs::kRootRows = rowsFor<qvsClientProvCtx>(kAtTheTop);

@@ -82,6 +82,9 @@ struct CopyKind {
     void (*onCopied)(const void *copy); // behind the rows
 };
 
+// Rows of children that one parent has, at most.
+constexpr size_t kMostChildRows = 9;
+
 // What is done when a record of the context has its texts.
 template <class To>
 struct OnCopied {
@@ -108,6 +111,7 @@ struct CopyOf {
     consteval CopyOf(const Table<To, ChildRow, N> &children, bool refusalTraced)
         : CopyOf(rowsFor<To>(children), refusalTraced, {})
     {
+        static_assert(N <= kMostChildRows);
     }
 
     CopyKind kind;
@@ -129,9 +133,6 @@ struct Child : ChildRow {
 
 // Every kind at the top of a document, in the order in which a node's records are taken.
 extern const Rows<ChildRow> kRootRows;
-
-// Rows of children that one parent has, at most.
-constexpr size_t kMostChildRows = 9;
 
 // A copy of a tree record with its lists and accepted children, which the caller owns; null for a
 // null record or without memory.

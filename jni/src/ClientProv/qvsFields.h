@@ -168,6 +168,12 @@ struct Table {
     Row rows[N];
 };
 
+template <class Row, size_t N>
+consteval size_t countOf(const Row (&)[N])
+{
+    return N;
+}
+
 // The same when it runs: a table of rows that differ in number.
 template <class Row>
 struct Rows {

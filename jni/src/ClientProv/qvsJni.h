@@ -26,12 +26,6 @@ namespace [[gnu::visibility("hidden")]] qvs {
 // after the delete method. Owned by the session.
 extern smlpushHdlrInfo *ptPushHdlrInfo;
 
-template <class Row, size_t N>
-consteval size_t countOf(const Row (&)[N])
-{
-    return N;
-}
-
 // ---- Walks. Indexes count from 1.
 
 // The n-th record of a chain; null when the chain ends before it or n is below 1.
@@ -125,6 +119,13 @@ struct Shown {
     const char *texts[kMost + 1];
     jsize length;
 };
+
+// The length of the array of a record.
+template <class Record>
+constexpr jsize lengthOf(const Record * /*record*/)
+{
+    return textsOf<Record>() + 1;
+}
 
 // All texts of a record, in their order.
 template <class Record>

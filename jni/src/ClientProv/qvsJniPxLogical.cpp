@@ -117,7 +117,7 @@ jobjectArray qvomacp_GetProxyData(JNIEnv *env, jobject, jint p)
     }
     const Logical *record = logical(p);
     // kept[proxy-blank]: unlike its siblings, a missing proxy answers an array of empty strings.
-    return record ? array(env, record) : stringArray(env, nullptr, 0, textsOf<Logical>() + 1);
+    return record ? array(env, record) : stringArray(env, nullptr, 0, lengthOf(record));
 }
 
 // ---- Natives: physical proxies
