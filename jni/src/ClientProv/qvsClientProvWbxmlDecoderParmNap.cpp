@@ -8,9 +8,29 @@ namespace {
 // What pszInit points at: never allocated, never released.
 char kInit[] = "empty";
 
-qvsResult readNapNamed(qvsWbxmlDecoder *decoder, qvsWapNapDef *record)
+qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapNapDef *record, uint8_t tag)
 {
-    return qvsClientProvWbxmlDecoderParamNapNameString(decoder, &record, attr::kName);
+    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamNameString";
+    ParmName name;
+    if (qvsResult result = readParmName(decoder, state, tag, kLabel, false, &name)) {
+        return result;
+    }
+    // kept[napdef-init]: INIT is remembered when it has no value, as a constant text; the value of
+    // any named parameter is read and dropped.
+    if (name.next == wbxml::kEnd && qvsStrcmp(name.text.str(), "INIT") == 0) {
+        record->pszInit = kInit;
+        trace("[%s] INIT Value is NULL!!!!!!!!", kLabel);
+    }
+    if (name.next == attr::kValue) {
+        Text dropped;
+        return paramValue(decoder, state, &dropped, lookAt);
+    }
+    return QVS_OK;
+}
+
+qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapNapDef *record)
+{
+    return readNamed(decoder, state, record, attr::kName);
 }
 
 namespace napDef {
@@ -76,7 +96,7 @@ constexpr auto kParms = tableOf<Parm<R>>({
 constexpr ParmsOf<qvsWapNapDef> qvs::kNapDefParms = {
     {.name = "NapDef", .onRefused = napDef::traceRefused},
     napDef::kParms,
-    kReadBy<qvsWapNapDef, readNapNamed>};
+    kReadBy<qvsWapNapDef, readName>};
 
 constexpr ParmsOf<qvsWapNapAuthInfo> qvs::kNapAuthInfoParms = {{.name = "NapAuthInfo"},
                                                                napAuthInfo::kParms};
@@ -102,20 +122,6 @@ qvsResult qvsClientProvWbxmlDecoderParamValidity(qvsWbxmlDecoder *decoder, qvsWa
 qvsResult qvsClientProvWbxmlDecoderParamNapNameString(qvsWbxmlDecoder *decoder,
                                                       qvsWapNapDef **record, uint8_t tag)
 {
-    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamNameString";
-    ParmName name;
-    if (qvsResult result = readParmName(decoder, tag, kLabel, false, &name)) {
-        return result;
-    }
-    // kept[napdef-init]: INIT is remembered when it has no value, as a constant text; the value of
-    // any named parameter is read and dropped.
-    if (name.next == wbxml::kEnd && qvsStrcmp(name.text.data, "INIT") == 0) {
-        (*record)->pszInit = kInit;
-        trace("[%s] INIT Value is NULL!!!!!!!!", kLabel);
-    }
-    if (name.next == attr::kValue) {
-        Text dropped;
-        return paramValue(decoder, &dropped);
-    }
-    return QVS_OK;
+    DecodeState alone;
+    return readNamed(decoder, &alone, *record, tag);
 }

@@ -5,10 +5,33 @@ using namespace qvs;
 
 namespace {
 
-qvsResult readVendorNamed(qvsWbxmlDecoder *decoder, qvsWapVendorConfig *record)
+qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, char **name, char **value,
+                    uint8_t tag)
 {
-    return qvsClientProvWbxmlDecoderParamVendorNameString(decoder, &record->pszParamName,
-                                                          &record->pszParamValue, attr::kName);
+    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamVendorNameString";
+    ParmName read;
+    if (qvsResult result = readParmName(decoder, state, tag, kLabel, true, &read)) {
+        return result;
+    }
+    if (read.next == wbxml::kEnd) {
+        // kept[vendor-name-trace]: traced under the other readers' name.
+        trace("[qvsClientProvWbxmlDecoderParamNameString] nID [0x%x]", read.next);
+    }
+    if (read.next == attr::kValue) {
+        if (qvsResult result = readValue(decoder, state, value)) {
+            return result;
+        }
+        trace("--------------------------[%s]", *value ? *value : "");
+    }
+    // kept[vendor-any-name]: no name is compared; the last one and its value replace earlier ones,
+    // which stay allocated.
+    *name = read.text.take();
+    return QVS_OK;
+}
+
+qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapVendorConfig *record)
+{
+    return readNamed(decoder, state, &record->pszParamName, &record->pszParamValue, attr::kName);
 }
 
 namespace bootstrap {
@@ -59,7 +82,7 @@ constexpr ParmsOf<qvsWapClientIdentity> qvs::kClientIdentityParms = {{.name = "C
                                                                      clientIdentity::kParms};
 
 constexpr ParmsOf<qvsWapVendorConfig> qvs::kVendorConfigParms = {
-    {.name = "VendorConfig"}, vendorConfig::kParms, kReadBy<qvsWapVendorConfig, readVendorNamed>};
+    {.name = "VendorConfig"}, vendorConfig::kParms, kReadBy<qvsWapVendorConfig, readName>};
 
 constexpr ParmsOf<qvsWapAccess> qvs::kAccessParms = {{.name = "Access"}, access::kParms};
 
@@ -88,23 +111,6 @@ qvsResult qvsClientProvWbxmlDecoderParamAccess(qvsWbxmlDecoder *decoder, qvsWapA
 qvsResult qvsClientProvWbxmlDecoderParamVendorNameString(qvsWbxmlDecoder *decoder, char **name,
                                                          char **value, uint8_t tag)
 {
-    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamVendorNameString";
-    ParmName read;
-    if (qvsResult result = readParmName(decoder, tag, kLabel, true, &read)) {
-        return result;
-    }
-    if (read.next == wbxml::kEnd) {
-        // kept[vendor-name-trace]: traced under the other readers' name.
-        trace("[qvsClientProvWbxmlDecoderParamNameString] nID [0x%x]", read.next);
-    }
-    if (read.next == attr::kValue) {
-        if (qvsResult result = readParmValue(decoder, value)) {
-            return result;
-        }
-        trace("--------------------------[%s]", *value ? *value : "");
-    }
-    // kept[vendor-any-name]: no name is compared; the last one and its value replace earlier ones,
-    // which stay allocated.
-    *name = read.text.take();
-    return QVS_OK;
+    DecodeState alone;
+    return readNamed(decoder, &alone, name, value, tag);
 }

@@ -59,18 +59,20 @@ struct ParmStyle {
 struct ParmTable {
     ParmStyle style;
     Rows<ParmRow> rows;
-    qvsResult (*reader)(qvsWbxmlDecoder *decoder, void *record); // of kByReader
+    // Of kByReader.
+    qvsResult (*reader)(qvsWbxmlDecoder *decoder, DecodeState *state, void *record);
 };
 
 template <class Record>
 struct ParmReader {
-    qvsResult (*read)(qvsWbxmlDecoder *decoder, void *record) = nullptr;
+    qvsResult (*read)(qvsWbxmlDecoder *decoder, DecodeState *state, void *record) = nullptr;
 };
 
-template <class Record, qvsResult (*read)(qvsWbxmlDecoder *, Record *)>
-constexpr ParmReader<Record> kReadBy = {[](qvsWbxmlDecoder *decoder, void *record) {
-    return read(decoder, static_cast<Record *>(record));
-}};
+template <class Record, qvsResult (*read)(qvsWbxmlDecoder *, DecodeState *, Record *)>
+constexpr ParmReader<Record> kReadBy = {
+    [](qvsWbxmlDecoder *decoder, DecodeState *state, void *record) {
+        return read(decoder, state, static_cast<Record *>(record));
+    }};
 
 template <class Record>
 struct ParmsOf {
@@ -104,7 +106,7 @@ extern const ParmsOf<qvsWapWifi> kWifiParms;
 extern const ParmsOf<qvsWapVoWifi> kVoWifiParms;
 
 // Reads one parm element into `record`. Stops at the END of its attributes, which it consumes,
-// or at the first token that is refused or cannot be read. `state` is that of the decoder.
+// or at the first token that is refused or cannot be read. Without a state it is a step alone.
 qvsResult readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
                     const ParmTable &table);
 qvsResult readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table);
@@ -114,8 +116,11 @@ qvsResult readParms(qvsWbxmlDecoder *decoder, Record *record, const ParmsOf<Reco
     return readParms(decoder, record, parms.table);
 }
 
+// Reads the parameter that the NAME attribute `token` announces into `*text`.
+qvsResult readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token);
+
 // Reads one parameter onto a list of `record`. On failure the list is as it was, but for the items
-// that it has got. `state` is that of the decoder.
+// that it has got.
 qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t field,
                    uint8_t place);
 template <class Record>
@@ -147,7 +152,7 @@ struct NamedParm : NamedRow {
     }
 };
 
-// The name of one parameter and the token behind it.
+// The name of one parameter, compared where it lies, and the token behind it.
 struct ParmName {
     Text text;
     uint8_t next = 0;
@@ -155,18 +160,14 @@ struct ParmName {
 
 // Reads the NAME attribute `tag` and the text behind it, and peeks at the next token. `label` is
 // what the traces are written under. QVS_ERROR_FAILED for a name that is not there; an empty one
-// is one for `mayBeEmpty` alone.
-qvsResult readParmName(qvsWbxmlDecoder *decoder, uint8_t tag, const char *label, bool mayBeEmpty,
-                       ParmName *name);
-
-// Reads a VALUE into `*field`, in place of what it held, which stays allocated. On failure the
-// field stays.
-qvsResult readParmValue(qvsWbxmlDecoder *decoder, char **field);
+// is one for `isKept` alone, whose name is a block.
+qvsResult readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag, const char *label,
+                       bool isKept, ParmName *name);
 
 // The field of `record` that the name selects; null for a name that is not listed.
-char **findNamed(void *record, const Rows<NamedRow> &names, const char *name);
+char **findNamed(void *record, const Rows<NamedRow> &names, const Text &name);
 template <class Record, size_t N>
-char **findNamed(Record *record, const Table<Record, NamedRow, N> &names, const char *name)
+char **findNamed(Record *record, const Table<Record, NamedRow, N> &names, const Text &name)
 {
     return findNamed(record, rowsFor<Record>(names), name);
 }

@@ -1,7 +1,7 @@
 // The list: every walk is a loop.
 #include "qvslist.h"
 
-#include "qvsTree.h"
+#include "qvsArena.h"
 #include "qvsmemory.h"
 
 namespace {
@@ -50,12 +50,17 @@ void unlink(qvsList *list, qvsListNode *before, const qvsListNode *node)
     }
 }
 
-// Releases a node that was taken out, and moves a cursor that stood on it on.
-void releaseNode(qvsList *list, qvsListNode *node)
+// Moves a cursor that stands on a node on, before the node leaves the list.
+void leave(qvsList *list, const qvsListNode *node)
 {
     if (list->ptCursor == node) {
         list->ptCursor = node->ptNext;
     }
+}
+
+// Releases a node that was taken out.
+void releaseNode(qvsList *list, qvsListNode *node)
+{
     qvsMemFree_debug(node);
     --list->nCount;
 }
@@ -187,6 +192,8 @@ qvsResult qvsListDeleteNodeFindItem(qvsList *list, void *item, qvsListFree freeI
     if (!node) {
         return QVS_ERROR_LIST_NOT_FOUND;
     }
+    // The callback finds a list without the item, and a cursor that is not on it.
+    leave(list, node);
     unlink(list, before, node);
     releaseItem(node->pItem, freeItem);
     releaseNode(list, node);
@@ -205,8 +212,7 @@ qvsResult qvsListDeleteNodeFirst(qvsList *list, qvsListFree freeItem)
     unlink(list, nullptr, node);
     releaseItem(node->pItem, freeItem);
     // kept[list-first-cursor]: a cursor on the node stays where it is.
-    qvsMemFree_debug(node);
-    --list->nCount;
+    releaseNode(list, node);
     return QVS_OK;
 }
 
@@ -272,6 +278,7 @@ qvsResult qvsListGetItemFirstAndDeleteNode(qvsList *list, void **item)
     }
     if (qvsListNode *node = list->ptFirst) {
         *item = node->pItem;
+        leave(list, node);
         unlink(list, nullptr, node);
         releaseNode(list, node);
     }
@@ -298,6 +305,7 @@ qvsResult qvsListGetItemNextAndDeleteNode(qvsList *list, void **item)
         }
     }
     *item = node->pItem;
+    leave(list, node);
     unlink(list, before, node);
     releaseNode(list, node);
     return QVS_OK;
@@ -327,8 +335,9 @@ qvsResult qvsListGetItemIndexAndDeleteNode(qvsList *list, void **item, uint32_t 
         return QVS_ERROR_LIST_NOT_FOUND;
     }
     // kept[list-index-delete]: the nodes before this one leave the list and stay allocated.
-    unlink(list, nullptr, node);
     // hardened: a cursor on the node moves to the next one.
+    leave(list, node);
+    unlink(list, nullptr, node);
     releaseNode(list, node);
     return QVS_OK;
 }

@@ -97,6 +97,11 @@ void *qvsMemAlloc_debug(uint32_t size, const char *file, int line)
     return qvs::tracking ? remembered(malloc(size), size, file, line) : malloc(size);
 }
 
+void *qvs::newTrackedText(uint32_t size, const char *module, int line)
+{
+    return remembered(malloc(size + kSpareZeros), size, module, line);
+}
+
 void *qvsMemAllocSetZero_debug(uint32_t size, const char *file, int line)
 {
     return qvs::tracking ? remembered(cleared(size), size, file, line) : cleared(size);

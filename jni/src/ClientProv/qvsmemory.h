@@ -81,6 +81,15 @@ inline void *newBlock(uint32_t size, const char *module, int line = __builtin_LI
     return tracking ? qvsMemAlloc_debug(size, module, line) : malloc(size);
 }
 
+// A block for a text of `size` bytes with its terminator, and kSpareZeros more, which its tracked
+// size leaves out.
+void *newTrackedText(uint32_t size, const char *module, int line);
+inline char *newText(uint32_t size, const char *module, int line = __builtin_LINE())
+{
+    return static_cast<char *>(tracking ? newTrackedText(size, module, line)
+                                        : malloc(size + kSpareZeros));
+}
+
 inline void freeBlock(void *block)
 {
     if (tracking) {

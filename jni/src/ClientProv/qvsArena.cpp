@@ -1,5 +1,5 @@
-// Pieces of a tree and the blocks that they share.
-#include "qvsTree.h"
+// Pieces and the blocks that they share.
+#include "qvsArena.h"
 
 #include "qvsmemory.h"
 
@@ -10,7 +10,7 @@ namespace [[gnu::visibility("hidden")]] qvs {
 
 namespace {
 
-constexpr char kModule[] = "jni/src/ClientProv/qvsTree";
+constexpr char kModule[] = "jni/src/ClientProv/qvsArena";
 
 // From 1 KB on the C library joins its free small blocks for each that it is asked for.
 constexpr uint32_t kBlockSize = 960;
