@@ -96,8 +96,8 @@ qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_
     if (qvsResult result = checkAttr(decoder, tag)) {
         return result;
     }
-    qvsResult result = isKept ? content(decoder, state, &name->text)
-                              : lookAt(decoder, state, &name->text);
+    qvsResult result =
+        isKept ? content(decoder, state, &name->text) : lookAt(decoder, state, &name->text);
     if (result == QVS_OK && !isKept && name->text.length == 0) {
         result = QVS_ERROR_FAILED;
     }
