@@ -537,6 +537,20 @@ TEST_F(ParamList, FailsCleanlyWithoutMemory)
     EXPECT_TRUE(traces.has("[Error] [qvsClientProvWbxmlDecoderParamListString] ptTmpList NULL\n"));
 }
 
+TEST_F(ParamList, TracesNoMissingListWhereOneIsThereAndItsNodeIsNot)
+{
+    OwnList own;
+    Decoder first({0x17, 0x06, 0x85, 0x01});
+    ASSERT_EQ(qvsClientProvWbxmlDecoderParamListString(first, &own.list, 0x17), QVS_OK);
+    Decoder second({0x17, 0x06, 0x86, 0x01});
+    Traces traces;
+    blocks::failAt = 1; // the text can be had
+    EXPECT_EQ(qvsClientProvWbxmlDecoderParamListString(second, &own.list, 0x17), 1U);
+    blocks::reset();
+    EXPECT_EQ(own.list->nCount, 1U);
+    EXPECT_FALSE(traces.has("[Error] [qvsClientProvWbxmlDecoderParamListString] ptTmpList NULL\n"));
+}
+
 TEST_F(CommaAdd, JoinsAStringBehindAComma)
 {
     Decoder decoder({0x90, 0x03, 'x', 0, 0x01});
@@ -694,7 +708,7 @@ TEST_F(TextLimit, CountsTheTextThatALaterPairContinues)
     Decoder decoder(bytes);
     qvs::DecodeState state = qvs::wholeDecode(decoder);
     qvsWapPxPhysical record = {};
-    EXPECT_EQ(qvs::readList(decoder, &state, &record, QVS_FIELD(qvsWapPxPhysical, ptDomainList)),
-              4111U);
+    static constexpr qvs::Parm<qvsWapPxPhysical> kDomain = {0x17, &qvsWapPxPhysical::ptDomainList};
+    EXPECT_EQ(qvs::readList(decoder, &state, &record, kDomain), 4111U);
     EXPECT_EQ(record.ptDomainList, nullptr);
 }

@@ -101,22 +101,24 @@ appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end, 
     return piece;
 }
 
-// Appends the only piece of a value, which has been taken.
-[[gnu::always_inline]] inline qvsResult appendOnly(qvsWbxmlDecoder *decoder, DecodeState *state,
-                                                   Text *text, const Piece &piece)
+// appendAll() where a text is not all that is read.
+[[gnu::noinline]] const Piece *appendMore(DecodeState *state, Text *text, const Piece *piece,
+                                          const Piece *end, uint64_t added)
 {
-    const uint32_t separator = text->str() ? separatorOf(piece) : 0;
-    const Piece *const end = &piece + 1;
-    if (appendAll(state, text, &piece, end, uint64_t{piece.length} + separator) != end)
-        [[unlikely]] {
-        decoder->ptBuffer->pHead = piece.unread;
-        return QVS_ERROR_WBXML_NO_DATA;
-    }
-    return QVS_OK;
+    return appendAll(state, text, piece, end, added);
 }
 
-// Reads opaque data, a token that stands for no text, or a run.
-[[gnu::noinline]] qvsResult readAny(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
+// The result of appending the only piece of a value, which has been taken.
+inline qvsResult endOfPiece(qvsWbxmlDecoder *decoder, const Piece &piece, bool appended)
+{
+    if (!appended) [[unlikely]] {
+        decoder->ptBuffer->pHead = piece.unread;
+    }
+    return appended ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+}
+
+// Reads a run, a value token, opaque data, or a token that stands for no text.
+qvsResult readAny(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
     uint8_t token = 0;
     if (!peekByte(decoder->ptBuffer, &token)) {
@@ -127,12 +129,15 @@ appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end, 
     }
     uint8_t *&head = decoder->ptBuffer->pHead;
     ++head;
-    if (token == wbxml::kOpaque) {
-        uint32_t length = 0;
-        Piece piece;
-        return takeOpaque(&head, head + bytesLeft(decoder), &length, &piece)
-                   ? appendOnly(decoder, state, text, piece)
-                   : qvsResult{QVS_ERROR_WBXML_NO_DATA};
+    const bool opaque = token == wbxml::kOpaque;
+    uint32_t length = 0;
+    Piece piece;
+    if (opaque ? takeOpaque(&head, head + bytesLeft(decoder), &length, &piece)
+               : tokenPiece(token, &piece)) {
+        return endOfPiece(decoder, piece, append(state, text, piece));
+    }
+    if (opaque) {
+        return QVS_ERROR_WBXML_NO_DATA;
     }
     char *unknown = nullptr;
     const qvsResult result = readUnknown(decoder, state, &unknown);
@@ -184,7 +189,8 @@ DecodeState qvs::wholeDecode(const qvsWbxmlDecoder *decoder, qvsArena *arena)
 bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
 {
     const uint32_t separator = text->str() ? separatorOf(piece) : 0;
-    return appendAll(state, text, &piece, &piece + 1, uint64_t{piece.length} + separator) != &piece;
+    const uint64_t added = uint64_t{piece.length} + separator;
+    return appendMore(state, text, &piece, &piece + 1, added) != &piece;
 }
 
 bool qvs::tablePiece(const qvsWbxmlDecoder *decoder, uint8_t **at, const uint8_t *end, Piece *piece)
@@ -239,7 +245,7 @@ bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
             joins = true;
         }
         const Piece *const left =
-            piece != pieces ? appendAll(state, text, pieces, piece, added) : piece;
+            piece != pieces ? appendMore(state, text, pieces, piece, added) : piece;
         if (left != piece) [[unlikely]] {
             decoder->ptBuffer->pHead = left->unread;
             return false;
@@ -259,11 +265,7 @@ qvsResult qvs::dropInlineString(qvsWbxmlDecoder *decoder, DecodeState *state)
 
 qvsResult qvs::content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
-    Piece piece;
-    if (!takeOnlyPiece(decoder, &piece)) {
-        return endOfContent(state, readAny(decoder, state, text));
-    }
-    return endOfContent(state, appendOnly(decoder, state, text, piece));
+    return endOfContent(state, readAny(decoder, state, text));
 }
 
 qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text,
@@ -289,7 +291,9 @@ qvsResult qvs::readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **te
     Piece piece;
     if (!before && takeOnlyPiece(decoder, &piece)) {
         Text read;
-        result = appendOnly(decoder, state, &read, piece);
+        const Piece *const end = &piece + 1;
+        const bool appended = appendAll(state, &read, &piece, end, piece.length) == end;
+        result = endOfPiece(decoder, piece, appended);
         return keep(text, &read, endOfContent(state, result));
     }
     Text read;

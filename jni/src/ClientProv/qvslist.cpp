@@ -8,11 +8,17 @@ namespace {
 
 constexpr char kModule[] = "jni/src/ClientProv/qvslist";
 
+// A piece whose fields are written next.
+void *newUncleared(qvsArena *arena, uint32_t size, int line = __builtin_LINE())
+{
+    return arena ? qvs::takeRoom(arena, size) : qvsMemAllocSetZero_debug(size, kModule, line);
+}
+
 qvsListNode *newNode(qvsArena *arena, void *item)
 {
-    auto *node = static_cast<qvsListNode *>(qvs::newPiece(arena, sizeof(qvsListNode), kModule));
+    auto *node = static_cast<qvsListNode *>(newUncleared(arena, sizeof(qvsListNode)));
     if (node) {
-        node->pItem = item;
+        *node = {item, nullptr};
     }
     return node;
 }
@@ -103,10 +109,11 @@ qvsResult addLast(qvsArena *arena, qvsList *list, void *item, qvsListNode **last
 qvsResult create(qvsArena *arena, qvsList **list, void *item, qvsListNode **last)
 {
     *last = nullptr;
-    auto *made = static_cast<qvsList *>(qvs::newPiece(arena, sizeof(qvsList), kModule));
+    auto *made = static_cast<qvsList *>(newUncleared(arena, sizeof(qvsList)));
     if (!made) {
         return QVS_ERROR_LIST_NO_MEMORY;
     }
+    *made = {};
     if (item) {
         if (qvsResult result = addLast(arena, made, item, last)) {
             if (!arena) {
