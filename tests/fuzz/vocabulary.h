@@ -79,4 +79,4 @@ struct ValueToken {
 } // namespace fuzz
 
 // The kinds and the value tokens, which are written from tools/tokens.py.
-#include "kinds.h"
+#include "fuzz_kinds.h"
