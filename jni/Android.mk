@@ -6,7 +6,7 @@ LOCAL_SRC_FILES := $(patsubst $(LOCAL_PATH)/%,%,$(sort $(wildcard $(LOCAL_PATH)/
 LOCAL_CPPFLAGS  := -std=c++20 -fno-exceptions -fno-rtti -fno-threadsafe-statics -nostdinc++ \
                    -fvisibility=hidden -fno-semantic-interposition -fstack-protector-strong \
                    -Wall -Wextra -Wconversion -Wshadow
-LOCAL_LDFLAGS   := -Wl,-Bsymbolic-functions
+LOCAL_LDFLAGS   := -Wl,-Bsymbolic-functions -Wl,-z,nodelete
 # Devices with 64 bits may have pages of 16 KiB.
 ifneq (,$(filter arm64-v8a x86_64,$(TARGET_ARCH_ABI)))
 LOCAL_LDFLAGS   += -Wl,-z,max-page-size=16384
