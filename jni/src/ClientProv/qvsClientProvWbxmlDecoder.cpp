@@ -113,12 +113,18 @@ qvsClientProvCtx *qvsClinetProvWbxmlDecoderMain(const uint8_t *data, uint32_t le
 {
     qvsWapDoc *document = nullptr;
     qvsClientProvCtx *context = nullptr;
+    const uint32_t refusalsBefore = refusals;
     alignas(void *) char room[kTreeRoom];
     qvsArena pieces = {room, room + sizeof room};
     // While blocks are tracked each is one of its own, listed under the module that made it.
     qvsArena *arena = tracking ? nullptr : &pieces;
     if (readDocument(data, length, arena, &document) == QVS_OK) {
         context = arena ? takeContext(document) : qvsClientProvCtxMakeContext(document);
+        // hardened: without memory for all that the message holds there is no context.
+        if (context && refusals != refusalsBefore) {
+            qvsClientProvCtxDelectContext(context);
+            context = nullptr;
+        }
         if (context) {
             trace("Success");
         } else {

@@ -102,10 +102,10 @@ appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end, 
 }
 
 // appendAll() where a text is not all that is read.
-[[gnu::noinline]] const Piece *appendMore(DecodeState *state, Text *text, const Piece *piece,
-                                          const Piece *end, uint64_t added)
+[[gnu::noinline]] const Piece *appendMore(DecodeState *state, Text *text, const Piece *first,
+                                          const Piece *behind, uint64_t added)
 {
-    return appendAll(state, text, piece, end, added);
+    return appendAll(state, text, first, behind, added);
 }
 
 // The result of appending the only piece of a value, which has been taken.
