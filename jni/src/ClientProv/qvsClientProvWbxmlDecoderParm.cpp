@@ -103,22 +103,22 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
 
 // ---- The loop
 
-// The token behind page switches. False at the end of the data.
-[[gnu::noinline, gnu::cold]] bool skipSwitches(qvsWbxmlDecoder *decoder, const ParmTable &table,
-                                               uint8_t *token)
+// The token behind page switches; another switch at the end of the data.
+[[gnu::noinline, gnu::cold]] uint8_t skipSwitches(qvsWbxmlDecoder *decoder, const ParmTable &table)
 {
+    uint8_t token = 0;
     do {
         // kept[parm-switch-ignored]: a switch to an unknown page is no failure by itself.
         (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
-        if (!peekByte(decoder->ptBuffer, token)) {
-            return false;
+        if (!peekByte(decoder->ptBuffer, &token)) {
+            return wbxml::kSwitchPage;
         }
         if (!table.style.freshTokenAfterSwitch) {
             // kept[parm-switch-masked]: behind a switch the token is seen without its top bits.
-            *token &= wbxml::kTagMask;
+            token &= wbxml::kTagMask;
         }
-    } while (*token == wbxml::kSwitchPage);
-    return true;
+    } while (token == wbxml::kSwitchPage);
+    return token;
 }
 
 const ParmRow *findParm(const ParmTable &table, uint8_t token)
@@ -225,8 +225,11 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *rec
     }
     uint8_t token = 0;
     while (peekByte(decoder->ptBuffer, &token)) {
-        if (token == wbxml::kSwitchPage && !skipSwitches(decoder, table, &token)) {
-            break;
+        if (token == wbxml::kSwitchPage) {
+            token = skipSwitches(decoder, table);
+            if (token == wbxml::kSwitchPage) {
+                break;
+            }
         }
         qvsResult result = QVS_OK;
         const bool end = token == wbxml::kEnd;

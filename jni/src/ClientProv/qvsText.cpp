@@ -6,8 +6,6 @@ using namespace qvs;
 
 namespace {
 
-constexpr uint32_t kUnreadTable = 0xFFFFFFFF;
-
 // Pieces of a run that are looked at before they are appended.
 constexpr uint32_t kMostPieces = 4;
 
@@ -83,8 +81,8 @@ inline uint32_t separatorOf(const Piece &piece)
 }
 
 // Appends pieces that add so many bytes, in one block. Answers the first one that is not appended.
-[[gnu::always_inline]] inline const Piece *
-appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end, uint64_t added)
+const Piece *appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end,
+                       uint64_t added)
 {
     bool joins = text->str() != nullptr;
     if (!reserve(state, text, added, piece->join == Join::kOpaque ? 1 : 0)) [[unlikely]] {
@@ -101,20 +99,30 @@ appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end, 
     return piece;
 }
 
-// appendAll() where a text is not all that is read.
-[[gnu::noinline]] const Piece *appendMore(DecodeState *state, Text *text, const Piece *first,
-                                          const Piece *behind, uint64_t added)
+// The result where the only piece of a value, which has been taken, is not appended.
+[[gnu::noinline, gnu::cold]] qvsResult lackPiece(qvsWbxmlDecoder *decoder, uint8_t *unread)
 {
-    return appendAll(state, text, first, behind, added);
+    const Piece piece = {nullptr, 0, Join::kDirect, unread};
+    if (appendNone(&piece, &piece + 1) != &piece) {
+        return QVS_OK;
+    }
+    decoder->ptBuffer->pHead = unread;
+    return QVS_ERROR_WBXML_NO_DATA;
 }
 
-// The result of appending the only piece of a value, which has been taken.
-inline qvsResult endOfPiece(qvsWbxmlDecoder *decoder, const Piece &piece, bool appended)
+// A block with a copy of the only piece of a value; null without memory, or once the texts of the
+// message passed their limit.
+inline char *copyOf(DecodeState *state, const Piece &piece)
 {
-    if (!appended) [[unlikely]] {
-        decoder->ptBuffer->pHead = piece.unread;
+    const uint32_t length = piece.length;
+    char *block = countText(state, length) && length < UINT32_MAX - kSpareZeros
+                      ? newText(length + 1, kDecoderModule)
+                      : nullptr;
+    if (block) {
+        memcpy(block, piece.bytes, length);
+        memset(block + length, 0, 1 + kSpareZeros);
     }
-    return appended ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+    return block;
 }
 
 // Reads a run, a value token, opaque data, or a token that stands for no text.
@@ -134,7 +142,7 @@ qvsResult readAny(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
     Piece piece;
     if (opaque ? takeOpaque(&head, head + bytesLeft(decoder), &length, &piece)
                : tokenPiece(token, &piece)) {
-        return endOfPiece(decoder, piece, append(state, text, piece));
+        return append(state, text, piece) ? qvsResult{QVS_OK} : lackPiece(decoder, piece.unread);
     }
     if (opaque) {
         return QVS_ERROR_WBXML_NO_DATA;
@@ -151,11 +159,26 @@ qvsResult readAny(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
     return result;
 }
 
-// Hands a text that was read out; on failure `*text` stays.
-[[gnu::always_inline]] inline qvsResult keep(char **text, Text *read, qvsResult result)
+// The result of reading a value, traced.
+inline qvsResult endOfContent(const DecodeState *state, qvsResult result)
 {
+    if (state->textLimit) [[unlikely]] {
+        result = QVS_ERROR_NO_MEMORY;
+    }
+    trace("qvsClientProvWbxmlDecoderContent Error:%d", static_cast<int>(result));
+    return result;
+}
+
+// Reads a value, which may continue the text `before`. On failure `*text` stays.
+[[gnu::noinline]] qvsResult readNew(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                                    const char *before)
+{
+    Text read;
+    read.before = before;
+    read.length = qvsStrlen(before);
+    const qvsResult result = content(decoder, state, &read);
     if (result == QVS_OK) {
-        *text = read->take();
+        *text = read.take();
     }
     return result;
 }
@@ -190,25 +213,7 @@ bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
 {
     const uint32_t separator = text->str() ? separatorOf(piece) : 0;
     const uint64_t added = uint64_t{piece.length} + separator;
-    return appendMore(state, text, &piece, &piece + 1, added) != &piece;
-}
-
-bool qvs::tablePiece(const qvsWbxmlDecoder *decoder, uint8_t **at, const uint8_t *end, Piece *piece)
-{
-    uint32_t index = 0;
-    // hardened: a table that was cut off, whose length is not known, is referred to in vain.
-    if (!takeUint32(at, end, &index) || !decoder->pStringTable ||
-        decoder->nStrSize == kUnreadTable || index > decoder->nStrSize - 1) {
-        return false;
-    }
-    // kept[empty-table-index]: every index passes the check of an empty table; its block of two
-    // zero bytes answers 0 and 1 with the empty text. hardened: an index behind that block fails.
-    if (decoder->nStrSize == 0 && index > 1) {
-        return false;
-    }
-    const char *entry = decoder->pStringTable + index;
-    *piece = {entry, static_cast<uint32_t>(strlen(entry)), Join::kDirect, *at};
-    return true;
+    return appendAll(state, text, &piece, &piece + 1, added) != &piece;
 }
 
 // All pieces are looked at before a block is made for them; of many, so many at a time, and while
@@ -245,7 +250,7 @@ bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
             joins = true;
         }
         const Piece *const left =
-            piece != pieces ? appendMore(state, text, pieces, piece, added) : piece;
+            piece != pieces ? appendAll(state, text, pieces, piece, added) : piece;
         if (left != piece) [[unlikely]] {
             decoder->ptBuffer->pHead = left->unread;
             return false;
@@ -266,6 +271,18 @@ qvsResult qvs::dropInlineString(qvsWbxmlDecoder *decoder, DecodeState *state)
 qvsResult qvs::content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
     return endOfContent(state, readAny(decoder, state, text));
+}
+
+qvsResult qvs::lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
+{
+    Piece piece;
+    if (!takeOnlyPiece(decoder, &piece)) {
+        return content(decoder, state, text);
+    }
+    (void)countText(state, piece.length); // the limit shows in the result
+    text->before = piece.bytes;
+    text->length = piece.length;
+    return endOfContent(state, QVS_OK);
 }
 
 qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text,
@@ -289,15 +306,15 @@ qvsResult qvs::readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **te
         return QVS_OK;
     }
     Piece piece;
-    if (!before && takeOnlyPiece(decoder, &piece)) {
-        Text read;
-        const Piece *const end = &piece + 1;
-        const bool appended = appendAll(state, &read, &piece, end, piece.length) == end;
-        result = endOfPiece(decoder, piece, appended);
-        return keep(text, &read, endOfContent(state, result));
+    if (before || !takeOnlyPiece(decoder, &piece)) {
+        return readNew(decoder, state, text, before);
     }
-    Text read;
-    read.before = before;
-    read.length = qvsStrlen(before);
-    return keep(text, &read, content(decoder, state, &read));
+    char *read = copyOf(state, piece);
+    result = endOfContent(state, read ? qvsResult{QVS_OK} : lackPiece(decoder, piece.unread));
+    if (result == QVS_OK) {
+        *text = read;
+    } else if (read) {
+        freeBlock(read);
+    }
+    return result;
 }
