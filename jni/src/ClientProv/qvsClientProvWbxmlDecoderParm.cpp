@@ -121,6 +121,18 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
     return token;
 }
 
+// Takes the END of a parm element, whose flags the decoder keeps: it has none unless it was masked.
+inline void takeEnd(qvsWbxmlDecoder *decoder, bool isMasked)
+{
+    if (isMasked) [[unlikely]] {
+        (void)takeSeenTag(decoder);
+        return;
+    }
+    ++decoder->ptBuffer->pHead;
+    decoder->nHasContent = 0;
+    decoder->nHasAttr = 0;
+}
+
 const ParmRow *findParm(const ParmTable &table, uint8_t token)
 {
     for (const ParmRow &parm : table.rows) {
@@ -200,14 +212,13 @@ qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvs
 qvsResult qvs::readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t field,
                         uint8_t place)
 {
-    qvsListNode *unknown = nullptr;
-    qvsListNode **end = state->open ? state->open->last + place : &unknown;
-    return readOnto(decoder, state, listAt(record, field), end);
+    return readOnto(decoder, state, listAt(record, field), state->open->last + place);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
 {
-    DecodeState alone;
+    OpenRecord open = {};
+    DecodeState alone = {.open = &open};
     return readParms(decoder, &alone, record, table);
 }
 
@@ -225,7 +236,8 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *rec
     }
     uint8_t token = 0;
     while (peekByte(decoder->ptBuffer, &token)) {
-        if (token == wbxml::kSwitchPage) {
+        const bool behindSwitch = token == wbxml::kSwitchPage;
+        if (behindSwitch) {
             token = skipSwitches(decoder, table);
             if (token == wbxml::kSwitchPage) {
                 break;
@@ -234,7 +246,7 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *rec
         qvsResult result = QVS_OK;
         const bool end = token == wbxml::kEnd;
         if (end) {
-            (void)takeSeenTag(decoder);
+            takeEnd(decoder, behindSwitch);
         } else {
             result = readParm(decoder, state, record, table, token);
         }

@@ -50,8 +50,7 @@ void traceParm(uint8_t token)
 qvsResult readComma(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapAppAuth *record)
 {
     char **types = &record->pszAAuthType;
-    const qvsResult result =
-        commaAdd(decoder, state, types, state->open ? &state->open->joined : nullptr);
+    const qvsResult result = commaAdd(decoder, state, types, &state->open->joined);
     trace("--------------------------[%s]", *types ? *types : "");
     return result;
 }

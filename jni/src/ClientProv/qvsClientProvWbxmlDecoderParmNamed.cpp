@@ -49,8 +49,8 @@ char **findNamed(void *record, const Rows<NamedRow> &names, const Text &name)
     const char *const text = name.str();
     const uint32_t length = name.length;
     for (const NamedRow &known : names) {
-        if (known.name[0] == text[0] && length < sizeof known.name && known.name[length] == '\0' &&
-            memcmp(text, known.name, length) == 0) {
+        if (known.length == length && known.name[0] == *text &&
+            memcmp(known.name, text, length) == 0) {
             return textAt(record, known.field);
         }
     }

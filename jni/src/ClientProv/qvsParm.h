@@ -134,7 +134,8 @@ qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, Record *record,
 
 // A name, and the text that its value goes to.
 struct NamedRow {
-    char name[18];
+    uint8_t length; // of the name
+    char name[17];
     uint8_t field;
 };
 
@@ -144,9 +145,10 @@ struct NamedParm : NamedRow {
     using Row = NamedRow;
 
     template <size_t N>
-    consteval NamedParm(const char (&text)[N], char *Record::*to) : NamedRow{{}, numberOf(to)}
+    consteval NamedParm(const char (&text)[N], char *Record::*to)
+        : NamedRow{N - 1, {}, numberOf(to)}
     {
-        for (size_t i = 0; i < N; ++i) {
+        for (size_t i = 0; i < N - 1; ++i) {
             name[i] = text[i];
         }
     }

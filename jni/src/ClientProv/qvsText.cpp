@@ -169,26 +169,9 @@ inline qvsResult endOfContent(const DecodeState *state, qvsResult result)
     return result;
 }
 
-// Reads a value, which may continue the text `before`. On failure `*text` stays.
-[[gnu::noinline]] qvsResult readNew(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
-                                    const char *before)
-{
-    Text read;
-    read.before = before;
-    read.length = qvsStrlen(before);
-    const qvsResult result = content(decoder, state, &read);
-    if (result == QVS_OK) {
-        *text = read.take();
-    }
-    return result;
-}
-
-// Takes a VALUE and a page switch behind it, up to the value. It may be none, where an END stands.
+// Takes a page switch behind a VALUE, up to the value. It may be none, where an END stands.
 inline qvsResult enterValue(qvsWbxmlDecoder *decoder, bool *present)
 {
-    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
-        return result;
-    }
     uint8_t next = 0;
     bool left = peekByte(decoder->ptBuffer, &next);
     if (left && next == wbxml::kSwitchPage) {
@@ -198,6 +181,24 @@ inline qvsResult enterValue(qvsWbxmlDecoder *decoder, bool *present)
     }
     *present = next != wbxml::kEnd;
     return left ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+}
+
+// Reads what a VALUE carries, as readValue() does.
+[[gnu::noinline]] qvsResult readNew(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                                    const char *before)
+{
+    bool present = false;
+    qvsResult result = enterValue(decoder, &present);
+    Text read;
+    if (result == QVS_OK && present) {
+        read.before = before;
+        read.length = qvsStrlen(before);
+        result = content(decoder, state, &read);
+    }
+    if (result == QVS_OK) {
+        *text = read.take();
+    }
+    return result;
 }
 
 } // namespace
@@ -288,6 +289,9 @@ qvsResult qvs::lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text,
                           ValueReader reader)
 {
+    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
+        return result;
+    }
     bool present = false;
     const qvsResult result = enterValue(decoder, &present);
     return result == QVS_OK && present ? reader(decoder, state, text) : result;
@@ -296,21 +300,16 @@ qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *te
 qvsResult qvs::readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
                          const char *before)
 {
-    bool present = false;
-    qvsResult result = enterValue(decoder, &present);
-    if (result != QVS_OK) {
+    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
         return result;
-    }
-    if (!present) {
-        *text = nullptr;
-        return QVS_OK;
     }
     Piece piece;
     if (before || !takeOnlyPiece(decoder, &piece)) {
         return readNew(decoder, state, text, before);
     }
     char *read = copyOf(state, piece);
-    result = endOfContent(state, read ? qvsResult{QVS_OK} : lackPiece(decoder, piece.unread));
+    const qvsResult result =
+        endOfContent(state, read ? qvsResult{QVS_OK} : lackPiece(decoder, piece.unread));
     if (result == QVS_OK) {
         *text = read;
     } else if (read) {
