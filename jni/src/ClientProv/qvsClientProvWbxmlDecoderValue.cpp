@@ -11,8 +11,12 @@ namespace {
 
 // kept[call-type-join]: a call type joins out of sight, so that the text reads as before.
 constexpr ValueToken kCallTypes[] = {
-    {0x90, "ANALOG-MODEM", Join::kHidden}, {0x91, "V.120", Join::kHidden},           {0x92, "V.110", Join::kHidden},
-    {0x93, "X.31", Join::kHidden},         {0x94, "BIT-TRANSPARENT", Join::kHidden}, {0x95, "DIRECT-ASYNCHRONOUS-DATA-SERVICE", Join::kHidden},
+    {0x90, "ANALOG-MODEM", Join::kHidden},
+    {0x91, "V.120", Join::kHidden},
+    {0x92, "V.110", Join::kHidden},
+    {0x93, "X.31", Join::kHidden},
+    {0x94, "BIT-TRANSPARENT", Join::kHidden},
+    {0x95, "DIRECT-ASYNCHRONOUS-DATA-SERVICE", Join::kHidden},
 };
 
 constexpr ValueToken kAuthSchemes[] = {
