@@ -707,6 +707,8 @@ TEST_F(TextLimit, CountsTheTextThatALaterPairContinues)
     bytes.push_back(0x01);
     Decoder decoder(bytes);
     qvs::DecodeState state = qvs::wholeDecode(decoder);
+    qvs::OpenRecord open = {};
+    state.open = &open;
     qvsWapPxPhysical record = {};
     static constexpr qvs::Parm<qvsWapPxPhysical> kDomain = {0x17, &qvsWapPxPhysical::ptDomainList};
     EXPECT_EQ(qvs::readList(decoder, &state, &record, kDomain), 4111U);

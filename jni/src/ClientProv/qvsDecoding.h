@@ -31,7 +31,7 @@ struct OpenRecord {
 struct DecodeState {
     uint64_t textLeft = UINT64_MAX; // bytes of text that may still be read or appended
     bool textLimit = false;         // the texts of the message passed their limit
-    OpenRecord *open = nullptr;     // the record being read by the body
+    OpenRecord *open = nullptr;     // the record being read; whoever reads parms gives one
     qvsArena *arena = nullptr;      // of nodes and lists
 };
 
