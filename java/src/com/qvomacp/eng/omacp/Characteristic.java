@@ -1,97 +1,107 @@
 package com.qvomacp.eng.omacp;
 
-import java.util.Arrays;
 import java.util.List;
 
-/** What all snapshots share: the parameters by their names, and what stands beside them. */
-abstract class Characteristic {
-    /** The names and values of a characteristic of which every parameter is a list. */
-    static final String[] NONE = {};
-
-    private static final List<String> SECRETS =
-            Arrays.asList(
-                    "PROXY-PW", "PXAUTH-PW", "AUTHSECRET", "AAUTHSECRET", "AAUTHDATA", "PASSWORD");
-
-    private final String[] names;
-    private final String[] values;
-    private final Object[] parts;
-
-    /**
-     * Takes what the library has answered.
-     *
-     * @param names what the elements of {@code values} are called; null for one without a name
-     * @param values at least as many as there are names; belongs to the snapshot from now on
-     * @param parts everything else that makes two snapshots equal
-     */
-    Characteristic(String[] names, String[] values, Object... parts) {
-        this.names = names;
-        this.values = values;
-        this.parts = parts;
-    }
-
-    final String value(String name) {
-        for (int i = 0; i < names.length; ++i) {
-            if (name.equals(names[i])) {
-                return values[i];
-            }
-        }
-        throw new IllegalArgumentException(name);
+/**
+ * A characteristic of a provisioning document: a type, such as {@code NAPDEF}, and what stands in
+ * it, in the order of the message.
+ *
+ * <pre>{@code
+ * for (Characteristic access : document.characteristics("NAPDEF")) {
+ *     System.out.println(access.value("NAPID") + ": " + access.values("BEARER"));
+ * }
+ * }</pre>
+ */
+public final class Characteristic extends Item {
+    Characteristic(Characteristic parent, int offset, int end) {
+        super(parent, offset, end);
     }
 
     /**
-     * Compares everything that the message sets.
+     * Tells the type.
      *
-     * @param other what to compare with
-     * @return true for an object of the same class that sets the same
+     * @return TYPE as the OMA documents write it, such as {@code NAPDEF}; {@code null} when the
+     *     characteristic has none
      */
-    @Override
-    public final boolean equals(Object other) {
-        if (other == null || other.getClass() != getClass()) {
-            return false;
-        }
-        Characteristic that = (Characteristic) other;
-        return Arrays.equals(values, that.values) && Arrays.equals(parts, that.parts);
+    public String type() {
+        throw new UnsupportedOperationException();
     }
 
     /**
-     * Answers a number that fits {@link #equals}.
+     * Tells how the type is written.
      *
-     * @return the same number for equal objects
+     * @return how; {@code null} without a type
      */
-    @Override
-    public final int hashCode() {
-        return 31 * Arrays.hashCode(values) + Arrays.hashCode(parts);
+    public Writing typeWriting() {
+        throw new UnsupportedOperationException();
     }
 
     /**
-     * Shows what is set, for logs: passwords and their like are shown as {@code ***}.
+     * Lists what stands in the characteristic.
      *
-     * @return one line of text
+     * @return every item, in the order of the message; not modifiable
      */
-    @Override
-    public final String toString() {
-        StringBuilder text = new StringBuilder(getClass().getSimpleName()).append('{');
-        String separator = "";
-        for (int i = 0; i < names.length; ++i) {
-            if (names[i] != null && values[i] != null) {
-                text.append(separator).append(names[i]).append('=');
-                text.append(SECRETS.contains(names[i]) ? "***" : values[i]);
-                separator = ", ";
-            }
-        }
-        for (Object part : parts) {
-            if (isShown(part)) {
-                text.append(separator).append(part);
-                separator = ", ";
-            }
-        }
-        return text.append('}').toString();
+    public List<Item> children() {
+        throw new UnsupportedOperationException();
     }
 
-    /** Counts and the like say little without their names. */
-    private static boolean isShown(Object part) {
-        return part instanceof List
-                ? !((List<?>) part).isEmpty()
-                : part instanceof Characteristic || part instanceof PushHeader;
+    /**
+     * Lists the parameters that stand directly in the characteristic.
+     *
+     * @return every parameter, in the order of the message; not modifiable
+     */
+    public List<Parameter> parameters() {
+        throw new UnsupportedOperationException();
+    }
+
+    /**
+     * Lists the characteristics that stand directly in this one.
+     *
+     * @return every characteristic, in the order of the message; not modifiable
+     */
+    public List<Characteristic> characteristics() {
+        throw new UnsupportedOperationException();
+    }
+
+    /**
+     * Lists the characteristics of a type that stand directly in this one.
+     *
+     * @param type what TYPE is, in exactly this case
+     * @return all of them, in the order of the message; not modifiable
+     */
+    public List<Characteristic> characteristics(String type) {
+        throw new UnsupportedOperationException();
+    }
+
+    /**
+     * Finds a parameter.
+     *
+     * @param name what NAME is, in exactly this case
+     * @return the first parameter of that name; {@code null} when there is none
+     */
+    public Parameter parameter(String name) {
+        throw new UnsupportedOperationException();
+    }
+
+    /**
+     * Tells the value of a parameter.
+     *
+     * @param name what NAME is, in exactly this case
+     * @return the value of the first parameter of that name; {@code null} when there is none, and
+     *     when it has no value
+     */
+    public String value(String name) {
+        throw new UnsupportedOperationException();
+    }
+
+    /**
+     * Lists the values of all parameters of a name.
+     *
+     * @param name what NAME is, in exactly this case
+     * @return the values, in the order of the message, without those parameters that have none; not
+     *     modifiable
+     */
+    public List<String> values(String name) {
+        throw new UnsupportedOperationException();
     }
 }

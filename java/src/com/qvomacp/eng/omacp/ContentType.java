@@ -1,65 +1,36 @@
 package com.qvomacp.eng.omacp;
 
-/** The content types that the library takes, with the codes that WSP assigns to them. */
-public enum ContentType {
-    /** A provisioning document in WBXML, which is what provisioning servers send. */
-    CONNECTIVITY_WBXML(54, "application/vnd.wap.connectivity-wbxml"),
+import java.util.List;
 
-    /** A provisioning document in XML; the library reads its body as WBXML all the same. */
-    CONNECTIVITY_XML(53, "application/vnd.wap.connectivity-xml"),
+/** The content type of a push: a media type and its parameters. Immutable. */
+public final class ContentType {
+    private ContentType() {}
 
-    /** A notification of SyncML device management. */
-    SYNCML_NOTIFICATION(68, "application/vnd.syncml.notification"),
-
-    /** A notification of SyncML data synchronisation. */
-    SYNCML_DS_NOTIFICATION(78, "application/vnd.syncml.ds.notification"),
-
-    /** A message of SyncML device management in WBXML. */
-    SYNCML_DM_WBXML(66, "application/vnd.syncml.dm+wbxml");
-
-    private final int code;
-    private final String mediaType;
-
-    ContentType(int code, String mediaType) {
-        this.code = code;
-        this.mediaType = mediaType;
+    /**
+     * Tells the media type.
+     *
+     * @return in lower case, such as {@code application/vnd.wap.connectivity-wbxml}; a printable name
+     *     for a number that stands for none
+     */
+    public String mediaType() {
+        throw new UnsupportedOperationException();
     }
 
     /**
-     * Tells the code of the content type.
+     * Tells the number that WSP assigns to the media type.
      *
-     * @return the code without its high bit, such as 54
+     * @return the number, such as 54; -1 when the media type is given as text and has none
      */
-    public int getCode() {
-        return code;
+    public int code() {
+        throw new UnsupportedOperationException();
     }
 
     /**
-     * Tells the name of the content type.
+     * Lists the parameters.
      *
-     * @return the media type, such as {@code application/vnd.wap.connectivity-wbxml}
+     * @return every parameter, in the order of the message; not modifiable
      */
-    public String getMediaType() {
-        return mediaType;
-    }
-
-    /** The content type with a code; null for a code that is none of these. */
-    static ContentType ofCode(int code) {
-        for (ContentType type : values()) {
-            if (type.code == code) {
-                return type;
-            }
-        }
-        return null;
-    }
-
-    /** The content type with a name, in exactly this case; null for any other name. */
-    static ContentType named(String mediaType) {
-        for (ContentType type : values()) {
-            if (type.mediaType.equals(mediaType)) {
-                return type;
-            }
-        }
-        return null;
+    public List<HeaderField> parameters() {
+        throw new UnsupportedOperationException();
     }
 }

@@ -1,85 +1,97 @@
 package com.qvomacp.eng.omacp;
 
-/** Says that a message cannot be parsed, and why. */
+import java.util.ArrayList;
+import java.util.Collections;
+import java.util.List;
+
+/** Says that a message cannot be read, or is refused, and why and where. */
 public final class ProvisioningException extends Exception {
-    private static final long serialVersionUID = 1L;
+    private static final long serialVersionUID = 2L;
 
-    /** Why a message cannot be parsed. */
+    /** Why a message is not read. */
     public enum Reason {
-        /** There is no message: null, or not a single byte. */
-        NO_MESSAGE,
+        /** The message is longer than the options allow. */
+        INPUT_TOO_LONG,
 
-        /** The message is not a connectionless WSP push. */
-        NOT_A_PUSH,
+        /** The texts of the document are more than the options allow. */
+        TEXT_TOO_LONG,
 
-        /** The message ends within the push header. */
-        HEADER_CUT_OFF,
+        /** The message does not begin with the header of a push, or ends within it. */
+        NO_PUSH_HEADER,
 
-        /** The content type is none of {@link ContentType}. */
-        UNKNOWN_CONTENT_TYPE,
+        /** The body is no WBXML, or none at all. */
+        NO_WBXML,
 
-        /** The MAC of the push header does not end within the message, or is too long. */
-        BAD_MAC,
+        /** The body is a document of another type. */
+        OTHER_DOCUMENT_TYPE,
 
-        /** The message ends with its push header. */
-        EMPTY_BODY,
-
-        /** The body is not a provisioning document that the library can decode. */
-        BODY_REFUSED
+        /** The native library refuses the message, and the options ask for that to count. */
+        REFUSED
     }
 
-    /** Why the message was refused. */
     private final Reason reason;
+    private final int code;
+    private final int offset;
+    private final String path;
+    private final ArrayList<String> expected;
 
-    /** The decoder's result code; null without its word. */
-    private final Integer resultCode;
-
-    /** How many bytes of the body the decoder had read; null without its word. */
-    private final Integer bodyOffset;
-
-    ProvisioningException(Reason reason, String text) {
-        this(reason, text, null);
+    ProvisioningException(Reason reason, int offset, String text) {
+        this(reason, 0, offset, null, Collections.<String>emptyList(), text);
     }
 
-    ProvisioningException(Reason reason, String text, NativeDecoder decoder) {
+    ProvisioningException(
+            Reason reason, int code, int offset, String path, List<String> expected, String text) {
         super(text);
         this.reason = reason;
-        this.resultCode = decoder == null ? null : decoder.code;
-        this.bodyOffset = decoder == null ? null : decoder.read;
+        this.code = code;
+        this.offset = offset;
+        this.path = path;
+        this.expected = new ArrayList<>(expected);
     }
 
     /**
-     * Tells why the message cannot be parsed. {@link #getMessage} says the same in words.
+     * Tells why the message is not read. {@link #getMessage} says the same in words.
      *
      * @return the reason, never {@code null}
      */
-    public Reason getReason() {
+    public Reason reason() {
         return reason;
     }
 
     /**
-     * Tells the library's result code for a body that it refuses.
+     * Tells the native library's result code for a body that it refuses: {@link Verdict#code}.
      *
-     * <p>The codes are those of {@code qvsresult.h}: 4101 for an element, attribute or token that is
-     * unknown or out of place, 4103 when the data ends or a text has no end, 4107 for another kind
-     * of document, 4111 when the texts of the body are too much, 2 for an empty body; 0 when it can
-     * be decoded and holds no document.
-     *
-     * @return the result code; {@code null} when the push header is refused, and when the library
-     *     {@code omacp_explain}, which asks the decoder, is not beside the library
+     * @return the code; 0 for any other reason
      */
-    public Integer getResultCode() {
-        return resultCode;
+    public int code() {
+        return code;
     }
 
     /**
-     * Tells how far the decoder had come in a body that it refuses. The byte that it refuses is
-     * the one at this offset, or the last one in front of it.
+     * Tells where the reading ends: in the message for {@link Reason#NO_PUSH_HEADER} and for a header
+     * that is refused, in the body otherwise.
      *
-     * @return bytes from the start of the body, up to its length; {@code null} where {@link
-     *     #getResultCode} is
+     * @return bytes from the start, counted from 0
      */
-    public Integer getBodyOffset() {
-        return bodyOffset;
+    public int offset() {
+        return offset;
+    }
+
+    /**
+     * Tells in which element the reading ends, as {@link Deviation#path} does.
+     *
+     * @return the path; {@code null} outside a document
+     */
+    public String path() {
+        return path;
+    }
+
+    /**
+     * Lists what would have been taken where the reading ends.
+     *
+     * @return what would have been taken; not modifiable, empty when that cannot be said
+     */
+    public List<String> expected() {
+        return Collections.unmodifiableList(expected);
     }
 }

@@ -1,220 +1,76 @@
 package com.qvomacp.eng.omacp;
 
-import java.util.List;
-
 /**
- * What a pushed provisioning message sets: an immutable snapshot of everything that the library
- * answers about it.
+ * What a pushed provisioning message sets. Immutable.
  *
  * <pre>{@code
- * ProvisioningMessage message = ProvisioningMessage.parse(bytes);
- * if (message.verifyMac("1234")) {
- *     for (AccessPoint accessPoint : message.getAccessPoints()) {
- *         System.out.println(accessPoint.getName() + ": " + accessPoint.getAddress());
+ * ProvisioningMessage message = ProvisioningMessage.parsePush(bytes);
+ * if (message.verifyMac("1234", null) == MacResult.RIGHT) {
+ *     for (AccessPoint accessPoint : message.accessPoints()) {
+ *         System.out.println(accessPoint.name() + ": " + accessPoint.address());
  *     }
  * }
  * }</pre>
  */
-public final class ProvisioningMessage extends Characteristic {
-    private static final String[] NAMES = {"CLIENT-ID"};
-
+public final class ProvisioningMessage {
     private final PushHeader header;
-    private final List<Proxy> proxies;
-    private final List<AccessPoint> accessPoints;
-    private final List<Bootstrap> bootstraps;
-    private final List<VendorConfiguration> vendorConfigurations;
-    private final List<Application> applications;
-    private final List<AccessRule> accessRules;
-    private final List<Wifi> wifis;
-    private final List<VoWifi> voWifis;
+    private final ProvisioningDocument document;
 
-    ProvisioningMessage(
-            PushHeader header,
-            String clientId,
-            List<Proxy> proxies,
-            List<AccessPoint> accessPoints,
-            List<Bootstrap> bootstraps,
-            List<VendorConfiguration> vendorConfigurations,
-            List<Application> applications,
-            List<AccessRule> accessRules,
-            List<Wifi> wifis,
-            List<VoWifi> voWifis) {
-        super(
-                NAMES,
-                new String[] {clientId},
-                header,
-                proxies,
-                accessPoints,
-                bootstraps,
-                vendorConfigurations,
-                applications,
-                accessRules,
-                wifis,
-                voWifis);
+    ProvisioningMessage(PushHeader header, ProvisioningDocument document) {
         this.header = header;
-        this.proxies = proxies;
-        this.accessPoints = accessPoints;
-        this.bootstraps = bootstraps;
-        this.vendorConfigurations = vendorConfigurations;
-        this.applications = applications;
-        this.accessRules = accessRules;
-        this.wifis = wifis;
-        this.voWifis = voWifis;
+        this.document = document;
     }
 
     /**
-     * Parses a pushed message. The MAC is not checked: see {@link #verifyMac(String)}.
+     * Reads a push with the usual limits.
      *
-     * <p>May be called from many threads: they take turns, since the library parses one message at
-     * a time. The natives find a record by counting up to it, so that the time grows with the square
-     * of the number of characteristics of one kind: a hostile message of 64 KiB takes half a second,
-     * one of 300 KiB half a minute. Refuse what is longer than a push can be.
-     *
-     * @param message the push as it was received, from its transaction identifier on; it is not
-     *     kept, and must not change during the call
-     * @return what the message sets
-     * @throws ProvisioningException when the message cannot be parsed, {@code null} included
-     * @throws UnsatisfiedLinkError when the native library cannot be loaded
+     * @param push the push as it was received, from its transaction identifier on; it is copied
+     * @return what it says
+     * @throws ProvisioningException when it is over a limit, does not begin with a push header, or
+     *     its body is no WBXML or a document of another type
      */
-    public static ProvisioningMessage parse(byte[] message) throws ProvisioningException {
-        return new MessageReader().parse(message);
+    public static ProvisioningMessage parsePush(byte[] push) throws ProvisioningException {
+        return parsePush(push, ReadOptions.DEFAULT);
     }
 
     /**
-     * Parses the push header of a message alone, whatever its body holds: enough to check the MAC
-     * before the body is looked at.
+     * Reads a push.
      *
-     * @param message the push as it was received, from its transaction identifier on; it is not
-     *     kept, and must not change during the call
-     * @return what the push header states
-     * @throws ProvisioningException when the push header cannot be parsed, or there is none
-     * @throws UnsatisfiedLinkError when the native library cannot be loaded
+     * @param push the push as it was received, from its transaction identifier on; it is copied
+     * @param options the limits, and whether what the native library refuses is refused
+     * @return what it says
+     * @throws ProvisioningException as {@link #parsePush(byte[])}, and as the options ask for
      */
-    public static PushHeader parseHeader(byte[] message) throws ProvisioningException {
-        return new MessageReader().parseHeader(message);
+    public static ProvisioningMessage parsePush(byte[] push, ReadOptions options)
+            throws ProvisioningException {
+        throw new UnsupportedOperationException();
     }
 
     /**
-     * Tells what the push header states.
+     * Tells the push header.
      *
-     * @return the push header, never {@code null}
+     * @return the header; {@code null} when a body alone was read
      */
-    public PushHeader getHeader() {
+    public PushHeader header() {
         return header;
     }
 
     /**
-     * Checks the MAC with the PIN that the user has been told: {@link
-     * PushHeader#verifyMac(String)}.
+     * Tells the document, with all that the message says.
      *
-     * @param pin what the user has been told, or {@code null}
-     * @return true when the MAC is right
+     * @return the document, never {@code null}
      */
-    public boolean verifyMac(String pin) {
-        return header.verifyMac(pin);
+    public ProvisioningDocument document() {
+        return document;
     }
 
     /**
-     * Checks the MAC with the subscriber's number: {@link PushHeader#verifyMacWithImsi}.
+     * Finds out whether the native library takes the message, its header and its body. It is worked
+     * out at each call.
      *
-     * @param imsi the subscriber's number, or {@code null}
-     * @return true when the MAC is right
+     * @return the verdict, never {@code null}
      */
-    public boolean verifyMacWithImsi(String imsi) {
-        return header.verifyMacWithImsi(imsi);
-    }
-
-    /**
-     * Checks the MAC by whichever security method the message states: {@link
-     * PushHeader#verifyMac(String, String)}.
-     *
-     * @param pin what the user has been told, or {@code null}
-     * @param imsi the subscriber's number, or {@code null}
-     * @return true when the MAC is right
-     */
-    public boolean verifyMac(String pin, String imsi) {
-        return header.verifyMac(pin, imsi);
-    }
-
-    /**
-     * Lists the proxies.
-     *
-     * @return every PXLOGICAL, in the order of the message; not modifiable
-     */
-    public List<Proxy> getProxies() {
-        return proxies;
-    }
-
-    /**
-     * Lists the network access points.
-     *
-     * @return every NAPDEF, in the order of the message; not modifiable
-     */
-    public List<AccessPoint> getAccessPoints() {
-        return accessPoints;
-    }
-
-    /**
-     * Lists where further provisioning comes from.
-     *
-     * @return every BOOTSTRAP, in the order of the message; not modifiable
-     */
-    public List<Bootstrap> getBootstraps() {
-        return bootstraps;
-    }
-
-    /**
-     * Tells the identity that the client gets.
-     *
-     * @return CLIENT-ID of the first CLIENTIDENTITY, or {@code null} when the message does not set
-     *     it
-     */
-    public String getClientId() {
-        return value("CLIENT-ID");
-    }
-
-    /**
-     * Lists what vendors' own software is told.
-     *
-     * @return every VENDORCONFIG, in the order of the message; not modifiable
-     */
-    public List<VendorConfiguration> getVendorConfigurations() {
-        return vendorConfigurations;
-    }
-
-    /**
-     * Lists the settings of applications.
-     *
-     * @return every APPLICATION, in the order of the message; not modifiable
-     */
-    public List<Application> getApplications() {
-        return applications;
-    }
-
-    /**
-     * Lists which traffic takes which way.
-     *
-     * @return every ACCESS, in the order of the message; not modifiable
-     */
-    public List<AccessRule> getAccessRules() {
-        return accessRules;
-    }
-
-    /**
-     * Lists the Wi-Fi networks.
-     *
-     * @return every WI-FI, in the order of the message; not modifiable
-     */
-    public List<Wifi> getWifis() {
-        return wifis;
-    }
-
-    /**
-     * Lists the settings for voice over Wi-Fi.
-     *
-     * @return every such characteristic, in the order of the message; not modifiable
-     */
-    public List<VoWifi> getVoWifis() {
-        return voWifis;
+    public Verdict verdict() {
+        throw new UnsupportedOperationException();
     }
 }

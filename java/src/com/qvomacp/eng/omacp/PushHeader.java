@@ -1,61 +1,66 @@
 package com.qvomacp.eng.omacp;
 
-import java.util.Arrays;
+import java.util.List;
 
 /**
- * The push header of a message, and what checks the MAC that it carries. The MAC can be checked
- * before the body is decoded: see {@link ProvisioningMessage#parseHeader}.
+ * The header of a push, by the Wireless Session Protocol (WAP-230): content type, security method,
+ * MAC, and whatever else the sender has put there. Immutable.
+ *
+ * <pre>{@code
+ * PushHeader header = PushHeader.parse(push);
+ * System.out.println(header.contentType().mediaType() + " " + header.securityMethod());
+ * }</pre>
  */
 public final class PushHeader {
-    private final ContentType contentType;
-    private final int headerLength;
-    private final int sec;
-    private final String mac;
-    private final byte[] body;
+    private PushHeader() {}
 
-    PushHeader(ContentType contentType, int headerLength, int sec, String mac, byte[] body) {
-        this.contentType = contentType;
-        this.headerLength = headerLength;
-        this.sec = sec;
-        this.mac = mac;
-        this.body = body;
+    /**
+     * Reads the header of a push, whatever follows it.
+     *
+     * @param push a push, from its transaction identifier on
+     * @return the header
+     * @throws ProvisioningException when the bytes do not begin with the header of a push
+     */
+    public static PushHeader parse(byte[] push) throws ProvisioningException {
+        throw new UnsupportedOperationException();
     }
 
     /**
-     * Tells the content type of the message.
+     * Reads the headers of a push alone, from the content type on, as a platform hands them out.
      *
-     * @return the content type, with its code and its name; never {@code null}
+     * @param headers the content type and the headers behind it
+     * @return the header, without transaction identifier
+     * @throws ProvisioningException when the bytes are no headers of a push
      */
-    public ContentType getContentType() {
-        return contentType;
+    public static PushHeader parseHeaders(byte[] headers) throws ProvisioningException {
+        throw new UnsupportedOperationException();
     }
 
     /**
-     * Tells how long the headers are. The body stands behind them, and behind the three bytes in
-     * front of them.
+     * Tells the transaction identifier.
      *
-     * @return bytes, 0 to 255
+     * @return 0 to 255; -1 when the headers were read alone
      */
-    public int getHeaderLength() {
-        return headerLength;
+    public int transactionIdentifier() {
+        throw new UnsupportedOperationException();
     }
 
     /**
-     * Tells how long the body is.
+     * Tells how long the header is.
      *
-     * @return bytes
+     * @return bytes from the start of what was read to the body
      */
-    public int getBodyLength() {
-        return body.length;
+    public int length() {
+        throw new UnsupportedOperationException();
     }
 
     /**
-     * Tells the body, over which the MAC is computed.
+     * Tells the content type with its parameters.
      *
-     * @return a new array
+     * @return the content type, never {@code null}
      */
-    public byte[] getBody() {
-        return body.clone();
+    public ContentType contentType() {
+        throw new UnsupportedOperationException();
     }
 
     /**
@@ -64,141 +69,26 @@ public final class PushHeader {
      * @return the method that SEC states; {@link SecurityMethod#NONE} without SEC, {@link
      *     SecurityMethod#UNKNOWN} for a SEC that states none of them; never {@code null}
      */
-    public SecurityMethod getSecurityMethod() {
-        return SecurityMethod.ofSec(sec);
-    }
-
-    /**
-     * Tells SEC as the message states it.
-     *
-     * @return the byte as sent, such as 0x81, or 0 when the message does not state it
-     */
-    public int getSec() {
-        return sec;
+    public SecurityMethod securityMethod() {
+        throw new UnsupportedOperationException();
     }
 
     /**
      * Tells the MAC as the message states it, which does not say that it is right.
      *
-     * @return the MAC, usually 40 hexadecimal digits, or {@code null} when the message carries none
+     * @return the MAC, 40 hexadecimal digits when it can be one; {@code null} when the message
+     *     carries none
      */
-    public String getMac() {
-        return mac;
+    public String mac() {
+        throw new UnsupportedOperationException();
     }
 
     /**
-     * Checks the MAC of a message that is secured by what the user has been told: {@link
-     * SecurityMethod#USERPIN} or {@link SecurityMethod#USERPINMAC}. The same as {@link
-     * #verifyMac(String, String) verifyMac(pin, null)}.
+     * Lists the headers behind the content type.
      *
-     * @param pin what the user has been told, or {@code null}
-     * @return true when the message carries the right MAC
+     * @return every header, in the order of the message; not modifiable
      */
-    public boolean verifyMac(String pin) {
-        return verifyMac(pin, null);
-    }
-
-    /**
-     * Checks the MAC of a message that is secured by the subscriber's number: {@link
-     * SecurityMethod#NETWPIN}. The same as {@link #verifyMac(String, String) verifyMac(null,
-     * imsi)}.
-     *
-     * @param imsi the subscriber's number, or {@code null}
-     * @return true when the message carries the right MAC
-     */
-    public boolean verifyMacWithImsi(String imsi) {
-        return verifyMac(null, imsi);
-    }
-
-    /**
-     * Checks the MAC by whichever security method the message states.
-     *
-     * <p>The MAC is the HMAC-SHA1 of the body. Its key, as OMA Provisioning Bootstrap defines it:
-     *
-     * <ul>
-     *   <li>{@link SecurityMethod#NETWPIN}: the IMSI in semi-octets, as it stands on a SIM card.
-     *   <li>{@link SecurityMethod#USERPIN}: the characters of the PIN.
-     *   <li>{@link SecurityMethod#USERNETWPIN}: that of the IMSI and then that of the PIN.
-     *   <li>{@link SecurityMethod#USERPINMAC}: the first half of the PIN, whose second half is the
-     *       MAC, a decimal digit for each of its first bytes. The PIN has an even number of digits,
-     *       10 to 40. A MAC in the push header is not looked at.
-     * </ul>
-     *
-     * <p>MACs are compared in a time that does not depend on where they differ. Small and capital
-     * hexadecimal digits are the same.
-     *
-     * @param pin what the user has been told; may be {@code null} for NETWPIN
-     * @param imsi the subscriber's number, 1 to 15 digits; may be {@code null} unless the method
-     *     has NETWPIN in its name
-     * @return true when the MAC is right; false when it is not, when the message states no security
-     *     method, one that is unknown, or carries no MAC, and when the PIN or the number that the
-     *     method needs is missing, empty or not made as said above
-     */
-    public boolean verifyMac(String pin, String imsi) {
-        return MacVerifier.verify(getSecurityMethod(), mac, body, pin, imsi);
-    }
-
-    /**
-     * Checks the MAC that the push header carries with a key that the caller has made: for a
-     * network whose subscribers have no IMSI.
-     *
-     * @param key the bytes of the key, or {@code null}
-     * @return true when the message carries a MAC and it is right; false when it is not, when there
-     *     is none, and without a key
-     */
-    public boolean verifyMacWithKey(byte[] key) {
-        return MacVerifier.verify(mac, body, key);
-    }
-
-    /** The first byte of a body that is not empty. */
-    byte firstBodyByte() {
-        return body[0];
-    }
-
-    /**
-     * Compares all that the header states, and the bodies.
-     *
-     * @param other what to compare with
-     * @return true for a header that states the same in front of the same body
-     */
-    @Override
-    public boolean equals(Object other) {
-        if (!(other instanceof PushHeader)) {
-            return false;
-        }
-        PushHeader that = (PushHeader) other;
-        return contentType == that.contentType
-                && headerLength == that.headerLength
-                && sec == that.sec
-                && (mac == null ? that.mac == null : mac.equals(that.mac))
-                && Arrays.equals(body, that.body);
-    }
-
-    /**
-     * Answers a number that fits {@link #equals}.
-     *
-     * @return the same number for equal headers
-     */
-    @Override
-    public int hashCode() {
-        return 31 * (31 * contentType.getCode() + sec) + Arrays.hashCode(body);
-    }
-
-    /**
-     * Shows what the header states.
-     *
-     * @return one line of text
-     */
-    @Override
-    public String toString() {
-        return "PushHeader{"
-                + contentType.getMediaType()
-                + ", SEC="
-                + getSecurityMethod()
-                + ", MAC="
-                + mac
-                + ", "
-                + body.length
-                + " bytes}";
+    public List<HeaderField> fields() {
+        throw new UnsupportedOperationException();
     }
 }

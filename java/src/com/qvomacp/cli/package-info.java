@@ -1,2 +1,0 @@
-/** The command-line program that shows what a pushed provisioning message sets. */
-package com.qvomacp.cli;
