@@ -10,8 +10,10 @@ import java.util.List;
  *
  * <pre>{@code
  * ProvisioningMessage message = ProvisioningMessage.parsePush(push);
- * for (AccessPoint accessPoint : message.accessPoints()) {
- *     System.out.println(accessPoint.name() + ": " + accessPoint.address());
+ * if (message.verifyMac("1234", null) == MacResult.RIGHT) {
+ *     for (AccessPoint accessPoint : message.accessPoints()) {
+ *         System.out.println(accessPoint.name() + ": " + accessPoint.address());
+ *     }
  * }
  * }</pre>
  *
@@ -149,6 +151,35 @@ public final class ProvisioningMessage {
             return document.verdict();
         }
         throw new UnsupportedOperationException();
+    }
+
+    /**
+     * Checks the MAC by whichever security method the message states: {@link ProvisioningMac#verify}.
+     *
+     * @param pin what the user has been told; may be {@code null} for NETWPIN
+     * @param imsi the subscriber's number, 1 to 15 digits; may be {@code null} unless the method has
+     *     NETWPIN in its name
+     * @return what comes of it, never {@code null}; {@link MacResult#NO_METHOD} for a body alone
+     */
+    public MacResult verifyMac(String pin, String imsi) {
+        return header == null
+                ? MacResult.NO_METHOD
+                : ProvisioningMac.verify(
+                        header.securityMethod(), header.mac(), document.body(), pin, imsi);
+    }
+
+    /**
+     * Checks the MAC with a key that the caller has made, for a network whose subscribers have no
+     * IMSI.
+     *
+     * @param key the bytes of the key
+     * @return what comes of it, never {@code null}; {@link MacResult#NO_METHOD} for a body alone
+     */
+    public MacResult verifyMac(byte[] key) {
+        return header == null
+                ? MacResult.NO_METHOD
+                : ProvisioningMac.verify(
+                        header.securityMethod(), header.mac(), document.body(), key);
     }
 
     /**
