@@ -1,6 +1,13 @@
 package com.qvomacp.eng.omacp;
 
-/** Is told what each byte of a message means, in order, without a gap and without an overlap. */
+/**
+ * Is told what each byte of a message means, in order, without a gap and without an overlap.
+ *
+ * <pre>{@code
+ * header.describe(
+ *         (offset, length, depth, meaning) -> System.out.println(offset + ": " + meaning));
+ * }</pre>
+ */
 public interface ByteVisitor {
     /**
      * Some bytes that mean something together.
