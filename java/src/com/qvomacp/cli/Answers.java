@@ -35,6 +35,7 @@ final class Answers {
 
     // The names of the elements of each array that is answered; - stands for one without a name.
 
+    private static final String[] METHODS = names("NETWPIN USERPIN USERNETWPIN USERPINMAC");
     private static final String[] PXLOGICAL =
             names("PROXY-ID PROXY-PW PPGAUTH-TYPE PROXY-PROVIDER-ID NAME TRUST MASTER STARTPAGE");
     private static final String[] PXAUTHINFO = names("PXAUTH-TYPE PXAUTH-ID PXAUTH-PW");
@@ -61,8 +62,7 @@ final class Answers {
                     "APPID PROVIDER-ID FROM NAME AACCEPT APROTOCOL INTERNET XCAP_AUID_DCS"
                             + " XCAP_AUID_PMS XCAP_AUID_CDMS XCAP_IMEI_HEADER XCAP_TID_HEADER");
     private static final String[] APPADDR = names("ADDR ADDRTYPE");
-    private static final String[] APPAUTH =
-            names("AAUTHLEVEL AAUTHTYPE AAUTHNAME AAUTHSECRET AAUTHDATA");
+    private static final String[] APPAUTH = names("AAUTHLEVEL AAUTHTYPE AAUTHNAME AAUTHSECRET AAUTHDATA");
     private static final String[] RESOURCE =
             names("URI NAME AACCEPT AAUTHTYPE AAUTHNAME AAUTHSECRET AAUTHDATA STARTPAGE");
     private static final String[] ROAMING = names("SYNC-ALLOWED SYNC-DEFAULT");
@@ -133,7 +133,8 @@ final class Answers {
         listener.single("Body length", "" + parser.qvomacp_GetParserBodyLen());
         int sec = parser.qvomacp_GetParserSEC();
         if (sec != 0) {
-            listener.single("SEC", Integer.toString(sec));
+            int method = sec & 0x7F;
+            listener.single("SEC", method < METHODS.length ? METHODS[method] : "UNKNOWN");
         }
         byte[] mac = parser.qvomacp_GetParserMAC();
         if (mac.length > 0) {
@@ -147,17 +148,11 @@ final class Answers {
         each("NAPDEF", napDefs.qvomacp_GetPxNapDefCount(), this::napDef);
         each("BOOTSTRAP", bootstraps.qvomacp_GetPxBootstrapCount(), this::bootstrap);
         String clientId = identity.qvomacp_GetPxClientIdentityData();
-        each(
-                "CLIENTIDENTITY",
-                clientId == null ? 0 : 1,
-                only -> listener.single("CLIENT-ID", clientId));
+        each("CLIENTIDENTITY", clientId == null ? 0 : 1, only -> listener.single("CLIENT-ID", clientId));
         each("VENDORCONFIG", vendorConfigs.qvomacp_GetPxVenderConfigCount(), this::vendorConfig);
         each("APPLICATION", applications.qvomacp_GetPxApplicationCount(), this::application);
         each("ACCESS", accesses.qvomacp_GetPxCtxAccessCount(), this::access);
-        each(
-                "WI-FI",
-                wifis.qvomacp_GetPxWifiCount(),
-                w -> array(WIFI, wifis.qvomacp_GetPxWifiData(w)));
+        each("WI-FI", wifis.qvomacp_GetPxWifiCount(), w -> array(WIFI, wifis.qvomacp_GetPxWifiData(w)));
         each(
                 "Vodafone VoWiFi",
                 voWifis.qvomacp_GetPxVoWifiCount(),
@@ -197,10 +192,7 @@ final class Answers {
 
     private void pxLogical(int p) {
         array(PXLOGICAL, proxies.qvomacp_GetProxyData(p));
-        list(
-                "DOMAIN",
-                proxies.qvomacp_GetPxDomainCount(p),
-                d -> proxies.qvomacp_GetPxDomainData(p, d));
+        list("DOMAIN", proxies.qvomacp_GetPxDomainCount(p), d -> proxies.qvomacp_GetPxDomainData(p, d));
         each(
                 "PXAUTHINFO",
                 proxies.qvomacp_GetPxAuthInfoCount(p),
@@ -238,14 +230,8 @@ final class Answers {
 
     private void napDef(int n) {
         napDefArray(napDefs.qvomacp_GetPxNapDefData(n));
-        list(
-                "BEARER",
-                napDefs.qvomacp_GetPxBearerCount(n),
-                d -> napDefs.qvomacp_GetPxBearerData(n, d));
-        list(
-                "DNS-ADDR",
-                napDefs.qvomacp_GetPxDnsAddrCount(n),
-                d -> napDefs.qvomacp_GetPxDnsAddrData(n, d));
+        list("BEARER", napDefs.qvomacp_GetPxBearerCount(n), d -> napDefs.qvomacp_GetPxBearerData(n, d));
+        list("DNS-ADDR", napDefs.qvomacp_GetPxDnsAddrCount(n), d -> napDefs.qvomacp_GetPxDnsAddrData(n, d));
         each("NAPAUTHINFO", napDefs.qvomacp_GetPxNapAuthInfoCount(n), a -> napAuthInfo(n, a));
         each(
                 "VALIDITY",
@@ -280,12 +266,10 @@ final class Answers {
         array(BOOTSTRAP, bootstraps.qvomacp_GetBootstrapData(b));
         list(
                 "PROXY-ID",
-                bootstraps.qvomacp_GetPxProxyIdCount(b),
-                d -> bootstraps.qvomacp_GetPxProxyIdData(b, d));
+                bootstraps.qvomacp_GetPxProxyIdCount(b), d -> bootstraps.qvomacp_GetPxProxyIdData(b, d));
         list(
                 "NETWORK",
-                bootstraps.qvomacp_GetPxNetworkCount(b),
-                d -> bootstraps.qvomacp_GetPxNetworkData(b, d));
+                bootstraps.qvomacp_GetPxNetworkCount(b), d -> bootstraps.qvomacp_GetPxNetworkData(b, d));
     }
 
     /** The second and third element are the name and value of the vendor's own. */
@@ -307,12 +291,10 @@ final class Answers {
                 d -> applications.qvomacp_GetPxToProxyData(a, d));
         list(
                 "TO-NAPID",
-                applications.qvomacp_GetPxNapIdCount(a),
-                d -> applications.qvomacp_GetPxNapIdData(a, d));
+                applications.qvomacp_GetPxNapIdCount(a), d -> applications.qvomacp_GetPxNapIdData(a, d));
         list(
                 "ADDR",
-                applications.qvomacp_GetPxToAddrCount(a),
-                d -> applications.qvomacp_GetPxToAddrData(a, d));
+                applications.qvomacp_GetPxToAddrCount(a), d -> applications.qvomacp_GetPxToAddrData(a, d));
         each("APPADDR", applications.qvomacp_GetPxAppAddrCount(a), r -> appAddr(a, r));
         each(
                 "APPAUTH",
@@ -341,14 +323,10 @@ final class Answers {
 
     private void access(int a) {
         list("RULE", accesses.qvomacp_GetPxRuleCount(a), d -> accesses.qvomacp_GetPxRuleData(a, d));
-        list(
-                "APPID",
-                accesses.qvomacp_GetPxAppIdCount(a),
-                d -> accesses.qvomacp_GetPxAppIdData(a, d));
+        list("APPID", accesses.qvomacp_GetPxAppIdCount(a), d -> accesses.qvomacp_GetPxAppIdData(a, d));
         list(
                 "PORTNBR",
-                accesses.qvomacp_GetPxPortNbrCount(a),
-                d -> accesses.qvomacp_GetPxPortNbrData(a, d));
+                accesses.qvomacp_GetPxPortNbrCount(a), d -> accesses.qvomacp_GetPxPortNbrData(a, d));
         list(
                 "DOMAIN",
                 accesses.qvomacp_GetPxAccessDomainCount(a),

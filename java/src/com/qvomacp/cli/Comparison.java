@@ -4,6 +4,7 @@ import com.qvomacp.eng.omacp.Characteristic;
 import com.qvomacp.eng.omacp.Item;
 import com.qvomacp.eng.omacp.Parameter;
 import com.qvomacp.eng.omacp.PushHeader;
+import com.qvomacp.eng.omacp.SecurityMethod;
 import java.util.ArrayDeque;
 import java.util.Collections;
 import java.util.Deque;
@@ -122,9 +123,10 @@ final class Comparison implements Answers.Listener {
         PushHeader header = reading.header;
         if (header != null) {
             facts.put("Content type", "" + header.contentType().code());
-            facts.put("Header length", "" + header.headersLength());
+            facts.put("Header length", "" + (header.length() - header.contentType().offset()));
             facts.put("Body length", "" + (reading.source.bytes.length - header.length()));
-            facts.put("SEC", header.sec() < 0 ? null : "" + header.sec());
+            SecurityMethod method = header.securityMethod();
+            facts.put("SEC", method == SecurityMethod.NONE ? null : method.name());
             facts.put("MAC", header.mac());
         }
         return facts;

@@ -69,13 +69,8 @@ final class MessageJson {
         }
         json.member("headerLength", header.length());
         json.member("bodyLength", bodyLength);
-        if (header.sec() >= 0) {
-            json.member("sec", header.securityMethod().name());
-            json.member("secCode", header.sec());
-        }
-        if (header.mac() != null) {
-            json.member("mac", header.mac());
-        }
+        json.member("securityMethod", header.securityMethod().name());
+        json.member("mac", header.mac());
         fields("parameters", header.contentType().parameters());
         fields("fields", header.fields());
         json.end();

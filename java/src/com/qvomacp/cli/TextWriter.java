@@ -45,21 +45,13 @@ final class TextWriter {
         fact("Content type", type.mediaType() + code);
         fact("Header length", header.length() + " bytes");
         fact("Body length", bodyLength + " bytes");
-        if (header.sec() >= 0) {
-            fact("SEC", String.format("%s (0x%02X)", header.securityMethod(), header.sec()));
-        }
-        if (header.mac() != null) {
-            fact("MAC", header.mac());
-        }
         fields(type.parameters());
         fields(header.fields());
     }
 
     private void fields(List<HeaderField> fields) {
         for (HeaderField field : fields) {
-            if (!field.name().equals("SEC") && !field.name().equals("MAC")) {
-                fact(field.name(), field.value());
-            }
+            fact(field.name(), field.value());
         }
     }
 

@@ -1,0 +1,3 @@
+package com.qvomacp.cli;
+@picocli.CommandLine.Command(name = "verify")
+final class Verify extends Job { void begin() {} void run(Source s) {} }
