@@ -132,7 +132,7 @@ public final class Eap extends TypedCharacteristic {
      *
      * @return every CERT that stands directly in this characteristic, in its order; not modifiable
      */
-    public List<Certificate> certificates() {
-        return views(Certificate.TYPE, Certificate::new);
+    public List<EapCertificate> certificates() {
+        return views(EapCertificate.TYPE, EapCertificate::new);
     }
 }

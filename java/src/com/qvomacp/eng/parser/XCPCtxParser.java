@@ -17,8 +17,8 @@ public class XCPCtxParser {
      * that cannot be decoded neither a header nor a context is there.
      *
      * @param message the push as it was received, from its transaction identifier on
-     * @param length how many bytes of {@code message} to read; the low 32 bits count, and nothing
-     *     compares them with the length of the array, so it must not be more than that
+     * @param length how many bytes of {@code message} to read; the low 32 bits count. A message is
+     *     refused when they are more than the array has
      * @param mode 1 to read the header only; every other value for the whole message
      * @return {@code true} when header and (unless mode is 1) body were understood; {@code false}
      *     when the push is refused (not a connectionless push, an unknown content type) or its body

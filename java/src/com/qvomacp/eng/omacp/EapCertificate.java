@@ -5,16 +5,16 @@ package com.qvomacp.eng.omacp;
  *
  * <pre>{@code
  * Wlan wlan = message.accessPoints().get(0).wlans().get(0);
- * for (Certificate certificate : wlan.eaps().get(0).certificates()) {
+ * for (EapCertificate certificate : wlan.eaps().get(0).certificates()) {
  *     System.out.println(certificate.issuerName() + " " + certificate.serialNumber());
  * }
  * }</pre>
  */
-public final class Certificate extends TypedCharacteristic {
+public final class EapCertificate extends TypedCharacteristic {
     /** The type of such a characteristic. */
     static final String TYPE = "CERT";
 
-    Certificate(Characteristic characteristic) {
+    EapCertificate(Characteristic characteristic) {
         super(characteristic);
     }
 
