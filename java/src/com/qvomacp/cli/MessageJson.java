@@ -97,51 +97,51 @@ final class MessageJson {
         new Walk() {
             @Override
             void enter(Item item, int depth) {
-                if (item instanceof Characteristic) {
-                    begin((Characteristic) item);
-                } else if (item instanceof Parameter) {
-                    parameter((Parameter) item);
+                boolean isOpen = isOpen(item);
+                if (isOpen) {
+                    json.beginObject();
                 } else {
-                    begin((Other) item);
+                    json.beginFlatObject();
+                }
+                describe(item);
+                if (isOpen) {
+                    json.name("children").beginArray();
                 }
             }
 
             @Override
             void leave(Item item) {
-                if (!(item instanceof Parameter)) {
-                    json.end().end();
+                if (isOpen(item)) {
+                    json.end();
                 }
+                json.end();
             }
         }.through(document.children());
         json.end().end();
     }
 
-    private void begin(Characteristic characteristic) {
-        json.beginObject().member("type", characteristic.type());
-        writing("typeWriting", characteristic.typeWriting());
-        place(characteristic);
-        json.name("children").beginArray();
+    /** Whether others stand in an item, or have their place there. */
+    private static boolean isOpen(Item item) {
+        return item instanceof Characteristic || !item.children().isEmpty();
     }
 
-    private void parameter(Parameter parameter) {
-        json.beginFlatObject();
-        json.member("name", parameter.name()).member("value", parameter.value());
-        writing("nameWriting", parameter.nameWriting());
-        writing("valueWriting", parameter.valueWriting());
-        place(parameter);
-        json.end();
-    }
-
-    private void begin(Other other) {
-        if (other.children().isEmpty()) {
-            json.beginFlatObject();
+    private void describe(Item item) {
+        if (item instanceof Characteristic) {
+            Characteristic characteristic = (Characteristic) item;
+            json.member("type", characteristic.type());
+            writing("typeWriting", characteristic.typeWriting());
+        } else if (item instanceof Parameter) {
+            Parameter parameter = (Parameter) item;
+            json.member("name", parameter.name()).member("value", parameter.value());
+            writing("nameWriting", parameter.nameWriting());
+            writing("valueWriting", parameter.valueWriting());
         } else {
-            json.beginObject();
+            Other other = (Other) item;
+            json.member("other", lowerCase(other.kind()));
+            json.member("name", other.name()).member("text", other.text());
+            writing("textWriting", other.textWriting());
         }
-        json.member("other", lowerCase(other.kind()));
-        json.member("name", other.name()).member("text", other.text());
-        place(other);
-        json.name("children").beginArray();
+        place(item);
     }
 
     private void writing(String member, Writing writing) {

@@ -82,17 +82,19 @@ final class TextWriter {
                 int indent = Math.min(depth, DEEPEST);
                 if (item instanceof Parameter) {
                     parameter((Parameter) item, indent * INDENT, columns[indent]);
-                    return;
-                }
-                spaces(indent * INDENT);
-                if (isCharacteristic) {
-                    String type = ((Characteristic) item).type();
-                    out.append(type == null ? palette.error("(no TYPE)") : Visible.of(type));
                 } else {
-                    out.append(palette.error(describe((Other) item)));
+                    spaces(indent * INDENT);
+                    if (isCharacteristic) {
+                        String type = ((Characteristic) item).type();
+                        out.append(type == null ? palette.error("(no TYPE)") : Visible.of(type));
+                    } else {
+                        out.append(palette.error(describe((Other) item)));
+                    }
+                    out.append('\n');
                 }
-                out.append('\n');
-                columns[Math.min(depth + 1, DEEPEST)] = column(childrenOf(item));
+                if (!item.children().isEmpty()) {
+                    columns[Math.min(depth + 1, DEEPEST)] = column(item.children());
+                }
             }
         }.through(document.children());
         deviations(document.deviations());
@@ -123,17 +125,9 @@ final class TextWriter {
     }
 
     private static String describe(Other other) {
+        boolean isTrailing = other.kind() == Other.Kind.TRAILING;
         StringBuilder text = new StringBuilder("(");
-        switch (other.kind()) {
-            case PARM_CONTENT:
-                text.append("in this parm");
-                break;
-            case TRAILING:
-                text.append(other.length()).append(" bytes behind the document");
-                break;
-            default:
-                text.append(other.kind().name().toLowerCase(Locale.ROOT));
-        }
+        text.append(isTrailing ? other.length() + " bytes behind the document" : nameOf(other.kind()));
         if (other.name() != null) {
             text.append(' ').append(Visible.of(other.name()));
         }
@@ -141,6 +135,10 @@ final class TextWriter {
             text.append(' ').append(Visible.quoted(other.text()));
         }
         return text.append(')').toString();
+    }
+
+    private static String nameOf(Other.Kind kind) {
+        return kind.name().toLowerCase(Locale.ROOT);
     }
 
     private void deviations(List<Deviation> deviations) {

@@ -1,10 +1,7 @@
 package com.qvomacp.cli;
 
-import com.qvomacp.eng.omacp.Characteristic;
 import com.qvomacp.eng.omacp.Item;
-import com.qvomacp.eng.omacp.Other;
 import java.util.ArrayDeque;
-import java.util.Collections;
 import java.util.Deque;
 import java.util.Iterator;
 import java.util.List;
@@ -35,7 +32,7 @@ abstract class Walk {
             if (level.children.hasNext()) {
                 Item item = level.children.next();
                 enter(item, open.size() - 1);
-                open.push(new Level(item, childrenOf(item)));
+                open.push(new Level(item, item.children()));
             } else {
                 open.pop();
                 if (level.item != null) {
@@ -43,12 +40,5 @@ abstract class Walk {
                 }
             }
         }
-    }
-
-    static List<Item> childrenOf(Item item) {
-        if (item instanceof Characteristic) {
-            return ((Characteristic) item).children();
-        }
-        return item instanceof Other ? ((Other) item).children() : Collections.<Item>emptyList();
     }
 }
