@@ -212,6 +212,18 @@ public final class ProvisioningDocument {
         throw new UnsupportedOperationException();
     }
 
+    /**
+     * Tells what each byte of the body means by the format, in order, without a gap and without an
+     * overlap. Texts are told whole. Nothing is kept: the body is read again.
+     *
+     * @param visitor who is told
+     */
+    public void describe(ByteVisitor visitor) {
+        Describer describer = new Describer(visitor);
+        describer.header(body, header);
+        read(describer);
+    }
+
     /** The innermost item that some byte of the body is in; the document for one outside of all. */
     Item itemAt(int offset) {
         Item item = root;
