@@ -33,12 +33,7 @@ public final class ProvisioningDocument {
 
     /** Reads a body that nobody else has. */
     static ProvisioningDocument of(byte[] body, ReadOptions options) throws ProvisioningException {
-        if (body.length > options.inputLimit()) {
-            throw new ProvisioningException(
-                    ProvisioningException.Reason.INPUT_TOO_LONG,
-                    options.inputLimit(),
-                    "the body has " + body.length + " bytes, over the limit of " + options.inputLimit());
-        }
+        ProvisioningException.checkInput(body.length, options);
         return new ProvisioningDocument(body, options.textLimit());
     }
 

@@ -19,16 +19,10 @@ import java.util.List;
  * message; {@link #document} has those that stand elsewhere, and whatever else there is.
  */
 public final class ProvisioningMessage {
-    private static final int PUSH = 6;
-
-    /** The bytes of a push in front of the body; null when a body alone was read. */
-    private final byte[] head;
-
     private final PushHeader header;
     private final ProvisioningDocument document;
 
-    private ProvisioningMessage(byte[] head, PushHeader header, ProvisioningDocument document) {
-        this.head = head;
+    private ProvisioningMessage(PushHeader header, ProvisioningDocument document) {
         this.header = header;
         this.document = document;
     }
@@ -57,9 +51,7 @@ public final class ProvisioningMessage {
             throws ProvisioningException {
         ProvisioningException.checkInput(push.length, options);
         PushHeader header = PushHeader.parse(push);
-        byte[] head = Arrays.copyOf(push, header.length());
-        byte[] body = Arrays.copyOfRange(push, header.length(), push.length);
-        return read(head, header, body, options);
+        return read(header, Arrays.copyOfRange(push, header.length(), push.length), options);
     }
 
     /**
@@ -84,7 +76,8 @@ public final class ProvisioningMessage {
      */
     public static ProvisioningMessage parseBody(byte[] body, ReadOptions options)
             throws ProvisioningException {
-        return read(null, null, body, options);
+        ProvisioningException.checkInput(body.length, options);
+        return read(null, body.clone(), options);
     }
 
     /**
@@ -113,35 +106,18 @@ public final class ProvisioningMessage {
     public static ProvisioningMessage parse(byte[] header, byte[] data, ReadOptions options)
             throws ProvisioningException {
         ProvisioningException.checkInput((long) header.length + data.length, options);
-        return read(headOf(header), PushHeader.parseHeaders(header), data, options);
+        return read(PushHeader.parseHeaders(header), data.clone(), options);
     }
 
-    private static ProvisioningMessage read(
-            byte[] head, PushHeader header, byte[] body, ReadOptions options)
+    /** Reads a body that nobody else has. */
+    private static ProvisioningMessage read(PushHeader header, byte[] body, ReadOptions options)
             throws ProvisioningException {
-        ProvisioningDocument document =
-                ProvisioningDocument.parse(body, options.withAcceptedOnly(false));
-        ProvisioningMessage message = new ProvisioningMessage(head, header, document);
+        ProvisioningMessage message =
+                new ProvisioningMessage(header, ProvisioningDocument.of(body, options));
         if (options.acceptedOnly()) {
             ProvisioningException.checkVerdict(message.verdict());
         }
         return message;
-    }
-
-    /** The head of the push that has these headers, and 0 for its transaction identifier. */
-    private static byte[] headOf(byte[] headers) {
-        int width = 1;
-        while (headers.length >>> (7 * width) != 0) {
-            ++width;
-        }
-        byte[] head = new byte[2 + width + headers.length];
-        head[1] = PUSH;
-        for (int i = 0; i < width; ++i) {
-            int more = i < width - 1 ? 0x80 : 0;
-            head[2 + i] = (byte) (headers.length >>> (7 * (width - 1 - i)) & 0x7F | more);
-        }
-        System.arraycopy(headers, 0, head, 2 + width, headers.length);
-        return head;
     }
 
     /**
@@ -169,7 +145,7 @@ public final class ProvisioningMessage {
      * @return the verdict, never {@code null}; that on the body when a body alone was read
      */
     public Verdict verdict() {
-        if (head == null) {
+        if (header == null) {
             return document.verdict();
         }
         throw new UnsupportedOperationException();
