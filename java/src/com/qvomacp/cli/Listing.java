@@ -1,6 +1,7 @@
 package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.ByteVisitor;
+import com.qvomacp.eng.omacp.Deviation;
 import com.qvomacp.eng.omacp.Item;
 import com.qvomacp.eng.omacp.Verdict;
 import java.io.PrintWriter;
@@ -24,6 +25,7 @@ final class Listing implements ByteVisitor {
     /** Characters of a meaning that are shown. */
     private static final int LONGEST = 160;
 
+    private static final String UNREAD = "not read";
     private static final String DIGITS = "0123456789ABCDEF";
 
     private final PrintWriter out;
@@ -44,8 +46,13 @@ final class Listing implements ByteVisitor {
     private int told;
 
     private int depth;
+
+    /** What is still to be said, besides the meanings: the first of each, null behind the last. */
     private Iterator<Item> otherwise = Collections.emptyIterator();
+
+    private Iterator<Deviation> deviations = Collections.emptyIterator();
     private Item nextOtherwise;
+    private Deviation nextDeviation;
 
     /** Where the library stops, counted from {@link #start}; -1 where it does not. */
     private int stop = -1;
@@ -71,26 +78,24 @@ final class Listing implements ByteVisitor {
                 listing.stopsAt(verdict);
             }
             reading.header.describe(listing);
-            listing.end(reading.bodyAt(), "not read");
+            listing.end(reading.bodyAt());
         }
         listing.start = reading.bodyAt();
-        listing.isBody = hasBody(reading);
+        listing.isBody = reading.header != null || !reading.source.isPush;
         listing.told = 0;
         if (reading.document != null) {
-            if (isRefused && !verdict.isHeaderRefused()) {
-                listing.stopsAt(verdict);
-            }
             if (!verdict.isHeaderRefused()) {
+                if (isRefused) {
+                    listing.stopsAt(verdict);
+                }
                 listing.otherwise = verdict.readOtherwise().iterator();
-                listing.nextOtherwise();
             }
+            listing.deviations = reading.document.deviations().iterator();
+            listing.nextOtherwise();
+            listing.nextDeviation();
             reading.document.describe(listing);
         }
-        listing.end(reading.source.bytes.length - listing.start, "not read");
-    }
-
-    private static boolean hasBody(Reading reading) {
-        return reading.header != null || !reading.source.isPush;
+        listing.end(reading.source.bytes.length - listing.start);
     }
 
     private void stopsAt(Verdict verdict) {
@@ -102,9 +107,13 @@ final class Listing implements ByteVisitor {
         nextOtherwise = otherwise.hasNext() ? otherwise.next() : null;
     }
 
+    private void nextDeviation() {
+        nextDeviation = deviations.hasNext() ? deviations.next() : null;
+    }
+
     private void title() {
         StringBuilder title = new StringBuilder();
-        pad(title, hasTwoOffsets ? "msg" : "body", digits + 1);
+        pad(title, hasTwoOffsets ? "msg" : "at", digits + 1);
         pad(title, hasTwoOffsets ? "body" : "", hasTwoOffsets ? digits + 2 : 1);
         pad(title, "bytes", BYTES_WIDTH + 2);
         out.append(palette.bold(title + "meaning")).append('\n');
@@ -114,8 +123,12 @@ final class Listing implements ByteVisitor {
     public void visit(int offset, int length, int nesting, String meaning) {
         depth = nesting;
         while (nextOtherwise != null && nextOtherwise.offset() <= offset) {
-            row(offset, 0, palette.error("the library reads this otherwise"));
+            row(offset, 0, "the library reads this otherwise");
             nextOtherwise();
+        }
+        while (nextDeviation != null && nextDeviation.offset() < offset + length) {
+            row(offset, 0, "departs from the format: " + nextDeviation.sentence());
+            nextDeviation();
         }
         row(offset, length, meaning);
         told = offset + length;
@@ -125,9 +138,9 @@ final class Listing implements ByteVisitor {
     }
 
     /** Tells what is left up to the end. */
-    private void end(int end, String meaning) {
+    private void end(int end) {
         if (told < end) {
-            visit(told, end - told, 0, meaning);
+            visit(told, end - told, 0, UNREAD);
         }
         if (stop >= 0) {
             refused();
@@ -144,12 +157,25 @@ final class Listing implements ByteVisitor {
         int indent = Math.min(depth, DEEPEST) * INDENT;
         List<String> texts = Lines.of(shown(meaning), Lines.WIDTH - column - indent);
         int lines = Math.max((length + BYTES_PER_LINE - 1) / BYTES_PER_LINE, texts.size());
+        boolean isUnread = meaning.equals(UNREAD);
         for (int i = 0; i < lines; ++i) {
             int from = offset + Math.min(i * BYTES_PER_LINE, length);
             int to = Math.min(from + BYTES_PER_LINE, offset + length);
             String text = i < texts.size() ? texts.get(i) : "";
+            if (i > 0 && isUnread) {
+                text = characters(from, to);
+            }
             line(from, to, indent, length == 0 ? palette.error(text) : painted(meaning, text));
         }
+    }
+
+    /** Bytes that were not read, as characters where they are ones of ASCII. */
+    private String characters(int from, int to) {
+        StringBuilder text = new StringBuilder("|");
+        for (int i = start + from; i < start + to; ++i) {
+            text.append(message[i] >= ' ' && message[i] <= '~' ? (char) message[i] : '.');
+        }
+        return text.append('|').toString();
     }
 
     private static String shown(String meaning) {
@@ -160,9 +186,6 @@ final class Listing implements ByteVisitor {
     }
 
     private String painted(String meaning, String text) {
-        if (meaning.startsWith("<")) {
-            return palette.element(text);
-        }
         return meaning.indexOf('"') >= 0 ? palette.text(text) : text;
     }
 
