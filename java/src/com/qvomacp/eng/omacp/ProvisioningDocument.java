@@ -1,7 +1,6 @@
 package com.qvomacp.eng.omacp;
 
 import java.util.Arrays;
-import java.util.Collections;
 import java.util.List;
 import java.util.Objects;
 
@@ -186,7 +185,7 @@ public final class ProvisioningDocument {
     public List<Deviation> deviations() {
         DeviationFinder finder = new DeviationFinder(root, body.length);
         read(finder);
-        return Collections.unmodifiableList(finder.found());
+        return finder.found();
     }
 
     /**
