@@ -10,8 +10,10 @@ import java.util.List;
  *
  * <pre>{@code
  * ProvisioningMessage message = ProvisioningMessage.parsePush(push);
- * for (AccessPoint accessPoint : message.accessPoints()) {
- *     System.out.println(accessPoint.name() + ": " + accessPoint.address());
+ * if (message.verifyMac("1234", null) == MacResult.RIGHT) {
+ *     for (AccessPoint accessPoint : message.accessPoints()) {
+ *         System.out.println(accessPoint.name() + ": " + accessPoint.address());
+ *     }
  * }
  * }</pre>
  *

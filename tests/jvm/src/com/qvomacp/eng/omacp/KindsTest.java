@@ -205,10 +205,11 @@ class KindsTest {
     @SuppressWarnings("unchecked")
     private static <T extends Item> T read(int page, int token, int element) throws Exception {
         byte[] body = {
-            3, 0x0B, 0x6A, 0, 0x45, (byte) (element | 0x80), 0, (byte) page, (byte) token, 1, 1
+            3, 0x0B, 0x6A, 0, 0x45, 0x46, (byte) (element | 0x80), 0, (byte) page, (byte) token, 1, 1, 1
         };
         ProvisioningDocument document = ProvisioningDocument.parse(body);
-        boolean isWhole = document.deviations().isEmpty() && document.children().size() == 1;
-        return isWhole ? (T) document.children().get(0) : null;
+        List<Item> items = document.characteristics().get(0).children();
+        boolean isUsual = items.size() == 1 && document.deviations().size() < 2;
+        return isUsual ? (T) items.get(0) : null;
     }
 }
