@@ -40,10 +40,16 @@ public final class Deviation {
         END_MISSING("the body ends without the END of the element"),
         TRAILING("these bytes stand behind the end of the document");
 
+        private static final Kind[] ALL = values();
+
         private final String sentence;
 
         Kind(String sentence) {
             this.sentence = sentence;
+        }
+
+        static Kind of(int ordinal) {
+            return ALL[ordinal];
         }
     }
 

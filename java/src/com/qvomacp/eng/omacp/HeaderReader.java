@@ -39,6 +39,7 @@ final class HeaderReader {
     /** Content types that the native library takes without their high bit. */
     private static final int[] BARE_TOKENS = {0x35, 0x36, 0x42, 0x44, 0x4E};
 
+    private static final String NO_MEDIA_TYPE = "the content type has no media type";
     private static final long LAST_SECOND_OF_9999 = 253402300799L;
     private static final char[] DIGITS = "0123456789ABCDEF".toCharArray();
 
@@ -135,7 +136,7 @@ final class HeaderReader {
         }
         int mediaTypeAt = cursor.at();
         if (first <= 0 || first == LENGTH_QUOTE) {
-            throw none(mediaTypeAt, "the content type has no media type");
+            throw none(mediaTypeAt, NO_MEDIA_TYPE);
         }
         int code;
         String mediaType;
@@ -149,6 +150,9 @@ final class HeaderReader {
             int nameEnd = text.indexOf(';');
             mediaType = nameEnd < 0 ? text : text.substring(0, nameEnd);
             mediaType = mediaType.trim().toLowerCase(Locale.ROOT);
+            if (mediaType.isEmpty()) {
+                throw none(mediaTypeAt, NO_MEDIA_TYPE);
+            }
             code = WspTable.MEDIA_TYPES.number(mediaType);
             mediaTypeEnd = nameEnd < 0 ? cursor.at() : textAt + nameEnd;
             if (nameEnd >= 0) {
@@ -280,7 +284,7 @@ final class HeaderReader {
             name = table.nameOrDigits(number);
             kind = table.kind(number);
         } else {
-            name = hexadecimal(cursor.take()) + " of code page " + page;
+            name = "0x" + hexadecimal(cursor.take() & 0x7F) + " of code page " + page;
         }
         add(fields, name, fieldValue(kind), at, cursor.at());
     }
@@ -391,7 +395,8 @@ final class HeaderReader {
             case DATE:
                 return number > LAST_SECOND_OF_9999 ? Long.toString(number) : date(number);
             case CHARSET:
-                return Long.toString(number);
+                String charset = CharacterSet.of(number).name();
+                return charset != null ? charset : Long.toString(number);
             case MEDIA_TYPE:
                 return named(WspTable.MEDIA_TYPES, number);
             case FIELD_NAME:

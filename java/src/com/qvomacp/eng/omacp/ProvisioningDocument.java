@@ -1,7 +1,6 @@
 package com.qvomacp.eng.omacp;
 
 import java.util.Arrays;
-import java.util.Collections;
 import java.util.List;
 import java.util.Objects;
 
@@ -186,7 +185,7 @@ public final class ProvisioningDocument {
     public List<Deviation> deviations() {
         DeviationFinder finder = new DeviationFinder(root, body.length);
         read(finder);
-        return Collections.unmodifiableList(finder.found());
+        return finder.found();
     }
 
     /**
@@ -205,6 +204,18 @@ public final class ProvisioningDocument {
      */
     public Verdict verdict() {
         throw new UnsupportedOperationException();
+    }
+
+    /**
+     * Tells what each byte of the body means by the format, in order, without a gap and without an
+     * overlap. Texts are told whole. Nothing is kept: the body is read again.
+     *
+     * @param visitor who is told
+     */
+    public void describe(ByteVisitor visitor) {
+        Describer describer = new Describer(visitor);
+        describer.header(body, header);
+        read(describer);
     }
 
     /** The innermost item that some byte of the body is in; the document for one outside of all. */

@@ -15,7 +15,6 @@ import static org.junit.jupiter.api.Assertions.assertTrue;
 import com.qvomacp.support.ChildVm;
 import com.qvomacp.support.Document;
 import com.qvomacp.support.Json;
-import com.qvomacp.support.Natives;
 import java.io.ByteArrayInputStream;
 import java.io.ByteArrayOutputStream;
 import java.nio.charset.StandardCharsets;
@@ -33,7 +32,7 @@ import org.junit.jupiter.params.ParameterizedTest;
 import org.junit.jupiter.params.provider.CsvSource;
 
 /** What the program shows of bytes, of several files, of bodies alone and of refused messages. */
-class ShowTest extends Natives {
+class ShowTest {
     private static final byte[] BODY =
             Document.document(characteristic("NAPDEF", parm("NAME", "abc")));
     private static final byte[] REFUSED =
@@ -60,12 +59,10 @@ class ShowTest extends Natives {
     }
 
     private int run(Terminal terminal, byte[] input, String... arguments) {
-        ByteArrayOutputStream out = new ByteArrayOutputStream();
-        ByteArrayOutputStream err = new ByteArrayOutputStream();
-        int status = Main.run(new ByteArrayInputStream(input), out, err, terminal, arguments);
-        output = out.toString(StandardCharsets.UTF_8);
-        errors = err.toString(StandardCharsets.UTF_8);
-        return status;
+        Program program = Program.run(terminal, input, arguments);
+        output = program.output();
+        errors = program.errors();
+        return program.status();
     }
 
     private String file(String name, byte[] content) throws Exception {
