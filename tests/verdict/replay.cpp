@@ -23,7 +23,7 @@ constexpr char kHeader = 'H';
 constexpr size_t kHeadSize = 14;
 constexpr size_t kBatchBytes = 8U << 20U;
 constexpr int kShown = 5;
-constexpr uint32_t kShownBytes = 4096;
+constexpr uint32_t kShownBytes = 400;
 
 struct Verdict {
     bool taken;
@@ -49,8 +49,10 @@ Verdict judgeBody(const Message &message)
         result = qvsClientProvWbxmlDecoder(decoder, &document);
         (void)qvsClientProvWbxmlDeleteWapDoc(document);
     }
-    const uint32_t read = qvsClientProvWbxmlDecoderDecodingSize(decoder);
+    const uint32_t end = qvsClientProvWbxmlDecoderDecodingSize(decoder);
     (void)qvsClientProvWbxmlDeleteDecoder(decoder);
+    // Behind a text without a terminator the decoder stands one byte behind the body.
+    const uint32_t read = end < message.size ? end : message.size;
     qvsClientProvCtx *context = qvsClinetProvWbxmlDecoderMain(message.bytes, message.size);
     if (context) {
         qvsClientProvCtxDelectContext(context);

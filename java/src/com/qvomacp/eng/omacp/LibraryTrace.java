@@ -8,8 +8,9 @@ interface LibraryTrace {
      * @param depth how many characteristics it stands in
      * @param start where it begins
      * @param kind null when its type is none that the library knows
+     * @param type as the message names it; null when there is none
      */
-    void characteristic(int depth, int start, LibraryKind kind);
+    void characteristic(int depth, int start, LibraryKind kind, String type);
 
     /** A characteristic is over, at its END or where it begins, since it has no content. */
     void characteristicEnd(int start, int end);
@@ -17,7 +18,7 @@ interface LibraryTrace {
     /** A parm begins. */
     void parm(int start);
 
-    /** The name of a parameter is known. */
+    /** The name of a parameter is known; null when it is none that the library knows. */
     void name(String name);
 
     /** The value of a parameter has been read. */

@@ -107,6 +107,9 @@ final class LibraryWalk {
     /** How many of its bytes are there. */
     int tablePresent;
 
+    /** Where the elements begin; 0 as long as the header is read. */
+    int elementsAt;
+
     // ---- Elements
 
     /** The code page. */
@@ -195,6 +198,7 @@ final class LibraryWalk {
             throw new LibraryStop(BAD_ARGUMENT, Cause.EMPTY_BODY, Place.DOCUMENT, 0);
         }
         header();
+        elementsAt = at;
         switch (peekTag(Place.DOCUMENT)) {
             case TAG_DOCUMENT:
                 document();
@@ -397,6 +401,13 @@ final class LibraryWalk {
     /** How much of the name is kept; one more than that for a longer one. */
     private int keptLength() {
         return (int) Math.min(nameLength, NAME_KEPT + 1);
+    }
+
+    /** The type or name that was read last, or as much of it as is kept; null for none. */
+    String nameText() {
+        return nameLength < 0
+                ? null
+                : CharacterSet.UTF_8.decode(name, 0, Math.min(keptLength(), NAME_KEPT));
     }
 
     /** Counts text that is decoded. False once there is too much of it. */
@@ -617,10 +628,10 @@ final class LibraryWalk {
 
     private void document() throws LibraryStop {
         element(TAG_DOCUMENT, Place.DOCUMENT);
+        inDocument = true;
         if (!hasContent) {
             return;
         }
-        inDocument = true;
         if (hasAttributes) {
             version();
         }
@@ -704,7 +715,7 @@ final class LibraryWalk {
         element(TAG_CHARACTERISTIC, Place.NEXT_CHARACTERISTIC);
         if (!hasContent) {
             if (trace != null) {
-                trace.characteristic(depth, start, null);
+                trace.characteristic(depth, start, null, null);
                 trace.characteristicEnd(start, at);
             }
             return false;
@@ -722,7 +733,7 @@ final class LibraryWalk {
         kinds[depth - 1] = kind;
         authTypeLength = -1;
         if (trace != null) {
-            trace.characteristic(depth - 1, start, kind);
+            trace.characteristic(depth - 1, start, kind, kind == null ? nameText() : kind.type);
         }
         return true;
     }
@@ -875,7 +886,7 @@ final class LibraryWalk {
         if (next != END) {
             int start = at;
             content();
-            if (trace != null) {
+            if (trace != null && held) {
                 trace.value(start, at);
             }
         }
@@ -920,7 +931,7 @@ final class LibraryWalk {
             throw new LibraryStop(FAILED, Cause.EMPTY_NAME, Place.PARM, start);
         }
         if (trace != null) {
-            trace.name(null);
+            trace.name(nameText());
         }
         if (peek(Place.BEHIND_NAME) == VALUE) {
             if (!kind.takesName(name, keptLength())) {

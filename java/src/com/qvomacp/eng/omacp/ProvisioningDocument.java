@@ -209,7 +209,7 @@ public final class ProvisioningDocument {
      * @return the verdict, never {@code null}
      */
     public Verdict verdict() {
-        throw new UnsupportedOperationException();
+        return LibraryRules.verdictOnBody(body, this);
     }
 
     /** The innermost item that some byte of the body is in; the document for one outside of all. */
