@@ -203,7 +203,7 @@ public final class ProvisioningDocument {
      * @return the verdict, never {@code null}
      */
     public Verdict verdict() {
-        throw new UnsupportedOperationException();
+        return LibraryRules.verdictOnBody(body, this);
     }
 
     /**
