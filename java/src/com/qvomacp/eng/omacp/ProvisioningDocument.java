@@ -218,6 +218,11 @@ public final class ProvisioningDocument {
         read(describer);
     }
 
+    /** The document element. */
+    Item root() {
+        return root;
+    }
+
     /** The innermost item that some byte of the body is in; the document for one outside of all. */
     Item itemAt(int offset) {
         Item item = root;

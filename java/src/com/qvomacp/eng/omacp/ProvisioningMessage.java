@@ -274,7 +274,7 @@ public final class ProvisioningMessage {
     }
 
     private <V> List<V> views(String type, TypedCharacteristic.Maker<V> maker) {
-        return TypedCharacteristic.views(document.characteristics(type), maker);
+        return TypedCharacteristic.views(document.root(), type, maker);
     }
 
     /**

@@ -27,11 +27,13 @@ public abstract class TypedCharacteristic {
         V of(Characteristic characteristic);
     }
 
-    /** A view of each characteristic of a list, in a list that cannot be modified. */
-    static <V> List<V> views(List<Characteristic> characteristics, Maker<V> maker) {
-        List<V> views = new ArrayList<>(characteristics.size());
-        for (Characteristic characteristic : characteristics) {
-            views.add(maker.of(characteristic));
+    /** A view of each characteristic of a type directly in an item, in a list that stays as it is. */
+    static <V> List<V> views(Item item, String type, Maker<V> maker) {
+        List<V> views = new ArrayList<>();
+        for (Item child : item.inside()) {
+            if (child instanceof Characteristic && type.equals(((Characteristic) child).type())) {
+                views.add(maker.of((Characteristic) child));
+            }
         }
         return Collections.unmodifiableList(views);
     }
@@ -58,7 +60,7 @@ public abstract class TypedCharacteristic {
     }
 
     final <V> List<V> views(String type, Maker<V> maker) {
-        return views(characteristic.characteristics(type), maker);
+        return views(characteristic, type, maker);
     }
 
     /**

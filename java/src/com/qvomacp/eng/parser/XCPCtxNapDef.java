@@ -6,6 +6,13 @@ package com.qvomacp.eng.parser;
  *
  * <p>Parameter names used here: {@code napDef} counts the NAPDEF of the message, or those that
  * {@link #qvomacp_SetPxNapDefIndex} has left; everything counts from 1.
+ *
+ * <pre>{@code
+ * XCPCtxNapDef napDefs = new XCPCtxNapDef();
+ * for (int n = 1; n <= napDefs.qvomacp_GetPxNapDefCount(); ++n) {
+ *     System.out.println(napDefs.qvomacp_GetPxNapDefData(n)[0]);
+ * }
+ * }</pre>
  */
 public class XCPCtxNapDef {
     /** Makes an object to call the natives on; it holds no state. */

@@ -5,6 +5,14 @@ package com.qvomacp.eng.parser;
  *
  * <p>Calling order: {@link #qvomacp_parser}, then (if it answered {@code true}) queries, then
  * {@link #qvomacp_parser_del}. See the package description for loading and for threads.
+ *
+ * <pre>{@code
+ * XCPCtxParser parser = new XCPCtxParser();
+ * if (parser.qvomacp_parser(push, push.length, 0)) {
+ *     System.out.println(parser.qvomacp_GetParserBodyLen());
+ * }
+ * parser.qvomacp_parser_del();
+ * }</pre>
  */
 public class XCPCtxParser {
     /** Makes an object to call the natives on; it holds no state. */
