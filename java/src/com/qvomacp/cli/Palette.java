@@ -25,10 +25,6 @@ final class Palette {
         return painted("\u001b[1m", text);
     }
 
-    String element(String text) {
-        return painted("\u001b[36m", text);
-    }
-
     String text(String text) {
         return painted("\u001b[32m", text);
     }

@@ -92,10 +92,6 @@ final class Refusal {
         if (!expected.isEmpty()) {
             paragraph(out, "Accepted here: " + String.join(", ", expected) + ".");
         }
-        String remark = source.isPush && bodyOffset < 0 ? source.remark() : null;
-        if (remark != null) {
-            paragraph(out, remark);
-        }
         return out.toString();
     }
 

@@ -10,7 +10,6 @@ import java.util.Base64;
 final class Source {
     private static final int PUSH = 0x06;
     private static final int LAST_WBXML_VERSION = 0x03;
-    private static final int DELETE = 0x7F;
 
     /** For people. */
     final String name;
@@ -36,30 +35,6 @@ final class Source {
                 && bytes[0] >= 0
                 && bytes[0] <= LAST_WBXML_VERSION
                 && bytes[1] != PUSH;
-    }
-
-    /** Says for people what a text is that is no message; null for anything but a text. */
-    String remark() {
-        int digits = 0;
-        int others = 0;
-        for (byte b : bytes) {
-            boolean isSpace = Character.isWhitespace(b);
-            if (b < ' ' && !isSpace || b == DELETE) {
-                return null;
-            }
-            boolean isDigit = Character.digit(b, 16) >= 0;
-            digits += isDigit ? 1 : 0;
-            others += isDigit || isSpace || isSeparator(b) ? 0 : 1;
-        }
-        if (bytes.length == 0) {
-            return null;
-        }
-        if (bytes[0] == '<') {
-            return "This is XML. What is pushed to a handset is the WBXML that encodes it.";
-        }
-        return digits % 2 != 0 && others == 0
-                ? "This is hexadecimal text with an odd number of digits: " + digits + "."
-                : "This is text, and neither hexadecimal nor base64 of a message.";
     }
 
     /**

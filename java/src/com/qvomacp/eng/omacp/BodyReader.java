@@ -217,7 +217,7 @@ final class BodyReader {
             if (token == SWITCH_PAGE) {
                 attributePage = switchPage(from, true, attributePage);
                 attributes = CodePage.of(attributePage);
-            } else if (PIECES[token]) {
+            } else if (PIECES[token] && !isOfPage(token)) {
                 piece(from, token);
                 ++pieces;
             } else if (token >= FIRST_VALUE) {
@@ -229,12 +229,31 @@ final class BodyReader {
         }
     }
 
+    /**
+     * Whether a token that WBXML gives another meaning is one of the code page all the same, as some
+     * of page 1 are. They stand for extensions, which mean nothing to the format, and for a reference
+     * to the string table, which it can only be where there is a table.
+     */
+    private boolean isOfPage(int token) {
+        if (attributePage == 0 || attributes == null) {
+            return false;
+        }
+        if (token < FIRST_VALUE) {
+            return attributes.start(token) != null;
+        }
+        return attributes.value(token) != null
+                && (token != STR_T || header.tableAt == header.elementsAt);
+    }
+
     private void attribute(int from, int token) throws ProvisioningException {
         if (token == LITERAL) {
             String name = literal(from);
             reading.attribute(from, cursor.at(), Attribute.of(name), name, null);
             pieces = 0;
             return;
+        }
+        if (PIECES[token]) {
+            reading.deviation(from, Deviation.Kind.OTHER_MEANING);
         }
         CodePage.Start start = attributes == null ? null : attributes.start(token);
         if (start == null && attributePage != 0) {
@@ -262,6 +281,9 @@ final class BodyReader {
     }
 
     private void value(int from, int token) throws ProvisioningException {
+        if (PIECES[token]) {
+            reading.deviation(from, Deviation.Kind.OTHER_MEANING);
+        }
         String value = attributes == null ? null : attributes.value(token);
         if (value == null && attributePage != 0) {
             value = CodePage.of(0).value(token);

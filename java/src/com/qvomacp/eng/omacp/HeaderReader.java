@@ -74,7 +74,13 @@ final class HeaderReader {
             throw none(start.at(), "the data ends before the type of a push");
         }
         if (type != PUSH) {
-            throw none(start.at(), "the second byte is " + hexadecimal(type) + ", and 06 in a push");
+            String likeness = ForeignBytes.describe(push);
+            throw none(
+                    start.at(),
+                    "the second byte is "
+                            + hexadecimal(type)
+                            + ", and in a push 06"
+                            + (likeness == null ? "" : "; this looks like " + likeness));
         }
         start.skip(1);
         long length = start.integer();
