@@ -15,8 +15,7 @@ import java.util.Locale;
 
 /**
  * Writes a message as the members of a JSON object. {@code header} is null for a body alone, {@code
- * document} and {@code verdict} are null when the message cannot be read, which {@code error} then
- * explains. {@code children} stand in the order of the message; each tells by its members what it
+ * document} is null when the message cannot be read, which {@code error} then explains. {@code children} stand in the order of the message; each tells by its members what it
  * is: {@code type} a characteristic, {@code name} and {@code value} a parameter, {@code other}
  * whatever else.
  */
@@ -44,11 +43,7 @@ final class MessageJson {
             }
         }
         json.end();
-        if (reading.verdict == null) {
-            json.nullMember("verdict");
-        } else {
-            verdict(reading.verdict);
-        }
+        verdict(reading.verdict);
         if (reading.failure != null) {
             json.member("error", reading.failure.getMessage());
         }
