@@ -43,7 +43,7 @@ final class MessageJson {
             }
         }
         json.end();
-        verdict(reading.verdict);
+        verdict(reading.verdict, reading.document);
         if (reading.failure != null) {
             json.member("error", reading.failure.getMessage());
         }
@@ -153,7 +153,7 @@ final class MessageJson {
         return constant.name().toLowerCase(Locale.ROOT).replace('_', '-');
     }
 
-    private void verdict(Verdict verdict) {
+    private void verdict(Verdict verdict, ProvisioningDocument document) {
         json.name("verdict").beginObject();
         json.member("accepted", verdict.isAccepted());
         if (!verdict.isAccepted()) {
@@ -176,7 +176,7 @@ final class MessageJson {
         json.end();
         json.name("readOtherwise").beginArray();
         for (Item item : verdict.readOtherwise()) {
-            json.beginFlatObject();
+            json.beginFlatObject().member("path", document.path(item));
             place(item);
             json.end();
         }
