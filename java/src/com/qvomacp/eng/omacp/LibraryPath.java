@@ -63,7 +63,7 @@ final class LibraryPath implements LibraryTrace {
         } else if (ended.parmToken >= 0) {
             name = ended.kinds[ended.depth - 1].parm(ended.parmToken);
         }
-        return name == null ? Element.PARM.text : Printable.of(name);
+        return name == null || name.isEmpty() ? Element.PARM.text : Printable.of(name);
     }
 
     private String text() {

@@ -158,8 +158,10 @@ final class LibraryWalk {
 
     // ---- What was skipped
 
-    /** The end of the page switch that was read last. */
+    /** The end of the page switch that was read last, and whether its page was there. */
     int switchEnd = -1;
+
+    boolean isSwitchWhole;
 
     /** Where a text begins that ends with the body, without a terminator; -1 for none. */
     int unendedText = -1;
@@ -357,18 +359,18 @@ final class LibraryWalk {
      * when there is no such page, which leaves the page as it was.
      */
     private boolean switchPage() {
-        boolean whole = size - at >= 2;
-        int wanted = whole ? data[at + 1] & TAG_MASK : -1;
         dropPageSwitch();
-        if (wanted == 0 || wanted == 1) {
-            page = wanted;
-            return true;
+        int wanted = data[at - 1] & TAG_MASK;
+        if (!isSwitchWhole || wanted > 1) {
+            return false;
         }
-        return false;
+        page = wanted;
+        return true;
     }
 
     /** A page switch between elements, which has no effect. */
     private void dropPageSwitch() {
+        isSwitchWhole = size - at >= 2;
         at = Math.min(at + 2, size);
         switchEnd = at;
     }
@@ -589,8 +591,8 @@ final class LibraryWalk {
         for (; ; ) {
             int token = take(Place.IN_SKIPPED);
             if (token == SWITCH_PAGE) {
-                at = Math.min(at + 1, size);
-                switchEnd = at;
+                --at;
+                dropPageSwitch();
             } else if (token == END) {
                 --level;
                 if (level == 0) {
@@ -759,7 +761,7 @@ final class LibraryWalk {
                 nameLength = -1;
                 int start = at;
                 if (!switchPage()) {
-                    Cause cause = at - start < 2 ? Cause.ENDED : Cause.NO_SUCH_PAGE;
+                    Cause cause = isSwitchWhole ? Cause.NO_SUCH_PAGE : Cause.ENDED;
                     throw new LibraryStop(UNKNOWN_ELEMENT, cause, Place.TYPE, start);
                 }
             } else if (token == LibraryKind.TYPE_AS_TEXT) {

@@ -48,6 +48,9 @@ final class ReadOtherwise implements LibraryTrace {
             end = walk.at;
         } catch (LibraryStop stop) {
             end = stop.offset;
+            if (walk.depth > 0 && !walk.isTyped) {
+                read.begin(walk.starts[walk.depth - 1], null, false);
+            }
         }
         List<Item> otherwise = new ArrayList<>();
         int next = 0;
@@ -76,8 +79,10 @@ final class ReadOtherwise implements LibraryTrace {
             return false;
         }
         if (item instanceof Characteristic) {
+            // One that is open and of no known type is where the library refuses the message.
             return !areParms[element]
-                    && Objects.equals(names[element], ((Characteristic) item).type());
+                    && (isOpen && names[element] == null
+                            || Objects.equals(names[element], ((Characteristic) item).type()));
         }
         if (!(item instanceof Parameter) || !areParms[element]) {
             return false;

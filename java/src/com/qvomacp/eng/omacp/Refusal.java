@@ -91,9 +91,9 @@ final class Refusal {
                 break;
             case LibraryWalk.SWITCH_PAGE:
                 reason =
-                        walk.size - offset < 2
-                                ? "the body ends within a SWITCH_PAGE"
-                                : "a document that begins with a SWITCH_PAGE is taken for an empty one";
+                        walk.isSwitchWhole
+                                ? "a document that begins with a SWITCH_PAGE is taken for an empty one"
+                                : "the body ends within a SWITCH_PAGE";
                 break;
             default:
                 reason = "a document that begins with a parm is taken for an empty one";
@@ -173,10 +173,13 @@ final class Refusal {
                 default:
                     break;
             }
+            String found = attributeAt(stop.offset);
             if (stop.cause == Cause.NO_SUCH_PAGE) {
-                return "SWITCH_PAGE (0x00) to page " + (walk.data[stop.offset + 1] & 0xFF);
+                return found + " to page " + (walk.data[stop.offset + 1] & 0xFF);
             }
-            return attributeAt(stop.offset);
+            return stop.cause == Cause.UNKNOWN_NAME
+                    ? found + " behind NAME=" + Printable.quoted(walk.nameText())
+                    : found;
         }
 
         private String documentType() {
@@ -426,9 +429,9 @@ final class Refusal {
                 return "the body ends within the text at offset " + walk.unendedText;
             }
             if (walk.switchEnd == walk.size) {
-                return place == Place.TYPE && walk.data[walk.size - 1] == 0
-                        ? "the body ends within a SWITCH_PAGE"
-                        : "the body ends behind a SWITCH_PAGE";
+                return walk.isSwitchWhole
+                        ? "the body ends behind a SWITCH_PAGE"
+                        : "the body ends within a SWITCH_PAGE";
             }
             return "the body ends " + endedIn(place);
         }
