@@ -1,6 +1,6 @@
 package com.qvomacp.eng.omacp;
 
-import java.nio.charset.StandardCharsets;
+import java.util.Arrays;
 import java.util.HashMap;
 import java.util.Locale;
 import java.util.Map;
@@ -22,13 +22,26 @@ final class BodyReader {
     static final int EXT_T_2 = 0x82;
     static final int STR_T = 0x83;
     static final int EXT_0 = 0xC0;
-    static final int EXT_2 = 0xC2;
     static final int OPAQUE = 0xC3;
 
     private static final int ATTRIBUTES = 0x80;
     private static final int CONTENT = 0x40;
     private static final int ELEMENT = 0x3F;
     private static final int FIRST_VALUE = 0x80;
+
+    /** The tokens that are a piece of text, in values as well as where elements stand. */
+    private static final boolean[] PIECES = new boolean[0x100];
+
+    static {
+        int[] single = {ENTITY, STR_I, STR_T, OPAQUE};
+        for (int token : single) {
+            PIECES[token] = true;
+        }
+        int[] extensions = {EXT_I_0, EXT_T_0, EXT_0};
+        for (int first : extensions) {
+            Arrays.fill(PIECES, first, first + 3, true);
+        }
+    }
 
     private static final String NO_LITERAL = "unknown-literal";
 
@@ -89,7 +102,7 @@ final class BodyReader {
                 elements = CodePage.of(elementPage);
             } else if (token == PI) {
                 instruction(from);
-            } else if (isPiece(token)) {
+            } else if (PIECES[token]) {
                 piece(from, token);
             } else {
                 element(from, token);
@@ -204,7 +217,7 @@ final class BodyReader {
             if (token == SWITCH_PAGE) {
                 attributePage = switchPage(from, true, attributePage);
                 attributes = CodePage.of(attributePage);
-            } else if (isPiece(token)) {
+            } else if (PIECES[token] && !isOfPage(token)) {
                 piece(from, token);
                 ++pieces;
             } else if (token >= FIRST_VALUE) {
@@ -216,12 +229,31 @@ final class BodyReader {
         }
     }
 
+    /**
+     * Whether a token that WBXML gives another meaning is one of the code page all the same, as some
+     * of page 1 are. They stand for extensions, which mean nothing to the format, and for a reference
+     * to the string table, which it can only be where there is a table.
+     */
+    private boolean isOfPage(int token) {
+        if (attributePage == 0 || attributes == null) {
+            return false;
+        }
+        if (token < FIRST_VALUE) {
+            return attributes.start(token) != null;
+        }
+        return attributes.value(token) != null
+                && (token != STR_T || header.tableAt == header.elementsAt);
+    }
+
     private void attribute(int from, int token) throws ProvisioningException {
         if (token == LITERAL) {
             String name = literal(from);
             reading.attribute(from, cursor.at(), Attribute.of(name), name, null);
             pieces = 0;
             return;
+        }
+        if (PIECES[token]) {
+            reading.deviation(from, Deviation.Kind.OTHER_MEANING);
         }
         CodePage.Start start = attributes == null ? null : attributes.start(token);
         if (start == null && attributePage != 0) {
@@ -249,6 +281,9 @@ final class BodyReader {
     }
 
     private void value(int from, int token) throws ProvisioningException {
+        if (PIECES[token]) {
+            reading.deviation(from, Deviation.Kind.OTHER_MEANING);
+        }
         String value = attributes == null ? null : attributes.value(token);
         if (value == null && attributePage != 0) {
             value = CodePage.of(0).value(token);
@@ -267,17 +302,6 @@ final class BodyReader {
     }
 
     // --- Texts ---------------------------------------------------------------------------------
-
-    /** Whether a token is a piece of text, in values as well as where elements stand. */
-    private static boolean isPiece(int token) {
-        return token == STR_I
-                || token == STR_T
-                || token == OPAQUE
-                || token == ENTITY
-                || token >= EXT_I_0 && token <= EXT_I_2
-                || token >= EXT_T_0 && token <= EXT_T_2
-                || token >= EXT_0 && token <= EXT_2;
-    }
 
     private void piece(int from, int token) throws ProvisioningException {
         String text;
@@ -309,9 +333,7 @@ final class BodyReader {
             if (zero < end && body[zero] == 0) {
                 cursor.skip(zero - start + 1);
                 charge(from, zero - start);
-                return zero == start
-                        ? ""
-                        : new String(body, start, zero - start, StandardCharsets.ISO_8859_1);
+                return zero == start ? "" : CharacterSet.ascii(body, start, zero);
             }
         }
         zero = charset.zero(body, start, end);

@@ -1,7 +1,6 @@
 package com.qvomacp.eng.omacp;
 
 import java.util.Arrays;
-import java.util.Collections;
 import java.util.List;
 import java.util.Objects;
 
@@ -33,12 +32,7 @@ public final class ProvisioningDocument {
 
     /** Reads a body that nobody else has. */
     static ProvisioningDocument of(byte[] body, ReadOptions options) throws ProvisioningException {
-        if (body.length > options.inputLimit()) {
-            throw new ProvisioningException(
-                    ProvisioningException.Reason.INPUT_TOO_LONG,
-                    options.inputLimit(),
-                    "the body has " + body.length + " bytes, over the limit of " + options.inputLimit());
-        }
+        ProvisioningException.checkInput(body.length, options);
         return new ProvisioningDocument(body, options.textLimit());
     }
 
@@ -191,7 +185,7 @@ public final class ProvisioningDocument {
     public List<Deviation> deviations() {
         DeviationFinder finder = new DeviationFinder(root, body.length);
         read(finder);
-        return Collections.unmodifiableList(finder.found());
+        return finder.found();
     }
 
     /**
@@ -210,6 +204,23 @@ public final class ProvisioningDocument {
      */
     public Verdict verdict() {
         return LibraryRules.verdictOnBody(body, this);
+    }
+
+    /**
+     * Tells what each byte of the body means by the format, in order, without a gap and without an
+     * overlap. Texts are told whole. Nothing is kept: the body is read again.
+     *
+     * @param visitor who is told
+     */
+    public void describe(ByteVisitor visitor) {
+        Describer describer = new Describer(visitor);
+        describer.header(body, header);
+        read(describer);
+    }
+
+    /** The document element. */
+    Item root() {
+        return root;
     }
 
     /** The innermost item that some byte of the body is in; the document for one outside of all. */

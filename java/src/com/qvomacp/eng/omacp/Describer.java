@@ -1,0 +1,105 @@
+package com.qvomacp.eng.omacp;
+
+import java.util.Arrays;
+import java.util.Locale;
+
+/** Tells a {@link ByteVisitor} what each byte of a body means. Nothing of it is kept. */
+final class Describer implements Reading {
+    private final ByteVisitor visitor;
+
+    /** The names of the elements that have not ended, of the outermost first. */
+    private String[] open = new String[16];
+
+    private int depth;
+
+    Describer(ByteVisitor visitor) {
+        this.visitor = visitor;
+    }
+
+    /** Tells the fields before the elements. */
+    void header(byte[] body, BodyHeader header) {
+        visit(0, header.identifierAt, "WBXML " + header.versionText());
+        String type = header.isStated() ? Printable.whole(header.documentType) : "not stated";
+        visit(header.identifierAt, header.charsetAt, "document type: " + type);
+        visit(header.charsetAt, header.tableLengthAt, "character set: " + charset(header.charset));
+        int length = header.elementsAt - header.tableAt;
+        visit(header.tableLengthAt, header.tableAt, "string table: " + length + " bytes");
+        CharacterSet charset = header.charset;
+        for (int from = header.tableAt; from < header.elementsAt; ) {
+            int zero = charset.zero(body, from, header.elementsAt);
+            int to = Math.min(zero + charset.unit(), header.elementsAt);
+            visit(
+                    from,
+                    to,
+                    "text "
+                            + (from - header.tableAt)
+                            + " of the table: "
+                            + Printable.whole(charset.decode(body, from, zero)));
+            from = to;
+        }
+    }
+
+    private static String charset(CharacterSet charset) {
+        return charset.name() == null ? "number " + charset.number() : charset.name();
+    }
+
+    @Override
+    public void element(int from, int to, Element element, String name, boolean attributes) {
+        String called = element == Element.INSTRUCTION ? "instruction" : Printable.of(name);
+        visit(from, to, called);
+        if (depth == open.length) {
+            open = Arrays.copyOf(open, 2 * depth);
+        }
+        open[depth++] = called;
+    }
+
+    @Override
+    public void attribute(int from, int to, Attribute attribute, String name, String value) {
+        visit(from, to, Printable.of(name) + (value == null ? "" : " = " + Printable.whole(value)));
+    }
+
+    @Override
+    public void text(int from, int to, Writing writing, String text) {
+        visit(
+                from,
+                to,
+                Printable.whole(text) + ", " + writing.name().toLowerCase(Locale.ROOT));
+    }
+
+    @Override
+    public void attributesEnd(int from, int to) {
+        visit(from, to, "END of attributes");
+    }
+
+    @Override
+    public void end(int from, int to) {
+        --depth;
+        if (to > from) {
+            visit(from, to, "END of " + open[depth]);
+        }
+    }
+
+    @Override
+    public void page(int from, int to, boolean attributes, int page) {
+        visit(
+                from,
+                to,
+                "SWITCH_PAGE: " + (attributes ? "attributes" : "elements") + " by code page " + page);
+    }
+
+    @Override
+    public void trailing(int from, int to) {
+        visit(from, to, "behind the end of the document");
+    }
+
+    @Override
+    public void deviation(int at, Deviation.Kind kind) {
+        // The bytes are told as what they are read as.
+    }
+
+    private void visit(int from, int to, String meaning) {
+        if (to > from) {
+            visitor.visit(from, to - from, depth, meaning);
+        }
+    }
+}
