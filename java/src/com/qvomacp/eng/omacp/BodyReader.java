@@ -350,7 +350,7 @@ final class BodyReader {
         if (length > cursor.left()) {
             reading.deviation(from, Deviation.Kind.CUT_OFF);
         }
-        cursor.skip((int) Math.min(length, cursor.left()));
+        cursor.skip((int) Math.max(0, Math.min(length, cursor.left())));
         return decode(from, start, cursor.at());
     }
 
@@ -366,6 +366,9 @@ final class BodyReader {
     private String character(int from) throws ProvisioningException {
         long point = integer(from);
         charge(from, 1);
+        if (point == Cursor.NO_INTEGER) {
+            return String.valueOf(CharacterSet.REPLACEMENT);
+        }
         if (point > Character.MAX_CODE_POINT
                 || point >= Character.MIN_SURROGATE && point <= Character.MAX_SURROGATE) {
             reading.deviation(from, Deviation.Kind.NO_CHARACTER);
@@ -380,20 +383,21 @@ final class BodyReader {
             return inline(from);
         }
         if (token <= EXT_T_2) {
-            charge(from, 1);
-            return Long.toString(integer(from));
+            long number = integer(from);
+            String text = number == Cursor.NO_INTEGER ? "" : Long.toString(number);
+            charge(from, text.length());
+            return text;
         }
         return "";
     }
 
-    /** A multi-byte integer; 0 for one that cannot be read. */
+    /** A multi-byte integer; {@link Cursor#NO_INTEGER}, which is told, for one that cannot be read. */
     private long integer(int from) {
         long value = cursor.integer();
         if (value == Cursor.NO_INTEGER) {
             reading.deviation(
                     from,
                     cursor.left() == 0 ? Deviation.Kind.CUT_OFF : Deviation.Kind.NUMBER);
-            return 0;
         }
         return value;
     }

@@ -86,7 +86,7 @@ final class DeviationFinder implements Reading {
         inAttribute = false;
         inAttributes = attributes;
         if (!attributes) {
-            requireName();
+            requireName(from);
         }
     }
 
@@ -139,24 +139,24 @@ final class DeviationFinder implements Reading {
 
     @Override
     public void attributesEnd(int from, int to) {
-        requireName();
+        requireName(from);
         inAttributes = false;
     }
 
     @Override
     public void end(int from, int to) {
         if (inAttributes) {
-            requireName();
+            requireName(from);
             inAttributes = false;
         }
         --depth;
     }
 
-    private void requireName() {
+    private void requireName(int from) {
         Element element = open[depth];
         if (!hasName && element.name != null) {
             deviation(
-                    offsets[depth],
+                    from,
                     element == Element.PARM
                             ? Deviation.Kind.NAME_MISSING
                             : Deviation.Kind.TYPE_MISSING);

@@ -59,10 +59,12 @@ public final class ProvisioningDocument {
      */
     public static ProvisioningDocument parse(byte[] body, ReadOptions options)
             throws ProvisioningException {
-        if (body.length > options.inputLimit()) {
-            return of(body, options);
+        ProvisioningException.checkInput(body.length, options);
+        ProvisioningDocument document = of(body.clone(), options);
+        if (options.acceptedOnly()) {
+            ProvisioningException.checkVerdict(document.verdict());
         }
-        return of(body.clone(), options);
+        return document;
     }
 
     /**
@@ -216,6 +218,11 @@ public final class ProvisioningDocument {
         Describer describer = new Describer(visitor);
         describer.header(body, header);
         read(describer);
+    }
+
+    /** The body, not to be changed. */
+    byte[] bytes() {
+        return body;
     }
 
     /** The document element. */

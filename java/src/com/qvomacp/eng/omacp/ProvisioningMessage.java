@@ -21,6 +21,8 @@ import java.util.List;
  * message; {@link #document} has those that stand elsewhere, and whatever else there is.
  */
 public final class ProvisioningMessage {
+    private static final int PUSH = 6;
+
     private final PushHeader header;
     private final ProvisioningDocument document;
 
@@ -144,13 +146,46 @@ public final class ProvisioningMessage {
      * Finds out whether the native library takes the message, its header and its body. It is worked
      * out at each call.
      *
+     * <p>The library takes whole pushes only. Of headers and body that were read apart it is asked
+     * about the push that has them: three bytes in front of the headers, or four in front of more than
+     * 127, for the offset of a header that is refused.
+     *
      * @return the verdict, never {@code null}; that on the body when a body alone was read
      */
     public Verdict verdict() {
         if (header == null) {
             return document.verdict();
         }
-        throw new UnsupportedOperationException();
+        byte[] head = header.bytes();
+        byte[] body = document.bytes();
+        int front = header.transactionIdentifier() == PushHeader.NO_TRANSACTION ? front(head) : 0;
+        int bodyAt = front + head.length;
+        byte[] push = new byte[bodyAt + body.length];
+        if (front > 0) {
+            push[1] = PUSH;
+            putLength(push, front, head.length);
+        }
+        System.arraycopy(head, 0, push, front, head.length);
+        System.arraycopy(body, 0, push, bodyAt, body.length);
+        return LibraryRules.verdictOnPush(push, bodyAt, document);
+    }
+
+    /** How many bytes stand in front of the headers: identifier, type, and length in bytes of 7 bits. */
+    private static int front(byte[] headers) {
+        int front = 3;
+        for (int rest = headers.length >>> 7; rest != 0; rest >>>= 7) {
+            ++front;
+        }
+        return front;
+    }
+
+    /** Writes a length that ends in front of an offset, the high bit set in all bytes but the last. */
+    private static void putLength(byte[] push, int end, int length) {
+        int rest = length;
+        for (int at = end - 1; at > 1; --at) {
+            push[at] = (byte) (rest & 0x7F | (at < end - 1 ? 0x80 : 0));
+            rest >>>= 7;
+        }
     }
 
     /**
@@ -165,7 +200,7 @@ public final class ProvisioningMessage {
         return header == null
                 ? MacResult.NO_METHOD
                 : ProvisioningMac.verify(
-                        header.securityMethod(), header.mac(), document.body(), pin, imsi);
+                        header.securityMethod(), header.mac(), document.bytes(), pin, imsi);
     }
 
     /**
@@ -179,7 +214,7 @@ public final class ProvisioningMessage {
         return header == null
                 ? MacResult.NO_METHOD
                 : ProvisioningMac.verify(
-                        header.securityMethod(), header.mac(), document.body(), key);
+                        header.securityMethod(), header.mac(), document.bytes(), key);
     }
 
     /**

@@ -22,6 +22,7 @@ import java.nio.file.Files;
 import java.nio.file.Path;
 import java.util.ArrayList;
 import java.util.Arrays;
+import java.util.HexFormat;
 import java.util.List;
 import org.junit.jupiter.api.Test;
 import org.junit.jupiter.api.function.Executable;
@@ -162,10 +163,13 @@ class ProvisioningMessageTest {
 
     @Test
     void throwsForWhatTheLibraryRefusesWhenAskedTo() throws Exception {
-        byte[] body = document(characteristic("NAPDEF", parm("APPID", "x")));
+        // A NAPDEF with a parm whose NAME token is none.
+        byte[] body = HexFormat.of().parseHex("030b6a0045c65501877001" + "0101");
         byte[] push = Push.push(body);
         Verdict verdict = ProvisioningMessage.parsePush(push).verdict();
         assertFalse(verdict.isAccepted());
+        assertEquals(4101, verdict.code());
+        assertFalse(verdict.expected().isEmpty());
         ProvisioningException e =
                 refusal(Reason.REFUSED, () -> ProvisioningMessage.parsePush(push, ACCEPTED_ONLY));
         assertEquals(verdict.code(), e.code());
@@ -200,6 +204,21 @@ class ProvisioningMessageTest {
         refusal(
                 Reason.REFUSED,
                 () -> ProvisioningMessage.parse(headers, document(), ACCEPTED_ONLY));
+    }
+
+    @Test
+    void hasTheVerdictOfItsPushWhenHeadersAndBodyWereReadApart() throws Exception {
+        // The library reads the length of the headers from one byte, which 128 bytes do not fit.
+        for (int filler : new int[] {0, 125, 126, 127, 300}) {
+            byte[] headers = new byte[2 + filler + 1];
+            headers[0] = (byte) 0xB6;
+            headers[1] = (byte) 0x84;
+            Arrays.fill(headers, 2, 2 + filler, (byte) 'a');
+            ProvisioningMessage message = ProvisioningMessage.parse(headers, Everything.body());
+            boolean fits = headers.length < 128;
+            assertEquals(fits, message.verdict().isAccepted(), "filler " + filler);
+            assertEquals(!fits, message.verdict().isHeaderRefused(), "filler " + filler);
+        }
     }
 
     // ---- What a message says
