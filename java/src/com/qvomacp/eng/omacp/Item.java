@@ -8,6 +8,12 @@ import java.util.List;
  * Something that stands in a provisioning document: a {@link Characteristic}, a {@link Parameter},
  * or {@link Other} content. Items are immutable; two of them are equal when they say the same,
  * wherever they stand and however they are written.
+ *
+ * <pre>{@code
+ * for (Item item : document.children()) {
+ *     System.out.println(document.path(item) + " at offset " + item.offset());
+ * }
+ * }</pre>
  */
 public abstract class Item {
     static final Item[] NONE = {};

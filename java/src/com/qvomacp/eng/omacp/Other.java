@@ -6,6 +6,14 @@ import java.util.Objects;
 /**
  * What stands in a document and is neither a characteristic nor a parameter. The format has no place
  * for it there, but nothing that was read is left out.
+ *
+ * <pre>{@code
+ * for (Item item : document.children()) {
+ *     if (item instanceof Other) {
+ *         System.out.println(((Other) item).kind() + " at offset " + item.offset());
+ *     }
+ * }
+ * }</pre>
  */
 public final class Other extends Item {
     /** What it is. */

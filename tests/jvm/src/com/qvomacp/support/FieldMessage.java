@@ -11,7 +11,8 @@ import java.util.Map;
 /**
  * A message from elsewhere, of the file that OMACP_FIELD_MESSAGES names: a JSON object a line. Of its
  * members, {@code id} names the message, {@code kind} says what {@code data} is: {@code push-hex} a
- * whole push, {@code wbxml-hex} a body, {@code xml} a document, which is encoded as a sample is.
+ * whole push, {@code wbxml-hex} a body, {@code xml} a document, which is encoded as a sample is; {@code
+ * expected} may hold the PIN that its MAC is made with.
  */
 public final class FieldMessage {
     public static final String VARIABLE = "OMACP_FIELD_MESSAGES";
@@ -24,8 +25,12 @@ public final class FieldMessage {
     /** Null for another kind, and for a document that cannot be encoded. */
     public final byte[] bytes;
 
-    private FieldMessage(String id, String kind, String data) throws Exception {
+    /** Null when it is not known. */
+    public final String pin;
+
+    private FieldMessage(String id, String kind, String data, String pin) throws Exception {
         this.id = id;
+        this.pin = pin;
         this.isPush = !kind.equals("wbxml-hex");
         if (kind.equals("xml")) {
             this.bytes = encoded(data);
@@ -46,10 +51,20 @@ public final class FieldMessage {
                         new FieldMessage(
                                 String.valueOf(fields.get("id")),
                                 String.valueOf(fields.get("kind")),
-                                String.valueOf(fields.get("data"))));
+                                String.valueOf(fields.get("data")),
+                                pin(fields.get("expected"))));
             }
         }
         return messages;
+    }
+
+    private static String pin(Object expected) {
+        if (!(expected instanceof Map)) {
+            return null;
+        }
+        Map<?, ?> facts = (Map<?, ?>) expected;
+        Object pin = facts.get("user_pin");
+        return (String) (pin != null ? pin : facts.get("MAC_verified_with_userpin"));
     }
 
     /** The message as a push. */

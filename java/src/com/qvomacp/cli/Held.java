@@ -1,0 +1,47 @@
+package com.qvomacp.cli;
+
+import java.util.Collections;
+import java.util.List;
+
+/** What came of something that people hold: a push, a body, or why there is no message. */
+final class Held {
+    /** Where it comes from, for people: the input, its line, or all the parts of an SMS. */
+    final String name;
+
+    /** The push or the body; null when there is none. */
+    final byte[] bytes;
+
+    /** False for a body alone. */
+    final boolean isPush;
+
+    /** Why there is no message, as a sentence without a full stop; null when there is one. */
+    final String error;
+
+    /** What is worth a remark, each a sentence without a full stop. */
+    final List<String> notes;
+
+    private Held(String name, byte[] bytes, boolean isPush, String error, List<String> notes) {
+        this.name = name;
+        this.bytes = bytes;
+        this.isPush = isPush;
+        this.error = error;
+        this.notes = notes;
+    }
+
+    static Held push(String name, byte[] push, List<String> notes) {
+        return new Held(name, push, true, null, notes);
+    }
+
+    static Held message(String name, byte[] bytes, boolean isPush) {
+        return new Held(name, bytes, isPush, null, Collections.<String>emptyList());
+    }
+
+    static Held error(String name, String sentence) {
+        return new Held(name, null, false, sentence, Collections.<String>emptyList());
+    }
+
+    /** A remark that belongs to no message. */
+    static Held note(String name, String sentence) {
+        return new Held(name, null, false, null, Collections.singletonList(sentence));
+    }
+}

@@ -1,0 +1,123 @@
+package com.qvomacp.cli;
+
+import java.io.ByteArrayOutputStream;
+import java.util.ArrayList;
+import java.util.Arrays;
+import java.util.Collections;
+import java.util.LinkedHashMap;
+import java.util.List;
+import java.util.Map;
+
+/** Puts pushes together from the parts that short messages carry, in whichever order they come. */
+final class SmsParts {
+    /** The parts of one push. */
+    private static final class Push {
+        final ShortMessage any;
+        final byte[][] parts;
+        final String[] names;
+        final List<String> notes = new ArrayList<>();
+        boolean isFinished;
+
+        Push(ShortMessage first) {
+            any = first;
+            parts = new byte[first.total()][];
+            names = new String[first.total()];
+        }
+
+        List<Integer> missing() {
+            List<Integer> missing = new ArrayList<>();
+            for (int i = 0; i < parts.length; ++i) {
+                if (parts[i] == null) {
+                    missing.add(i + 1);
+                }
+            }
+            return missing;
+        }
+
+        /** Where the parts come from, in their order, each once. */
+        String name() {
+            List<String> different = new ArrayList<>();
+            for (String name : names) {
+                if (name != null && !different.contains(name)) {
+                    different.add(name);
+                }
+            }
+            return String.join(" + ", different);
+        }
+    }
+
+    private final Map<String, Push> pushes = new LinkedHashMap<>();
+
+    /** Takes a short message. Answers the push that is whole with it, an error, or null. */
+    Held take(String name, ShortMessage message) {
+        if (!message.isPart()) {
+            return Held.message(name, message.data, true);
+        }
+        Push push = pushes.get(message.key());
+        if (push == null) {
+            push = new Push(message);
+            pushes.put(message.key(), push);
+        }
+        int index = message.number() - 1;
+        String part = "part " + message.number() + " of " + message.description();
+        if (push.parts[index] != null) {
+            return again(push, name, message, part);
+        }
+        push.parts[index] = message.data;
+        push.names[index] = name;
+        if (push.isFinished || !push.missing().isEmpty()) {
+            return null;
+        }
+        push.isFinished = true;
+        ByteArrayOutputStream whole = new ByteArrayOutputStream();
+        for (byte[] bytes : push.parts) {
+            whole.write(bytes, 0, bytes.length);
+        }
+        return Held.push(push.name(), whole.toByteArray(), push.notes);
+    }
+
+    private static Held again(Push push, String name, ShortMessage message, String part) {
+        String first = push.names[message.number() - 1];
+        if (Arrays.equals(push.parts[message.number() - 1], message.data)) {
+            String sentence = part + " is there twice: in " + first + " and in " + name;
+            if (push.isFinished) {
+                return Held.note(name, sentence);
+            }
+            push.notes.add(sentence);
+            return null;
+        }
+        push.isFinished = true;
+        return Held.error(
+                name, part + " is there twice with different bytes: in " + first + " and in " + name);
+    }
+
+    /** Names what is missing of the pushes that are not whole. */
+    List<Held> missing() {
+        List<Held> errors = new ArrayList<>();
+        for (Push push : pushes.values()) {
+            List<Integer> missing = push.missing();
+            if (!push.isFinished && !missing.isEmpty()) {
+                errors.add(
+                        Held.error(
+                                push.name(),
+                                (missing.size() == 1 ? "part " : "parts ")
+                                        + listed(missing)
+                                        + " of "
+                                        + push.parts.length
+                                        + " of "
+                                        + push.any.description()
+                                        + (missing.size() == 1 ? " is" : " are")
+                                        + " missing"));
+            }
+        }
+        return errors.isEmpty() ? Collections.<Held>emptyList() : errors;
+    }
+
+    private static String listed(List<Integer> numbers) {
+        StringBuilder text = new StringBuilder();
+        for (int i = 0; i < numbers.size(); ++i) {
+            text.append(i == 0 ? "" : i + 1 < numbers.size() ? ", " : " and ").append(numbers.get(i));
+        }
+        return text.toString();
+    }
+}

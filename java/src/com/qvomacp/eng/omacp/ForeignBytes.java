@@ -1,0 +1,323 @@
+package com.qvomacp.eng.omacp;
+
+import java.nio.charset.StandardCharsets;
+import java.util.Locale;
+
+/**
+ * Says what bytes look like that are no provisioning message, for the sentence that refuses them. It
+ * is a guess, and nothing is read by it.
+ *
+ * <pre>{@code
+ * String likeness = ForeignBytes.describe(bytes);
+ * System.err.println(likeness == null ? "no message" : "no message: it looks like " + likeness);
+ * }</pre>
+ */
+public final class ForeignBytes {
+    private static final int PUSH = 0x06;
+    private static final int CONFIRMED_PUSH = 0x07;
+    private static final int LAST_WBXML_VERSION = 0x03;
+    private static final int PROVISIONING = 0x0B;
+    private static final int SHORTEST_BASE64 = 16;
+    private static final char BYTE_ORDER_MARK = '\uFEFF';
+    private static final int LONGEST_LOOK = 4096;
+
+    /** Document types of WBXML, by their public identifiers. */
+    private static final Object[][] DOCUMENTS = {
+        {0x02, "WML 1.0"},
+        {0x03, "WTA 1.0"},
+        {0x04, "WML 1.1"},
+        {0x05, "a service indication (SI 1.0)"},
+        {0x06, "a service loading (SL 1.0)"},
+        {0x07, "a cache operation (CO 1.0)"},
+        {0x08, "a channel (CHANNEL 1.1)"},
+        {0x09, "WML 1.2"},
+        {0x0A, "WML 1.3"},
+        {PROVISIONING, "a provisioning document (PROV 1.0)"},
+        {0x0C, "WTA-WML 1.2"},
+        {0x0D, "an e-mail notification (EMN 1.0)"},
+        {0x0E, "DRM rights (DRMREL 1.0)"},
+        {0x0F, "instant messaging (CSP 1.0)"},
+        {0x10, "instant messaging (CSP 1.1)"},
+        {0x11, "instant messaging (CSP 1.2)"},
+        {0x12, "instant messaging (CSP 1.3)"},
+        {0x13, "DRM (DRM 2.1)"},
+        {0xFD1, "SyncML 1.0"},
+        {0xFD2, "device information (DevInf 1.0)"},
+        {0xFD3, "SyncML 1.1, as of synchronisation or device management"},
+        {0xFD4, "device information (DevInf 1.1)"},
+        {0x1201, "SyncML 1.2, as of synchronisation or device management"},
+        {0x1202, "meta information (MetInf 1.2)"},
+        {0x1203, "device information (DevInf 1.2)"},
+    };
+
+    /** What is pushed under a media type. */
+    private static final String[][] PUSHED = {
+        {"text/vnd.wap.si", "a service indication in XML"},
+        {"application/vnd.wap.sic", "a service indication"},
+        {"text/vnd.wap.sl", "a service loading in XML"},
+        {"application/vnd.wap.slc", "a service loading"},
+        {"text/vnd.wap.co", "a cache operation in XML"},
+        {"application/vnd.wap.coc", "a cache operation"},
+        {"application/vnd.wap.sia", "a session initiation"},
+        {"application/vnd.wap.mms-message", "an MMS notification"},
+        {"text/vnd.wap.emn+xml", "an e-mail notification in XML"},
+        {"application/vnd.wap.emn+wbxml", "an e-mail notification"},
+        {"text/vnd.wap.connectivity-xml", "a provisioning document in XML"},
+        {"application/vnd.wap.connectivity-xml", "a provisioning document in XML"},
+        {"application/vnd.wap.connectivity-wbxml", "a provisioning document"},
+        {"application/vnd.syncml.dm+wbxml", "a device management message"},
+        {"application/vnd.syncml.dm+xml", "a device management message in XML"},
+        {"application/vnd.syncml.notification", "a device management notification"},
+        {"application/vnd.syncml.ds.notification", "a synchronisation notification"},
+        {"application/vnd.oma.drm.message", "a DRM message"},
+        {"application/vnd.oma.drm.rights+xml", "DRM rights in XML"},
+        {"application/vnd.oma.drm.rights+wbxml", "DRM rights"},
+        {"application/vnd.omaloc-supl-init", "a location request (SUPL)"},
+    };
+
+    /** How XML begins, by the names of its document elements. */
+    private static final String[][] ELEMENTS = {
+        {"wap-provisioningdoc", "a provisioning document in XML, which is not encoded yet"},
+        {"si", "a service indication in XML"},
+        {"sl", "a service loading in XML"},
+        {"co", "a cache operation in XML"},
+        {"emn", "an e-mail notification in XML"},
+        {"SyncML", "SyncML in XML"},
+        {"html", "a page in HTML"},
+    };
+
+    /** How files of other kinds begin. */
+    private static final String[][] FILES = {
+        {"\u008C\u0082", "an MMS notification"},
+        {"\u00D4\u00C3\u00B2\u00A1", "a capture of packets (pcap)"},
+        {"\u00A1\u00B2\u00C3\u00D4", "a capture of packets (pcap)"},
+        {"\n\r\r\n", "a capture of packets (pcapng)"},
+        {"PK\u0003\u0004", "a ZIP archive"},
+        {"\u001F\u008B", "data compressed by gzip"},
+        {"\u0089PNG", "a picture (PNG)"},
+        {"\u00FF\u00D8\u00FF", "a picture (JPEG)"},
+        {"%PDF", "a PDF document"},
+    };
+
+    private ForeignBytes() {}
+
+    /**
+     * Says what bytes look like: other documents in WBXML, other pushes, SMS, XML, hexadecimal or
+     * base64 text, and so on.
+     *
+     * @param bytes any bytes
+     * @return such as {@code a service indication (SI 1.0) in WBXML}, without any text of the bytes
+     *     but the name of a media type; {@code null} when they look like nothing that is known
+     */
+    public static String describe(byte[] bytes) {
+        if (bytes.length == 0) {
+            return "no bytes at all";
+        }
+        String text = text(bytes);
+        if (text != null) {
+            return text(text);
+        }
+        String name = push(bytes);
+        if (name == null) {
+            name = sms(bytes);
+        }
+        if (name == null) {
+            name = wbxml(bytes);
+        }
+        return name != null ? name : file(bytes);
+    }
+
+    /** The name of a document type by its public identifier; null for one that is not known. */
+    static String document(long publicIdentifier) {
+        for (Object[] row : DOCUMENTS) {
+            if ((Integer) row[0] == publicIdentifier) {
+                return (String) row[1];
+            }
+        }
+        return null;
+    }
+
+    private static String push(byte[] bytes) {
+        int type = bytes.length > 1 ? bytes[1] : 0;
+        if (type != PUSH && type != CONFIRMED_PUSH) {
+            return null;
+        }
+        String mediaType;
+        try {
+            byte[] push = bytes.clone();
+            push[1] = PUSH;
+            mediaType = PushHeader.parse(push).contentType().mediaType();
+        } catch (ProvisioningException none) {
+            return null;
+        }
+        if (mediaType.indexOf('/') < 0) {
+            return null;
+        }
+        String pushed = value(PUSHED, mediaType);
+        return (type == PUSH ? "a push of " : "a confirmed push of ")
+                + (pushed != null ? pushed : "the type " + Printable.of(mediaType));
+    }
+
+    private static String value(String[][] rows, String key) {
+        for (String[] row : rows) {
+            if (row[0].equals(key)) {
+                return row[1];
+            }
+        }
+        return null;
+    }
+
+    private static String wbxml(byte[] bytes) {
+        Cursor cursor = new Cursor(bytes, 0, bytes.length);
+        int version = cursor.take();
+        long type = cursor.integer();
+        if (version > LAST_WBXML_VERSION || type < 0) {
+            return null;
+        }
+        String name = document(type);
+        if (name == null) {
+            return null;
+        }
+        boolean isWhole = (version == 0 || cursor.integer() >= 0) && cursor.integer() <= cursor.left();
+        return isWhole ? name + " in WBXML" : null;
+    }
+
+    /** Whether the lengths of a message between handset and network, or of its data, come out. */
+    private static String sms(byte[] bytes) {
+        int centre = bytes[0];
+        if (centre == 0 || centre > 1 && centre <= 12 && bytes.length > 1 && bytes[1] < 0) {
+            String name = transferUnit(new Cursor(bytes, centre + 1, bytes.length));
+            if (name != null) {
+                return name;
+            }
+        }
+        String name = transferUnit(new Cursor(bytes, 0, bytes.length));
+        return name == null && isUserData(bytes) ? "the user data of an SMS" : name;
+    }
+
+    private static String transferUnit(Cursor cursor) {
+        int first = cursor.take();
+        int type = first & 0x03;
+        if (first < 0 || type > 1) {
+            return null;
+        }
+        boolean isSubmit = type == 1;
+        cursor.skip(isSubmit ? 1 : 0);
+        int digits = cursor.take();
+        int kind = cursor.take();
+        if (digits < 0 || digits > 20 || kind < 0x80) {
+            return null;
+        }
+        cursor.skip((digits + 1) / 2 + 1);
+        int coding = cursor.take();
+        int validity = (first & 0x18) == 0 ? 0 : (first & 0x18) == 0x10 ? 1 : 7;
+        cursor.skip(isSubmit ? validity : 7);
+        int length = cursor.take();
+        boolean isText = (coding & 0xCC) == 0 || (coding & 0xF4) == 0xF0;
+        int octets = isText ? (7 * length + 7) / 8 : length;
+        if (length < 0 || octets != cursor.left()) {
+            return null;
+        }
+        return isSubmit ? "an SMS that is being sent (SMS-SUBMIT)" : "an SMS (SMS-DELIVER)";
+    }
+
+    private static boolean isUserData(byte[] bytes) {
+        int left = bytes[0];
+        boolean isKnown = false;
+        Cursor cursor = new Cursor(bytes, 1, bytes.length);
+        while (left > 0) {
+            int element = cursor.take();
+            int length = cursor.take();
+            if (length < 0 || length > cursor.left()) {
+                return false;
+            }
+            isKnown |= element == 0x05 && length == 4 || element == 0 && length == 3;
+            cursor.skip(length);
+            left -= 2 + length;
+        }
+        return isKnown && left == 0;
+    }
+
+    private static String file(byte[] bytes) {
+        int length = Math.min(bytes.length, 8);
+        String start = new String(bytes, 0, length, StandardCharsets.ISO_8859_1);
+        for (String[] row : FILES) {
+            if (start.startsWith(row[0])) {
+                return row[1];
+            }
+        }
+        return null;
+    }
+
+    /** The bytes as text when they can be one, without a byte order mark; null otherwise. */
+    private static String text(byte[] bytes) {
+        boolean isWide = bytes.length > 1 && (bytes[0] & 0xFF) + (bytes[1] & 0xFF) == 0xFE + 0xFF;
+        String text = new String(bytes, isWide ? StandardCharsets.UTF_16 : StandardCharsets.UTF_8);
+        boolean isMarked = !text.isEmpty() && text.charAt(0) == BYTE_ORDER_MARK;
+        text = isMarked ? text.substring(1) : text;
+        for (int i = 0; i < text.length(); ++i) {
+            char c = text.charAt(i);
+            if (c < ' ' && !Character.isWhitespace(c) || c == '\u007F' || c == '\uFFFD') {
+                return null;
+            }
+        }
+        return text;
+    }
+
+    private static String text(String text) {
+        String content = text.trim();
+        if (content.isEmpty()) {
+            return "nothing but blanks";
+        }
+        if (content.startsWith("<")) {
+            return markup(content);
+        }
+        if (content.startsWith("{") || content.startsWith("[")) {
+            return "JSON";
+        }
+        if (content.startsWith("+CM") || content.startsWith("AT+CM")) {
+            return "what a modem says of an SMS";
+        }
+        return encoded(content);
+    }
+
+    private static String markup(String content) {
+        String start = content.substring(0, Math.min(content.length(), LONGEST_LOOK));
+        String lower = start.toLowerCase(Locale.ROOT);
+        int found = start.length();
+        String name = "XML";
+        for (String[] row : ELEMENTS) {
+            int at = lower.indexOf("<" + row[0].toLowerCase(Locale.ROOT));
+            int after = at + 1 + row[0].length();
+            boolean isName = after < start.length() && " \t\r\n>/".indexOf(start.charAt(after)) >= 0;
+            if (at >= 0 && at < found && isName) {
+                found = at;
+                name = row[1];
+            }
+        }
+        return name;
+    }
+
+    private static String encoded(String content) {
+        int digits = 0;
+        int letters = 0;
+        int others = 0;
+        for (int i = 0; i < content.length(); ++i) {
+            char c = content.charAt(i);
+            if (c < 0x80 && Character.digit(c, 16) >= 0) {
+                ++digits;
+            } else if (c >= 'A' && c <= 'Z' || c >= 'a' && c <= 'z' || "0123456789+/=-_".indexOf(c) >= 0) {
+                ++letters;
+            } else if (!Character.isWhitespace(c)) {
+                ++others;
+            }
+        }
+        if (letters == 0 && others == 0) {
+            return digits % 2 == 0
+                    ? "hexadecimal text"
+                    : "hexadecimal text with an odd number of digits, " + digits;
+        }
+        boolean isBase64 = others == 0 && content.indexOf(' ') < 0 && digits + letters >= SHORTEST_BASE64;
+        return isBase64 ? "base64 text" : "text";
+    }
+}
