@@ -110,9 +110,14 @@ abstract class Job {
         return "omacp: " + Visible.of(name) + ": ";
     }
 
+    /** Writes to standard error; more about the file goes to the output behind it. */
+    void complain(String text) {
+        console.complain(text);
+    }
+
     void fail(int status, String name, String reason) {
         console.raise(status);
-        console.complain(startOf(name) + Visible.of(reason) + System.lineSeparator());
+        complain(startOf(name) + Visible.of(reason) + System.lineSeparator());
         failed(name, reason);
     }
 }

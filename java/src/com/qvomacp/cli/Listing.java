@@ -70,9 +70,9 @@ final class Listing implements ByteVisitor {
 
     static void write(PrintWriter out, Palette palette, Reading reading) {
         Listing listing = new Listing(out, palette, reading);
-        listing.title();
+        listing.title(reading.source.isPush);
         Verdict verdict = reading.verdict;
-        boolean isRefused = verdict != null && !verdict.isAccepted();
+        boolean isRefused = !verdict.isAccepted();
         if (reading.header != null) {
             if (isRefused && verdict.isHeaderRefused()) {
                 listing.stopsAt(verdict);
@@ -111,9 +111,9 @@ final class Listing implements ByteVisitor {
         nextDeviation = deviations.hasNext() ? deviations.next() : null;
     }
 
-    private void title() {
+    private void title(boolean isPush) {
         StringBuilder title = new StringBuilder();
-        pad(title, hasTwoOffsets ? "msg" : "at", digits + 1);
+        pad(title, hasTwoOffsets ? "msg" : isPush ? "at" : "body", digits + 1);
         pad(title, hasTwoOffsets ? "body" : "", hasTwoOffsets ? digits + 2 : 1);
         pad(title, "bytes", BYTES_WIDTH + 2);
         out.append(palette.bold(title + "meaning")).append('\n');

@@ -6,7 +6,6 @@ import com.qvomacp.eng.omacp.ProvisioningMessage;
 import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.ReadOptions;
 import com.qvomacp.eng.omacp.Verdict;
-import java.util.Arrays;
 
 /** What could be read of a message, and what the native library makes of it. */
 final class Reading {
@@ -18,7 +17,6 @@ final class Reading {
     /** Null when the body cannot be read. */
     final ProvisioningDocument document;
 
-    /** Null when the message cannot be read. */
     final Verdict verdict;
 
     /** Why the message cannot be read; null when it can. */
@@ -47,7 +45,9 @@ final class Reading {
             return new Reading(
                     source, message.header(), message.document(), message.verdict(), null);
         } catch (ProvisioningException failure) {
-            return new Reading(source, headerOf(source), null, null, failure);
+            Verdict verdict =
+                    source.isPush ? Verdict.ofPush(source.bytes) : Verdict.ofBody(source.bytes);
+            return new Reading(source, headerOf(source), null, verdict, failure);
         }
     }
 
@@ -65,13 +65,9 @@ final class Reading {
         return header == null ? 0 : header.length();
     }
 
-    byte[] body() {
-        return Arrays.copyOfRange(source.bytes, bodyAt(), source.bytes.length);
-    }
-
-    /** Whether the library takes the message. */
+    /** Whether the message can be read, and the library takes it. */
     boolean isAccepted() {
-        return verdict != null && verdict.isAccepted();
+        return failure == null && verdict.isAccepted();
     }
 
     /** The exit status that the message stands for. */

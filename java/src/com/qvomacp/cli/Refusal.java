@@ -45,13 +45,18 @@ final class Refusal {
 
     /** Why a message is refused that cannot be read, or is not taken by the library. */
     static Refusal of(Reading reading) {
-        if (reading.failure != null) {
-            return of(reading.source, reading.failure, reading.bodyAt());
-        }
+        ProvisioningException failure = reading.failure;
         Verdict verdict = reading.verdict;
+        boolean isBoth =
+                failure != null
+                        && !verdict.isHeaderRefused()
+                        && verdict.offset() == failure.offset();
+        if (failure != null && !isBoth) {
+            return of(reading.source, failure, reading.bodyAt());
+        }
         return new Refusal(
                 reading.source,
-                verdict.reason(),
+                isBoth ? failure.getMessage() : verdict.reason(),
                 verdict.code() == 0 ? null : verdict.code() + " " + verdict.codeName(),
                 verdict.isHeaderRefused(),
                 reading.bodyAt(),

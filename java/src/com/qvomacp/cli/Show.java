@@ -80,23 +80,28 @@ final class Show extends Job {
         Reading reading = Reading.of(source, limit());
         console.raise(reading.status());
         if (isJson()) {
+            if (!reading.isAccepted()) {
+                complain(Refusal.of(reading).write(startOf(source.name), errPalette()));
+            }
             json(reading);
         } else if (bytes) {
             title(source.name);
             Listing.write(console.out, outPalette(), reading);
+            if (!reading.isAccepted()) {
+                console.out.print("\n" + Refusal.of(reading).write("", outPalette()));
+            }
         } else {
             text(reading);
+            if (!reading.isAccepted()) {
+                complain(Refusal.of(reading).write(startOf(source.name), errPalette()));
+            }
         }
-        if (reading.isAccepted()) {
-            return;
-        }
-        String reason = Refusal.of(reading).write(bytes ? "" : startOf(source.name),
-                bytes ? outPalette() : errPalette());
-        if (bytes) {
-            console.out.print("\n" + reason);
-        } else {
-            console.complain(reason);
-        }
+    }
+
+    @Override
+    void complain(String text) {
+        writer.separate();
+        super.complain(text);
     }
 
     private void showHeader(Source source) {
@@ -109,8 +114,7 @@ final class Show extends Job {
             read = PushHeader.parse(source.bytes);
         } catch (ProvisioningException refused) {
             console.raise(Console.REFUSED);
-            console.complain(
-                    Refusal.of(source, refused, 0).write(startOf(source.name), errPalette()));
+            complain(Refusal.of(source, refused, 0).write(startOf(source.name), errPalette()));
             failed(source.name, refused.getMessage());
             return;
         }
@@ -164,10 +168,9 @@ final class Show extends Job {
         try {
             Comparison.of(reading, listener);
         } catch (UnsatisfiedLinkError missing) {
-            listener.unanswered("the library cannot be loaded");
             console.raise(Console.FAILED);
-            console.complain(
-                    startOf(reading.source.name) + Visible.of(missing.getMessage()) + "\n");
+            complain(startOf(reading.source.name) + Visible.of(missing.getMessage()) + "\n");
+            listener.unanswered("the library cannot be loaded");
         }
     }
 

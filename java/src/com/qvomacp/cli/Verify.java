@@ -56,7 +56,7 @@ final class Verify extends Job {
             header = PushHeader.parse(source.bytes);
         } catch (ProvisioningException none) {
             console.raise(Console.REFUSED);
-            console.complain(Refusal.of(source, none, 0).write(startOf(source.name), errPalette()));
+            complain(Refusal.of(source, none, 0).write(startOf(source.name), errPalette()));
             return;
         }
         SecurityMethod method = header.securityMethod();

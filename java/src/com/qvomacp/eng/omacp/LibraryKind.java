@@ -50,7 +50,7 @@ enum LibraryKind {
             0x57,
             Pages.SECOND,
             Nests.NO,
-            "2F AAUTHDATA 30 AAUTHLEVEL 31 AAUTHNAME 32 AAUTHSECRET 33 AAUTHTYPE 90 ,"),
+            "2F AAUTHDATA 30 AAUTHLEVEL 31 AAUTHNAME 32 AAUTHSECRET 33 AAUTHTYPE+ 90 ,"),
     CLIENTIDENTITY(0x58, Pages.BOTH, Nests.NO, "30 CLIENT-ID"),
     PXAUTHINFO(0x59, Pages.FIRST, Nests.NO, "19 PXAUTH-TYPE 1A PXAUTH-ID 1B PXAUTH-PW"),
     RESOURCE(
@@ -107,11 +107,16 @@ enum LibraryKind {
     /** A list that is left out when it cannot be read. */
     static final byte OPTIONAL_LIST = 3;
 
-    /** The name is given as text. */
-    static final byte NAMED = 4;
+    /** A text that commas go on with. */
+    static final byte CONTINUED_TEXT = 4;
 
-    /** One more value of AAUTHTYPE. */
-    static final byte COMMA = 5;
+    /** The name is given as text. */
+    static final byte NAMED = 5;
+
+    /** One more value of the text that goes on. */
+    static final byte COMMA = 6;
+
+    private static final String MARKS = "*?+";
 
     private static final int FIRST_TYPE = TYPE_AS_TEXT;
     private static final int LAST_TYPE = 0x5B;
@@ -137,8 +142,8 @@ enum LibraryKind {
     private final List<String> namesListed;
 
     /**
-     * Parameters as pairs of token and name: * stands behind a list, ? behind one that may fail, =
-     * for a name given as text, a comma for itself.
+     * Parameters as pairs of token and name: * stands behind a list, ? behind one that may fail, +
+     * behind a text that commas go on with, = for a name given as text, a comma for itself.
      */
     LibraryKind(int token, Pages pages, Nests nests, String pairs) {
         this.type = name();
@@ -181,11 +186,10 @@ enum LibraryKind {
         } else if (marked.equals("=")) {
             shapes[announced] = NAMED;
             name = "NAME";
-        } else if (marked.endsWith("*") || marked.endsWith("?")) {
-            shapes[announced] = marked.endsWith("*") ? LIST : OPTIONAL_LIST;
-            name = marked.substring(0, marked.length() - 1);
         } else {
-            shapes[announced] = TEXT;
+            int mark = MARKS.indexOf(marked.charAt(marked.length() - 1));
+            shapes[announced] = (byte) (TEXT + 1 + mark);
+            name = mark < 0 ? marked : marked.substring(0, marked.length() - 1);
         }
         parms[announced] = name;
     }

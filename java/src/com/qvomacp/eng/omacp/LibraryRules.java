@@ -28,11 +28,19 @@ final class LibraryRules {
         if (!header.isTaken()) {
             return Verdict.onHeader(Refusal.ofHeader(header));
         }
+        if (header.bodyAt == bodyAt && document != null) {
+            return document.verdict();
+        }
         // The library reads the length of the headers from one byte, whatever its form.
         byte[] body = Arrays.copyOfRange(push, header.bodyAt, push.length);
         return verdictOn(body, document, bodyAt - header.bodyAt);
     }
 
+    /**
+     * Finds out whether the library takes a body.
+     *
+     * @param shift where the document begins in what the library takes for the body
+     */
     private static Verdict verdictOn(byte[] body, ProvisioningDocument document, int shift) {
         LibraryWalk walk = new LibraryWalk(body, null);
         Refusal refusal = null;
@@ -45,6 +53,9 @@ final class LibraryRules {
         } catch (LibraryStop stop) {
             code = stop.code;
             refusal = Refusal.of(walk, stop);
+        }
+        if (refusal != null && shift != 0) {
+            refusal = refusal.ofShiftedBody(shift);
         }
         return Verdict.onBody(body, code, walk.at, refusal, document, shift);
     }

@@ -39,7 +39,6 @@ final class LibraryWalk {
     private static final int HAS_ATTRIBUTES = 0x80;
     private static final int VERSION = 0x45;
     private static final int VERSION_1_0 = 0x46;
-    private static final int AAUTHTYPE = 0x33;
 
     private static final int PROVISIONING = 11;
     private static final int LONGEST_INTEGER = 5;
@@ -52,6 +51,9 @@ final class LibraryWalk {
 
     /** Longer than every name that is compared. */
     private static final int NAME_KEPT = 64;
+
+    /** NAME, VALUE and STR_I. */
+    private static final int PLAIN_START = 3;
 
     /** How the text of a value token joins a text that is there. */
     private static final int DIRECT = 0;
@@ -153,8 +155,8 @@ final class LibraryWalk {
 
     long nameLength = -1;
 
-    /** AAUTHTYPE of the innermost characteristic, which commas continue; -1 for none. */
-    private long authTypeLength;
+    /** How long the text of the innermost characteristic is that commas go on with; -1 for none. */
+    private long continuedLength;
 
     // ---- What was skipped
 
@@ -733,7 +735,7 @@ final class LibraryWalk {
         LibraryKind kind = hasAttributes ? type() : null;
         isTyped = true;
         kinds[depth - 1] = kind;
-        authTypeLength = -1;
+        continuedLength = -1;
         if (trace != null) {
             trace.characteristic(depth - 1, start, kind, kind == null ? nameText() : kind.type);
         }
@@ -821,6 +823,10 @@ final class LibraryWalk {
                     token &= TAG_MASK;
                 }
             }
+            if (trace == null && takePlain(kind, token)) {
+                inParm = false;
+                return;
+            }
             if (token == END) {
                 ++at;
                 inParm = false;
@@ -833,14 +839,46 @@ final class LibraryWalk {
         }
     }
 
+    /**
+     * Reads the usual parameter in one go: NAME, VALUE, an inline string and the END of the parm.
+     * Any other is read step by step, and so is one that would pass the limit of text.
+     */
+    private boolean takePlain(LibraryKind kind, int token) {
+        byte[] bytes = data;
+        int end = size;
+        int start = at + PLAIN_START;
+        byte shape = kind.shapes[token];
+        if (shape == LibraryKind.UNKNOWN
+                || shape > LibraryKind.OPTIONAL_LIST
+                || start >= end
+                || bytes[at] != (byte) token
+                || bytes[at + 1] != VALUE
+                || bytes[at + 2] != STR_I) {
+            return false;
+        }
+        int nul = start;
+        while (nul < end && bytes[nul] != 0) {
+            ++nul;
+        }
+        long read = textRead + nul - start;
+        if (nul + 1 >= end || bytes[nul + 1] != END || read > textLimit) {
+            return false;
+        }
+        textRead = read;
+        at = nul + 2;
+        return true;
+    }
+
     private void parameter(LibraryKind kind, int token) throws LibraryStop {
         switch (kind.shapes[token]) {
             case LibraryKind.TEXT:
                 newText();
                 pair(kind, token);
-                if (kind == LibraryKind.APPAUTH && token == AAUTHTYPE) {
-                    authTypeLength = held ? length : -1;
-                }
+                break;
+            case LibraryKind.CONTINUED_TEXT:
+                newText();
+                pair(kind, token);
+                continuedLength = held ? length : -1;
                 break;
             case LibraryKind.LIST:
                 list(kind);
@@ -944,9 +982,9 @@ final class LibraryWalk {
         }
     }
 
-    /** Reads one more value of AAUTHTYPE. */
+    /** Reads one more value of the text that goes on. */
     private void comma() throws LibraryStop {
-        ++at;
+        int comma = at++;
         int token = peek(Place.COMMA_VALUE);
         boolean isBehindSwitch = token == SWITCH_PAGE;
         if (isBehindSwitch) {
@@ -954,8 +992,8 @@ final class LibraryWalk {
             token = peek(Place.COMMA_VALUE);
         }
         newText();
-        held = authTypeLength >= 0;
-        length = Math.max(authTypeLength, 0);
+        held = continuedLength >= 0;
+        length = Math.max(continuedLength, 0);
         int start = at;
         if (isString(token) && !isBehindSwitch) {
             if (!reserve(1)) {
@@ -968,6 +1006,9 @@ final class LibraryWalk {
             ++at;
             checkLimit(Place.COMMA_VALUE, start);
         }
-        authTypeLength = held ? length : -1;
+        continuedLength = held ? length : -1;
+        if (trace != null) {
+            trace.value(comma, at);
+        }
     }
 }

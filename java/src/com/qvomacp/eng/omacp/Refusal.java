@@ -114,6 +114,15 @@ final class Refusal {
                 reason + skipped(walk));
     }
 
+    /** The same of a body that is not the message's, which begins so many bytes behind it. */
+    Refusal ofShiftedBody(int shift) {
+        String where =
+                "; the library takes the body to begin "
+                        + bytes(Math.abs(shift))
+                        + (shift < 0 ? " later" : " earlier");
+        return new Refusal(offset, path, found, expected, reason + where);
+    }
+
     /** What was skipped against the format in front of where the walk ended; empty for nothing. */
     private static String skipped(LibraryWalk walk) {
         if (walk.skipped == null) {

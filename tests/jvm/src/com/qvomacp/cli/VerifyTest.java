@@ -130,7 +130,7 @@ class VerifyTest {
         message[1] = 7;
         assertEquals(1, verify(message, "--pin", "1234"));
         assertEquals("", output);
-        String start = "omacp: standard input: refused: the second byte is 07, and 06 in a push";
+        String start = "omacp: standard input: refused: the second byte is 07, and in a push 06;";
         assertTrue(errors.startsWith(start), errors);
         message[1] = 6;
         message[message.length - 1] = 99;
