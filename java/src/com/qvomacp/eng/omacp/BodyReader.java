@@ -217,7 +217,7 @@ final class BodyReader {
             if (token == SWITCH_PAGE) {
                 attributePage = switchPage(from, true, attributePage);
                 attributes = CodePage.of(attributePage);
-            } else if (PIECES[token]) {
+            } else if (PIECES[token] && !isOfPage(token)) {
                 piece(from, token);
                 ++pieces;
             } else if (token >= FIRST_VALUE) {
@@ -229,12 +229,31 @@ final class BodyReader {
         }
     }
 
+    /**
+     * Whether a token that WBXML gives another meaning is one of the code page all the same, as some
+     * of page 1 are. They stand for extensions, which mean nothing to the format, and for a reference
+     * to the string table, which it can only be where there is a table.
+     */
+    private boolean isOfPage(int token) {
+        if (attributePage == 0 || attributes == null) {
+            return false;
+        }
+        if (token < FIRST_VALUE) {
+            return attributes.start(token) != null;
+        }
+        return attributes.value(token) != null
+                && (token != STR_T || header.tableAt == header.elementsAt);
+    }
+
     private void attribute(int from, int token) throws ProvisioningException {
         if (token == LITERAL) {
             String name = literal(from);
             reading.attribute(from, cursor.at(), Attribute.of(name), name, null);
             pieces = 0;
             return;
+        }
+        if (PIECES[token]) {
+            reading.deviation(from, Deviation.Kind.OTHER_MEANING);
         }
         CodePage.Start start = attributes == null ? null : attributes.start(token);
         if (start == null && attributePage != 0) {
@@ -262,6 +281,9 @@ final class BodyReader {
     }
 
     private void value(int from, int token) throws ProvisioningException {
+        if (PIECES[token]) {
+            reading.deviation(from, Deviation.Kind.OTHER_MEANING);
+        }
         String value = attributes == null ? null : attributes.value(token);
         if (value == null && attributePage != 0) {
             value = CodePage.of(0).value(token);
@@ -328,7 +350,7 @@ final class BodyReader {
         if (length > cursor.left()) {
             reading.deviation(from, Deviation.Kind.CUT_OFF);
         }
-        cursor.skip((int) Math.min(length, cursor.left()));
+        cursor.skip((int) Math.max(0, Math.min(length, cursor.left())));
         return decode(from, start, cursor.at());
     }
 
@@ -344,6 +366,9 @@ final class BodyReader {
     private String character(int from) throws ProvisioningException {
         long point = integer(from);
         charge(from, 1);
+        if (point == Cursor.NO_INTEGER) {
+            return String.valueOf(CharacterSet.REPLACEMENT);
+        }
         if (point > Character.MAX_CODE_POINT
                 || point >= Character.MIN_SURROGATE && point <= Character.MAX_SURROGATE) {
             reading.deviation(from, Deviation.Kind.NO_CHARACTER);
@@ -358,20 +383,21 @@ final class BodyReader {
             return inline(from);
         }
         if (token <= EXT_T_2) {
-            charge(from, 1);
-            return Long.toString(integer(from));
+            long number = integer(from);
+            String text = number == Cursor.NO_INTEGER ? "" : Long.toString(number);
+            charge(from, text.length());
+            return text;
         }
         return "";
     }
 
-    /** A multi-byte integer; 0 for one that cannot be read. */
+    /** A multi-byte integer; {@link Cursor#NO_INTEGER}, which is told, for one that cannot be read. */
     private long integer(int from) {
         long value = cursor.integer();
         if (value == Cursor.NO_INTEGER) {
             reading.deviation(
                     from,
                     cursor.left() == 0 ? Deviation.Kind.CUT_OFF : Deviation.Kind.NUMBER);
-            return 0;
         }
         return value;
     }

@@ -21,6 +21,7 @@ public final class Deviation {
         OTHER_ELEMENT("the element is none of the format"),
         UNKNOWN_TOKEN("the token stands for nothing"),
         OTHER_PAGE("the token is not one of the code page in force, and is read by page 0"),
+        OTHER_MEANING("WBXML has another meaning for the token of the code page"),
         NAME_MISSING("the parm has no NAME"),
         TYPE_MISSING("the characteristic has no TYPE"),
         SECOND_ATTRIBUTE("the element has the attribute already"),
@@ -40,10 +41,16 @@ public final class Deviation {
         END_MISSING("the body ends without the END of the element"),
         TRAILING("these bytes stand behind the end of the document");
 
+        private static final Kind[] ALL = values();
+
         private final String sentence;
 
         Kind(String sentence) {
             this.sentence = sentence;
+        }
+
+        static Kind of(int ordinal) {
+            return ALL[ordinal];
         }
     }
 

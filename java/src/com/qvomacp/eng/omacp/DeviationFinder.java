@@ -1,8 +1,9 @@
 package com.qvomacp.eng.omacp;
 
-import java.util.ArrayList;
+import java.util.AbstractList;
 import java.util.Arrays;
 import java.util.List;
+import java.util.RandomAccess;
 
 /**
  * Gathers where a body departs from the format: what its reader tells, and where elements and
@@ -13,7 +14,13 @@ final class DeviationFinder implements Reading {
     private final Item[] items;
 
     private final Item root;
-    private final List<Deviation> deviations = new ArrayList<>();
+
+    /** The deviations, each an offset, a kind and the item that it is in: there may be many. */
+    private int[] at = new int[16];
+
+    private byte[] kinds = new byte[16];
+    private Item[] in = new Item[16];
+    private int count;
 
     /** The elements that have not ended, and where they begin. */
     private Element[] open = new Element[16];
@@ -36,8 +43,31 @@ final class DeviationFinder implements Reading {
         }
     }
 
+    /** What was found; a deviation is made when somebody asks for it. */
     List<Deviation> found() {
-        return deviations;
+        return new Found(Arrays.copyOf(at, count), Arrays.copyOf(kinds, count), Arrays.copyOf(in, count));
+    }
+
+    private static final class Found extends AbstractList<Deviation> implements RandomAccess {
+        private final int[] at;
+        private final byte[] kinds;
+        private final Item[] in;
+
+        Found(int[] at, byte[] kinds, Item[] in) {
+            this.at = at;
+            this.kinds = kinds;
+            this.in = in;
+        }
+
+        @Override
+        public Deviation get(int index) {
+            return new Deviation(at[index], Deviation.Kind.of(kinds[index]), in[index]);
+        }
+
+        @Override
+        public int size() {
+            return at.length;
+        }
     }
 
     @Override
@@ -56,7 +86,7 @@ final class DeviationFinder implements Reading {
         inAttribute = false;
         inAttributes = attributes;
         if (!attributes) {
-            requireName();
+            requireName(from);
         }
     }
 
@@ -109,24 +139,24 @@ final class DeviationFinder implements Reading {
 
     @Override
     public void attributesEnd(int from, int to) {
-        requireName();
+        requireName(from);
         inAttributes = false;
     }
 
     @Override
     public void end(int from, int to) {
         if (inAttributes) {
-            requireName();
+            requireName(from);
             inAttributes = false;
         }
         --depth;
     }
 
-    private void requireName() {
+    private void requireName(int from) {
         Element element = open[depth];
         if (!hasName && element.name != null) {
             deviation(
-                    offsets[depth],
+                    from,
                     element == Element.PARM
                             ? Deviation.Kind.NAME_MISSING
                             : Deviation.Kind.TYPE_MISSING);
@@ -151,7 +181,14 @@ final class DeviationFinder implements Reading {
 
     @Override
     public void deviation(int at, Deviation.Kind kind) {
+        if (count == kinds.length) {
+            this.at = Arrays.copyOf(this.at, 2 * count);
+            kinds = Arrays.copyOf(kinds, 2 * count);
+            in = Arrays.copyOf(in, 2 * count);
+        }
         Item item = depth == 0 ? null : items[offsets[depth]];
-        deviations.add(new Deviation(at, kind, item == null ? root : item));
+        this.at[count] = at;
+        kinds[count] = (byte) kind.ordinal();
+        in[count++] = item == null ? root : item;
     }
 }

@@ -8,6 +8,12 @@ import java.util.List;
  * Something that stands in a provisioning document: a {@link Characteristic}, a {@link Parameter},
  * or {@link Other} content. Items are immutable; two of them are equal when they say the same,
  * wherever they stand and however they are written.
+ *
+ * <pre>{@code
+ * for (Item item : document.children()) {
+ *     System.out.println(document.path(item) + " at offset " + item.offset());
+ * }
+ * }</pre>
  */
 public abstract class Item {
     static final Item[] NONE = {};
@@ -66,8 +72,8 @@ public abstract class Item {
         return parent;
     }
 
-    /** What the item is called in a path. */
-    abstract String step();
+    /** Adds what the item is called in a path. */
+    abstract void step(StringBuilder path);
 
     /** Whether the item itself says the same as another one, whatever stands in them. */
     abstract boolean says(Item other);

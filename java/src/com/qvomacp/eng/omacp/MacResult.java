@@ -1,6 +1,14 @@
 package com.qvomacp.eng.omacp;
 
-/** What comes of checking the MAC of a message. */
+/**
+ * What comes of checking the MAC of a message.
+ *
+ * <pre>{@code
+ * if (message.verifyMac("1234", null) != MacResult.RIGHT) {
+ *     System.out.println("the message is not to be believed");
+ * }
+ * }</pre>
+ */
 public enum MacResult {
     /** The MAC is that of the body and the key: nobody who has no key has written the message. */
     RIGHT,

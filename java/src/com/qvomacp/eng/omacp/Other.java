@@ -6,6 +6,14 @@ import java.util.Objects;
 /**
  * What stands in a document and is neither a characteristic nor a parameter. The format has no place
  * for it there, but nothing that was read is left out.
+ *
+ * <pre>{@code
+ * for (Item item : document.children()) {
+ *     if (item instanceof Other) {
+ *         System.out.println(((Other) item).kind() + " at offset " + item.offset());
+ *     }
+ * }
+ * }</pre>
  */
 public final class Other extends Item {
     /** What it is. */
@@ -86,8 +94,8 @@ public final class Other extends Item {
     }
 
     @Override
-    String step() {
-        return name == null ? kind().name().toLowerCase(Locale.ROOT) : Printable.of(name);
+    void step(StringBuilder path) {
+        Printable.append(path, name == null ? kind().name().toLowerCase(Locale.ROOT) : name);
     }
 
     @Override

@@ -1,7 +1,6 @@
 package com.qvomacp.eng.omacp;
 
 import java.util.Arrays;
-import java.util.Collections;
 import java.util.List;
 import java.util.Objects;
 
@@ -33,12 +32,7 @@ public final class ProvisioningDocument {
 
     /** Reads a body that nobody else has. */
     static ProvisioningDocument of(byte[] body, ReadOptions options) throws ProvisioningException {
-        if (body.length > options.inputLimit()) {
-            throw new ProvisioningException(
-                    ProvisioningException.Reason.INPUT_TOO_LONG,
-                    options.inputLimit(),
-                    "the body has " + body.length + " bytes, over the limit of " + options.inputLimit());
-        }
+        ProvisioningException.checkInput(body.length, options);
         return new ProvisioningDocument(body, options.textLimit());
     }
 
@@ -65,10 +59,12 @@ public final class ProvisioningDocument {
      */
     public static ProvisioningDocument parse(byte[] body, ReadOptions options)
             throws ProvisioningException {
-        if (body.length > options.inputLimit()) {
-            return of(body, options);
+        ProvisioningException.checkInput(body.length, options);
+        ProvisioningDocument document = of(body.clone(), options);
+        if (options.acceptedOnly()) {
+            ProvisioningException.checkVerdict(document.verdict());
         }
-        return of(body.clone(), options);
+        return document;
     }
 
     /**
@@ -191,7 +187,7 @@ public final class ProvisioningDocument {
     public List<Deviation> deviations() {
         DeviationFinder finder = new DeviationFinder(root, body.length);
         read(finder);
-        return Collections.unmodifiableList(finder.found());
+        return finder.found();
     }
 
     /**
@@ -209,7 +205,7 @@ public final class ProvisioningDocument {
      * @return the verdict, never {@code null}
      */
     public Verdict verdict() {
-        throw new UnsupportedOperationException();
+        return LibraryRules.verdictOnBody(body, this);
     }
 
     /**
@@ -222,6 +218,16 @@ public final class ProvisioningDocument {
         Describer describer = new Describer(visitor);
         describer.header(body, header);
         read(describer);
+    }
+
+    /** The body, not to be changed. */
+    byte[] bytes() {
+        return body;
+    }
+
+    /** The document element. */
+    Item root() {
+        return root;
     }
 
     /** The innermost item that some byte of the body is in; the document for one outside of all. */

@@ -4,7 +4,17 @@ import java.util.ArrayList;
 import java.util.Collections;
 import java.util.List;
 
-/** Says that a message cannot be read, or is refused, and why and where. */
+/**
+ * Says that a message cannot be read, or is refused, and why and where.
+ *
+ * <pre>{@code
+ * try {
+ *     ProvisioningMessage.parseBody(new byte[] {3, 11, 106});
+ * } catch (ProvisioningException e) {
+ *     System.out.println(e.reason() + " at " + e.offset() + ": " + e.getMessage());
+ * }
+ * }</pre>
+ */
 public final class ProvisioningException extends Exception {
     private static final long serialVersionUID = 2L;
 
@@ -29,10 +39,19 @@ public final class ProvisioningException extends Exception {
         REFUSED
     }
 
+    /** Why the message is not read. */
     private final Reason reason;
+
+    /** The library's result code, or 0. */
     private final int code;
+
+    /** Where the reading ends. */
     private final int offset;
+
+    /** In which element it ends, or null. */
     private final String path;
+
+    /** What would have been taken there. */
     private final ArrayList<String> expected;
 
     ProvisioningException(Reason reason, int offset, String text) {
@@ -47,6 +66,27 @@ public final class ProvisioningException extends Exception {
         this.offset = offset;
         this.path = path;
         this.expected = new ArrayList<>(expected);
+    }
+
+    /** Throws for an input that is longer than the options allow. */
+    static void checkInput(long length, ReadOptions options) throws ProvisioningException {
+        if (length > options.inputLimit()) {
+            String text = length + " bytes are more than the limit of " + options.inputLimit();
+            throw new ProvisioningException(Reason.INPUT_TOO_LONG, options.inputLimit(), text);
+        }
+    }
+
+    /** Throws for what the native library refuses. */
+    static void checkVerdict(Verdict verdict) throws ProvisioningException {
+        if (!verdict.isAccepted()) {
+            throw new ProvisioningException(
+                    Reason.REFUSED,
+                    verdict.code(),
+                    verdict.offset(),
+                    verdict.path(),
+                    verdict.expected(),
+                    verdict.reason());
+        }
     }
 
     /**

@@ -1,22 +1,32 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Arrays;
+import java.util.List;
+
 /**
- * What a pushed provisioning message sets. Immutable.
+ * What a provisioning message says: its push header, its document, and views of the document's
+ * characteristics by their kinds. Everything that can be read is read; whether the native library
+ * takes the message is told beside it, by {@link #verdict}. Immutable.
  *
  * <pre>{@code
- * ProvisioningMessage message = ProvisioningMessage.parsePush(bytes);
+ * ProvisioningMessage message = ProvisioningMessage.parsePush(push);
  * if (message.verifyMac("1234", null) == MacResult.RIGHT) {
  *     for (AccessPoint accessPoint : message.accessPoints()) {
  *         System.out.println(accessPoint.name() + ": " + accessPoint.address());
  *     }
  * }
  * }</pre>
+ *
+ * <p>The lists hold the characteristics that stand directly in the document, in the order of the
+ * message; {@link #document} has those that stand elsewhere, and whatever else there is.
  */
 public final class ProvisioningMessage {
+    private static final int PUSH = 6;
+
     private final PushHeader header;
     private final ProvisioningDocument document;
 
-    ProvisioningMessage(PushHeader header, ProvisioningDocument document) {
+    private ProvisioningMessage(PushHeader header, ProvisioningDocument document) {
         this.header = header;
         this.document = document;
     }
@@ -43,7 +53,75 @@ public final class ProvisioningMessage {
      */
     public static ProvisioningMessage parsePush(byte[] push, ReadOptions options)
             throws ProvisioningException {
-        throw new UnsupportedOperationException();
+        ProvisioningException.checkInput(push.length, options);
+        PushHeader header = PushHeader.parse(push);
+        return read(header, Arrays.copyOfRange(push, header.length(), push.length), options);
+    }
+
+    /**
+     * Reads a body with the usual limits.
+     *
+     * @param body a WBXML body; it is copied
+     * @return what it says
+     * @throws ProvisioningException when it is over a limit, is no WBXML, or is a document of another
+     *     type
+     */
+    public static ProvisioningMessage parseBody(byte[] body) throws ProvisioningException {
+        return parseBody(body, ReadOptions.DEFAULT);
+    }
+
+    /**
+     * Reads a body.
+     *
+     * @param body a WBXML body; it is copied
+     * @param options the limits, and whether what the native library refuses is refused
+     * @return what it says
+     * @throws ProvisioningException as {@link #parseBody(byte[])}, and as the options ask for
+     */
+    public static ProvisioningMessage parseBody(byte[] body, ReadOptions options)
+            throws ProvisioningException {
+        ProvisioningException.checkInput(body.length, options);
+        return read(null, body.clone(), options);
+    }
+
+    /**
+     * Reads a message as a platform's receiver of pushes hands it out, with the usual limits.
+     *
+     * @param header the headers, from the content type on; they are copied
+     * @param data the body; it is copied
+     * @return what it says
+     * @throws ProvisioningException when it is over a limit, {@code header} does not begin with a
+     *     content type, or {@code data} is no WBXML or a document of another type
+     */
+    public static ProvisioningMessage parse(byte[] header, byte[] data)
+            throws ProvisioningException {
+        return parse(header, data, ReadOptions.DEFAULT);
+    }
+
+    /**
+     * Reads a message as a platform's receiver of pushes hands it out.
+     *
+     * @param header the headers, from the content type on; they are copied
+     * @param data the body; it is copied
+     * @param options the limits, and whether what the native library refuses is refused
+     * @return what it says
+     * @throws ProvisioningException as {@link #parse(byte[], byte[])}, and as the options ask for
+     */
+    public static ProvisioningMessage parse(byte[] header, byte[] data, ReadOptions options)
+            throws ProvisioningException {
+        ProvisioningException.checkInput((long) header.length + data.length, options);
+        return read(PushHeader.parseHeaders(header), data.clone(), options);
+    }
+
+    /** Reads a body that nobody else has. */
+    private static ProvisioningMessage read(PushHeader header, byte[] body, ReadOptions options)
+            throws ProvisioningException {
+        ProvisioningMessage message =
+                new ProvisioningMessage(header, ProvisioningDocument.of(body, options));
+        if (options.acceptedOnly()) {
+            ProvisioningException.checkVerdict(message.verdict());
+        }
+        return message;
     }
 
     /**
@@ -68,10 +146,46 @@ public final class ProvisioningMessage {
      * Finds out whether the native library takes the message, its header and its body. It is worked
      * out at each call.
      *
-     * @return the verdict, never {@code null}
+     * <p>The library takes whole pushes only. Of headers and body that were read apart it is asked
+     * about the push that has them: three bytes in front of the headers, or four in front of more than
+     * 127, for the offset of a header that is refused.
+     *
+     * @return the verdict, never {@code null}; that on the body when a body alone was read
      */
     public Verdict verdict() {
-        throw new UnsupportedOperationException();
+        if (header == null) {
+            return document.verdict();
+        }
+        byte[] head = header.bytes();
+        byte[] body = document.bytes();
+        int front = header.transactionIdentifier() == PushHeader.NO_TRANSACTION ? front(head) : 0;
+        int bodyAt = front + head.length;
+        byte[] push = new byte[bodyAt + body.length];
+        if (front > 0) {
+            push[1] = PUSH;
+            putLength(push, front, head.length);
+        }
+        System.arraycopy(head, 0, push, front, head.length);
+        System.arraycopy(body, 0, push, bodyAt, body.length);
+        return LibraryRules.verdictOnPush(push, bodyAt, document);
+    }
+
+    /** How many bytes stand in front of the headers: identifier, type, and length in bytes of 7 bits. */
+    private static int front(byte[] headers) {
+        int front = 3;
+        for (int rest = headers.length >>> 7; rest != 0; rest >>>= 7) {
+            ++front;
+        }
+        return front;
+    }
+
+    /** Writes a length that ends in front of an offset, the high bit set in all bytes but the last. */
+    private static void putLength(byte[] push, int end, int length) {
+        int rest = length;
+        for (int at = end - 1; at > 1; --at) {
+            push[at] = (byte) (rest & 0x7F | (at < end - 1 ? 0x80 : 0));
+            rest >>>= 7;
+        }
     }
 
     /**
@@ -86,7 +200,7 @@ public final class ProvisioningMessage {
         return header == null
                 ? MacResult.NO_METHOD
                 : ProvisioningMac.verify(
-                        header.securityMethod(), header.mac(), document.body(), pin, imsi);
+                        header.securityMethod(), header.mac(), document.bytes(), pin, imsi);
     }
 
     /**
@@ -100,6 +214,158 @@ public final class ProvisioningMessage {
         return header == null
                 ? MacResult.NO_METHOD
                 : ProvisioningMac.verify(
-                        header.securityMethod(), header.mac(), document.body(), key);
+                        header.securityMethod(), header.mac(), document.bytes(), key);
+    }
+
+    /**
+     * Lists the proxies.
+     *
+     * @return every PXLOGICAL, in the order of the message; not modifiable
+     */
+    public List<Proxy> proxies() {
+        return views(Proxy.TYPE, Proxy::new);
+    }
+
+    /**
+     * Lists the network access points.
+     *
+     * @return every NAPDEF, in the order of the message; not modifiable
+     */
+    public List<AccessPoint> accessPoints() {
+        return views(AccessPoint.TYPE, AccessPoint::new);
+    }
+
+    /**
+     * Lists where further provisioning comes from.
+     *
+     * @return every BOOTSTRAP, in the order of the message; not modifiable
+     */
+    public List<Bootstrap> bootstraps() {
+        return views(Bootstrap.TYPE, Bootstrap::new);
+    }
+
+    /**
+     * Lists the identities that the client gets.
+     *
+     * @return every CLIENTIDENTITY, in the order of the message; not modifiable
+     */
+    public List<ClientIdentity> clientIdentities() {
+        return views(ClientIdentity.TYPE, ClientIdentity::new);
+    }
+
+    /**
+     * Tells the identity that the client gets.
+     *
+     * @return CLIENT-ID of the first CLIENTIDENTITY; {@code null} when it is not set
+     */
+    public String clientId() {
+        List<ClientIdentity> identities = clientIdentities();
+        return identities.isEmpty() ? null : identities.get(0).clientId();
+    }
+
+    /**
+     * Lists what vendors' own software is told.
+     *
+     * @return every VENDORCONFIG, in the order of the message; not modifiable
+     */
+    public List<VendorConfiguration> vendorConfigurations() {
+        return views(VendorConfiguration.TYPE, VendorConfiguration::new);
+    }
+
+    /**
+     * Lists the settings of applications.
+     *
+     * @return every APPLICATION, in the order of the message; not modifiable
+     */
+    public List<Application> applications() {
+        return views(Application.TYPE, Application::new);
+    }
+
+    /**
+     * Lists which traffic takes which way.
+     *
+     * @return every ACCESS, in the order of the message; not modifiable
+     */
+    public List<AccessRule> accessRules() {
+        return views(AccessRule.TYPE, AccessRule::new);
+    }
+
+    /**
+     * Lists the Wi-Fi networks.
+     *
+     * @return every WI-FI, in the order of the message; not modifiable
+     */
+    public List<Wifi> wifis() {
+        return views(Wifi.TYPE, Wifi::new);
+    }
+
+    /**
+     * Lists the settings for voice over Wi-Fi.
+     *
+     * @return every such characteristic, in the order of the message; not modifiable
+     */
+    public List<VoWifi> voWifis() {
+        return views(VoWifi.TYPE, VoWifi::new);
+    }
+
+    private <V> List<V> views(String type, TypedCharacteristic.Maker<V> maker) {
+        return TypedCharacteristic.views(document.root(), type, maker);
+    }
+
+    /**
+     * Compares what two messages say.
+     *
+     * @param other what to compare with
+     * @return true for a message with an equal header, or none either, and an equal document
+     */
+    @Override
+    public boolean equals(Object other) {
+        if (!(other instanceof ProvisioningMessage)) {
+            return false;
+        }
+        ProvisioningMessage that = (ProvisioningMessage) other;
+        return (header == null ? that.header == null : header.equals(that.header))
+                && document.equals(that.document);
+    }
+
+    /**
+     * Answers a number that fits {@link #equals}.
+     *
+     * @return the same number for equal messages
+     */
+    @Override
+    public int hashCode() {
+        return 31 * (header == null ? 0 : header.hashCode()) + document.hashCode();
+    }
+
+    /**
+     * Shows how much is set, in one line without any value and without the MAC, which may go to a
+     * log.
+     *
+     * @return one line of text
+     */
+    @Override
+    public String toString() {
+        return "ProvisioningMessage{"
+                + (header == null ? "" : "securityMethod=" + header.securityMethod() + ", ")
+                + "proxies="
+                + proxies().size()
+                + ", accessPoints="
+                + accessPoints().size()
+                + ", bootstraps="
+                + bootstraps().size()
+                + ", clientIdentities="
+                + clientIdentities().size()
+                + ", vendorConfigurations="
+                + vendorConfigurations().size()
+                + ", applications="
+                + applications().size()
+                + ", accessRules="
+                + accessRules().size()
+                + ", wifis="
+                + wifis().size()
+                + ", voWifis="
+                + voWifis().size()
+                + "}";
     }
 }

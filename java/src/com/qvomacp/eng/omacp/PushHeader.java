@@ -77,6 +77,11 @@ public final class PushHeader {
         return HeaderReader.readHeaders(headers);
     }
 
+    /** What was read, not to be changed. */
+    byte[] bytes() {
+        return bytes;
+    }
+
     /**
      * Tells the transaction identifier.
      *

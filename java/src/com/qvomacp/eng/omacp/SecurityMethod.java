@@ -1,6 +1,14 @@
 package com.qvomacp.eng.omacp;
 
-/** The security methods of OMA Provisioning Bootstrap: what the key of the MAC is made of. */
+/**
+ * The security methods of OMA Provisioning Bootstrap: what the key of the MAC is made of.
+ *
+ * <pre>{@code
+ * if (header.securityMethod() == SecurityMethod.NETWPIN) {
+ *     System.out.println("the user need not type a PIN");
+ * }
+ * }</pre>
+ */
 public enum SecurityMethod {
     /** The message states no security method. */
     NONE,

@@ -1,6 +1,9 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Arrays;
+import java.util.Collections;
 import java.util.List;
+import java.util.Objects;
 
 /**
  * Whether the native library takes a message, and where and why it does not. The library has rules
@@ -14,7 +17,53 @@ import java.util.List;
  * }</pre>
  */
 public final class Verdict {
-    private Verdict() {}
+    private static final byte[] NO_BODY = {};
+
+    private final boolean headerRefused;
+    private final int code;
+    private final int bytesRead;
+
+    /** Null when the message is accepted. */
+    private final Refusal refusal;
+
+    private final byte[] body;
+
+    /** Null when the body could not be read. */
+    private final ProvisioningDocument document;
+
+    /** Where the document begins in what the library takes for the body. */
+    private final int shift;
+
+    private Verdict(
+            boolean headerRefused,
+            int code,
+            int bytesRead,
+            Refusal refusal,
+            byte[] body,
+            ProvisioningDocument document,
+            int shift) {
+        this.headerRefused = headerRefused;
+        this.code = code;
+        this.bytesRead = bytesRead;
+        this.refusal = refusal;
+        this.body = body;
+        this.document = document;
+        this.shift = shift;
+    }
+
+    static Verdict onHeader(Refusal refusal) {
+        return new Verdict(true, 0, 0, refusal, NO_BODY, null, 0);
+    }
+
+    static Verdict onBody(
+            byte[] body,
+            int code,
+            int bytesRead,
+            Refusal refusal,
+            ProvisioningDocument document,
+            int shift) {
+        return new Verdict(false, code, bytesRead, refusal, body, document, shift);
+    }
 
     /**
      * Tells whether the library takes the message.
@@ -22,7 +71,7 @@ public final class Verdict {
      * @return true when it does
      */
     public boolean isAccepted() {
-        throw new UnsupportedOperationException();
+        return refusal == null;
     }
 
     /**
@@ -31,7 +80,7 @@ public final class Verdict {
      * @return true when it does not get as far as the body
      */
     public boolean isHeaderRefused() {
-        throw new UnsupportedOperationException();
+        return headerRefused;
     }
 
     /**
@@ -41,7 +90,7 @@ public final class Verdict {
      *     and holds no document; 0 too when the header is refused, for which there is no code
      */
     public int code() {
-        throw new UnsupportedOperationException();
+        return code;
     }
 
     /**
@@ -50,7 +99,24 @@ public final class Verdict {
      * @return such as {@code QVS_ERROR_WBXML_UNKNOWN_ELEMENT}; never {@code null}
      */
     public String codeName() {
-        throw new UnsupportedOperationException();
+        switch (code) {
+            case 0:
+                return "QVS_OK";
+            case LibraryWalk.FAILED:
+                return "QVS_ERROR_FAILED";
+            case LibraryWalk.BAD_ARGUMENT:
+                return "QVS_ERROR_BAD_ARGUMENT";
+            case LibraryWalk.UNKNOWN_ELEMENT:
+                return "QVS_ERROR_WBXML_UNKNOWN_ELEMENT";
+            case LibraryWalk.NO_DATA:
+                return "QVS_ERROR_WBXML_NO_DATA";
+            case LibraryWalk.WRONG_DOCUMENT_TYPE:
+                return "QVS_ERROR_WBXML_DOCUMENT_TYPE";
+            case LibraryWalk.NO_MEMORY:
+                return "QVS_ERROR_NO_MEMORY";
+            default:
+                throw new AssertionError(code);
+        }
     }
 
     /**
@@ -59,7 +125,7 @@ public final class Verdict {
      * @return bytes
      */
     public int bytesRead() {
-        throw new UnsupportedOperationException();
+        return bytesRead;
     }
 
     /**
@@ -68,7 +134,7 @@ public final class Verdict {
      * @return bytes from its start, counted from 0; -1 when the message is accepted
      */
     public int offset() {
-        throw new UnsupportedOperationException();
+        return refusal == null ? -1 : refusal.offset;
     }
 
     /**
@@ -77,7 +143,7 @@ public final class Verdict {
      * @return the path; {@code null} when the message is accepted or the header is refused
      */
     public String path() {
-        throw new UnsupportedOperationException();
+        return refusal == null ? null : refusal.path;
     }
 
     /**
@@ -86,7 +152,7 @@ public final class Verdict {
      * @return such as {@code SWITCH_PAGE (0x00)}; {@code null} when the message is accepted
      */
     public String found() {
-        throw new UnsupportedOperationException();
+        return refusal == null ? null : refusal.found;
     }
 
     /**
@@ -96,7 +162,7 @@ public final class Verdict {
      *     message is accepted and when nothing would have been
      */
     public List<String> expected() {
-        throw new UnsupportedOperationException();
+        return refusal == null ? Collections.<String>emptyList() : refusal.expected;
     }
 
     /**
@@ -105,7 +171,7 @@ public final class Verdict {
      * @return a sentence without a full stop; {@code null} when the message is accepted
      */
     public String reason() {
-        throw new UnsupportedOperationException();
+        return refusal == null ? null : refusal.reason;
     }
 
     /**
@@ -114,6 +180,50 @@ public final class Verdict {
      * @return the items of the document, in its order; not modifiable
      */
     public List<Item> readOtherwise() {
-        throw new UnsupportedOperationException();
+        if (headerRefused || document == null) {
+            return Collections.emptyList();
+        }
+        return Collections.unmodifiableList(ReadOtherwise.of(body, document, shift));
+    }
+
+    @Override
+    public boolean equals(Object other) {
+        if (!(other instanceof Verdict)) {
+            return false;
+        }
+        Verdict that = (Verdict) other;
+        return headerRefused == that.headerRefused
+                && code == that.code
+                && bytesRead == that.bytesRead
+                && offset() == that.offset()
+                && Objects.equals(path(), that.path())
+                && Objects.equals(found(), that.found())
+                && Objects.equals(reason(), that.reason())
+                && expected().equals(that.expected())
+                && shift == that.shift
+                && Arrays.equals(body, that.body);
+    }
+
+    @Override
+    public int hashCode() {
+        return 31 * (31 * (31 * code + bytesRead) + offset()) + Objects.hashCode(reason());
+    }
+
+    /**
+     * Shows the verdict in one line, which may go to a log.
+     *
+     * @return the code and where and why the message is refused
+     */
+    @Override
+    public String toString() {
+        if (isAccepted()) {
+            return "accepted";
+        }
+        return "refused: "
+                + reason()
+                + (headerRefused ? "" : ", " + code + " " + codeName())
+                + ", offset "
+                + offset()
+                + (path() == null ? "" : ", " + path());
     }
 }

@@ -1,6 +1,16 @@
 package com.qvomacp.eng.omacp;
 
-/** How a type, a name or a value is written in the body. */
+/**
+ * How a type, a name or a value is written in the body.
+ *
+ * <pre>{@code
+ * for (Characteristic characteristic : document.characteristics()) {
+ *     if (characteristic.typeWriting() == Writing.INLINE) {
+ *         System.out.println(characteristic.type() + " is written out");
+ *     }
+ * }
+ * }</pre>
+ */
 public enum Writing {
     /** As a token that stands for it. */
     TOKEN,

@@ -3,6 +3,13 @@ package com.qvomacp.eng.parser;
 /**
  * The ACCESS characteristics of the message. Every parameter of an ACCESS is a list of values. All
  * indexes count from 1.
+ *
+ * <pre>{@code
+ * XCPCtxAccess access = new XCPCtxAccess();
+ * for (int a = 1; a <= access.qvomacp_GetPxCtxAccessCount(); ++a) {
+ *     System.out.println(access.qvomacp_GetPxRuleData(a, 1));
+ * }
+ * }</pre>
  */
 public class XCPCtxAccess {
     /** Makes an object to call the natives on; it holds no state. */

@@ -6,6 +6,13 @@ package com.qvomacp.eng.parser;
  *
  * <p>Parameter names used here: {@code application} counts the APPLICATION of the message, the
  * others count within the characteristic before them. All count from 1.
+ *
+ * <pre>{@code
+ * XCPCtxApplication applications = new XCPCtxApplication();
+ * for (int a = 1; a <= applications.qvomacp_GetPxApplicationCount(); ++a) {
+ *     System.out.println(applications.qvomacp_GetApplicationData(a)[0]);
+ * }
+ * }</pre>
  */
 public class XCPCtxApplication {
     /** Makes an object to call the natives on; it holds no state. */

@@ -1,6 +1,15 @@
 package com.qvomacp.eng.parser;
 
-/** The BOOTSTRAP characteristics of the message. All indexes count from 1. */
+/**
+ * The BOOTSTRAP characteristics of the message. All indexes count from 1.
+ *
+ * <pre>{@code
+ * XCPCtxBootstrap bootstraps = new XCPCtxBootstrap();
+ * for (int b = 1; b <= bootstraps.qvomacp_GetPxBootstrapCount(); ++b) {
+ *     System.out.println(bootstraps.qvomacp_GetBootstrapData(b)[2]);
+ * }
+ * }</pre>
+ */
 public class XCPCtxBootstrap {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxBootstrap() {}

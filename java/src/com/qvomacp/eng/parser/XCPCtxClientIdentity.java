@@ -1,6 +1,13 @@
 package com.qvomacp.eng.parser;
 
-/** The CLIENTIDENTITY of the message. Only the first one of a message is kept. */
+/**
+ * The CLIENTIDENTITY of the message. Only the first one of a message is kept.
+ *
+ * <pre>{@code
+ * String clientId = new XCPCtxClientIdentity().qvomacp_GetPxClientIdentityData();
+ * System.out.println(clientId);
+ * }</pre>
+ */
 public class XCPCtxClientIdentity {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxClientIdentity() {}

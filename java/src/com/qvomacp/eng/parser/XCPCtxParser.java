@@ -5,6 +5,14 @@ package com.qvomacp.eng.parser;
  *
  * <p>Calling order: {@link #qvomacp_parser}, then (if it answered {@code true}) queries, then
  * {@link #qvomacp_parser_del}. See the package description for loading and for threads.
+ *
+ * <pre>{@code
+ * XCPCtxParser parser = new XCPCtxParser();
+ * if (parser.qvomacp_parser(push, push.length, 0)) {
+ *     System.out.println(parser.qvomacp_GetParserBodyLen());
+ * }
+ * parser.qvomacp_parser_del();
+ * }</pre>
  */
 public class XCPCtxParser {
     /** Makes an object to call the natives on; it holds no state. */
@@ -17,8 +25,8 @@ public class XCPCtxParser {
      * that cannot be decoded neither a header nor a context is there.
      *
      * @param message the push as it was received, from its transaction identifier on
-     * @param length how many bytes of {@code message} to read; the low 32 bits count, and nothing
-     *     compares them with the length of the array, so it must not be more than that
+     * @param length how many bytes of {@code message} to read; the low 32 bits count. A message is
+     *     refused when they are more than the array has
      * @param mode 1 to read the header only; every other value for the whole message
      * @return {@code true} when header and (unless mode is 1) body were understood; {@code false}
      *     when the push is refused (not a connectionless push, an unknown content type) or its body

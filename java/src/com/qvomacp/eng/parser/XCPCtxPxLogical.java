@@ -7,6 +7,13 @@ package com.qvomacp.eng.parser;
  * <p>Parameter names used here: {@code proxy} counts the PXLOGICAL of the message, {@code physical}
  * the PXPHYSICAL of that PXLOGICAL, {@code port} the PORT of the one or of the other. All count
  * from 1.
+ *
+ * <pre>{@code
+ * XCPCtxPxLogical proxies = new XCPCtxPxLogical();
+ * for (int p = 1; p <= proxies.qvomacp_GetPxLogicalCount(); ++p) {
+ *     System.out.println(proxies.qvomacp_GetProxyData(p)[0]);
+ * }
+ * }</pre>
  */
 public class XCPCtxPxLogical {
     /** Makes an object to call the natives on; it holds no state. */

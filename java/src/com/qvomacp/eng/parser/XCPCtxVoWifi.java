@@ -1,6 +1,15 @@
 package com.qvomacp.eng.parser;
 
-/** The voice-over-Wi-Fi characteristics of the message. Indexes count from 1. */
+/**
+ * The voice-over-Wi-Fi characteristics of the message. Indexes count from 1.
+ *
+ * <pre>{@code
+ * XCPCtxVoWifi voWifis = new XCPCtxVoWifi();
+ * for (int v = 1; v <= voWifis.qvomacp_GetPxVoWifiCount(); ++v) {
+ *     System.out.println(voWifis.qvomacp_GetPxVoWifiData(v)[0]);
+ * }
+ * }</pre>
+ */
 public class XCPCtxVoWifi {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxVoWifi() {}

@@ -1,6 +1,15 @@
 package com.qvomacp.eng.parser;
 
-/** The WI-FI characteristics of the message. Indexes count from 1. */
+/**
+ * The WI-FI characteristics of the message. Indexes count from 1.
+ *
+ * <pre>{@code
+ * XCPCtxWifi wifis = new XCPCtxWifi();
+ * for (int w = 1; w <= wifis.qvomacp_GetPxWifiCount(); ++w) {
+ *     System.out.println(wifis.qvomacp_GetPxWifiData(w)[0]);
+ * }
+ * }</pre>
+ */
 public class XCPCtxWifi {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxWifi() {}

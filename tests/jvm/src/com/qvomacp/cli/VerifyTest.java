@@ -6,12 +6,11 @@ import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
 import com.qvomacp.support.Document;
-import com.qvomacp.support.Natives;
-import java.io.ByteArrayInputStream;
-import java.io.ByteArrayOutputStream;
+import com.qvomacp.support.Push;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.Path;
+import java.util.Arrays;
 import java.util.HexFormat;
 import javax.crypto.Mac;
 import javax.crypto.spec.SecretKeySpec;
@@ -19,7 +18,7 @@ import org.junit.jupiter.api.Test;
 import org.junit.jupiter.api.io.TempDir;
 
 /** The command that checks MACs. */
-class VerifyTest extends Natives {
+class VerifyTest {
     private static final byte[] BODY = Document.document(Document.characteristic("PORT"));
 
     @TempDir Path directory;
@@ -28,15 +27,13 @@ class VerifyTest extends Natives {
     private String errors;
 
     private int verify(byte[] input, String... arguments) {
-        ByteArrayOutputStream out = new ByteArrayOutputStream();
-        ByteArrayOutputStream err = new ByteArrayOutputStream();
         String[] all = new String[arguments.length + 1];
         all[0] = "verify";
         System.arraycopy(arguments, 0, all, 1, arguments.length);
-        int status = Main.run(new ByteArrayInputStream(input), out, err, Terminal.NONE, all);
-        output = out.toString(StandardCharsets.UTF_8);
-        errors = err.toString(StandardCharsets.UTF_8);
-        return status;
+        Program program = Program.run(input, all);
+        output = program.output();
+        errors = program.errors();
+        return program.status();
     }
 
     private static byte[] signed(int sec, byte[] key) throws Exception {
@@ -89,20 +86,52 @@ class VerifyTest extends Natives {
         assertSays(
                 1,
                 "NOT VERIFIED: the message states a security method that is not known",
-                withShortType(0xB6, BODY).sec(0x99).mac("00").bytes(),
+                Push.secured(0x99, "00", BODY),
                 "--pin=1");
         assertSays(
                 1, "NOT VERIFIED: it has no push header, and so no MAC", BODY, "--pin=1");
+    }
+
+    @Test
+    void tellsAMissingMacFromAWrongOne() {
+        byte[] message = withShortType(0xB6, BODY).sec(0x81).bytes();
+        assertSays(1, "NOT VERIFIED: no MAC was found (USERPIN)", message, "--pin=1");
+        byte[] behind = Arrays.copyOf(message, message.length + 41);
+        Arrays.fill(behind, message.length + 1, behind.length, (byte) 'A');
+        assertSays(
+                1,
+                "NOT VERIFIED: no MAC was found (USERPIN), but what may be one stands at message"
+                        + " offset "
+                        + (message.length + 1),
+                behind,
+                "--pin=1");
+    }
+
+    @Test
+    void saysWhatCannotBeAPinOrAnImsi() throws Exception {
+        byte[] userPinMac = withShortType(0xB6, BODY).sec(0x83).bytes();
+        assertSays(
+                2, "NOT VERIFIED: the PIN cannot be one for USERPINMAC", userPinMac, "--pin=1234");
+        byte[] netwPin = signed(0x80, HexFormat.of().parseHex("2943103254769810"));
+        for (String imsi : new String[] {"", "23401234567890a", "2340123456789012"}) {
+            assertSays(
+                    2,
+                    "NOT VERIFIED: the IMSI is no number of 1 to 15 digits",
+                    netwPin,
+                    "--imsi=" + imsi);
+        }
     }
 
     /** The MAC is that of the body, whether or not the body can be decoded. */
     @Test
     void explainsARefusedHeaderAlone() throws Exception {
         byte[] message = signed(0x81, ascii("1234"));
+        message[0] = 99;
         message[1] = 7;
         assertEquals(1, verify(message, "--pin", "1234"));
         assertEquals("", output);
-        assertTrue(errors.startsWith("omacp: standard input: refused: PDU type 0x07"), errors);
+        String start = "omacp: standard input: refused: the second byte is 07, and 06 in a push";
+        assertTrue(errors.startsWith(start), errors);
         message[1] = 6;
         message[message.length - 1] = 99;
         assertSays(1, "NOT VERIFIED: the MAC is wrong (USERPIN)", message, "--pin", "1234");

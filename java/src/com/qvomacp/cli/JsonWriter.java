@@ -1,0 +1,199 @@
+package com.qvomacp.cli;
+
+import java.io.PrintWriter;
+
+/**
+ * Writes JSON as it is told it: nothing but the open brackets is kept. What a terminal would obey
+ * is escaped in strings.
+ */
+final class JsonWriter {
+    private static final String INDENT = "  ";
+
+    /** Deeper values are indented no further: the brackets tell how deep they are. */
+    private static final int DEEPEST = 32;
+
+    private final PrintWriter out;
+    private final boolean onOneLine;
+
+    /** The closing brackets of what is open, the innermost one last. */
+    private final StringBuilder open = new StringBuilder();
+
+    /** How much of {@link #open} stands on lines of its own; the rest shares a line. */
+    private int flatFrom = Integer.MAX_VALUE;
+
+    private boolean isFirst = true;
+    private boolean isNamed;
+
+    JsonWriter(PrintWriter out, boolean onOneLine) {
+        this.out = out;
+        this.onOneLine = onOneLine;
+    }
+
+    JsonWriter beginObject() {
+        return begin('{', '}');
+    }
+
+    /** An object all of which stands on one line. */
+    JsonWriter beginFlatObject() {
+        beginObject();
+        flatFrom = Math.min(flatFrom, open.length());
+        return this;
+    }
+
+    JsonWriter beginArray() {
+        return begin('[', ']');
+    }
+
+    /** Ends the innermost object or array; a line ends behind the outermost one. */
+    JsonWriter end() {
+        int last = open.length() - 1;
+        char bracket = open.charAt(last);
+        boolean wasFlat = isFlat();
+        open.setLength(last);
+        if (open.length() < flatFrom) {
+            flatFrom = Integer.MAX_VALUE;
+        }
+        if (!isFirst && !wasFlat) {
+            newLine();
+        }
+        out.append(bracket);
+        isFirst = false;
+        if (open.length() == 0) {
+            out.append('\n');
+            isFirst = true;
+        }
+        return this;
+    }
+
+    int depth() {
+        return open.length();
+    }
+
+    /** Ends what has been begun since there were so many objects and arrays open. */
+    void endTo(int depth) {
+        if (isNamed) {
+            nothing();
+        }
+        while (open.length() > depth) {
+            end();
+        }
+    }
+
+    JsonWriter name(String name) {
+        next();
+        string(name);
+        out.append(": ");
+        isNamed = true;
+        return this;
+    }
+
+    JsonWriter member(String name, String value) {
+        return name(name).text(value);
+    }
+
+    JsonWriter member(String name, long value) {
+        return name(name).number(value);
+    }
+
+    JsonWriter member(String name, boolean value) {
+        name(name).next();
+        out.print(value);
+        return this;
+    }
+
+    JsonWriter nullMember(String name) {
+        return name(name).nothing();
+    }
+
+    /** A string, or null. */
+    JsonWriter text(String text) {
+        if (text == null) {
+            return nothing();
+        }
+        next();
+        string(text);
+        return this;
+    }
+
+    private JsonWriter number(long number) {
+        next();
+        out.print(number);
+        return this;
+    }
+
+    private JsonWriter nothing() {
+        next();
+        out.append("null");
+        return this;
+    }
+
+    private JsonWriter begin(char bracket, char closing) {
+        next();
+        out.append(bracket);
+        open.append(closing);
+        isFirst = true;
+        return this;
+    }
+
+    /** Whatever stands between one value and the next. */
+    private void next() {
+        if (isNamed) {
+            isNamed = false;
+            return;
+        }
+        if (open.length() > 0) {
+            if (!isFirst) {
+                out.append(isFlat() ? ", " : ",");
+            }
+            if (!isFlat()) {
+                newLine();
+            }
+        }
+        isFirst = false;
+    }
+
+    private boolean isFlat() {
+        return onOneLine || open.length() >= flatFrom;
+    }
+
+    private void newLine() {
+        out.append('\n');
+        for (int i = Math.min(open.length(), DEEPEST); i > 0; --i) {
+            out.append(INDENT);
+        }
+    }
+
+    private void string(String text) {
+        StringBuilder escaped = new StringBuilder();
+        out.append('"');
+        int written = 0;
+        for (int i = 0; i < text.length(); ) {
+            int codePoint = text.codePointAt(i);
+            int next = i + Character.charCount(codePoint);
+            boolean isQuoted = codePoint == '"' || codePoint == '\\';
+            if (isQuoted || !Visible.isVisible(codePoint)) {
+                out.write(text, written, i - written);
+                escaped.setLength(0);
+                if (isQuoted) {
+                    escaped.append('\\').append((char) codePoint);
+                } else {
+                    escape(escaped, codePoint, text, i, next);
+                }
+                out.append(escaped);
+                written = next;
+            }
+            i = next;
+        }
+        out.write(text, written, text.length() - written);
+        out.append('"');
+    }
+
+    private static void escape(StringBuilder to, int codePoint, String text, int from, int end) {
+        int known = "\n\r\t".indexOf(codePoint);
+        if (known >= 0) {
+            to.append('\\').append("nrt".charAt(known));
+        } else {
+            Visible.escape(to, text, from, end);
+        }
+    }
+}

@@ -1,0 +1,35 @@
+package com.qvomacp.cli;
+
+/** Colours, where they are wanted. */
+final class Palette {
+    static final Palette NONE = new Palette(false);
+    static final Palette COLORS = new Palette(true);
+
+    private static final String RESET = "\u001b[0m";
+
+    private final boolean on;
+
+    private Palette(boolean on) {
+        this.on = on;
+    }
+
+    String dim(String text) {
+        return painted("\u001b[2m", text);
+    }
+
+    String error(String text) {
+        return painted("\u001b[1;31m", text);
+    }
+
+    String bold(String text) {
+        return painted("\u001b[1m", text);
+    }
+
+    String text(String text) {
+        return painted("\u001b[32m", text);
+    }
+
+    private String painted(String color, String text) {
+        return on && !text.isEmpty() ? color + text + RESET : text;
+    }
+}

@@ -1,0 +1,28 @@
+package com.qvomacp.eng.omacp;
+
+/**
+ * The identity that the client gets: a CLIENTIDENTITY.
+ *
+ * <pre>{@code
+ * for (ClientIdentity identity : message.clientIdentities()) {
+ *     System.out.println(identity.clientId());
+ * }
+ * }</pre>
+ */
+public final class ClientIdentity extends TypedCharacteristic {
+    /** The type of such a characteristic. */
+    static final String TYPE = "CLIENTIDENTITY";
+
+    ClientIdentity(Characteristic characteristic) {
+        super(characteristic);
+    }
+
+    /**
+     * Tells the identity.
+     *
+     * @return CLIENT-ID; {@code null} when it is not set
+     */
+    public String clientId() {
+        return value("CLIENT-ID");
+    }
+}

@@ -1,0 +1,113 @@
+package com.qvomacp.eng.omacp;
+
+/**
+ * Where a walk has ended: the elements around, innermost eight at most. To number them the body is
+ * walked once more, since counting while nobody asks would cost every walk.
+ */
+final class LibraryPath implements LibraryTrace {
+    private static final int LONGEST = 8;
+    private static final String SEPARATOR = " / ";
+    private static final String UNTYPED = "characteristic";
+
+    /** The walk that has ended. */
+    private final LibraryWalk ended;
+
+    private final int[] numbers;
+
+    private LibraryPath(LibraryWalk ended) {
+        this.ended = ended;
+        numbers = new int[ended.depth];
+    }
+
+    /** The elements around the place where a walk has ended. */
+    static String of(LibraryWalk ended) {
+        LibraryPath path = new LibraryPath(ended);
+        if (ended.depth > 0) {
+            try {
+                new LibraryWalk(ended.data, path).run();
+            } catch (LibraryStop again) {
+                // As before.
+            }
+        }
+        return path.text();
+    }
+
+    /** Counts a characteristic that stands in front of one of those around, of the same type. */
+    @Override
+    public void characteristic(int depth, int start, LibraryKind kind, String type) {
+        if (depth < numbers.length
+                && start < ended.starts[depth]
+                && (depth == 0 || start > ended.starts[depth - 1])
+                && typeText(type).equals(type(depth))) {
+            ++numbers[depth];
+        }
+    }
+
+    private static String typeText(String type) {
+        return type == null ? UNTYPED : Printable.of(type);
+    }
+
+    /** The type of one that is open. Only the innermost one can be of an unknown type. */
+    private String type(int depth) {
+        LibraryKind kind = ended.kinds[depth];
+        if (kind != null) {
+            return kind.type;
+        }
+        return typeText(ended.isTyped ? ended.nameText() : null);
+    }
+
+    private String parm() {
+        String name = null;
+        if (ended.parmToken == LibraryWalk.NAME_AS_TEXT) {
+            name = ended.nameText();
+        } else if (ended.parmToken >= 0) {
+            name = ended.kinds[ended.depth - 1].parm(ended.parmToken);
+        }
+        return name == null || name.isEmpty() ? Element.PARM.text : Printable.of(name);
+    }
+
+    private String text() {
+        StringBuilder path = new StringBuilder();
+        int steps = 1 + ended.depth + (ended.inParm ? 1 : 0);
+        int first = Math.max(steps - LONGEST, 0);
+        if (first > 0) {
+            path.append("...");
+        }
+        for (int step = first; step < steps; ++step) {
+            path.append(path.length() == 0 ? "" : SEPARATOR);
+            if (step == 0) {
+                path.append(ended.inDocument ? Element.DOCUMENT.text : "document");
+            } else if (step <= ended.depth) {
+                path.append(type(step - 1)).append(' ').append(numbers[step - 1] + 1);
+            } else {
+                path.append(parm());
+            }
+        }
+        return path.toString();
+    }
+
+    @Override
+    public void characteristicEnd(int start, int end) {
+        // Counted where it begins.
+    }
+
+    @Override
+    public void parm(int start) {
+        // Not numbered.
+    }
+
+    @Override
+    public void name(String name) {
+        // Not numbered.
+    }
+
+    @Override
+    public void value(int start, int end) {
+        // Not numbered.
+    }
+
+    @Override
+    public void parmEnd(int start, int end) {
+        // Not numbered.
+    }
+}

@@ -1,0 +1,39 @@
+package com.qvomacp.eng.omacp;
+
+import java.util.List;
+
+/**
+ * A port of a proxy, a machine of it, or an application address: a PORT.
+ *
+ * <pre>{@code
+ * for (Port port : message.proxies().get(0).ports()) {
+ *     System.out.println(port.number() + " for " + port.services());
+ * }
+ * }</pre>
+ */
+public final class Port extends TypedCharacteristic {
+    /** The type of such a characteristic. */
+    static final String TYPE = "PORT";
+
+    Port(Characteristic characteristic) {
+        super(characteristic);
+    }
+
+    /**
+     * Tells the number of the port, as the message writes it.
+     *
+     * @return PORTNBR; {@code null} when it is not set
+     */
+    public String number() {
+        return value("PORTNBR");
+    }
+
+    /**
+     * Lists the services of the port, such as {@code CO-WSP}.
+     *
+     * @return every SERVICE, in the order of the message; not modifiable
+     */
+    public List<String> services() {
+        return values("SERVICE");
+    }
+}

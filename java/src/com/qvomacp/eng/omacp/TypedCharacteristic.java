@@ -1,0 +1,103 @@
+package com.qvomacp.eng.omacp;
+
+import java.util.ArrayList;
+import java.util.Collections;
+import java.util.List;
+
+/**
+ * A characteristic of a kind that is known, with an accessor for each parameter of its kind. It is a
+ * view of the tree and holds nothing of its own: what it has no accessor for is within reach by
+ * {@link #characteristic}.
+ *
+ * <pre>{@code
+ * for (AccessPoint accessPoint : message.accessPoints()) {
+ *     System.out.println(accessPoint.name() + ": " + accessPoint.characteristic().parameters());
+ * }
+ * }</pre>
+ */
+public abstract class TypedCharacteristic {
+    private final Characteristic characteristic;
+
+    TypedCharacteristic(Characteristic characteristic) {
+        this.characteristic = characteristic;
+    }
+
+    /** What makes a view of a characteristic. */
+    interface Maker<V> {
+        V of(Characteristic characteristic);
+    }
+
+    /** A view of each characteristic of a type directly in an item, in a list that stays as it is. */
+    static <V> List<V> views(Item item, String type, Maker<V> maker) {
+        List<V> views = new ArrayList<>();
+        for (Item child : item.inside()) {
+            if (child instanceof Characteristic && type.equals(((Characteristic) child).type())) {
+                views.add(maker.of((Characteristic) child));
+            }
+        }
+        return Collections.unmodifiableList(views);
+    }
+
+    /**
+     * Tells the characteristic, with everything that stands in it.
+     *
+     * @return the characteristic of the tree, never {@code null}
+     */
+    public final Characteristic characteristic() {
+        return characteristic;
+    }
+
+    final boolean has(String name) {
+        return characteristic.parameter(name) != null;
+    }
+
+    final String value(String name) {
+        return characteristic.value(name);
+    }
+
+    final List<String> values(String name) {
+        return characteristic.values(name);
+    }
+
+    final <V> List<V> views(String type, Maker<V> maker) {
+        return views(characteristic, type, maker);
+    }
+
+    /**
+     * Compares what is set.
+     *
+     * @param other what to compare with
+     * @return true for an object of the same class whose characteristic is equal
+     */
+    @Override
+    public final boolean equals(Object other) {
+        return other != null
+                && other.getClass() == getClass()
+                && ((TypedCharacteristic) other).characteristic.equals(characteristic);
+    }
+
+    /**
+     * Answers a number that fits {@link #equals}.
+     *
+     * @return the same number for equal objects
+     */
+    @Override
+    public final int hashCode() {
+        return characteristic.hashCode();
+    }
+
+    /**
+     * Shows how much is set, in one line without any value, which may go to a log.
+     *
+     * @return one line of text
+     */
+    @Override
+    public final String toString() {
+        return getClass().getSimpleName()
+                + "{parameters="
+                + characteristic.parameters().size()
+                + ", characteristics="
+                + characteristic.characteristics().size()
+                + "}";
+    }
+}

@@ -1,0 +1,52 @@
+package com.qvomacp.eng.omacp;
+
+import java.util.List;
+
+/**
+ * What a vendor's own software is told: a VENDORCONFIG. But for NAME its parameters are the
+ * vendor's own.
+ *
+ * <pre>{@code
+ * for (VendorConfiguration configuration : message.vendorConfigurations()) {
+ *     for (Parameter parameter : configuration.parameters()) {
+ *         System.out.println(parameter.name() + ": " + parameter.value());
+ *     }
+ * }
+ * }</pre>
+ */
+public final class VendorConfiguration extends TypedCharacteristic {
+    /** The type of such a characteristic. */
+    static final String TYPE = "VENDORCONFIG";
+
+    VendorConfiguration(Characteristic characteristic) {
+        super(characteristic);
+    }
+
+    /**
+     * Names the vendor or what the configuration is for.
+     *
+     * @return NAME; {@code null} when it is not set
+     */
+    public String name() {
+        return value("NAME");
+    }
+
+    /**
+     * Lists the parameters by their names, NAME included.
+     *
+     * @return every parameter, in the order of the message; not modifiable
+     */
+    public List<Parameter> parameters() {
+        return characteristic().parameters();
+    }
+
+    /**
+     * Finds a parameter.
+     *
+     * @param name what NAME is, in exactly this case
+     * @return the first parameter of that name; {@code null} when there is none
+     */
+    public Parameter parameter(String name) {
+        return characteristic().parameter(name);
+    }
+}

@@ -1,0 +1,28 @@
+package com.qvomacp.eng.omacp;
+
+/**
+ * Voice over Wi-Fi: a characteristic of a type of its own, which {@link #characteristic} tells.
+ *
+ * <pre>{@code
+ * for (VoWifi voWifi : message.voWifis()) {
+ *     System.out.println(voWifi.epdgHostName());
+ * }
+ * }</pre>
+ */
+public final class VoWifi extends TypedCharacteristic {
+    /** The type of such a characteristic. */
+    static final String TYPE = "Vodafone VoWiFi";
+
+    VoWifi(Characteristic characteristic) {
+        super(characteristic);
+    }
+
+    /**
+     * Tells the full domain name of the gateway.
+     *
+     * @return ePDG FQDN; {@code null} when it is not set
+     */
+    public String epdgHostName() {
+        return value("ePDG FQDN");
+    }
+}
