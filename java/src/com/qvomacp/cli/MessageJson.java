@@ -27,7 +27,7 @@ final class MessageJson {
     }
 
     void message(Reading reading) {
-        header(reading.header, reading.source.bytes.length - reading.bodyAt());
+        header(reading.header, reading.held.bytes.length - reading.bodyAt());
         if (reading.document == null) {
             json.nullMember("document");
         } else {

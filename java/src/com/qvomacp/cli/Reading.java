@@ -9,7 +9,7 @@ import com.qvomacp.eng.omacp.Verdict;
 
 /** What could be read of a message, and what the native library makes of it. */
 final class Reading {
-    final Source source;
+    final Held held;
 
     /** Null for a body alone, and for a message that does not begin with the header of a push. */
     final PushHeader header;
@@ -23,38 +23,38 @@ final class Reading {
     final ProvisioningException failure;
 
     private Reading(
-            Source source,
+            Held held,
             PushHeader header,
             ProvisioningDocument document,
             Verdict verdict,
             ProvisioningException failure) {
-        this.source = source;
+        this.held = held;
         this.header = header;
         this.document = document;
         this.verdict = verdict;
         this.failure = failure;
     }
 
-    static Reading of(Source source, int limit) {
+    static Reading of(Held held, int limit) {
         ReadOptions options = ReadOptions.DEFAULT.withInputLimit(limit);
         try {
             ProvisioningMessage message =
-                    source.isPush
-                            ? ProvisioningMessage.parsePush(source.bytes, options)
-                            : ProvisioningMessage.parseBody(source.bytes, options);
+                    held.isPush
+                            ? ProvisioningMessage.parsePush(held.bytes, options)
+                            : ProvisioningMessage.parseBody(held.bytes, options);
             return new Reading(
-                    source, message.header(), message.document(), message.verdict(), null);
+                    held, message.header(), message.document(), message.verdict(), null);
         } catch (ProvisioningException failure) {
             Verdict verdict =
-                    source.isPush ? Verdict.ofPush(source.bytes) : Verdict.ofBody(source.bytes);
-            return new Reading(source, headerOf(source), null, verdict, failure);
+                    held.isPush ? Verdict.ofPush(held.bytes) : Verdict.ofBody(held.bytes);
+            return new Reading(held, headerOf(held), null, verdict, failure);
         }
     }
 
     /** Reads the push header alone, whatever stands behind it. */
-    static PushHeader headerOf(Source source) {
+    static PushHeader headerOf(Held held) {
         try {
-            return source.isPush ? PushHeader.parse(source.bytes) : null;
+            return held.isPush ? PushHeader.parse(held.bytes) : null;
         } catch (ProvisioningException none) {
             return null;
         }

@@ -33,7 +33,7 @@ class FieldMessagesTest extends Natives {
     private boolean show(FieldMessage message) {
         byte[] hex = HexFormat.of().formatHex(message.bytes).getBytes(StandardCharsets.US_ASCII);
         Program program = Program.run(hex);
-        assertEquals(message.isPush, new Source(message.id, message.bytes).isPush, message.id);
+        assertEquals(message.isPush, new Intake(null).take("", message.bytes).get(0).isPush, message.id);
         boolean isTaken = parse(message.push(), WHOLE_MESSAGE);
         parser.qvomacp_parser_del();
         assertEquals(isTaken ? 0 : 1, program.status(), message.id + ": " + program.errors());
