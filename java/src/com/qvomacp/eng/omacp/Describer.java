@@ -55,7 +55,7 @@ final class Describer implements Reading {
 
     @Override
     public void attribute(int from, int to, Attribute attribute, String name, String value) {
-        visit(from, to, Printable.of(name) + (value == null ? "" : " = " + Printable.whole(value)));
+        visit(from, to, Printable.of(attribute.name(name)) + (value == null ? "" : " = " + Printable.whole(value)));
     }
 
     @Override
