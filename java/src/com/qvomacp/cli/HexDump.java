@@ -13,6 +13,11 @@ final class HexDump {
     private static final int LONGEST_LINE = 256;
     private static final int HALF_LINE = 8;
 
+    /** How many digits od and hexdump write for a byte and for a word of two, in octal. */
+    private static final int OCTAL_BYTE = 3;
+
+    private static final int OCTAL_WORD = 6;
+
     /** The bytes of the dump. */
     final byte[] bytes;
 
@@ -188,11 +193,11 @@ final class HexDump {
                 ++end;
             }
             boolean isAlone = end == line.length() || Character.isWhitespace(line.charAt(end));
-            if (end == from || (end - from) % 2 != 0 || !isAlone) {
+            byte[] bytes = isAlone ? number(line.substring(from, end)) : null;
+            if (bytes == null) {
                 return null;
             }
             at = end;
-            byte[] bytes = HexText.bytes(line.substring(from, end));
             // Words without a colon behind the offset are numbers, of a machine with its low byte first.
             for (int low = 0, high = bytes.length - 1; !hasColon && low < high; ++low, --high) {
                 byte swapped = bytes[low];
@@ -200,6 +205,22 @@ final class HexDump {
                 bytes[high] = swapped;
             }
             return bytes;
+        }
+
+        /** The bytes of a group, the highest first; null when it has not as many digits as it must. */
+        private byte[] number(String group) {
+            boolean isOctal = group.length() == OCTAL_BYTE || group.length() == OCTAL_WORD && !hasColon;
+            if (!isOctal) {
+                return group.isEmpty() || group.length() % 2 != 0 ? null : HexText.bytes(group);
+            }
+            try {
+                int value = Integer.parseInt(group, 8);
+                return group.length() == OCTAL_BYTE
+                        ? new byte[] {(byte) value}
+                        : new byte[] {(byte) (value >> 8), (byte) value};
+            } catch (NumberFormatException other) {
+                return null;
+            }
         }
     }
 }

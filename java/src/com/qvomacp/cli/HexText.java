@@ -119,8 +119,9 @@ final class HexText {
             --from;
         }
         boolean hasLabel = from > 0;
+        boolean isInWord = hasLabel && Character.isLetterOrDigit(line.charAt(from - 1));
         // A label may end with letters that are digits too.
-        while (hasLabel && from < line.length() && Character.isLetterOrDigit(line.charAt(from))) {
+        while (isInWord && from < line.length() && Character.isLetterOrDigit(line.charAt(from))) {
             ++from;
         }
         int colon = line.indexOf(':', from);
@@ -258,14 +259,22 @@ final class HexText {
         return bytes.toByteArray();
     }
 
-    /** What base64 of either alphabet stands for, white space left out; null for anything else. */
+    /**
+     * What base64 of either alphabet stands for, white space left out; null for anything else, and for
+     * what is nothing but hexadecimal digits.
+     */
     static byte[] base64(String text) {
         StringBuilder letters = new StringBuilder(text.length());
+        boolean areDigits = true;
         for (int i = 0; i < text.length(); ++i) {
             char c = text.charAt(i);
             if (!Character.isWhitespace(c)) {
+                areDigits &= isDigit(c);
                 letters.append(c == '-' ? '+' : c == '_' ? '/' : c);
             }
+        }
+        if (areDigits) {
+            return null;
         }
         try {
             byte[] bytes = Base64.getDecoder().decode(letters.toString());

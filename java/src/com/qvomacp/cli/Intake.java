@@ -15,6 +15,10 @@ import java.util.List;
  * push and a body, in this order; each only when its lengths come out.
  */
 final class Intake {
+    private static final String NO_MESSAGE = "no message: this is ";
+    private static final String UNKNOWN = "nothing that is known";
+    private static final String HEXADECIMAL = "hexadecimal text";
+
     private static final int PUSH = 0x06;
     private static final int LAST_WBXML_VERSION = 0x03;
     private static final int LAST_CHARSET = 3000;
@@ -69,9 +73,23 @@ final class Intake {
         if (isMessage) {
             take(name, base64, form, held);
         } else if (pieces.isEmpty()) {
-            held.add(Held.error(name, "no message: this is " + likeness(content)));
+            held.add(Held.unknown(name, content, NO_MESSAGE + likeness(content)));
         } else {
             takePieces(name, pieces, held);
+            nameWhole(name, content, held);
+        }
+    }
+
+    /** Calls the whole text what it is when digits have been read out of it that are nothing. */
+    private static void nameWhole(String name, byte[] content, List<Held> held) {
+        boolean areUnknown = !held.isEmpty();
+        for (Held each : held) {
+            areUnknown &= (NO_MESSAGE + UNKNOWN).equals(each.error);
+        }
+        String likeness = areUnknown ? likeness(content) : HEXADECIMAL;
+        if (!likeness.startsWith(HEXADECIMAL)) {
+            held.clear();
+            held.add(Held.unknown(name, content, NO_MESSAGE + likeness));
         }
     }
 
@@ -81,7 +99,7 @@ final class Intake {
 
     private static String likeness(byte[] bytes) {
         String likeness = ForeignBytes.describe(bytes);
-        return likeness == null ? "nothing that is known" : likeness;
+        return likeness == null ? UNKNOWN : likeness;
     }
 
     /**
@@ -116,7 +134,9 @@ final class Intake {
             held.add(
                     Held.error(
                             name,
-                            "no message: this is hexadecimal text with an odd number of digits, "
+                            NO_MESSAGE
+                                    + HEXADECIMAL
+                                    + " with an odd number of digits, "
                                     + digits.length()));
             return;
         }
@@ -231,7 +251,7 @@ final class Intake {
                 return;
             }
         } catch (ShortMessage.OtherException other) {
-            held.add(Held.error(name, "no message: this is " + other.getMessage()));
+            held.add(Held.error(name, NO_MESSAGE + other.getMessage()));
             return;
         }
         if (form == Form.SMS || form == Form.UD) {
@@ -246,7 +266,7 @@ final class Intake {
         boolean isPush = bytes.length > 1 && bytes[1] == PUSH;
         boolean isBody = bytes.length > 0 && bytes[0] >= 0 && bytes[0] <= LAST_WBXML_VERSION;
         if (header(bytes) == null && !isDocument(bytes, 0) && !isPush && !isBody) {
-            held.add(Held.error(name, "no message: this is " + likeness(bytes)));
+            held.add(Held.unknown(name, bytes, NO_MESSAGE + likeness(bytes)));
         } else {
             held.add(Held.message(name, bytes, isPush));
         }
@@ -255,7 +275,7 @@ final class Intake {
     private Held takeShortMessage(String name, ShortMessage message) {
         String fault = message.fault();
         if (fault != null) {
-            return Held.error(name, "no message: this is " + fault);
+            return Held.error(name, NO_MESSAGE + fault);
         }
         Held whole = parts.take(name, message);
         boolean isOther =
@@ -263,7 +283,7 @@ final class Intake {
                         && whole.bytes != null
                         && !message.hasPort()
                         && header(whole.bytes) == null;
-        return isOther ? Held.error(whole.name, "no message: this is an SMS without a port") : whole;
+        return isOther ? Held.error(whole.name, NO_MESSAGE + "an SMS without a port") : whole;
     }
 
     private static PushHeader header(byte[] bytes) {

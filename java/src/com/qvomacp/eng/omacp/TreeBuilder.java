@@ -11,7 +11,7 @@ final class TreeBuilder implements Reading {
     private static final String DOCUMENT = "document";
 
     private static final int FRAMES = 8;
-    private static final int ITEMS = 32;
+    private static final int ITEMS = 16;
 
     /** What is known of an element whose content is read. Frames are used again. */
     private static final class Frame {
@@ -24,6 +24,9 @@ final class TreeBuilder implements Reading {
         String value;
         Writing valueWriting;
     }
+
+    /** Deeper ones are let go of when their element ends: its item takes their place in memory. */
+    private static final int KEPT_FRAMES = 64;
 
     private Frame[] frames = new Frame[FRAMES];
     private int depth;
@@ -136,6 +139,9 @@ final class TreeBuilder implements Reading {
         nameWriting = frame.nameWriting;
         value = frame.value;
         valueWriting = frame.valueWriting;
+        if (depth >= KEPT_FRAMES) {
+            frames[depth] = null;
+        }
     }
 
     @Override
