@@ -55,7 +55,8 @@ final class Describer implements Reading {
 
     @Override
     public void attribute(int from, int to, Attribute attribute, String name, String value) {
-        visit(from, to, name + (value == null ? "" : " = " + quoted(value)));
+        String called = Printable.of(attribute.name(name));
+        visit(from, to, called + (value == null ? "" : " = " + quoted(value)));
     }
 
     @Override

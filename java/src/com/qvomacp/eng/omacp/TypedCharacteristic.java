@@ -33,13 +33,17 @@ public abstract class TypedCharacteristic {
 
     /** A view of each characteristic of a type directly in an item, in a list that stays as it is. */
     static <V> List<V> views(Item item, String type, Maker<V> maker) {
-        List<V> views = new ArrayList<>();
+        // Most messages lack most kinds: the list is made for the first.
+        List<V> views = Collections.emptyList();
         for (Item child : item.inside()) {
             if (child instanceof Characteristic && type.equals(((Characteristic) child).type())) {
+                if (views.isEmpty()) {
+                    views = new ArrayList<>();
+                }
                 views.add(maker.of((Characteristic) child));
             }
         }
-        return Collections.unmodifiableList(views);
+        return views.isEmpty() ? views : Collections.unmodifiableList(views);
     }
 
     /**
