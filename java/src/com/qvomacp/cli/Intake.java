@@ -103,8 +103,8 @@ final class Intake {
     }
 
     /**
-     * Takes lines of digits. Each line may hold a message, or one message all lines that follow each
-     * other, or all lines of the text.
+     * Takes lines of digits. Each line may hold a message, or one message all lines that follow
+     * each other, or all lines of the text.
      */
     private void takePieces(String name, List<HexText.Piece> pieces, List<Held> held) {
         List<Run> runs = Run.of(pieces);
@@ -201,7 +201,9 @@ final class Intake {
             return false;
         }
         byte[] bytes = HexText.bytes(digits);
-        return isShortMessage(bytes) || isKnownPush(bytes) && hasDocument(bytes) || isDocument(bytes, 0);
+        return isShortMessage(bytes)
+                || isKnownPush(bytes) && hasDocument(bytes)
+                || isDocument(bytes, 0);
     }
 
     private boolean isMessage(byte[] bytes) {

@@ -88,7 +88,8 @@ final class SmsParts {
         }
         push.isFinished = true;
         return Held.error(
-                name, part + " is there twice with different bytes: in " + first + " and in " + name);
+                name,
+                part + " is there twice with different bytes: in " + first + " and in " + name);
     }
 
     /** Names what is missing of the pushes that are not whole. */
@@ -116,7 +117,8 @@ final class SmsParts {
     private static String listed(List<Integer> numbers) {
         StringBuilder text = new StringBuilder();
         for (int i = 0; i < numbers.size(); ++i) {
-            text.append(i == 0 ? "" : i + 1 < numbers.size() ? ", " : " and ").append(numbers.get(i));
+            String separator = i + 1 < numbers.size() ? ", " : " and ";
+            text.append(i == 0 ? "" : separator).append(numbers.get(i));
         }
         return text.toString();
     }
