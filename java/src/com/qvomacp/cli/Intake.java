@@ -73,7 +73,7 @@ final class Intake {
         if (isMessage) {
             take(name, base64, form, held);
         } else if (pieces.isEmpty()) {
-            held.add(Held.error(name, NO_MESSAGE + likeness(content)));
+            held.add(Held.unknown(name, content, NO_MESSAGE + likeness(content)));
         } else {
             takePieces(name, pieces, held);
             nameWhole(name, content, held);
@@ -89,7 +89,7 @@ final class Intake {
         String likeness = areUnknown ? likeness(content) : HEXADECIMAL;
         if (!likeness.startsWith(HEXADECIMAL)) {
             held.clear();
-            held.add(Held.error(name, NO_MESSAGE + likeness));
+            held.add(Held.unknown(name, content, NO_MESSAGE + likeness));
         }
     }
 
@@ -268,7 +268,7 @@ final class Intake {
         boolean isPush = bytes.length > 1 && bytes[1] == PUSH;
         boolean isBody = bytes.length > 0 && bytes[0] >= 0 && bytes[0] <= LAST_WBXML_VERSION;
         if (header(bytes) == null && !isDocument(bytes, 0) && !isPush && !isBody) {
-            held.add(Held.error(name, NO_MESSAGE + likeness(bytes)));
+            held.add(Held.unknown(name, bytes, NO_MESSAGE + likeness(bytes)));
         } else {
             held.add(Held.message(name, bytes, isPush));
         }

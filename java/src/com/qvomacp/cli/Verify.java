@@ -46,26 +46,26 @@ final class Verify extends Job {
     }
 
     @Override
-    void run(Source source) {
-        if (!source.isPush) {
-            say(source, Console.REFUSED, "it has no push header, and so no MAC");
+    void run(Held held) {
+        if (!held.isPush) {
+            say(held, Console.REFUSED, "it has no push header, and so no MAC");
             return;
         }
         PushHeader header;
         try {
-            header = PushHeader.parse(source.bytes);
+            header = PushHeader.parse(held.bytes);
         } catch (ProvisioningException none) {
             console.raise(Console.REFUSED);
-            console.complain(Refusal.of(source, none, 0).write(startOf(source.name), errPalette()));
+            complain(Refusal.of(held, none, 0).write(startOf(held.name), errPalette()));
             return;
         }
         SecurityMethod method = header.securityMethod();
-        byte[] body = Arrays.copyOfRange(source.bytes, header.length(), source.bytes.length);
+        byte[] body = Arrays.copyOfRange(held.bytes, header.length(), held.bytes.length);
         MacResult result = ProvisioningMac.verify(method, header.mac(), body, pin, imsi);
         if (result == MacResult.RIGHT) {
-            console.out.println(Visible.of(source.name) + ": verified (" + method + ")");
+            console.out.println(Visible.of(held.name) + ": verified (" + method + ")");
         } else {
-            say(source, statusOf(result), reasonFor(result, method, source.bytes));
+            say(held, statusOf(result), reasonFor(result, method, held.bytes));
         }
     }
 
@@ -120,9 +120,9 @@ final class Verify extends Job {
         return -1;
     }
 
-    private void say(Source source, int status, String reason) {
+    private void say(Held held, int status, String reason) {
         console.raise(status);
-        String name = Visible.of(source.name) + ": ";
+        String name = Visible.of(held.name) + ": ";
         console.out.println(name + outPalette().error("NOT VERIFIED") + ": " + reason);
     }
 }

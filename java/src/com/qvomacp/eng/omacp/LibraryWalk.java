@@ -984,7 +984,7 @@ final class LibraryWalk {
 
     /** Reads one more value of the text that goes on. */
     private void comma() throws LibraryStop {
-        ++at;
+        int comma = at++;
         int token = peek(Place.COMMA_VALUE);
         boolean isBehindSwitch = token == SWITCH_PAGE;
         if (isBehindSwitch) {
@@ -1007,5 +1007,8 @@ final class LibraryWalk {
             checkLimit(Place.COMMA_VALUE, start);
         }
         continuedLength = held ? length : -1;
+        if (trace != null) {
+            trace.value(comma, at);
+        }
     }
 }

@@ -22,13 +22,6 @@ final class Printable {
         return '"' + of(text) + '"';
     }
 
-    /** The whole text in quotes, with control characters written as U+0000. */
-    static String whole(String text) {
-        StringBuilder line = new StringBuilder(text.length() + 2).append('"');
-        append(line, text, text.length());
-        return line.append('"').toString();
-    }
-
     private static void append(StringBuilder line, String text, int longest) {
         int end = Math.min(text.length(), longest);
         for (int i = 0; i < end; ++i) {

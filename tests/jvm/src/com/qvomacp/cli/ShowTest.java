@@ -183,7 +183,7 @@ class ShowTest {
         }
         for (String form : List.of("--color=never", "--json", "--json-lines", "--bytes")) {
             run(body, form);
-            assertTrue(output.length() < 400 * 20000, form + ": " + output.length());
+            assertTrue(output.length() < 1000 * 20000, form + ": " + output.length());
         }
     }
 
@@ -229,7 +229,7 @@ class ShowTest {
                                                           ^^
                         """),
                 errors);
-        assertTrue(words.contains(" Accepted here: NAME=text (0x05), NAME (0x07), "), errors);
+        assertTrue(words.contains(" NAME=text (0x05), NAME (0x07), "), errors);
         assertTrue(errors.lines().allMatch(line -> line.length() <= 80), errors);
     }
 
