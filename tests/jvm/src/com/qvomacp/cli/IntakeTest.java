@@ -256,7 +256,7 @@ class IntakeTest {
     void tellsWhereThePartsComeFrom() {
         List<byte[]> parts = Sms.parts(PUSH, 40, false, 1);
         assertEquals("input 2 + input 1", only(take(parts.get(1), parts.get(0))).name);
-        assertEquals("input 1, line 1 + input 1, line 2", only(take(Sms.lines(parts))).name);
+        assertEquals("input 1, lines 1 and 2", only(take(Sms.lines(parts))).name);
     }
 
     @Test
