@@ -7,8 +7,8 @@ final class StrayMac {
     private StrayMac() {}
 
     /**
-     * Finds 40 hexadecimal digits that stand alone, behind the token or the name of the parameter or
-     * behind any octet that is no digit, with a NUL behind them.
+     * Finds 40 hexadecimal digits that stand alone, behind the token or the name of the parameter
+     * or behind any octet that is no digit, with a NUL behind them.
      *
      * @param message a push
      * @param from where the header ends
