@@ -98,18 +98,18 @@ final class Answers {
      * @return false when the library refuses the message, and so answers nothing
      * @throws UnsatisfiedLinkError when the library cannot be loaded
      */
-    static boolean ask(Source source, Listener listener) {
+    static boolean ask(Held held, Listener listener) {
         NativeLibrary.load();
-        return new Answers(listener).ask(source);
+        return new Answers(listener).ask(held);
     }
 
-    private boolean ask(Source source) {
-        byte[] push = source.isPush ? source.bytes : push(source.bytes);
+    private boolean ask(Held held) {
+        byte[] push = held.isPush ? held.bytes : push(held.bytes);
         try {
             if (!parser.qvomacp_parser(push, push.length, 0)) {
                 return false;
             }
-            if (source.isPush) {
+            if (held.isPush) {
                 header();
             }
             characteristics();

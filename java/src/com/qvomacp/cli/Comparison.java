@@ -110,7 +110,7 @@ final class Comparison implements Answers.Listener {
      */
     static void of(Reading reading, Listener listener) {
         Comparison comparison = new Comparison(reading, listener);
-        if (Answers.ask(reading.source, comparison)) {
+        if (Answers.ask(reading.held, comparison)) {
             comparison.rest();
         } else {
             listener.unanswered("it refuses the message");
@@ -124,7 +124,7 @@ final class Comparison implements Answers.Listener {
         if (header != null) {
             facts.put("Content type", "" + header.contentType().code());
             facts.put("Header length", "" + (header.length() - header.contentType().offset()));
-            facts.put("Body length", "" + (reading.source.bytes.length - header.length()));
+            facts.put("Body length", "" + (reading.held.bytes.length - header.length()));
             SecurityMethod method = header.securityMethod();
             facts.put("SEC", method == SecurityMethod.NONE ? null : method.name());
             facts.put("MAC", header.mac());

@@ -8,7 +8,7 @@ final class Held {
     /** Where it comes from, for people: the input, its line, or all the parts of an SMS. */
     final String name;
 
-    /** The push or the body; null when there is none. */
+    /** The push or the body, or what is neither; null when there is nothing of all. */
     final byte[] bytes;
 
     /** False for a body alone. */
@@ -38,6 +38,11 @@ final class Held {
 
     static Held error(String name, String sentence) {
         return new Held(name, null, false, sentence, Collections.<String>emptyList());
+    }
+
+    /** Bytes that are no message. */
+    static Held unknown(String name, byte[] bytes, String sentence) {
+        return new Held(name, bytes, true, sentence, Collections.<String>emptyList());
     }
 
     /** A remark that belongs to no message. */

@@ -9,19 +9,11 @@ import java.nio.file.InvalidPathException;
 import java.nio.file.NoSuchFileException;
 import java.nio.file.Paths;
 
-/** What a file holds, or standard input. */
+/** Reads what a file holds, or standard input. */
 final class Input {
     static final String STANDARD_INPUT = "-";
 
-    /** For people. */
-    final String name;
-
-    final byte[] content;
-
-    Input(String name, byte[] content) {
-        this.name = name;
-        this.content = content;
-    }
+    private Input() {}
 
     static String nameOf(String file) {
         return file.equals(STANDARD_INPUT) ? "standard input" : file;
@@ -32,13 +24,13 @@ final class Input {
      *
      * @throws IOException with a sentence for people
      */
-    static Input read(String file, InputStream standardInput, int limit) throws IOException {
+    static byte[] read(String file, InputStream standardInput, int limit) throws IOException {
         try {
             if (file.equals(STANDARD_INPUT)) {
-                return new Input(nameOf(file), read(standardInput, limit));
+                return read(standardInput, limit);
             }
             try (InputStream in = Files.newInputStream(Paths.get(file))) {
-                return new Input(file, read(in, limit));
+                return read(in, limit);
             }
         } catch (TooLongException tooLong) {
             throw tooLong;

@@ -15,6 +15,10 @@ import java.util.List;
  * push and a body, in this order; each only when its lengths come out.
  */
 final class Intake {
+    private static final String NO_MESSAGE = "no message: this is ";
+    private static final String UNKNOWN = "nothing that is known";
+    private static final String HEXADECIMAL = "hexadecimal text";
+
     private static final int PUSH = 0x06;
     private static final int LAST_WBXML_VERSION = 0x03;
     private static final int LAST_CHARSET = 3000;
@@ -40,7 +44,7 @@ final class Intake {
         List<Held> held = new ArrayList<>();
         String text = HexText.text(content);
         if (text == null) {
-            take(name, content, form, held);
+            take(Place.in(name), content, form, held);
         } else {
             takeText(name, content, text, held);
         }
@@ -67,11 +71,25 @@ final class Intake {
                         ? Collections.<HexText.Piece>emptyList()
                         : HexText.pieces(text);
         if (isMessage) {
-            take(name, base64, form, held);
+            take(Place.in(name), base64, form, held);
         } else if (pieces.isEmpty()) {
-            held.add(Held.error(name, "no message: this is " + likeness(content)));
+            held.add(Held.unknown(name, content, NO_MESSAGE + likeness(content)));
         } else {
-            takePieces(name, pieces, held);
+            takePieces(Place.in(name), pieces, held);
+            nameWhole(name, content, held);
+        }
+    }
+
+    /** Calls the whole text what it is when digits have been read out of it that are nothing. */
+    private static void nameWhole(String name, byte[] content, List<Held> held) {
+        boolean areUnknown = !held.isEmpty();
+        for (Held each : held) {
+            areUnknown &= (NO_MESSAGE + UNKNOWN).equals(each.error);
+        }
+        String likeness = areUnknown ? likeness(content) : HEXADECIMAL;
+        if (!likeness.startsWith(HEXADECIMAL)) {
+            held.clear();
+            held.add(Held.unknown(name, content, NO_MESSAGE + likeness));
         }
     }
 
@@ -81,14 +99,14 @@ final class Intake {
 
     private static String likeness(byte[] bytes) {
         String likeness = ForeignBytes.describe(bytes);
-        return likeness == null ? "nothing that is known" : likeness;
+        return likeness == null ? UNKNOWN : likeness;
     }
 
     /**
-     * Takes lines of digits. Each line may hold a message, or one message all lines that follow each
-     * other, or all lines of the text.
+     * Takes lines of digits. Each line may hold a message, or one message all lines that follow
+     * each other, or all lines of the text.
      */
-    private void takePieces(String name, List<HexText.Piece> pieces, List<Held> held) {
+    private void takePieces(Place input, List<HexText.Piece> pieces, List<Held> held) {
         List<Run> runs = Run.of(pieces);
         boolean areMessages = true;
         for (Run run : runs) {
@@ -101,26 +119,28 @@ final class Intake {
         for (Run run : runs) {
             if (run.isLineByLine(this)) {
                 for (HexText.Piece piece : run.pieces) {
-                    takeDigits(name + ", line " + piece.line, piece.digits, piece.isUserData, held);
+                    takeDigits(input.line(piece.line), piece.digits, piece.isUserData, held);
                 }
             } else {
                 HexText.Piece first = run.pieces.get(0);
-                String place = isAlone ? name : name + ", line " + first.line;
+                Place place = isAlone ? input : input.line(first.line);
                 takeDigits(place, run.digits(), first.isUserData, held);
             }
         }
     }
 
-    private void takeDigits(String name, String digits, boolean isUserData, List<Held> held) {
+    private void takeDigits(Place place, String digits, boolean isUserData, List<Held> held) {
         if (digits.length() % 2 != 0) {
             held.add(
                     Held.error(
-                            name,
-                            "no message: this is hexadecimal text with an odd number of digits, "
+                            place.toString(),
+                            NO_MESSAGE
+                                    + HEXADECIMAL
+                                    + " with an odd number of digits, "
                                     + digits.length()));
             return;
         }
-        take(name, HexText.bytes(digits), isUserData && form == null ? Form.UD : form, held);
+        take(place, HexText.bytes(digits), isUserData && form == null ? Form.UD : form, held);
     }
 
     /** Lines of digits that follow each other. */
@@ -181,7 +201,9 @@ final class Intake {
             return false;
         }
         byte[] bytes = HexText.bytes(digits);
-        return isShortMessage(bytes) || isKnownPush(bytes) && hasDocument(bytes) || isDocument(bytes, 0);
+        return isShortMessage(bytes)
+                || isKnownPush(bytes) && hasDocument(bytes)
+                || isDocument(bytes, 0);
     }
 
     private boolean isMessage(byte[] bytes) {
@@ -223,15 +245,16 @@ final class Intake {
         return message;
     }
 
-    private void take(String name, byte[] bytes, Form form, List<Held> held) {
+    private void take(Place place, byte[] bytes, Form form, List<Held> held) {
+        String name = place.toString();
         try {
             ShortMessage message = shortMessage(bytes, form);
             if (message != null) {
-                add(held, takeShortMessage(name, message));
+                add(held, takeShortMessage(place, message));
                 return;
             }
         } catch (ShortMessage.OtherException other) {
-            held.add(Held.error(name, "no message: this is " + other.getMessage()));
+            held.add(Held.error(name, NO_MESSAGE + other.getMessage()));
             return;
         }
         if (form == Form.SMS || form == Form.UD) {
@@ -246,24 +269,24 @@ final class Intake {
         boolean isPush = bytes.length > 1 && bytes[1] == PUSH;
         boolean isBody = bytes.length > 0 && bytes[0] >= 0 && bytes[0] <= LAST_WBXML_VERSION;
         if (header(bytes) == null && !isDocument(bytes, 0) && !isPush && !isBody) {
-            held.add(Held.error(name, "no message: this is " + likeness(bytes)));
+            held.add(Held.unknown(name, bytes, NO_MESSAGE + likeness(bytes)));
         } else {
             held.add(Held.message(name, bytes, isPush));
         }
     }
 
-    private Held takeShortMessage(String name, ShortMessage message) {
+    private Held takeShortMessage(Place place, ShortMessage message) {
         String fault = message.fault();
         if (fault != null) {
-            return Held.error(name, "no message: this is " + fault);
+            return Held.error(place.toString(), NO_MESSAGE + fault);
         }
-        Held whole = parts.take(name, message);
+        Held whole = parts.take(place, message);
         boolean isOther =
                 whole != null
                         && whole.bytes != null
                         && !message.hasPort()
                         && header(whole.bytes) == null;
-        return isOther ? Held.error(whole.name, "no message: this is an SMS without a port") : whole;
+        return isOther ? Held.error(whole.name, NO_MESSAGE + "an SMS without a port") : whole;
     }
 
     private static PushHeader header(byte[] bytes) {

@@ -19,6 +19,14 @@ abstract class Job {
     private String limit;
 
     @Option(
+            names = "--as",
+            paramLabel = "FORM",
+            description =
+                    "What the messages are, where it does not show by itself: push, body, sms (an"
+                            + " SMS-DELIVER) or ud (the user data of an SMS).")
+    private Form form;
+
+    @Option(
             names = "--color",
             paramLabel = "WHEN",
             defaultValue = "auto",
@@ -36,18 +44,23 @@ abstract class Job {
             arity = "0..*",
             paramLabel = "FILE",
             description =
-                    "A message: a push, or the WBXML body of one alone; its bytes, or hexadecimal"
-                            + " or base64 text. Standard input when it is \"-\" or there is none.")
+                    "What holds messages: pushes, WBXML bodies alone, or parts of SMS; their bytes,"
+                            + " or hexadecimal or base64 text, also in a log or a dump. Standard"
+                            + " input when it is \"-\" or there is none.")
     private List<String> files = new ArrayList<>();
 
     Console console;
     private int bytesRead;
+    private boolean isOneOfSeveral;
 
     /** Does it to one message. */
-    abstract void run(Source source);
+    abstract void run(Held held);
 
     /** Looks at what the command line asks for, in front of the first file. */
     abstract void begin();
+
+    /** Called in front of saying that something is no message. */
+    void unknown(Held held) {}
 
     /** Says in which way a file has failed, where more than a complaint is wanted. */
     void failed(String name, String reason) {}
@@ -62,16 +75,47 @@ abstract class Job {
         if (files.isEmpty()) {
             files.add(Input.STANDARD_INPUT);
         }
-        for (String file : files) {
-            try {
-                run(Source.of(Input.read(file, console.in, bytesRead)));
-            } catch (IOException unreadable) {
-                fail(Console.FAILED, Input.nameOf(file), unreadable.getMessage());
-            } catch (OutOfMemoryError tooLarge) {
-                fail(Console.FAILED, Input.nameOf(file), "needs more memory than there is");
-            }
+        Intake intake = new Intake(form);
+        isOneOfSeveral = files.size() > 1;
+        for (int i = 0; i < files.size(); ++i) {
+            run(files.get(i), intake, i == files.size() - 1);
         }
         end();
+    }
+
+    /** Does it to the messages that are whole with a file, or for which it was the last hope. */
+    private void run(String file, Intake intake, boolean isLast) {
+        String name = Input.nameOf(file);
+        try {
+            List<Held> messages = new ArrayList<>();
+            try {
+                messages.addAll(intake.take(name, Input.read(file, console.in, bytesRead)));
+            } catch (IOException unreadable) {
+                fail(Console.FAILED, name, unreadable.getMessage());
+            }
+            if (isLast) {
+                messages.addAll(intake.finish());
+            }
+            isOneOfSeveral |= messages.size() > 1;
+            for (Held held : messages) {
+                name = held.name;
+                look(held);
+            }
+        } catch (OutOfMemoryError tooLarge) {
+            fail(Console.FAILED, name, "needs more memory than there is");
+        }
+    }
+
+    private void look(Held held) {
+        for (String note : held.notes) {
+            complain(startOf(held.name) + "note: " + Visible.of(note) + "\n");
+        }
+        if (held.error != null) {
+            unknown(held);
+            fail(Console.REFUSED, held.name, held.error);
+        } else if (held.bytes != null) {
+            run(held);
+        }
     }
 
     private static int bytes(String number) {
@@ -93,8 +137,9 @@ abstract class Job {
         return bytesRead;
     }
 
-    boolean hasSeveralFiles() {
-        return files.size() > 1;
+    /** Whether there are several files, or several messages in the only one. */
+    boolean isOneOfSeveral() {
+        return isOneOfSeveral;
     }
 
     Palette outPalette() {
@@ -110,9 +155,14 @@ abstract class Job {
         return "omacp: " + Visible.of(name) + ": ";
     }
 
+    /** Writes to standard error; more about the file goes to the output behind it. */
+    void complain(String text) {
+        console.complain(text);
+    }
+
     void fail(int status, String name, String reason) {
         console.raise(status);
-        console.complain(startOf(name) + Visible.of(reason) + System.lineSeparator());
+        complain(startOf(name) + Visible.of(reason) + "\n");
         failed(name, reason);
     }
 }

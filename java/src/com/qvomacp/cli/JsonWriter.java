@@ -23,6 +23,7 @@ final class JsonWriter {
 
     private boolean isFirst = true;
     private boolean isNamed;
+    private boolean isSeparated;
 
     JsonWriter(PrintWriter out, boolean onOneLine) {
         this.out = out;
@@ -54,7 +55,8 @@ final class JsonWriter {
             flatFrom = Integer.MAX_VALUE;
         }
         if (!isFirst && !wasFlat) {
-            newLine();
+            out.append('\n');
+            indent();
         }
         out.append(bracket);
         isFirst = false;
@@ -141,23 +143,29 @@ final class JsonWriter {
             isNamed = false;
             return;
         }
-        if (open.length() > 0) {
-            if (!isFirst) {
-                out.append(isFlat() ? ", " : ",");
-            }
-            if (!isFlat()) {
-                newLine();
-            }
+        if (open.length() > 0 && isFlat()) {
+            out.append(isFirst ? "" : ", ");
+        } else if (open.length() > 0) {
+            separate();
+            indent();
+            isSeparated = false;
         }
         isFirst = false;
+    }
+
+    /** Ends the line in front of a value that is going to follow, for something to stand between. */
+    void separate() {
+        if (open.length() > 0 && !isFlat() && !isSeparated) {
+            out.append(isFirst ? "\n" : ",\n");
+            isSeparated = true;
+        }
     }
 
     private boolean isFlat() {
         return onOneLine || open.length() >= flatFrom;
     }
 
-    private void newLine() {
-        out.append('\n');
+    private void indent() {
         for (int i = Math.min(open.length(), DEEPEST); i > 0; --i) {
             out.append(INDENT);
         }

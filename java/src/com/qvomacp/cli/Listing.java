@@ -62,7 +62,7 @@ final class Listing implements ByteVisitor {
     private Listing(PrintWriter out, Palette palette, Reading reading) {
         this.out = out;
         this.palette = palette;
-        this.message = reading.source.bytes;
+        this.message = reading.held.bytes;
         this.bodyAt = reading.bodyAt();
         this.hasTwoOffsets = reading.header != null;
         this.digits = message.length > 0x10000 ? 6 : 4;
@@ -70,9 +70,9 @@ final class Listing implements ByteVisitor {
 
     static void write(PrintWriter out, Palette palette, Reading reading) {
         Listing listing = new Listing(out, palette, reading);
-        listing.title();
+        listing.title(reading.held.isPush);
         Verdict verdict = reading.verdict;
-        boolean isRefused = verdict != null && !verdict.isAccepted();
+        boolean isRefused = !verdict.isAccepted();
         if (reading.header != null) {
             if (isRefused && verdict.isHeaderRefused()) {
                 listing.stopsAt(verdict);
@@ -81,7 +81,7 @@ final class Listing implements ByteVisitor {
             listing.end(reading.bodyAt());
         }
         listing.start = reading.bodyAt();
-        listing.isBody = reading.header != null || !reading.source.isPush;
+        listing.isBody = reading.header != null || !reading.held.isPush;
         listing.told = 0;
         if (reading.document != null) {
             if (!verdict.isHeaderRefused()) {
@@ -95,7 +95,7 @@ final class Listing implements ByteVisitor {
             listing.nextDeviation();
             reading.document.describe(listing);
         }
-        listing.end(reading.source.bytes.length - listing.start);
+        listing.end(reading.held.bytes.length - listing.start);
     }
 
     private void stopsAt(Verdict verdict) {
@@ -111,9 +111,9 @@ final class Listing implements ByteVisitor {
         nextDeviation = deviations.hasNext() ? deviations.next() : null;
     }
 
-    private void title() {
+    private void title(boolean isPush) {
         StringBuilder title = new StringBuilder();
-        pad(title, hasTwoOffsets ? "msg" : "at", digits + 1);
+        pad(title, hasTwoOffsets ? "msg" : isPush ? "at" : "body", digits + 1);
         pad(title, hasTwoOffsets ? "body" : "", hasTwoOffsets ? digits + 2 : 1);
         pad(title, "bytes", BYTES_WIDTH + 2);
         out.append(palette.bold(title + "meaning")).append('\n');

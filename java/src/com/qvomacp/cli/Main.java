@@ -130,7 +130,8 @@ public final class Main {
                 .addSubcommand(new Show())
                 .addSubcommand(new Verify())
                 .addSubcommand(new Completion())
-                .setExpandAtFiles(false);
+                .setExpandAtFiles(false)
+                .setCaseInsensitiveEnumValuesAllowed(true);
     }
 
     /** Says in a few lines what is wrong with a command line. */

@@ -15,8 +15,7 @@ import java.util.Locale;
 
 /**
  * Writes a message as the members of a JSON object. {@code header} is null for a body alone, {@code
- * document} and {@code verdict} are null when the message cannot be read, which {@code error} then
- * explains. {@code children} stand in the order of the message; each tells by its members what it
+ * document} is null when the message cannot be read, which {@code error} then explains. {@code children} stand in the order of the message; each tells by its members what it
  * is: {@code type} a characteristic, {@code name} and {@code value} a parameter, {@code other}
  * whatever else.
  */
@@ -28,7 +27,7 @@ final class MessageJson {
     }
 
     void message(Reading reading) {
-        header(reading.header, reading.source.bytes.length - reading.bodyAt());
+        header(reading.header, reading.held.bytes.length - reading.bodyAt());
         if (reading.document == null) {
             json.nullMember("document");
         } else {
@@ -44,11 +43,7 @@ final class MessageJson {
             }
         }
         json.end();
-        if (reading.verdict == null) {
-            json.nullMember("verdict");
-        } else {
-            verdict(reading.verdict);
-        }
+        verdict(reading.verdict, reading.document);
         if (reading.failure != null) {
             json.member("error", reading.failure.getMessage());
         }
@@ -158,7 +153,7 @@ final class MessageJson {
         return constant.name().toLowerCase(Locale.ROOT).replace('_', '-');
     }
 
-    private void verdict(Verdict verdict) {
+    private void verdict(Verdict verdict, ProvisioningDocument document) {
         json.name("verdict").beginObject();
         json.member("accepted", verdict.isAccepted());
         if (!verdict.isAccepted()) {
@@ -181,7 +176,7 @@ final class MessageJson {
         json.end();
         json.name("readOtherwise").beginArray();
         for (Item item : verdict.readOtherwise()) {
-            json.beginFlatObject();
+            json.beginFlatObject().member("path", document.path(item));
             place(item);
             json.end();
         }

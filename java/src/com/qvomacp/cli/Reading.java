@@ -6,11 +6,10 @@ import com.qvomacp.eng.omacp.ProvisioningMessage;
 import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.ReadOptions;
 import com.qvomacp.eng.omacp.Verdict;
-import java.util.Arrays;
 
 /** What could be read of a message, and what the native library makes of it. */
 final class Reading {
-    final Source source;
+    final Held held;
 
     /** Null for a body alone, and for a message that does not begin with the header of a push. */
     final PushHeader header;
@@ -18,43 +17,44 @@ final class Reading {
     /** Null when the body cannot be read. */
     final ProvisioningDocument document;
 
-    /** Null when the message cannot be read. */
     final Verdict verdict;
 
     /** Why the message cannot be read; null when it can. */
     final ProvisioningException failure;
 
     private Reading(
-            Source source,
+            Held held,
             PushHeader header,
             ProvisioningDocument document,
             Verdict verdict,
             ProvisioningException failure) {
-        this.source = source;
+        this.held = held;
         this.header = header;
         this.document = document;
         this.verdict = verdict;
         this.failure = failure;
     }
 
-    static Reading of(Source source, int limit) {
+    static Reading of(Held held, int limit) {
         ReadOptions options = ReadOptions.DEFAULT.withInputLimit(limit);
         try {
             ProvisioningMessage message =
-                    source.isPush
-                            ? ProvisioningMessage.parsePush(source.bytes, options)
-                            : ProvisioningMessage.parseBody(source.bytes, options);
+                    held.isPush
+                            ? ProvisioningMessage.parsePush(held.bytes, options)
+                            : ProvisioningMessage.parseBody(held.bytes, options);
             return new Reading(
-                    source, message.header(), message.document(), message.verdict(), null);
+                    held, message.header(), message.document(), message.verdict(), null);
         } catch (ProvisioningException failure) {
-            return new Reading(source, headerOf(source), null, null, failure);
+            Verdict verdict =
+                    held.isPush ? Verdict.ofPush(held.bytes) : Verdict.ofBody(held.bytes);
+            return new Reading(held, headerOf(held), null, verdict, failure);
         }
     }
 
     /** Reads the push header alone, whatever stands behind it. */
-    static PushHeader headerOf(Source source) {
+    static PushHeader headerOf(Held held) {
         try {
-            return source.isPush ? PushHeader.parse(source.bytes) : null;
+            return held.isPush ? PushHeader.parse(held.bytes) : null;
         } catch (ProvisioningException none) {
             return null;
         }
@@ -65,13 +65,9 @@ final class Reading {
         return header == null ? 0 : header.length();
     }
 
-    byte[] body() {
-        return Arrays.copyOfRange(source.bytes, bodyAt(), source.bytes.length);
-    }
-
-    /** Whether the library takes the message. */
+    /** Whether the message can be read, and the library takes it. */
     boolean isAccepted() {
-        return verdict != null && verdict.isAccepted();
+        return failure == null && verdict.isAccepted();
     }
 
     /** The exit status that the message stands for. */

@@ -10,7 +10,7 @@ final class Refusal {
     private static final int AROUND = 8;
     private static final String INDENT = "  ";
 
-    private final Source source;
+    private final Held held;
     private final String sentence;
 
     /** The result code with its name; null where there is none, as for a push header. */
@@ -26,7 +26,7 @@ final class Refusal {
     private final List<String> expected;
 
     private Refusal(
-            Source source,
+            Held held,
             String sentence,
             String code,
             boolean isHeader,
@@ -34,7 +34,7 @@ final class Refusal {
             int offset,
             String path,
             List<String> expected) {
-        this.source = source;
+        this.held = held;
         this.sentence = sentence;
         this.code = code;
         this.bodyOffset = isHeader ? -1 : offset;
@@ -45,13 +45,18 @@ final class Refusal {
 
     /** Why a message is refused that cannot be read, or is not taken by the library. */
     static Refusal of(Reading reading) {
-        if (reading.failure != null) {
-            return of(reading.source, reading.failure, reading.bodyAt());
-        }
+        ProvisioningException failure = reading.failure;
         Verdict verdict = reading.verdict;
+        boolean isBoth =
+                failure != null
+                        && !verdict.isHeaderRefused()
+                        && verdict.offset() == failure.offset();
+        if (failure != null && !isBoth) {
+            return of(reading.held, failure, reading.bodyAt());
+        }
         return new Refusal(
-                reading.source,
-                verdict.reason(),
+                reading.held,
+                isBoth ? failure.getMessage() : verdict.reason(),
                 verdict.code() == 0 ? null : verdict.code() + " " + verdict.codeName(),
                 verdict.isHeaderRefused(),
                 reading.bodyAt(),
@@ -61,9 +66,9 @@ final class Refusal {
     }
 
     /** Why a message cannot be read. */
-    static Refusal of(Source source, ProvisioningException failure, int bodyAt) {
+    static Refusal of(Held held, ProvisioningException failure, int bodyAt) {
         return new Refusal(
-                source,
+                held,
                 failure.getMessage(),
                 null,
                 failure.reason() == ProvisioningException.Reason.NO_PUSH_HEADER,
@@ -86,7 +91,7 @@ final class Refusal {
             out.append(INDENT).append(palette.error(line)).append('\n');
         }
         paragraph(out, place());
-        if (source.bytes.length > 0) {
+        if (held.bytes.length > 0) {
             bytes(out, palette);
         }
         if (!expected.isEmpty()) {
@@ -103,7 +108,7 @@ final class Refusal {
         if (bodyOffset >= 0) {
             parts.add(String.format("body offset %d (0x%X)", bodyOffset, bodyOffset));
         }
-        if (source.isPush) {
+        if (held.isPush) {
             parts.add(String.format("message offset %d (0x%X)", offset, offset));
         }
         if (path != null && !path.isEmpty()) {
@@ -121,9 +126,9 @@ final class Refusal {
     /** The bytes around, and a mark below the first that is refused. */
     private void bytes(StringBuilder out, Palette palette) {
         int from = Math.max(offset - AROUND, 0);
-        int to = Math.min(offset + AROUND, source.bytes.length);
+        int to = Math.min(offset + AROUND, held.bytes.length);
         String start = INDENT + INDENT + Listing.hexadecimal(from, 4) + "  ";
-        out.append(palette.dim(start)).append(Listing.hexadecimal(source.bytes, from, to));
+        out.append(palette.dim(start)).append(Listing.hexadecimal(held.bytes, from, to));
         out.append('\n');
         for (int i = start.length() + (offset - from) * 3; i > 0; --i) {
             out.append(' ');

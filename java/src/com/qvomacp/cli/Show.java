@@ -46,6 +46,7 @@ final class Show extends Job {
 
     private JsonWriter writer;
     private int shown;
+    private boolean inObject;
 
     @Override
     void begin() {
@@ -57,14 +58,18 @@ final class Show extends Job {
                     (json ? "--json-lines goes not with --json" : "--answers goes not with --header"));
         }
         writer = new JsonWriter(console.out, jsonLines);
-        if (json && hasSeveralFiles()) {
-            writer.beginArray();
-        }
     }
 
     @Override
     void end() {
+        if (isInArray() && writer.depth() == 0) {
+            writer.beginArray();
+        }
         writer.endTo(0);
+    }
+
+    private boolean isInArray() {
+        return json && isOneOfSeveral();
     }
 
     private boolean isJson() {
@@ -72,55 +77,70 @@ final class Show extends Job {
     }
 
     @Override
-    void run(Source source) {
+    void run(Held held) {
         if (header) {
-            showHeader(source);
+            showHeader(held);
             return;
         }
-        Reading reading = Reading.of(source, limit());
+        Reading reading = Reading.of(held, limit());
         console.raise(reading.status());
         if (isJson()) {
+            if (!reading.isAccepted()) {
+                complain(Refusal.of(reading).write(startOf(held.name), errPalette()));
+            }
             json(reading);
         } else if (bytes) {
-            title(source.name);
-            Listing.write(console.out, outPalette(), reading);
+            list(reading);
+            if (!reading.isAccepted()) {
+                console.out.print("\n" + Refusal.of(reading).write("", outPalette()));
+            }
         } else {
             text(reading);
-        }
-        if (reading.isAccepted()) {
-            return;
-        }
-        String reason = Refusal.of(reading).write(bytes ? "" : startOf(source.name),
-                bytes ? outPalette() : errPalette());
-        if (bytes) {
-            console.out.print("\n" + reason);
-        } else {
-            console.complain(reason);
+            if (!reading.isAccepted()) {
+                complain(Refusal.of(reading).write(startOf(held.name), errPalette()));
+            }
         }
     }
 
-    private void showHeader(Source source) {
-        if (!source.isPush) {
-            fail(Console.REFUSED, source.name, "has no push header");
+    private void list(Reading reading) {
+        title(reading.held.name);
+        Listing.write(console.out, outPalette(), reading);
+    }
+
+    @Override
+    void unknown(Held held) {
+        if (bytes && held.bytes != null) {
+            list(Reading.of(held, limit()));
+        }
+    }
+
+    @Override
+    void complain(String text) {
+        writer.separate();
+        super.complain(text);
+    }
+
+    private void showHeader(Held held) {
+        if (!held.isPush) {
+            fail(Console.REFUSED, held.name, "has no push header");
             return;
         }
         PushHeader read;
         try {
-            read = PushHeader.parse(source.bytes);
+            read = PushHeader.parse(held.bytes);
         } catch (ProvisioningException refused) {
             console.raise(Console.REFUSED);
-            console.complain(
-                    Refusal.of(source, refused, 0).write(startOf(source.name), errPalette()));
-            failed(source.name, refused.getMessage());
+            complain(Refusal.of(held, refused, 0).write(startOf(held.name), errPalette()));
+            failed(held.name, refused.getMessage());
             return;
         }
-        int bodyLength = source.bytes.length - read.length();
+        int bodyLength = held.bytes.length - read.length();
         if (isJson()) {
-            beginObject(source.name);
+            beginObject(held.name);
             new MessageJson(writer).header(read, bodyLength);
-            writer.end();
+            endObject();
         } else {
-            title(source.name);
+            title(held.name);
             new TextWriter(console.out, outPalette()).header(read, bodyLength);
         }
     }
@@ -129,9 +149,9 @@ final class Show extends Job {
         if (reading.document == null && reading.header == null) {
             return;
         }
-        title(reading.source.name);
+        title(reading.held.name);
         TextWriter text = new TextWriter(console.out, outPalette());
-        int bodyLength = reading.source.bytes.length - reading.bodyAt();
+        int bodyLength = reading.held.bytes.length - reading.bodyAt();
         if (reading.header == null) {
             text.bodyAlone(bodyLength);
         } else {
@@ -146,7 +166,7 @@ final class Show extends Job {
     }
 
     private void json(Reading reading) {
-        beginObject(reading.source.name);
+        beginObject(reading.held.name);
         int depth = writer.depth();
         try {
             new MessageJson(writer).message(reading);
@@ -156,7 +176,7 @@ final class Show extends Job {
         } finally {
             writer.endTo(depth);
         }
-        writer.end();
+        endObject();
     }
 
     /** Asks the library; where it cannot be loaded, that is said. */
@@ -164,23 +184,31 @@ final class Show extends Job {
         try {
             Comparison.of(reading, listener);
         } catch (UnsatisfiedLinkError missing) {
-            listener.unanswered("the library cannot be loaded");
             console.raise(Console.FAILED);
-            console.complain(
-                    startOf(reading.source.name) + Visible.of(missing.getMessage()) + "\n");
+            complain(startOf(reading.held.name) + Visible.of(missing.getMessage()) + "\n");
+            listener.unanswered("the library cannot be loaded");
         }
     }
 
     private void beginObject(String name) {
+        if (isInArray() && writer.depth() == 0) {
+            writer.beginArray();
+        }
         writer.beginObject();
-        if (hasSeveralFiles()) {
+        inObject = true;
+        if (isOneOfSeveral()) {
             writer.member("file", name);
         }
     }
 
+    private void endObject() {
+        writer.end();
+        inObject = false;
+    }
+
     /** Of several files, each stands under its name. */
     private void title(String name) {
-        if (hasSeveralFiles()) {
+        if (isOneOfSeveral()) {
             console.out.print(shown == 0 ? "" : "\n");
             console.out.println(outPalette().bold("==> " + Visible.of(name) + " <=="));
         }
@@ -190,11 +218,12 @@ final class Show extends Job {
     @Override
     void failed(String name, String reason) {
         if (isJson()) {
-            // What was begun of the message may stand already.
-            if (writer.depth() == (json && hasSeveralFiles() ? 1 : 0)) {
+            // What was begun of the message stands already.
+            if (!inObject) {
                 beginObject(name);
             }
-            writer.member("error", reason).end();
+            writer.member("error", reason);
+            endObject();
         }
     }
 }

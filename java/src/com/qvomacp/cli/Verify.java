@@ -24,8 +24,6 @@ import picocli.CommandLine.Option;
                     + " or the output cannot be written"
         })
 final class Verify extends Job {
-    private static final int MAC_DIGITS = 40;
-
     @Option(
             names = "--pin",
             paramLabel = "PIN",
@@ -46,26 +44,26 @@ final class Verify extends Job {
     }
 
     @Override
-    void run(Source source) {
-        if (!source.isPush) {
-            say(source, Console.REFUSED, "it has no push header, and so no MAC");
+    void run(Held held) {
+        if (!held.isPush) {
+            say(held, Console.REFUSED, "it has no push header, and so no MAC");
             return;
         }
         PushHeader header;
         try {
-            header = PushHeader.parse(source.bytes);
+            header = PushHeader.parse(held.bytes);
         } catch (ProvisioningException none) {
             console.raise(Console.REFUSED);
-            console.complain(Refusal.of(source, none, 0).write(startOf(source.name), errPalette()));
+            complain(Refusal.of(held, none, 0).write(startOf(held.name), errPalette()));
             return;
         }
         SecurityMethod method = header.securityMethod();
-        byte[] body = Arrays.copyOfRange(source.bytes, header.length(), source.bytes.length);
+        byte[] body = Arrays.copyOfRange(held.bytes, header.length(), held.bytes.length);
         MacResult result = ProvisioningMac.verify(method, header.mac(), body, pin, imsi);
         if (result == MacResult.RIGHT) {
-            console.out.println(Visible.of(source.name) + ": verified (" + method + ")");
+            console.out.println(Visible.of(held.name) + ": verified (" + method + ")");
         } else {
-            say(source, statusOf(result), reasonFor(result, method, source.bytes));
+            say(held, statusOf(result), reasonFor(result, header, held.bytes));
         }
     }
 
@@ -77,7 +75,8 @@ final class Verify extends Job {
         return isUnusable ? Console.FAILED : Console.REFUSED;
     }
 
-    private String reasonFor(MacResult result, SecurityMethod method, byte[] message) {
+    private String reasonFor(MacResult result, PushHeader header, byte[] message) {
+        SecurityMethod method = header.securityMethod();
         switch (result) {
             case WRONG:
                 return "the MAC is wrong (" + method + ")";
@@ -86,7 +85,7 @@ final class Verify extends Job {
                         ? "the message states no security method"
                         : "the message states a security method that is not known";
             case NO_MAC:
-                int at = digitsAt(message);
+                int at = StrayMac.find(message, header.length());
                 return "no MAC was found ("
                         + method
                         + (at < 0 ? ")" : "), but what may be one stands at message offset " + at);
@@ -108,21 +107,9 @@ final class Verify extends Job {
         }
     }
 
-    /** Where as many hexadecimal digits stand as a MAC has; -1 when they stand nowhere. */
-    private static int digitsAt(byte[] message) {
-        int digits = 0;
-        for (int i = 0; i < message.length; ++i) {
-            digits = Character.digit(message[i], 16) < 0 ? 0 : digits + 1;
-            if (digits == MAC_DIGITS) {
-                return i + 1 - MAC_DIGITS;
-            }
-        }
-        return -1;
-    }
-
-    private void say(Source source, int status, String reason) {
+    private void say(Held held, int status, String reason) {
         console.raise(status);
-        String name = Visible.of(source.name) + ": ";
+        String name = Visible.of(held.name) + ": ";
         console.out.println(name + outPalette().error("NOT VERIFIED") + ": " + reason);
     }
 }

@@ -47,38 +47,47 @@ final class BodyHeader {
         Cursor cursor = new Cursor(body, 0, body.length);
         version = cursor.take();
         if (version < 0) {
-            throw unreadable("the body is empty", 0);
+            throw unreadable(body, "the body is empty", 0);
         }
         if (version >> 4 != 0) {
-            throw unreadable("the body is no WBXML: its version is " + versionText(), 0);
+            throw unreadable(body, "the body is no WBXML: its version is " + versionText(), 0);
         }
-        publicIdentifier = integer(cursor, "document type");
-        long typeIndex = publicIdentifier == 0 ? integer(cursor, "document type") : 0;
+        publicIdentifier = integer(body, cursor, "document type");
+        long typeIndex = publicIdentifier == 0 ? integer(body, cursor, "document type") : 0;
         charsetAt = cursor.at();
-        charset = CharacterSet.of(version == FIRST_VERSION ? 0 : integer(cursor, "character set"));
+        long number = version == FIRST_VERSION ? 0 : integer(body, cursor, "character set");
+        charset = CharacterSet.of(number);
         tableLengthAt = cursor.at();
-        long length = integer(cursor, "string table");
+        long length = integer(body, cursor, "string table");
         tableAt = cursor.at();
         if (length > cursor.left()) {
-            throw unreadable("the body ends within its string table", body.length);
+            throw unreadable(body, "the body ends within its string table", body.length);
         }
         cursor.skip((int) length);
         elementsAt = cursor.at();
         documentType = documentType(body, typeIndex);
-        requireProvisioning(cursor);
+        requireProvisioning(body, cursor);
     }
 
-    private static long integer(Cursor cursor, String field) throws ProvisioningException {
+    private static long integer(byte[] body, Cursor cursor, String field)
+            throws ProvisioningException {
         int from = cursor.at();
         long value = cursor.integer();
         if (value == Cursor.NO_INTEGER) {
-            throw unreadable("the body is no WBXML: its " + field + " cannot be read", from);
+            throw unreadable(body, "the body is no WBXML: its " + field + " cannot be read", from);
         }
         return value;
     }
 
-    private static ProvisioningException unreadable(String text, int offset) {
-        return new ProvisioningException(ProvisioningException.Reason.NO_WBXML, offset, text);
+    private static ProvisioningException unreadable(byte[] body, String text, int offset) {
+        return new ProvisioningException(
+                ProvisioningException.Reason.NO_WBXML, offset, text + likeness(body));
+    }
+
+    /** What the body looks like, if that can be said. */
+    private static String likeness(byte[] body) {
+        String likeness = body.length == 0 ? null : ForeignBytes.describe(body);
+        return likeness == null ? "" : "; this looks like " + likeness;
     }
 
     private String documentType(byte[] body, long index) {
@@ -95,25 +104,26 @@ final class BodyHeader {
     }
 
     /** Refuses another document type. One that is not stated is looked at: its root must fit. */
-    private void requireProvisioning(Cursor cursor) throws ProvisioningException {
+    private void requireProvisioning(byte[] body, Cursor cursor) throws ProvisioningException {
         if (isStated()) {
             if (!documentType.contains(PROVISIONING_TEXT)) {
-                throw otherType("the document type is " + Printable.quoted(documentType));
+                throw otherType(body, "the document type is " + Printable.quoted(documentType));
             }
         } else if (publicIdentifier > UNKNOWN) {
-            throw otherType("the public identifier of the document is " + publicIdentifier);
+            throw otherType(body, "the public identifier of the document is " + publicIdentifier);
         } else {
             int root = cursor.peek();
             boolean literal = root >= 0 && (root & ROOT_MASK) == BodyReader.LITERAL;
             if (root >= 0 && !literal && (root & ROOT_MASK) != ROOT_TOKEN) {
-                throw otherType("the document type is not stated, and its first token is another's");
+                throw otherType(
+                        body, "the document type is not stated, and its first token is another's");
             }
         }
     }
 
-    private static ProvisioningException otherType(String text) {
+    private static ProvisioningException otherType(byte[] body, String text) {
         return new ProvisioningException(
-                ProvisioningException.Reason.OTHER_DOCUMENT_TYPE, 1, text);
+                ProvisioningException.Reason.OTHER_DOCUMENT_TYPE, 1, text + likeness(body));
     }
 
     /** Whether it says of what type the document is. */

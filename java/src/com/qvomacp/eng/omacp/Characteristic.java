@@ -151,11 +151,12 @@ public final class Characteristic extends Item {
     }
 
     @Override
-    String step() {
+    void step(StringBuilder path) {
         if (ordinal == 0) {
             count(parent());
         }
-        return (type == null ? "characteristic" : Printable.of(type)) + ' ' + ordinal;
+        Printable.append(path, type == null ? Element.CHARACTERISTIC.text : type);
+        path.append(' ').append(ordinal);
     }
 
     /**

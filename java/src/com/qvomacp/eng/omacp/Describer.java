@@ -19,7 +19,7 @@ final class Describer implements Reading {
     /** Tells the fields before the elements. */
     void header(byte[] body, BodyHeader header) {
         visit(0, header.identifierAt, "WBXML " + header.versionText());
-        String type = header.isStated() ? Printable.whole(header.documentType) : "not stated";
+        String type = header.isStated() ? quoted(header.documentType) : "not stated";
         visit(header.identifierAt, header.charsetAt, "document type: " + type);
         visit(header.charsetAt, header.tableLengthAt, "character set: " + charset(header.charset));
         int length = header.elementsAt - header.tableAt;
@@ -34,7 +34,7 @@ final class Describer implements Reading {
                     "text "
                             + (from - header.tableAt)
                             + " of the table: "
-                            + Printable.whole(charset.decode(body, from, zero)));
+                            + quoted(charset.decode(body, from, zero)));
             from = to;
         }
     }
@@ -45,7 +45,7 @@ final class Describer implements Reading {
 
     @Override
     public void element(int from, int to, Element element, String name, boolean attributes) {
-        String called = element == Element.INSTRUCTION ? "instruction" : Printable.of(name);
+        String called = element == Element.INSTRUCTION ? "instruction" : name;
         visit(from, to, called);
         if (depth == open.length) {
             open = Arrays.copyOf(open, 2 * depth);
@@ -55,7 +55,7 @@ final class Describer implements Reading {
 
     @Override
     public void attribute(int from, int to, Attribute attribute, String name, String value) {
-        visit(from, to, Printable.of(name) + (value == null ? "" : " = " + Printable.whole(value)));
+        visit(from, to, name + (value == null ? "" : " = " + quoted(value)));
     }
 
     @Override
@@ -63,7 +63,7 @@ final class Describer implements Reading {
         visit(
                 from,
                 to,
-                Printable.whole(text) + ", " + writing.name().toLowerCase(Locale.ROOT));
+                quoted(text) + ", " + writing.name().toLowerCase(Locale.ROOT));
     }
 
     @Override
@@ -95,6 +95,10 @@ final class Describer implements Reading {
     @Override
     public void deviation(int at, Deviation.Kind kind) {
         // The bytes are told as what they are read as.
+    }
+
+    private static String quoted(String text) {
+        return '"' + text + '"';
     }
 
     private void visit(int from, int to, String meaning) {

@@ -72,8 +72,8 @@ public abstract class Item {
         return parent;
     }
 
-    /** What the item is called in a path. */
-    abstract String step();
+    /** Adds what the item is called in a path. */
+    abstract void step(StringBuilder path);
 
     /** Whether the item itself says the same as another one, whatever stands in them. */
     abstract boolean says(Item other);

@@ -8,13 +8,21 @@ final class ItemPath {
 
     /** The path, such as {@code wap-provisioningdoc / NAPDEF 1 / BEARER}; the innermost eight. */
     static String of(Item item) {
-        StringBuilder path = new StringBuilder(item.step());
-        Item outer = item.parent();
-        for (int told = 1; outer != null; outer = outer.parent()) {
-            if (told++ == LONGEST) {
-                return path.insert(0, "... / ").toString();
+        Item[] told = new Item[LONGEST];
+        int first = LONGEST;
+        Item outer = item;
+        for (; outer != null && first > 0; outer = outer.parent()) {
+            told[--first] = outer;
+        }
+        StringBuilder path = new StringBuilder();
+        if (outer != null) {
+            path.append("... / ");
+        }
+        for (int i = first; i < LONGEST; ++i) {
+            told[i].step(path);
+            if (i + 1 < LONGEST) {
+                path.append(" / ");
             }
-            path.insert(0, " / ").insert(0, outer.step());
         }
         return path.toString();
     }

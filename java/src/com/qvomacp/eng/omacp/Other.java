@@ -94,8 +94,8 @@ public final class Other extends Item {
     }
 
     @Override
-    String step() {
-        return name == null ? kind().name().toLowerCase(Locale.ROOT) : Printable.of(name);
+    void step(StringBuilder path) {
+        Printable.append(path, name == null ? kind().name().toLowerCase(Locale.ROOT) : name);
     }
 
     @Override

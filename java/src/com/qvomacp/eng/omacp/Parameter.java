@@ -71,8 +71,8 @@ public final class Parameter extends Item {
     }
 
     @Override
-    String step() {
-        return name == null ? Element.PARM.text : Printable.of(name);
+    void step(StringBuilder path) {
+        Printable.append(path, name == null ? Element.PARM.text : name);
     }
 
     @Override

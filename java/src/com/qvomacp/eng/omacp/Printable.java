@@ -9,19 +9,17 @@ final class Printable {
     /** The text, with control characters written as U+0000, and cut when it is long. */
     static String of(String text) {
         StringBuilder line = new StringBuilder();
-        append(line, text, LONGEST);
+        append(line, text);
         return line.toString();
+    }
+
+    /** Adds the text to a line, with control characters written as U+0000, and cut when it is long. */
+    static void append(StringBuilder line, String text) {
+        append(line, text, LONGEST);
     }
 
     static String quoted(String text) {
         return '"' + of(text) + '"';
-    }
-
-    /** The whole text in quotes, with control characters written as U+0000. */
-    static String whole(String text) {
-        StringBuilder line = new StringBuilder(text.length() + 2).append('"');
-        append(line, text, text.length());
-        return line.append('"').toString();
     }
 
     private static void append(StringBuilder line, String text, int longest) {

@@ -36,6 +36,9 @@ final class TreeBuilder implements Reading {
         }
     }
 
+    /** Deeper ones are let go of when their element ends: its item takes their place in memory. */
+    private static final int KEPT_FRAMES = 64;
+
     private Frame[] frames = new Frame[16];
     private int depth;
     private Frame innermost;
@@ -190,6 +193,9 @@ final class TreeBuilder implements Reading {
     public void end(int from, int to) {
         finishText();
         Frame frame = innermost;
+        if (depth >= KEPT_FRAMES) {
+            frames[depth] = null;
+        }
         innermost = frames[--depth];
         if (frame.element == Element.DOCUMENT) {
             // What stands in it waits on, for the document as a whole.

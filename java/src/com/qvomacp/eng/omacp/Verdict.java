@@ -51,6 +51,28 @@ public final class Verdict {
         this.shift = shift;
     }
 
+    /**
+     * Finds out whether the library takes a push of which no document can be read; of others {@link
+     * ProvisioningMessage#verdict} tells more.
+     *
+     * @param push any bytes
+     * @return the verdict, which knows of no item that is read otherwise; never {@code null}
+     */
+    public static Verdict ofPush(byte[] push) {
+        return LibraryRules.verdictOnPush(push, 0, null);
+    }
+
+    /**
+     * Finds out whether the library takes a body of which no document can be read; of others {@link
+     * ProvisioningDocument#verdict} tells more.
+     *
+     * @param body any bytes
+     * @return the verdict, which knows of no item that is read otherwise; never {@code null}
+     */
+    public static Verdict ofBody(byte[] body) {
+        return LibraryRules.verdictOnBody(body.clone(), null);
+    }
+
     static Verdict onHeader(Refusal refusal) {
         return new Verdict(true, 0, 0, refusal, NO_BODY, null, 0);
     }

@@ -26,6 +26,7 @@ import java.nio.file.Path;
 import java.util.HexFormat;
 import java.util.List;
 import java.util.Map;
+import java.util.Set;
 import org.junit.jupiter.api.Test;
 import org.junit.jupiter.api.io.TempDir;
 import org.junit.jupiter.params.ParameterizedTest;
@@ -109,12 +110,22 @@ class MainTest {
     }
 
     @ParameterizedTest
-    @ValueSource(strings = {"", "\n", "0106", "01 06 0", "0x0106", "hello", "A"})
-    void refusesTextThatIsNoMessage(String text) {
+    @ValueSource(strings = {"", "\n", "01 06 0", "hello", "A", "<?xml version='1.0'?>"})
+    void callsWhatItLooksLikeATextThatIsNoMessage(String text) {
         assertEquals(1, run(ascii(text)));
         assertEquals("", output);
-        assertTrue(errors.startsWith("omacp: standard input: refused: "), errors);
-        assertTrue(errors.contains(", in push header.\n"), errors);
+        assertTrue(errors.startsWith("omacp: standard input: no message: this is "), errors);
+        assertEquals(1, run(ascii(text), "--json"));
+        assertEquals(Set.of("error"), ((Map<?, ?>) Json.parse(output)).keySet());
+    }
+
+    @Test
+    void refusesAPushThatEnds() {
+        for (String text : List.of("0106", "0x0106")) {
+            assertEquals(1, run(ascii(text)));
+            assertTrue(errors.startsWith("omacp: standard input: refused: "), errors);
+            assertTrue(errors.contains(", in push header.\n"), errors);
+        }
     }
 
     @Test
@@ -154,13 +165,14 @@ class MainTest {
 
     @Test
     void showsTheMessageInItsOrder() {
-        assertEquals(0, run(push(
-                characteristic(
-                        "NAPDEF",
-                        characteristic("VALIDITY", parm("COUNTRY", "001")),
-                        parm("NAME", "n")),
-                characteristic("BOOTSTRAP"),
-                characteristic("NAPDEF"))));
+        run(
+                push(
+                        characteristic(
+                                "NAPDEF",
+                                characteristic("VALIDITY", parm("COUNTRY", "001")),
+                                parm("NAME", "n")),
+                        characteristic("BOOTSTRAP"),
+                        characteristic("NAPDEF")));
         assertTrue(
                 output.endsWith(
                         """
@@ -221,13 +233,18 @@ class MainTest {
         message[1] = 7;
         assertFails(
                 1,
-                """
-                omacp: standard input: refused: the second byte is 07, and 06 in a push
-                  message offset 1 (0x1), in push header.
-                    0000  63 07 09 B6 91 81 92 41 42
-                             ^^
-                """,
+                "omacp: standard input: no message: this is a confirmed push of a provisioning"
+                        + " document\n",
                 message);
+        assertEquals(1, run(message, "--as", "push"));
+        assertTrue(
+                errors.endsWith(
+                        """
+                          message offset 1 (0x1), in push header.
+                            0000  63 07 09 B6 91 81 92 41 42
+                                     ^^
+                        """),
+                errors);
     }
 
     @Test
@@ -358,8 +375,7 @@ class MainTest {
         assertEquals(new ChildVm.Result(0, resource("everything.json"), ""), json);
         String refusal =
                 """
-                omacp: standard input: refused: the data ends before the type of a push
-                  message offset 0 (0x0), in push header.
+                omacp: standard input: no message: this is no bytes at all
                 """;
         assertEquals(new ChildVm.Result(1, "", refusal), child(new byte[0]));
         Path missing = directory.resolve("missing");

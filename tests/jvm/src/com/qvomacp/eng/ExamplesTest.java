@@ -46,6 +46,7 @@ class ExamplesTest {
             import java.util.*;
 
             public class Examples {
+                static byte[] bytes;
                 static byte[] push;
                 static byte[] headers;
                 static byte[] body;
@@ -54,8 +55,9 @@ class ExamplesTest {
                 static PushHeader header;
                 static Characteristic characteristic;
 
-                public static void prepare(byte[] bytes) throws Exception {
-                    push = bytes;
+                public static void prepare(byte[] given) throws Exception {
+                    bytes = given;
+                    push = given;
                     message = ProvisioningMessage.parsePush(push);
                     document = message.document();
                     header = message.header();
