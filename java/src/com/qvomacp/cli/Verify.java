@@ -24,6 +24,8 @@ import picocli.CommandLine.Option;
                     + " or the output cannot be written"
         })
 final class Verify extends Job {
+    private static final int MAC_DIGITS = 40;
+
     @Option(
             names = "--pin",
             paramLabel = "PIN",
@@ -85,7 +87,7 @@ final class Verify extends Job {
                         ? "the message states no security method"
                         : "the message states a security method that is not known";
             case NO_MAC:
-                int at = StrayMac.find(message, header.length());
+                int at = digitsAt(message, header.length());
                 return "no MAC was found ("
                         + method
                         + (at < 0 ? ")" : "), but what may be one stands at message offset " + at);
@@ -105,6 +107,18 @@ final class Verify extends Job {
             default:
                 return method + " needs --pin";
         }
+    }
+
+    /** Where in the body as many hexadecimal digits stand as a MAC has, with a NUL behind; or -1. */
+    private static int digitsAt(byte[] message, int from) {
+        int digits = 0;
+        for (int at = from; at < message.length; ++at) {
+            if (message[at] == 0 && digits == MAC_DIGITS) {
+                return at - MAC_DIGITS;
+            }
+            digits = Character.digit(message[at], 16) < 0 ? 0 : digits + 1;
+        }
+        return -1;
     }
 
     private void say(Held held, int status, String reason) {
