@@ -35,7 +35,7 @@ final class Show {
             ProvisioningMessage.parsePush(bytes, ReadOptions.DEFAULT.withAcceptedOnly(true));
             System.out.println("taken");
         } catch (ProvisioningException e) {
-            System.out.println(e.reason() + ", " + e.code() + ": " + e.getMessage());
+            System.out.println(e.reason() + ", " + e.code());
         }
     }
 }

@@ -21,4 +21,9 @@ enum Attribute {
         }
         return OTHER;
     }
+
+    /** The name, which for one that the format does not have is {@code other}. */
+    String name(String other) {
+        return this == OTHER ? other : name();
+    }
 }

@@ -88,6 +88,7 @@ final class BodyReader {
 
     /** Reads everything behind the header. */
     void read() throws ProvisioningException {
+        Cursor cursor = this.cursor;
         deviationsOfHeader();
         for (int token; (token = cursor.take()) >= 0; ) {
             int from = cursor.at() - 1;
@@ -204,6 +205,7 @@ final class BodyReader {
 
     /** Reads attributes up to their END, which is that of the element when it has no content. */
     private void attributes(boolean content) throws ProvisioningException {
+        Cursor cursor = this.cursor;
         for (int token; (token = cursor.take()) >= 0; ) {
             int from = cursor.at() - 1;
             if (token == END) {
@@ -239,7 +241,7 @@ final class BodyReader {
             return false;
         }
         if (token < FIRST_VALUE) {
-            return attributes.start(token) != null;
+            return attributes.attribute(token) != null;
         }
         return attributes.value(token) != null
                 && (token != STR_T || header.tableAt == header.elementsAt);
@@ -248,23 +250,31 @@ final class BodyReader {
     private void attribute(int from, int token) throws ProvisioningException {
         if (token == LITERAL) {
             String name = literal(from);
-            reading.attribute(from, cursor.at(), Attribute.of(name), name, null);
+            Attribute attribute = Attribute.of(name);
+            reading.attribute(
+                    from,
+                    cursor.at(),
+                    attribute,
+                    attribute == Attribute.OTHER ? name : null,
+                    null);
             pieces = 0;
             return;
         }
         if (PIECES[token]) {
             reading.deviation(from, Deviation.Kind.OTHER_MEANING);
         }
-        CodePage.Start start = attributes == null ? null : attributes.start(token);
-        if (start == null && attributePage != 0) {
-            start = CodePage.of(0).start(token);
-            if (start != null) {
+        CodePage page = attributes;
+        Attribute attribute = page == null ? null : page.attribute(token);
+        if (attribute == null && attributePage != 0) {
+            page = CodePage.of(0);
+            attribute = page.attribute(token);
+            if (attribute != null) {
                 reading.deviation(from, Deviation.Kind.OTHER_PAGE);
             }
         }
-        if (start != null) {
-            String value = start.value;
-            reading.attribute(from, cursor.at(), start.attribute, start.attribute.name(), value);
+        if (attribute != null) {
+            String value = page.begin(token);
+            reading.attribute(from, cursor.at(), attribute, null, value);
             pieces = value == null ? 0 : 1;
             return;
         }
@@ -272,7 +282,7 @@ final class BodyReader {
         String name = unknown(attributePage, token);
         if (element.name != null) {
             // Nearly all tokens say what a parm or characteristic is, so this one may do so too.
-            reading.attribute(from, cursor.at(), element.name, element.name.name(), name);
+            reading.attribute(from, cursor.at(), element.name, null, name);
             pieces = 1;
         } else {
             reading.attribute(from, cursor.at(), Attribute.OTHER, name, null);
@@ -323,6 +333,7 @@ final class BodyReader {
     }
 
     private String inline(int from) throws ProvisioningException {
+        byte[] body = this.body;
         int start = cursor.at();
         int end = start + cursor.left();
         int zero = start;

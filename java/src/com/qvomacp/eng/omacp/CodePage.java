@@ -6,23 +6,11 @@ package com.qvomacp.eng.omacp;
  * its attributes apart.
  */
 final class CodePage {
-    /** The start of an attribute: which one, and what its value begins with. */
-    static final class Start {
-        final Attribute attribute;
-
-        /** {@code null} when the token says nothing of the value. */
-        final String value;
-
-        private Start(Attribute attribute, String value) {
-            this.attribute = attribute;
-            this.value = value;
-        }
-    }
-
     private static final int FIRST_VALUE = 0x80;
 
     private final Element[] elements = new Element[0x40];
-    private final Start[] starts = new Start[FIRST_VALUE];
+    private final Attribute[] attributes = new Attribute[FIRST_VALUE];
+    private final String[] begins = new String[FIRST_VALUE];
     private final String[] values = new String[0x100 - FIRST_VALUE];
 
     /** The pages that the format has. */
@@ -284,13 +272,14 @@ final class CodePage {
     }
 
     private CodePage attribute(int token, Attribute attribute) {
-        put(starts, token, new Start(attribute, null));
+        put(attributes, token, attribute);
         return this;
     }
 
     private CodePage starts(Attribute attribute, Object... rows) {
         for (int i = 0; i < rows.length; i += 2) {
-            put(starts, (Integer) rows[i], new Start(attribute, (String) rows[i + 1]));
+            put(attributes, (Integer) rows[i], attribute);
+            put(begins, (Integer) rows[i], (String) rows[i + 1]);
         }
         return this;
     }
@@ -320,8 +309,13 @@ final class CodePage {
     }
 
     /** The attribute that a token below 80 hexadecimal begins, or {@code null}. */
-    Start start(int token) {
-        return starts[token];
+    Attribute attribute(int token) {
+        return attributes[token];
+    }
+
+    /** What the value begins with of an attribute that a token begins; {@code null} for nothing. */
+    String begin(int token) {
+        return begins[token];
     }
 
     /** The part of a value that a token from 80 hexadecimal on stands for, or {@code null}. */

@@ -55,7 +55,7 @@ final class Describer implements Reading {
 
     @Override
     public void attribute(int from, int to, Attribute attribute, String name, String value) {
-        visit(from, to, name + (value == null ? "" : " = " + quoted(value)));
+        visit(from, to, attribute.name(name) + (value == null ? "" : " = " + quoted(value)));
     }
 
     @Override

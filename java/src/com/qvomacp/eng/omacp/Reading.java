@@ -9,7 +9,10 @@ interface Reading {
     /** An element or an instruction begins, in the one that has not ended yet. */
     void element(int from, int to, Element element, String name, boolean attributes);
 
-    /** An attribute begins; {@code value} is what its token says of the value, or {@code null}. */
+    /**
+     * An attribute begins. {@code name} is that of one that the format does not have; {@code value}
+     * is what its token says of the value. Either may be {@code null}.
+     */
     void attribute(int from, int to, Attribute attribute, String name, String value);
 
     /** A piece of an attribute's value, or of text where elements stand. */

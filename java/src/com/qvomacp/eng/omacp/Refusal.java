@@ -236,16 +236,12 @@ final class Refusal {
             if (token >= FIRST_VALUE) {
                 return page.value(token);
             }
-            CodePage.Start start = page.start(token);
-            if (start == null) {
-                return null;
+            Attribute attribute = page.attribute(token);
+            String value = page.begin(token);
+            if (attribute == null || attribute == Attribute.NAME && value != null) {
+                return value;
             }
-            if (start.value == null) {
-                return start.attribute.name();
-            }
-            return start.attribute == Attribute.NAME
-                    ? start.value
-                    : start.attribute.name() + "=" + start.value;
+            return value == null ? attribute.name() : attribute.name() + "=" + value;
         }
 
         /** A token of WBXML itself; a literal one with the name that it refers to. */

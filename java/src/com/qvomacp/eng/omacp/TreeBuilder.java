@@ -10,37 +10,42 @@ final class TreeBuilder implements Reading {
     /** The document, where nothing of the document element is known. */
     private static final String DOCUMENT = "document";
 
-    /** What is known of an element that has not ended. Frames are used again. */
+    private static final int FRAMES = 8;
+    private static final int ITEMS = 32;
+
+    /** What is known of an element whose content is read. Frames are used again. */
     private static final class Frame {
         Element element;
         String elementName;
         int from;
-
-        /** How many items waited when it began. */
         int waited;
-
         String name;
         Writing nameWriting;
         String value;
         Writing valueWriting;
-
-        void begin(int from, Element element, String elementName, int waited) {
-            this.element = element;
-            this.elementName = elementName;
-            this.from = from;
-            this.waited = waited;
-            name = null;
-            nameWriting = null;
-            value = null;
-            valueWriting = null;
-        }
     }
 
-    private Frame[] frames = new Frame[16];
+    private Frame[] frames = new Frame[FRAMES];
     private int depth;
-    private Frame innermost;
 
-    private Item[] waiting = new Item[64];
+    /** What is known of the element whose attributes are read, or that ends. */
+    private Element element;
+
+    private String elementName;
+    private int from;
+
+    /** How many items waited when the element began. */
+    private int waited;
+
+    private String name;
+    private Writing nameWriting;
+    private String value;
+    private Writing valueWriting;
+
+    /** Whether attributes are read. An element that has nothing else needs no frame. */
+    private boolean inAttributes;
+
+    private Item[] waiting = new Item[ITEMS];
     private int waits;
 
     /** The attribute whose value is read; {@code null} when text is. */
@@ -65,9 +70,6 @@ final class TreeBuilder implements Reading {
     TreeBuilder(int from) {
         rootFrom = from;
         rootTo = from;
-        innermost = new Frame();
-        innermost.begin(from, Element.OTHER, null, 0);
-        frames[0] = innermost;
     }
 
     /** The document element, with everything that was read. */
@@ -91,7 +93,21 @@ final class TreeBuilder implements Reading {
     @Override
     public void element(int from, int to, Element element, String name, boolean attributes) {
         finishText();
-        if (++depth == frames.length) {
+        this.from = from;
+        this.element = element;
+        elementName = name;
+        waited = waits;
+        this.name = null;
+        value = null;
+        inAttributes = true;
+        if (!attributes) {
+            push();
+        }
+    }
+
+    private void push() {
+        inAttributes = false;
+        if (depth == frames.length) {
             frames = Arrays.copyOf(frames, 2 * depth);
         }
         Frame frame = frames[depth];
@@ -99,8 +115,27 @@ final class TreeBuilder implements Reading {
             frame = new Frame();
             frames[depth] = frame;
         }
-        frame.begin(from, element, name, waits);
-        innermost = frame;
+        ++depth;
+        frame.element = element;
+        frame.elementName = elementName;
+        frame.from = from;
+        frame.waited = waited;
+        frame.name = name;
+        frame.nameWriting = nameWriting;
+        frame.value = value;
+        frame.valueWriting = valueWriting;
+    }
+
+    private void pop() {
+        Frame frame = frames[--depth];
+        element = frame.element;
+        elementName = frame.elementName;
+        from = frame.from;
+        waited = frame.waited;
+        name = frame.name;
+        nameWriting = frame.nameWriting;
+        value = frame.value;
+        valueWriting = frame.valueWriting;
     }
 
     @Override
@@ -164,66 +199,65 @@ final class TreeBuilder implements Reading {
     }
 
     private void finishAttribute(String whole) {
-        Element element = innermost.element;
-        if (attribute == element.name && innermost.name == null) {
-            innermost.name = whole;
-            innermost.nameWriting = writing;
-        } else if (attribute == element.value && innermost.value == null) {
-            innermost.value = whole;
-            innermost.valueWriting = writing;
-        } else if (element == Element.INSTRUCTION && innermost.name == null) {
-            innermost.name = attributeName;
-            innermost.value = whole;
-            innermost.valueWriting = writing;
+        if (attribute == element.name && name == null) {
+            name = whole;
+            nameWriting = writing;
+        } else if (attribute == element.value && value == null) {
+            value = whole;
+            valueWriting = writing;
+        } else if (element == Element.INSTRUCTION && name == null) {
+            name = attribute.name(attributeName);
+            value = whole;
+            valueWriting = writing;
         } else {
             Other.Kind kind = Other.Kind.ATTRIBUTE;
-            add(new Other(textFrom, textTo, Item.NONE, kind, attributeName, whole, writing));
+            String called = attribute.name(attributeName);
+            add(new Other(textFrom, textTo, Item.NONE, kind, called, whole, writing));
         }
     }
 
     @Override
     public void attributesEnd(int from, int to) {
         finishText();
+        push();
     }
 
     @Override
     public void end(int from, int to) {
         finishText();
-        Frame frame = innermost;
-        innermost = frames[--depth];
-        if (frame.element == Element.DOCUMENT) {
+        if (!inAttributes) {
+            pop();
+        }
+        inAttributes = false;
+        if (element == Element.DOCUMENT) {
             // What stands in it waits on, for the document as a whole.
-            rootFrom = frame.from;
+            rootFrom = this.from;
             rootTo = to;
-            rootName = frame.elementName;
-            version = frame.value;
+            rootName = elementName;
+            version = value;
             return;
         }
         Item[] inside = Item.NONE;
-        if (waits > frame.waited) {
-            inside = Arrays.copyOfRange(waiting, frame.waited, waits);
-            waits = frame.waited;
+        if (waits > waited) {
+            inside = Arrays.copyOfRange(waiting, waited, waits);
+            waits = waited;
         }
-        add(item(frame, to, inside));
+        add(item(to, inside));
     }
 
-    private static Item item(Frame frame, int to, Item[] inside) {
-        String name = frame.name;
-        String value = frame.value;
-        Writing valueWriting = frame.valueWriting;
-        if (frame.element == Element.PARM) {
-            return new Parameter(
-                    frame.from, to, inside, name, frame.nameWriting, value, valueWriting);
+    private Item item(int to, Item[] inside) {
+        Writing ofName = name == null ? null : nameWriting;
+        Writing ofValue = value == null ? null : valueWriting;
+        if (element == Element.PARM) {
+            return new Parameter(from, to, inside, name, ofName, value, ofValue);
         }
-        if (frame.element == Element.CHARACTERISTIC) {
-            return new Characteristic(frame.from, to, inside, name, frame.nameWriting);
+        if (element == Element.CHARACTERISTIC) {
+            return new Characteristic(from, to, inside, name, ofName);
         }
-        if (frame.element == Element.INSTRUCTION) {
-            Other.Kind kind = Other.Kind.INSTRUCTION;
-            return new Other(frame.from, to, inside, kind, name, value, valueWriting);
+        if (element == Element.INSTRUCTION) {
+            return new Other(from, to, inside, Other.Kind.INSTRUCTION, name, value, ofValue);
         }
-        Other.Kind kind = Other.Kind.ELEMENT;
-        return new Other(frame.from, to, inside, kind, frame.elementName, null, null);
+        return new Other(from, to, inside, Other.Kind.ELEMENT, elementName, null, null);
     }
 
     @Override

@@ -118,7 +118,7 @@ class CodePageTest {
             CodePage vocabulary = CodePage.of(page);
             for (int token = 5; token < 0x100; ++token) {
                 Object found =
-                        token < 0x80 ? vocabulary.start(token) : vocabulary.value(token);
+                        token < 0x80 ? vocabulary.attribute(token) : vocabulary.value(token);
                 String kind = token < 0x80 ? "attribute start" : "attribute value";
                 assertEquals(
                         published.contains(kind + page + " " + token), found != null, kind + token);
@@ -152,7 +152,7 @@ class CodePageTest {
 
     private static boolean hasOnPageOne(Row row) {
         CodePage one = CodePage.of(1);
-        return row.token < 0x80 ? one.start(row.token) != null : one.value(row.token) != null;
+        return row.token < 0x80 ? one.attribute(row.token) != null : one.value(row.token) != null;
     }
 
     @Test

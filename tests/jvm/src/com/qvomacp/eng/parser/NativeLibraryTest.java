@@ -27,7 +27,10 @@ import org.junit.jupiter.params.provider.ValueSource;
 class NativeLibraryTest {
     private static final String PARSED = "epdg.epc.mnc001.mcc001.example.net";
 
-    /** Loads twice, and parses the sample when that goes well; within one class loader of the child. */
+    /**
+     * Loads twice, and parses the sample when that goes well; within one class loader of the child.
+     * The second time the property is gone, and must not matter.
+     */
     public static final class Use implements Runnable {
         public Use() {}
 
@@ -41,6 +44,7 @@ class NativeLibraryTest {
                     Throwable cause = e.getCause();
                     System.out.println(cause.getClass().getSimpleName() + ": " + e.getMessage());
                 }
+                System.clearProperty(NativeLibrary.PATH_PROPERTY);
             }
         }
 

@@ -21,10 +21,9 @@ import java.util.List;
  */
 final class WriteVerdicts {
     private static final int HEAD = 14;
+    private static final int NEAR_LIMIT = 1000;
 
     private final OutputStream out;
-    private long bodies;
-    private long headers;
 
     private WriteVerdicts(OutputStream out) {
         this.out = out;
@@ -33,8 +32,8 @@ final class WriteVerdicts {
     /**
      * Writes the messages.
      *
-     * @param arguments the directory of the samples, how many bodies and how many headers at least,
-     *     the seed
+     * @param arguments the directory of the samples, how many bodies and how many headers are
+     *     generated, the seed
      */
     public static void main(String[] arguments) throws IOException {
         List<byte[]> samples = samples(Paths.get(arguments[0]));
@@ -51,10 +50,13 @@ final class WriteVerdicts {
             for (byte[] body : MessageGenerator.large()) {
                 verdicts.body(body);
             }
-            while (verdicts.headers < headers) {
+            for (int i = 0; i < NEAR_LIMIT; ++i) {
+                verdicts.body(generator.nearLimit());
+            }
+            for (long i = 0; i < headers; ++i) {
                 verdicts.header(generator.push());
             }
-            while (verdicts.bodies < bodies) {
+            for (long i = 0; i < bodies; ++i) {
                 verdicts.body(generator.body());
             }
         }
@@ -102,13 +104,11 @@ final class WriteVerdicts {
     private void body(byte[] body) throws IOException {
         Verdict verdict = LibraryRules.verdictOnBody(body, null);
         write('B', body, verdict.isAccepted(), verdict.code(), verdict.bytesRead());
-        ++bodies;
     }
 
     private void header(byte[] push) throws IOException {
         LibraryHeader header = LibraryHeader.of(push);
         write('H', push, header.isTaken(), 0, header.bodyAt);
-        ++headers;
     }
 
     private void write(char kind, byte[] bytes, boolean taken, int code, int read)
