@@ -9,6 +9,10 @@ import java.util.List;
  * view of the tree and holds nothing of its own: what it has no accessor for is within reach by
  * {@link #characteristic}.
  *
+ * <p>An accessor for one value answers that of the first parameter of its name, {@code null} when there
+ * is none and when it has no value. One for several answers all, in the order of the message, in a list
+ * that cannot be modified and is empty when there is none.
+ *
  * <pre>{@code
  * for (AccessPoint accessPoint : message.accessPoints()) {
  *     System.out.println(accessPoint.name() + ": " + accessPoint.characteristic().parameters());
@@ -29,13 +33,17 @@ public abstract class TypedCharacteristic {
 
     /** A view of each characteristic of a type directly in an item, in a list that stays as it is. */
     static <V> List<V> views(Item item, String type, Maker<V> maker) {
-        List<V> views = new ArrayList<>();
+        // Most messages lack most kinds: the list is made for the first.
+        List<V> views = Collections.emptyList();
         for (Item child : item.inside()) {
             if (child instanceof Characteristic && type.equals(((Characteristic) child).type())) {
+                if (views.isEmpty()) {
+                    views = new ArrayList<>();
+                }
                 views.add(maker.of((Characteristic) child));
             }
         }
-        return Collections.unmodifiableList(views);
+        return views.isEmpty() ? views : Collections.unmodifiableList(views);
     }
 
     /**
