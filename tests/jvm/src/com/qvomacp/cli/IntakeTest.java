@@ -109,6 +109,17 @@ class IntakeTest {
         }
     }
 
+    /** A string table that reads as the ports of a push, behind elements 06 and 03. */
+    @Test
+    void takesAPushForNoUserDataWhereTheLengthsOfBothComeOut() {
+        byte[] push =
+                Sms.bytes(
+                        "16 06 01 B6 030B6A0F 616263646566676869 05040B8423F0",
+                        "45 C6 55 01 87 11 06 83 00 01 01 01");
+        assertNotNull(ShortMessage.ofUserData(push));
+        assertMessage(push, true, take(push));
+    }
+
     @ParameterizedTest
     @CsvSource({
         "0B915348000000F0", "05812143F5", "0681214365", "06912143F5", "0B8153480000 00F0",
