@@ -1,6 +1,11 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.ArrayList;
+import java.util.Collections;
+import java.util.HashMap;
 import java.util.List;
+import java.util.Map;
+import java.util.Objects;
 
 /**
  * A characteristic of a provisioning document: a type, such as {@code NAPDEF}, and what stands in
@@ -13,8 +18,16 @@ import java.util.List;
  * }</pre>
  */
 public final class Characteristic extends Item {
-    Characteristic(Characteristic parent, int offset, int end) {
-        super(parent, offset, end);
+    private final String type;
+    private final byte typeWriting;
+
+    /** The number of the characteristic in a path; 0 until somebody asks for one beside it. */
+    private int ordinal;
+
+    Characteristic(int offset, int end, Item[] children, String type, Writing typeWriting) {
+        super(offset, end, children);
+        this.type = type;
+        this.typeWriting = Writing.code(typeWriting);
     }
 
     /**
@@ -24,7 +37,7 @@ public final class Characteristic extends Item {
      *     characteristic has none
      */
     public String type() {
-        throw new UnsupportedOperationException();
+        return type;
     }
 
     /**
@@ -33,16 +46,7 @@ public final class Characteristic extends Item {
      * @return how; {@code null} without a type
      */
     public Writing typeWriting() {
-        throw new UnsupportedOperationException();
-    }
-
-    /**
-     * Lists what stands in the characteristic.
-     *
-     * @return every item, in the order of the message; not modifiable
-     */
-    public List<Item> children() {
-        throw new UnsupportedOperationException();
+        return Writing.of(typeWriting);
     }
 
     /**
@@ -51,7 +55,13 @@ public final class Characteristic extends Item {
      * @return every parameter, in the order of the message; not modifiable
      */
     public List<Parameter> parameters() {
-        throw new UnsupportedOperationException();
+        List<Parameter> parameters = new ArrayList<>();
+        for (Item child : inside()) {
+            if (child instanceof Parameter) {
+                parameters.add((Parameter) child);
+            }
+        }
+        return Collections.unmodifiableList(parameters);
     }
 
     /**
@@ -60,7 +70,7 @@ public final class Characteristic extends Item {
      * @return every characteristic, in the order of the message; not modifiable
      */
     public List<Characteristic> characteristics() {
-        throw new UnsupportedOperationException();
+        return in(this);
     }
 
     /**
@@ -70,7 +80,7 @@ public final class Characteristic extends Item {
      * @return all of them, in the order of the message; not modifiable
      */
     public List<Characteristic> characteristics(String type) {
-        throw new UnsupportedOperationException();
+        return in(this, type);
     }
 
     /**
@@ -80,7 +90,12 @@ public final class Characteristic extends Item {
      * @return the first parameter of that name; {@code null} when there is none
      */
     public Parameter parameter(String name) {
-        throw new UnsupportedOperationException();
+        for (Item child : inside()) {
+            if (child instanceof Parameter && name.equals(((Parameter) child).name())) {
+                return (Parameter) child;
+            }
+        }
+        return null;
     }
 
     /**
@@ -91,7 +106,8 @@ public final class Characteristic extends Item {
      *     when it has no value
      */
     public String value(String name) {
-        throw new UnsupportedOperationException();
+        Parameter parameter = parameter(name);
+        return parameter == null ? null : parameter.value();
     }
 
     /**
@@ -102,6 +118,84 @@ public final class Characteristic extends Item {
      *     modifiable
      */
     public List<String> values(String name) {
-        throw new UnsupportedOperationException();
+        List<String> values = new ArrayList<>();
+        for (Item child : inside()) {
+            if (child instanceof Parameter) {
+                Parameter parameter = (Parameter) child;
+                if (parameter.value() != null && name.equals(parameter.name())) {
+                    values.add(parameter.value());
+                }
+            }
+        }
+        return Collections.unmodifiableList(values);
+    }
+
+    static List<Characteristic> in(Item item) {
+        List<Characteristic> characteristics = new ArrayList<>();
+        for (Item child : item.inside()) {
+            if (child instanceof Characteristic) {
+                characteristics.add((Characteristic) child);
+            }
+        }
+        return Collections.unmodifiableList(characteristics);
+    }
+
+    static List<Characteristic> in(Item item, String type) {
+        List<Characteristic> characteristics = new ArrayList<>();
+        for (Item child : item.inside()) {
+            if (child instanceof Characteristic && type.equals(((Characteristic) child).type)) {
+                characteristics.add((Characteristic) child);
+            }
+        }
+        return Collections.unmodifiableList(characteristics);
+    }
+
+    @Override
+    String step() {
+        if (ordinal == 0) {
+            count(parent());
+        }
+        return (type == null ? "characteristic" : Printable.of(type)) + ' ' + ordinal;
+    }
+
+    /**
+     * Numbers the characteristics of an item, all at once, so that many paths take no longer than
+     * few. Two threads that do so at the same time write the same numbers.
+     */
+    private static void count(Item item) {
+        Map<String, Integer> counts = new HashMap<>();
+        for (Item child : item.inside()) {
+            if (child instanceof Characteristic) {
+                Characteristic characteristic = (Characteristic) child;
+                Integer before = counts.get(characteristic.type);
+                int number = before == null ? 1 : before + 1;
+                counts.put(characteristic.type, number);
+                characteristic.ordinal = number;
+            }
+        }
+    }
+
+    @Override
+    boolean says(Item other) {
+        return other instanceof Characteristic && Objects.equals(type, ((Characteristic) other).type);
+    }
+
+    @Override
+    int hash() {
+        return Objects.hashCode(type);
+    }
+
+    /**
+     * Shows the characteristic, without what is in it.
+     *
+     * @return one line of text
+     */
+    @Override
+    public String toString() {
+        return "Characteristic{type="
+                + (type == null ? "none" : Printable.of(type))
+                + ", children="
+                + inside().length
+                + "}";
     }
 }

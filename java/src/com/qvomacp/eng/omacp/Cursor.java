@@ -5,6 +5,11 @@ final class Cursor {
     /** What {@link #integer} answers for one that is cut off, or larger than 32 bits. */
     static final long NO_INTEGER = -1;
 
+    private static final int MORE = 0x80;
+    private static final int DIGIT = 0x7F;
+    private static final int DIGIT_BITS = 7;
+    private static final long LARGEST = 0xFFFFFFFFL;
+
     private final byte[] bytes;
     private final int end;
     private int at;
@@ -36,5 +41,23 @@ final class Cursor {
     /** Goes on by so many bytes, to the end at most. */
     void skip(int count) {
         at = count < end - at ? at + count : end;
+    }
+
+    /**
+     * A multi-byte integer: seven bits a byte, the top bit on all but the last. One that is too large
+     * is taken whole, one that is cut off to the end.
+     */
+    long integer() {
+        long value = 0;
+        for (int next; (next = take()) >= 0; ) {
+            value = value << DIGIT_BITS | next & DIGIT;
+            if (value > LARGEST) {
+                value = LARGEST + 1;
+            }
+            if ((next & MORE) == 0) {
+                return value > LARGEST ? NO_INTEGER : value;
+            }
+        }
+        return NO_INTEGER;
     }
 }

@@ -1,24 +1,31 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Arrays;
+import java.util.Collections;
+import java.util.List;
+
 /**
  * Something that stands in a provisioning document: a {@link Characteristic}, a {@link Parameter},
  * or {@link Other} content. Items are immutable; two of them are equal when they say the same,
  * wherever they stand and however they are written.
  */
 public abstract class Item {
-    /** The place of an item that was not read from a body. */
-    static final int NOWHERE = -1;
+    static final Item[] NONE = {};
 
-    final Characteristic parent;
     private final int offset;
+    private final int end;
+    private final Item[] children;
 
-    /** Behind the last byte, until the item is whole. */
-    int end;
+    /** Set once, by the item that this one stands in, before anybody else sees either. */
+    private Item parent;
 
-    Item(Characteristic parent, int offset, int end) {
-        this.parent = parent;
+    Item(int offset, int end, Item[] children) {
         this.offset = offset;
         this.end = end;
+        this.children = children;
+        for (Item child : children) {
+            child.parent = this;
+        }
     }
 
     /**
@@ -37,5 +44,50 @@ public abstract class Item {
      */
     public final int length() {
         return end - offset;
+    }
+
+    /**
+     * Lists what stands in the item. The format has parameters and characteristics in a
+     * characteristic, and nothing in a parameter; attributes that it does not have come first.
+     *
+     * @return every item, in the order of the message; not modifiable
+     */
+    public final List<Item> children() {
+        return Collections.unmodifiableList(Arrays.asList(children));
+    }
+
+    /** What stands in the item, not to be changed. */
+    final Item[] inside() {
+        return children;
+    }
+
+    /** The item that this one stands in; {@code null} for the document element. */
+    final Item parent() {
+        return parent;
+    }
+
+    /** What the item is called in a path. */
+    abstract String step();
+
+    /** Whether the item itself says the same as another one, whatever stands in them. */
+    abstract boolean says(Item other);
+
+    /** What is the same for items that say the same, whatever stands in them. */
+    abstract int hash();
+
+    /**
+     * Finds out whether another item says the same: it is the same, and so is everything in it.
+     *
+     * @param other what to compare with
+     * @return true when it does
+     */
+    @Override
+    public final boolean equals(Object other) {
+        return other instanceof Item && Walk.same(this, (Item) other);
+    }
+
+    @Override
+    public final int hashCode() {
+        return Walk.hash(this);
     }
 }

@@ -1,6 +1,7 @@
 package com.qvomacp.eng.omacp;
 
-import java.util.List;
+import java.util.Locale;
+import java.util.Objects;
 
 /**
  * What stands in a document and is neither a characteristic nor a parameter. The format has no place
@@ -21,15 +22,30 @@ public final class Other extends Item {
         /** A processing instruction. */
         INSTRUCTION,
 
-        /** What stands in a parm, behind which this item follows; its children stand in it. */
-        PARM_CONTENT,
-
         /** Bytes behind the end of the document. */
-        TRAILING
+        TRAILING;
+
+        private static final Kind[] ALL = values();
     }
 
-    Other(Characteristic parent, int offset, int end) {
-        super(parent, offset, end);
+    private final String name;
+    private final String text;
+    private final byte kind;
+    private final byte textWriting;
+
+    Other(
+            int offset,
+            int end,
+            Item[] children,
+            Kind kind,
+            String name,
+            String text,
+            Writing textWriting) {
+        super(offset, end, children);
+        this.name = name;
+        this.text = text;
+        this.kind = (byte) kind.ordinal();
+        this.textWriting = Writing.code(textWriting);
     }
 
     /**
@@ -38,7 +54,7 @@ public final class Other extends Item {
      * @return the kind, never {@code null}
      */
     public Kind kind() {
-        throw new UnsupportedOperationException();
+        return Kind.ALL[kind];
     }
 
     /**
@@ -48,7 +64,7 @@ public final class Other extends Item {
      *     has none
      */
     public String name() {
-        throw new UnsupportedOperationException();
+        return name;
     }
 
     /**
@@ -57,15 +73,48 @@ public final class Other extends Item {
      * @return the text; {@code null} for what has none
      */
     public String text() {
-        throw new UnsupportedOperationException();
+        return text;
     }
 
     /**
-     * Lists what stands in an element or in a parm.
+     * Tells how the text is written.
      *
-     * @return every item, in the order of the message; not modifiable
+     * @return how; {@code null} without a text
      */
-    public List<Item> children() {
-        throw new UnsupportedOperationException();
+    public Writing textWriting() {
+        return Writing.of(textWriting);
+    }
+
+    @Override
+    String step() {
+        return name == null ? kind().name().toLowerCase(Locale.ROOT) : Printable.of(name);
+    }
+
+    @Override
+    boolean says(Item other) {
+        return other instanceof Other
+                && kind == ((Other) other).kind
+                && Objects.equals(name, ((Other) other).name)
+                && Objects.equals(text, ((Other) other).text);
+    }
+
+    @Override
+    int hash() {
+        return 31 * (31 * Objects.hashCode(name) + Objects.hashCode(text)) + kind;
+    }
+
+    /**
+     * Shows the item, without its text, which may be a secret.
+     *
+     * @return one line of text
+     */
+    @Override
+    public String toString() {
+        return "Other{kind="
+                + kind()
+                + (name == null ? "" : ", name=" + Printable.of(name))
+                + ", children="
+                + inside().length
+                + "}";
     }
 }

@@ -1,9 +1,36 @@
 package com.qvomacp.eng.omacp;
 
-/** A parameter of a provisioning document: a name, such as {@code NAPID}, and a value. */
+import java.util.Objects;
+
+/**
+ * A parameter of a provisioning document: a name, such as {@code NAPID}, and a value. The format has
+ * nothing in a parm; what stands there all the same is in {@link #children}.
+ *
+ * <pre>{@code
+ * for (Parameter parameter : characteristic.parameters()) {
+ *     System.out.println(parameter.name() + (parameter.value() == null ? "" : " is set"));
+ * }
+ * }</pre>
+ */
 public final class Parameter extends Item {
-    Parameter(Characteristic parent, int offset, int end) {
-        super(parent, offset, end);
+    private final String name;
+    private final String value;
+    private final byte nameWriting;
+    private final byte valueWriting;
+
+    Parameter(
+            int offset,
+            int end,
+            Item[] children,
+            String name,
+            Writing nameWriting,
+            String value,
+            Writing valueWriting) {
+        super(offset, end, children);
+        this.name = name;
+        this.value = value;
+        this.nameWriting = Writing.code(nameWriting);
+        this.valueWriting = Writing.code(valueWriting);
     }
 
     /**
@@ -13,7 +40,7 @@ public final class Parameter extends Item {
      *     the parameter has none
      */
     public String name() {
-        throw new UnsupportedOperationException();
+        return name;
     }
 
     /**
@@ -22,7 +49,7 @@ public final class Parameter extends Item {
      * @return VALUE, which may be empty; {@code null} when the parameter has none
      */
     public String value() {
-        throw new UnsupportedOperationException();
+        return value;
     }
 
     /**
@@ -31,7 +58,7 @@ public final class Parameter extends Item {
      * @return how; {@code null} without a name
      */
     public Writing nameWriting() {
-        throw new UnsupportedOperationException();
+        return Writing.of(nameWriting);
     }
 
     /**
@@ -40,6 +67,36 @@ public final class Parameter extends Item {
      * @return how; {@code null} without a value
      */
     public Writing valueWriting() {
-        throw new UnsupportedOperationException();
+        return Writing.of(valueWriting);
+    }
+
+    @Override
+    String step() {
+        return name == null ? Element.PARM.text : Printable.of(name);
+    }
+
+    @Override
+    boolean says(Item other) {
+        return other instanceof Parameter
+                && Objects.equals(name, ((Parameter) other).name)
+                && Objects.equals(value, ((Parameter) other).value);
+    }
+
+    @Override
+    int hash() {
+        return 31 * Objects.hashCode(name) + Objects.hashCode(value);
+    }
+
+    /**
+     * Shows the parameter, without its value, which may be a secret.
+     *
+     * @return one line of text
+     */
+    @Override
+    public String toString() {
+        return "Parameter{name="
+                + (name == null ? "none" : Printable.of(name))
+                + (value == null ? ", no value" : ", a value")
+                + "}";
     }
 }

@@ -1,6 +1,9 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Arrays;
+import java.util.Collections;
 import java.util.List;
+import java.util.Objects;
 
 /**
  * A provisioning document as its body says it: a tree of items in the order of the message. It reads
@@ -14,7 +17,30 @@ import java.util.List;
  * }</pre>
  */
 public final class ProvisioningDocument {
-    private ProvisioningDocument() {}
+    private final byte[] body;
+    private final BodyHeader header;
+    private final Other root;
+    private final String version;
+
+    private ProvisioningDocument(byte[] body, int textLimit) throws ProvisioningException {
+        this.body = body;
+        header = new BodyHeader(body);
+        TreeBuilder builder = new TreeBuilder(header.elementsAt);
+        new BodyReader(body, header, textLimit, builder).read();
+        root = builder.root();
+        version = builder.version();
+    }
+
+    /** Reads a body that nobody else has. */
+    static ProvisioningDocument of(byte[] body, ReadOptions options) throws ProvisioningException {
+        if (body.length > options.inputLimit()) {
+            throw new ProvisioningException(
+                    ProvisioningException.Reason.INPUT_TOO_LONG,
+                    options.inputLimit(),
+                    "the body has " + body.length + " bytes, over the limit of " + options.inputLimit());
+        }
+        return new ProvisioningDocument(body, options.textLimit());
+    }
 
     /**
      * Reads a body with the usual limits.
@@ -39,7 +65,10 @@ public final class ProvisioningDocument {
      */
     public static ProvisioningDocument parse(byte[] body, ReadOptions options)
             throws ProvisioningException {
-        throw new UnsupportedOperationException();
+        if (body.length > options.inputLimit()) {
+            return of(body, options);
+        }
+        return of(body.clone(), options);
     }
 
     /**
@@ -48,7 +77,7 @@ public final class ProvisioningDocument {
      * @return such as {@code 1.3}
      */
     public String wbxmlVersion() {
-        throw new UnsupportedOperationException();
+        return header.versionText();
     }
 
     /**
@@ -57,7 +86,7 @@ public final class ProvisioningDocument {
      * @return the number, 11 for a provisioning document; 0 when it is given as text
      */
     public int publicIdentifier() {
-        throw new UnsupportedOperationException();
+        return (int) header.publicIdentifier;
     }
 
     /**
@@ -67,7 +96,7 @@ public final class ProvisioningDocument {
      *     none, or the text cannot be had
      */
     public String documentType() {
-        throw new UnsupportedOperationException();
+        return header.documentType;
     }
 
     /**
@@ -76,7 +105,7 @@ public final class ProvisioningDocument {
      * @return the MIBenum that IANA assigns, 106 for UTF-8; 0 when it is not stated
      */
     public int charset() {
-        throw new UnsupportedOperationException();
+        return (int) header.charset.number();
     }
 
     /**
@@ -85,7 +114,7 @@ public final class ProvisioningDocument {
      * @return such as {@code UTF-8}; {@code null} when the number stands for none that is known
      */
     public String charsetName() {
-        throw new UnsupportedOperationException();
+        return header.charset.name();
     }
 
     /**
@@ -94,7 +123,7 @@ public final class ProvisioningDocument {
      * @return a new array, empty when there is none
      */
     public byte[] stringTable() {
-        throw new UnsupportedOperationException();
+        return Arrays.copyOfRange(body, header.tableAt, header.elementsAt);
     }
 
     /**
@@ -103,7 +132,7 @@ public final class ProvisioningDocument {
      * @return such as {@code 1.0}; {@code null} when there is none
      */
     public String version() {
-        throw new UnsupportedOperationException();
+        return version;
     }
 
     /**
@@ -112,7 +141,7 @@ public final class ProvisioningDocument {
      * @return every item, in the order of the message; not modifiable
      */
     public List<Item> children() {
-        throw new UnsupportedOperationException();
+        return root.children();
     }
 
     /**
@@ -121,7 +150,7 @@ public final class ProvisioningDocument {
      * @return every characteristic, in the order of the message; not modifiable
      */
     public List<Characteristic> characteristics() {
-        throw new UnsupportedOperationException();
+        return Characteristic.in(root);
     }
 
     /**
@@ -131,7 +160,7 @@ public final class ProvisioningDocument {
      * @return all of them, in the order of the message; not modifiable
      */
     public List<Characteristic> characteristics(String type) {
-        throw new UnsupportedOperationException();
+        return Characteristic.in(root, type);
     }
 
     /**
@@ -141,7 +170,7 @@ public final class ProvisioningDocument {
      * @return a new array with {@link Item#length} bytes
      */
     public byte[] bytes(Item item) {
-        throw new UnsupportedOperationException();
+        return Arrays.copyOfRange(body, item.offset(), item.offset() + item.length());
     }
 
     /**
@@ -151,7 +180,7 @@ public final class ProvisioningDocument {
      * @return the path, never {@code null}
      */
     public String path(Item item) {
-        throw new UnsupportedOperationException();
+        return ItemPath.of(item);
     }
 
     /**
@@ -160,7 +189,9 @@ public final class ProvisioningDocument {
      * @return every deviation, in the order of the body; not modifiable, empty when there is none
      */
     public List<Deviation> deviations() {
-        throw new UnsupportedOperationException();
+        DeviationFinder finder = new DeviationFinder(root, body.length);
+        read(finder);
+        return Collections.unmodifiableList(finder.found());
     }
 
     /**
@@ -169,7 +200,7 @@ public final class ProvisioningDocument {
      * @return a new array
      */
     public byte[] body() {
-        throw new UnsupportedOperationException();
+        return body.clone();
     }
 
     /**
@@ -179,5 +210,79 @@ public final class ProvisioningDocument {
      */
     public Verdict verdict() {
         throw new UnsupportedOperationException();
+    }
+
+    /** The innermost item that some byte of the body is in; the document for one outside of all. */
+    Item itemAt(int offset) {
+        Item item = root;
+        for (Item inner = item; inner != null; inner = childAt(item, offset)) {
+            item = inner;
+        }
+        return item;
+    }
+
+    private static Item childAt(Item item, int offset) {
+        Item[] children = item.inside();
+        int low = 0;
+        int high = children.length;
+        while (low < high) {
+            int middle = (low + high) >>> 1;
+            if (children[middle].offset() <= offset) {
+                low = middle + 1;
+            } else {
+                high = middle;
+            }
+        }
+        if (low == 0) {
+            return null;
+        }
+        Item last = children[low - 1];
+        return offset < last.offset() + last.length() ? last : null;
+    }
+
+    /** Reads the body again, which went well before, for another listener. */
+    private void read(Reading reading) {
+        try {
+            new BodyReader(body, header, Integer.MAX_VALUE, reading).read();
+        } catch (ProvisioningException e) {
+            throw new AssertionError(e);
+        }
+    }
+
+    /**
+     * Finds out whether another document says the same: the same version attribute, and the same
+     * items. How it is written does not count.
+     *
+     * @param other what to compare with
+     * @return true when it does
+     */
+    @Override
+    public boolean equals(Object other) {
+        if (!(other instanceof ProvisioningDocument)) {
+            return false;
+        }
+        ProvisioningDocument that = (ProvisioningDocument) other;
+        return Objects.equals(version, that.version) && root.equals(that.root);
+    }
+
+    @Override
+    public int hashCode() {
+        return 31 * Objects.hashCode(version) + root.hashCode();
+    }
+
+    /**
+     * Shows the document, without any value.
+     *
+     * @return one line of text
+     */
+    @Override
+    public String toString() {
+        return "ProvisioningDocument{WBXML "
+                + wbxmlVersion()
+                + ", "
+                + body.length
+                + " bytes, children="
+                + root.inside().length
+                + "}";
     }
 }

@@ -18,5 +18,16 @@ public enum Writing {
     ENTITY,
 
     /** As several pieces, or as none, which makes the empty text. */
-    JOINED
+    JOINED;
+
+    private static final Writing[] ALL = values();
+
+    /** A byte for an item, which has no room for more. */
+    static byte code(Writing writing) {
+        return (byte) (writing == null ? -1 : writing.ordinal());
+    }
+
+    static Writing of(byte code) {
+        return code < 0 ? null : ALL[code];
+    }
 }
