@@ -2,9 +2,39 @@ package com.qvomacp.eng.omacp;
 
 import java.util.List;
 
-/** The content type of a push: a media type and its parameters. Immutable. */
+/**
+ * The content type of a push: a media type and its parameters. Immutable.
+ *
+ * <pre>{@code
+ * ContentType type = header.contentType();
+ * System.out.println(type.mediaType() + ", " + type.parameters().size() + " parameters");
+ * }</pre>
+ */
 public final class ContentType {
-    private ContentType() {}
+    private final String mediaType;
+    private final int code;
+    private final int offset;
+    private final int mediaTypeOffset;
+    private final int mediaTypeEnd;
+    private final int end;
+    private final List<HeaderField> parameters;
+
+    ContentType(
+            String mediaType,
+            int code,
+            int offset,
+            int mediaTypeOffset,
+            int mediaTypeEnd,
+            int end,
+            List<HeaderField> parameters) {
+        this.mediaType = mediaType;
+        this.code = code;
+        this.offset = offset;
+        this.mediaTypeOffset = mediaTypeOffset;
+        this.mediaTypeEnd = mediaTypeEnd;
+        this.end = end;
+        this.parameters = parameters;
+    }
 
     /**
      * Tells the media type.
@@ -13,7 +43,7 @@ public final class ContentType {
      *     for a number that stands for none
      */
     public String mediaType() {
-        throw new UnsupportedOperationException();
+        return mediaType;
     }
 
     /**
@@ -22,7 +52,7 @@ public final class ContentType {
      * @return the number, such as 54; -1 when the media type is given as text and has none
      */
     public int code() {
-        throw new UnsupportedOperationException();
+        return code;
     }
 
     /**
@@ -31,6 +61,78 @@ public final class ContentType {
      * @return every parameter, in the order of the message; not modifiable
      */
     public List<HeaderField> parameters() {
-        throw new UnsupportedOperationException();
+        return parameters;
+    }
+
+    /**
+     * Tells where the content type begins, with the length that may stand in front of it.
+     *
+     * @return bytes from the start of what was read, counted from 0
+     */
+    public int offset() {
+        return offset;
+    }
+
+    /**
+     * Tells how long the content type is, with its parameters.
+     *
+     * @return bytes
+     */
+    public int length() {
+        return end - offset;
+    }
+
+    void describe(ByteVisitor visitor) {
+        int depth = 0;
+        if (mediaTypeOffset > offset) {
+            int left = end - mediaTypeOffset;
+            visitor.visit(offset, mediaTypeOffset - offset, 0, "content type of " + left + " bytes");
+            depth = 1;
+        }
+        visitor.visit(
+                mediaTypeOffset, mediaTypeEnd - mediaTypeOffset, depth, "content type: " + mediaType);
+        int at = mediaTypeEnd;
+        for (HeaderField parameter : parameters) {
+            describeGap(visitor, at, parameter.offset());
+            parameter.describe(visitor, 1);
+            at = parameter.offset() + parameter.length();
+        }
+        describeGap(visitor, at, end);
+    }
+
+    private static void describeGap(ByteVisitor visitor, int from, int to) {
+        if (to > from) {
+            visitor.visit(from, to - from, 1, "no parameter");
+        }
+    }
+
+    /**
+     * Compares media types and parameters.
+     *
+     * @param other what to compare with
+     * @return true for a content type that says the same, however it is written
+     */
+    @Override
+    public boolean equals(Object other) {
+        if (!(other instanceof ContentType)) {
+            return false;
+        }
+        ContentType that = (ContentType) other;
+        return mediaType.equals(that.mediaType) && parameters.equals(that.parameters);
+    }
+
+    @Override
+    public int hashCode() {
+        return 31 * mediaType.hashCode() + parameters.hashCode();
+    }
+
+    /**
+     * Shows the media type and how many parameters there are, which may go to a log.
+     *
+     * @return one line of text
+     */
+    @Override
+    public String toString() {
+        return "ContentType{" + Printable.of(mediaType) + ", " + parameters.size() + " parameters}";
     }
 }

@@ -1,25 +1,47 @@
 package com.qvomacp.eng.omacp;
 
-/** A header of a push, or a parameter of its content type. Immutable. */
+/**
+ * A header of a push, or a parameter of its content type. Immutable.
+ *
+ * <pre>{@code
+ * for (HeaderField parameter : header.contentType().parameters()) {
+ *     System.out.println(parameter.name() + " = " + parameter.value());
+ * }
+ * }</pre>
+ */
 public final class HeaderField {
-    private HeaderField() {}
+    private final String name;
+    private final String value;
+    private final int offset;
+    private final int length;
+
+    HeaderField(String name, String value, int offset, int length) {
+        this.name = name;
+        this.value = value;
+        this.offset = offset;
+        this.length = length;
+    }
 
     /**
      * Tells the name.
      *
-     * @return the name, such as {@code charset}; a printable one for a number that stands for none
+     * @return the name, such as {@code charset}, as the standard writes it when it is sent as a
+     *     number, as the message writes it when it is sent as text; a printable one for a number
+     *     that stands for none
      */
     public String name() {
-        throw new UnsupportedOperationException();
+        return name;
     }
 
     /**
-     * Tells the value.
+     * Tells the value: a number in decimal digits or by the name that it stands for, a date in UTC
+     * as ISO 8601 writes it, a text without the quotes of its form, and anything else in hexadecimal
+     * digits.
      *
      * @return the value as text; {@code null} when there is none
      */
     public String value() {
-        throw new UnsupportedOperationException();
+        return value;
     }
 
     /**
@@ -28,7 +50,7 @@ public final class HeaderField {
      * @return bytes from the start of what was read, counted from 0
      */
     public int offset() {
-        throw new UnsupportedOperationException();
+        return offset;
     }
 
     /**
@@ -37,6 +59,41 @@ public final class HeaderField {
      * @return bytes
      */
     public int length() {
-        throw new UnsupportedOperationException();
+        return length;
+    }
+
+    void describe(ByteVisitor visitor, int depth) {
+        visitor.visit(offset, length, depth, value == null ? name : name + ": " + value);
+    }
+
+    /**
+     * Compares name and value.
+     *
+     * @param other what to compare with
+     * @return true for a field that says the same, wherever it stands and however it is written
+     */
+    @Override
+    public boolean equals(Object other) {
+        if (!(other instanceof HeaderField)) {
+            return false;
+        }
+        HeaderField that = (HeaderField) other;
+        return name.equals(that.name)
+                && (value == null ? that.value == null : value.equals(that.value));
+    }
+
+    @Override
+    public int hashCode() {
+        return 31 * name.hashCode() + (value == null ? 0 : value.hashCode());
+    }
+
+    /**
+     * Shows the name, which may go to a log; the value may be a secret.
+     *
+     * @return one line of text
+     */
+    @Override
+    public String toString() {
+        return "HeaderField{" + Printable.of(name) + "}";
     }
 }

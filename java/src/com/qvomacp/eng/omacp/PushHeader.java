@@ -1,10 +1,17 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Arrays;
 import java.util.List;
 
 /**
  * The header of a push, by the Wireless Session Protocol (WAP-230): content type, security method,
  * MAC, and whatever else the sender has put there. Immutable.
+ *
+ * <p>There is no header without the type of a push, a header length that the data has, and a media
+ * type. Of anything else what is there is read: a length inside the header that runs beyond it ends
+ * with it, as does a text without its NUL; a parameter that begins inside the content type is read to
+ * its own end; an octet that can begin nothing is passed over. SEC and MAC are found as parameters and
+ * as headers, by number or by name in any case; the first one counts.
  *
  * <pre>{@code
  * PushHeader header = PushHeader.parse(push);
@@ -12,7 +19,41 @@ import java.util.List;
  * }</pre>
  */
 public final class PushHeader {
-    private PushHeader() {}
+    static final int NO_TRANSACTION = -1;
+
+    private static final int FIRST_TEXT = 0x20;
+    private static final int SHIFT = 0x7F;
+
+    private final int transactionIdentifier;
+
+    /** Where the content type begins. */
+    private final int from;
+
+    private final byte[] bytes;
+    private final ContentType contentType;
+    private final List<HeaderField> fields;
+    private final SecurityMethod securityMethod;
+    private final String mac;
+    private final int macOffset;
+
+    PushHeader(
+            int transactionIdentifier,
+            int from,
+            byte[] bytes,
+            ContentType contentType,
+            List<HeaderField> fields,
+            SecurityMethod securityMethod,
+            String mac,
+            int macOffset) {
+        this.transactionIdentifier = transactionIdentifier;
+        this.from = from;
+        this.bytes = bytes;
+        this.contentType = contentType;
+        this.fields = fields;
+        this.securityMethod = securityMethod;
+        this.mac = mac;
+        this.macOffset = macOffset;
+    }
 
     /**
      * Reads the header of a push, whatever follows it.
@@ -22,7 +63,7 @@ public final class PushHeader {
      * @throws ProvisioningException when the bytes do not begin with the header of a push
      */
     public static PushHeader parse(byte[] push) throws ProvisioningException {
-        throw new UnsupportedOperationException();
+        return HeaderReader.readPush(push);
     }
 
     /**
@@ -33,7 +74,7 @@ public final class PushHeader {
      * @throws ProvisioningException when the bytes are no headers of a push
      */
     public static PushHeader parseHeaders(byte[] headers) throws ProvisioningException {
-        throw new UnsupportedOperationException();
+        return HeaderReader.readHeaders(headers);
     }
 
     /**
@@ -42,7 +83,7 @@ public final class PushHeader {
      * @return 0 to 255; -1 when the headers were read alone
      */
     public int transactionIdentifier() {
-        throw new UnsupportedOperationException();
+        return transactionIdentifier;
     }
 
     /**
@@ -51,7 +92,7 @@ public final class PushHeader {
      * @return bytes from the start of what was read to the body
      */
     public int length() {
-        throw new UnsupportedOperationException();
+        return bytes.length;
     }
 
     /**
@@ -60,7 +101,7 @@ public final class PushHeader {
      * @return the content type, never {@code null}
      */
     public ContentType contentType() {
-        throw new UnsupportedOperationException();
+        return contentType;
     }
 
     /**
@@ -70,7 +111,7 @@ public final class PushHeader {
      *     SecurityMethod#UNKNOWN} for a SEC that states none of them; never {@code null}
      */
     public SecurityMethod securityMethod() {
-        throw new UnsupportedOperationException();
+        return securityMethod;
     }
 
     /**
@@ -80,7 +121,17 @@ public final class PushHeader {
      *     carries none
      */
     public String mac() {
-        throw new UnsupportedOperationException();
+        return mac;
+    }
+
+    /**
+     * Tells where the MAC stands.
+     *
+     * @return bytes from the start of what was read to the parameter, counted from 0; -1 when the
+     *     message carries none
+     */
+    public int macOffset() {
+        return macOffset;
     }
 
     /**
@@ -89,6 +140,82 @@ public final class PushHeader {
      * @return every header, in the order of the message; not modifiable
      */
     public List<HeaderField> fields() {
-        throw new UnsupportedOperationException();
+        return fields;
+    }
+
+    /**
+     * Tells what every byte of the header means. Nothing is kept: the visitor hears each as it is
+     * worked out.
+     *
+     * @param visitor hears all bytes in their order; a meaning may hold any character that the
+     *     message holds, the MAC among them
+     */
+    public void describe(ByteVisitor visitor) {
+        if (transactionIdentifier != NO_TRANSACTION) {
+            visitor.visit(0, 1, 0, "transaction identifier " + transactionIdentifier);
+            visitor.visit(1, 1, 0, "push");
+            visitor.visit(2, from - 2, 0, "header length " + (bytes.length - from));
+        }
+        contentType.describe(visitor);
+        int at = contentType.offset() + contentType.length();
+        for (HeaderField field : fields) {
+            describeShifts(visitor, at, field.offset());
+            field.describe(visitor, 0);
+            at = field.offset() + field.length();
+        }
+        describeShifts(visitor, at, bytes.length);
+    }
+
+    /** Between the headers stand changes of the code page, and what begins no header. */
+    private void describeShifts(ByteVisitor visitor, int from, int to) {
+        int at = from;
+        while (at < to) {
+            int octet = bytes[at] & 0xFF;
+            if (octet == SHIFT && at + 1 < to) {
+                visitor.visit(at, 2, 0, "headers of code page " + (bytes[at + 1] & 0xFF));
+                at += 2;
+            } else {
+                boolean isShift = octet > 0 && octet < FIRST_TEXT;
+                visitor.visit(at, 1, 0, isShift ? "headers of code page " + octet : "no header");
+                at += 1;
+            }
+        }
+    }
+
+    /**
+     * Compares all that the headers say.
+     *
+     * @param other what to compare with
+     * @return true for a header that says the same, however it is written
+     */
+    @Override
+    public boolean equals(Object other) {
+        if (!(other instanceof PushHeader)) {
+            return false;
+        }
+        PushHeader that = (PushHeader) other;
+        return transactionIdentifier == that.transactionIdentifier
+                && contentType.equals(that.contentType)
+                && fields.equals(that.fields);
+    }
+
+    @Override
+    public int hashCode() {
+        return Arrays.hashCode(new Object[] {transactionIdentifier, contentType, fields});
+    }
+
+    /**
+     * Shows the media type, the security method and whether there is a MAC, which may go to a log.
+     *
+     * @return one line of text
+     */
+    @Override
+    public String toString() {
+        return "PushHeader{"
+                + Printable.of(contentType.mediaType())
+                + ", "
+                + securityMethod
+                + (mac == null ? ", no MAC" : ", a MAC")
+                + "}";
     }
 }
