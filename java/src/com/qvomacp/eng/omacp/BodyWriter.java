@@ -54,20 +54,20 @@ final class BodyWriter implements DocumentSource.Steps {
 
     private int page;
 
-    private BodyWriter(WritingTokens tokens, int charset) {
+    private BodyWriter(WritingTokens tokens, CharacterSet charset) {
         this.tokens = tokens;
-        this.encoder = CharacterSet.charset(charset).newEncoder();
-        this.terminatorLength = CharacterSet.terminatorLength(charset);
+        this.encoder = charset.newEncoder();
+        this.terminatorLength = charset.unit();
     }
 
     static byte[] write(DocumentSource source, EncodeOptions options) throws EncodingException {
         String name = options.value(EncodeOption.CHARSET);
-        int charset = CharacterSet.mibEnum(name);
-        if (charset == 0) {
+        int charset = CharacterSet.number(name);
+        if (charset == CharacterSet.NOT_STATED) {
             throw EncodingException.in(null, "the character set " + name + " is not known");
         }
-        WritingTokens tokens = WritingTokens.named(options.value(EncodeOption.TOKENS));
-        return new BodyWriter(tokens, charset).body(source, options, charset);
+        WritingTokens tokens = new WritingTokens(options.value(EncodeOption.TOKENS));
+        return new BodyWriter(tokens, CharacterSet.of(charset)).body(source, options, charset);
     }
 
     private byte[] body(DocumentSource source, EncodeOptions options, int charset)
@@ -135,7 +135,7 @@ final class BodyWriter implements DocumentSource.Steps {
     public void parameter(String name, String value) throws EncodingException {
         String type = open.isEmpty() ? null : open.get(open.size() - 1);
         out.write(PARM);
-        start(tokens.name(type, name, page), NAME, name);
+        start(tokens.name(name, page), NAME, name);
         if (value != null) {
             out.write(VALUE);
             String rest = tokens.writeValue(type, name, value, page, out);
