@@ -1,21 +1,14 @@
 package com.qvomacp.eng.omacp;
 
-/**
- * Hears what the bytes of a message mean, in their order: each byte once, without a gap.
- *
- * <pre>{@code
- * header.describe(
- *         (offset, length, depth, meaning) -> System.out.println(offset + ": " + meaning));
- * }</pre>
- */
+/** Is told what each byte of a message means, in order, without a gap and without an overlap. */
 public interface ByteVisitor {
     /**
-     * Hears what some bytes mean.
+     * Some bytes that mean something together.
      *
-     * @param offset bytes from the start of what was read, counted from 0
-     * @param length how many bytes they are, at least 1
-     * @param depth how deep they are nested, 0 for what stands outermost
-     * @param meaning what they mean, for people
+     * @param offset where they begin: bytes from the start of what is told, counted from 0
+     * @param length how many they are, at least 1
+     * @param depth how many elements they stand in
+     * @param meaning what they mean, in one line
      */
     void visit(int offset, int length, int depth, String meaning);
 }

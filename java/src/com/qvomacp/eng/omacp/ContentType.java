@@ -85,8 +85,7 @@ public final class ContentType {
     void describe(ByteVisitor visitor) {
         int depth = 0;
         if (mediaTypeOffset > offset) {
-            int left = end - mediaTypeOffset;
-            visitor.visit(offset, mediaTypeOffset - offset, 0, "content type of " + left + " bytes");
+            visitor.visit(offset, mediaTypeOffset - offset, 0, "length of the content type");
             depth = 1;
         }
         visitor.visit(

@@ -49,6 +49,9 @@ final class HeaderReader {
     /** Where the text begins that was read last. */
     private int textAt;
 
+    /** Whether the length of a value that was read last was more than was left. */
+    private boolean isCutOff;
+
     private final List<HeaderField> parameters = new ArrayList<>(4);
     private final List<HeaderField> fields = new ArrayList<>(0);
     private String sec;
@@ -73,7 +76,7 @@ final class HeaderReader {
             throw none(start.at(), "the second byte is " + hexadecimal(type) + ", and 06 in a push");
         }
         start.skip(1);
-        long length = uintvar(start);
+        long length = start.integer();
         if (length < 0) {
             throw none(2, "the header length is cut off or too large");
         }
@@ -367,7 +370,7 @@ final class HeaderReader {
         return kind == Kind.CHARSET && number == 0 ? "*" : number(number, kind);
     }
 
-    /** Octets behind their length: a number, or what they are in hexadecimal. */
+    /** Octets behind their length: a number when they are all there, or hexadecimal digits. */
     private String data(Kind kind, boolean mayBeNumber) {
         boolean isLong = cursor.peek() < LENGTH_QUOTE;
         int length = valueLength();
@@ -380,7 +383,7 @@ final class HeaderReader {
             }
             number = number << 8 | bytes[at] & 0xFF;
         }
-        return isLong && mayBeNumber ? number(number, kind) : hexadecimal(from, length);
+        return isLong && mayBeNumber && !isCutOff ? number(number, kind) : hexadecimal(from, length);
     }
 
     private static String number(long number, Kind kind) {
@@ -430,7 +433,7 @@ final class HeaderReader {
 
     /** A quality: hundredths and one more up to 100, thousandths and a hundred more beyond. */
     private String quality() {
-        long number = uintvar(cursor);
+        long number = cursor.integer();
         if (number < 1 || number > 1099) {
             return number < 0 ? null : Long.toString(number);
         }
@@ -471,25 +474,12 @@ final class HeaderReader {
 
     /** The length of a value, which the header bounds. */
     private int valueLength() {
-        long length = cursor.peek() == LENGTH_QUOTE ? quotedLength() : cursor.take();
-        return length >= 0 && length < cursor.left() ? (int) length : cursor.left();
-    }
-
-    private long quotedLength() {
-        cursor.skip(1);
-        return uintvar(cursor);
-    }
-
-    /** Seven bits an octet; -1 for a number that is cut off or has more than 31 bits. */
-    private static long uintvar(Cursor cursor) {
-        long number = 0;
-        int octet;
-        do {
-            octet = cursor.take();
-            boolean isBad = octet < 0 || number < 0 || number >> 24 != 0;
-            number = isBad ? -1 : number << 7 | octet & 0x7F;
-        } while (octet >= FIRST_SHORT);
-        return number;
+        long length = cursor.take();
+        if (length == LENGTH_QUOTE) {
+            length = cursor.integer();
+        }
+        isCutOff = length < 0 || length > cursor.left();
+        return isCutOff ? cursor.left() : (int) length;
     }
 
     private String hexadecimal(int from, int length) {

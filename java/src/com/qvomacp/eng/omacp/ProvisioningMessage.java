@@ -73,4 +73,33 @@ public final class ProvisioningMessage {
     public Verdict verdict() {
         throw new UnsupportedOperationException();
     }
+
+    /**
+     * Checks the MAC by whichever security method the message states: {@link ProvisioningMac#verify}.
+     *
+     * @param pin what the user has been told; may be {@code null} for NETWPIN
+     * @param imsi the subscriber's number, 1 to 15 digits; may be {@code null} unless the method has
+     *     NETWPIN in its name
+     * @return what comes of it, never {@code null}; {@link MacResult#NO_METHOD} for a body alone
+     */
+    public MacResult verifyMac(String pin, String imsi) {
+        return header == null
+                ? MacResult.NO_METHOD
+                : ProvisioningMac.verify(
+                        header.securityMethod(), header.mac(), document.body(), pin, imsi);
+    }
+
+    /**
+     * Checks the MAC with a key that the caller has made, for a network whose subscribers have no
+     * IMSI.
+     *
+     * @param key the bytes of the key
+     * @return what comes of it, never {@code null}; {@link MacResult#NO_METHOD} for a body alone
+     */
+    public MacResult verifyMac(byte[] key) {
+        return header == null
+                ? MacResult.NO_METHOD
+                : ProvisioningMac.verify(
+                        header.securityMethod(), header.mac(), document.body(), key);
+    }
 }
