@@ -5,17 +5,15 @@ import java.nio.ByteBuffer;
 import java.nio.CharBuffer;
 import java.nio.charset.CharacterCodingException;
 import java.nio.charset.CharsetEncoder;
-import java.util.ArrayList;
 import java.util.HashMap;
 import java.util.LinkedHashMap;
-import java.util.List;
 import java.util.Map;
 
 /**
  * Writes a document as a body: the Binary XML Content Format (WAP-192-WBXML), version 1.3, with the
  * tokens of OMA provisioning content (OMA-WAP-TS-ProvCont).
  */
-final class BodyWriter implements DocumentSource.Steps {
+final class BodyWriter extends DocumentSource.Steps {
     private static final int SWITCH_PAGE = 0x00;
     private static final int END = 0x01;
     private static final int STR_I = 0x03;
@@ -48,9 +46,6 @@ final class BodyWriter implements DocumentSource.Steps {
     private final WritingTokens tokens;
     private final CharsetEncoder encoder;
     private final int terminatorLength;
-
-    /** The types of the characteristics that are open. */
-    private final List<String> open = new ArrayList<>();
 
     private int page;
 
@@ -124,21 +119,19 @@ final class BodyWriter implements DocumentSource.Steps {
 
     /** One without children is written as one with content, too. */
     @Override
-    public void characteristic(String type) throws EncodingException {
-        open.add(type);
+    void characteristic(String type) throws EncodingException {
         out.write(CHARACTERISTIC);
         start(tokens.type(type, page), TYPE, type);
         out.write(END);
     }
 
     @Override
-    public void parameter(String name, String value) throws EncodingException {
-        String type = open.isEmpty() ? null : open.get(open.size() - 1);
+    void parameter(String name, String value) throws EncodingException {
         out.write(PARM);
         start(tokens.name(name, page), NAME, name);
         if (value != null) {
             out.write(VALUE);
-            String rest = tokens.writeValue(type, name, value, page, out);
+            String rest = tokens.writeValue(innermost(), name, value, page, out);
             if (rest != null) {
                 text(rest);
             }
@@ -147,8 +140,7 @@ final class BodyWriter implements DocumentSource.Steps {
     }
 
     @Override
-    public void end() {
-        open.remove(open.size() - 1);
+    void end() {
         out.write(END);
     }
 
@@ -199,15 +191,6 @@ final class BodyWriter implements DocumentSource.Steps {
         for (int i = 0; i < terminatorLength; ++i) {
             to.write(0);
         }
-    }
-
-    /** The elements that are open, of more than eight the innermost. */
-    private String path() {
-        StringBuilder path = new StringBuilder("wap-provisioningdoc");
-        for (String type : open.subList(Math.max(0, open.size() - 7), open.size())) {
-            path.append(" / ").append(type);
-        }
-        return path.toString();
     }
 
     /** Writes a multi-byte integer. */

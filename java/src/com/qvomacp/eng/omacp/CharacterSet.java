@@ -126,8 +126,11 @@ final class CharacterSet {
         return NOT_STATED;
     }
 
-    /** What encodes texts. */
+    /** What encodes texts, without a byte order mark in each. */
     CharsetEncoder newEncoder() {
+        if (unit > 1 && charset != StandardCharsets.UTF_16LE) {
+            return StandardCharsets.UTF_16BE.newEncoder();
+        }
         return (charset == null ? StandardCharsets.UTF_8 : charset).newEncoder();
     }
 

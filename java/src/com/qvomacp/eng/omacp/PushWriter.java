@@ -2,6 +2,7 @@ package com.qvomacp.eng.omacp;
 
 import java.io.ByteArrayOutputStream;
 import java.nio.charset.StandardCharsets;
+import java.util.Locale;
 
 /** Puts the header of a push (WAP-230-WSP) in front of a body, with SEC and MAC. */
 final class PushWriter {
@@ -47,6 +48,73 @@ final class PushWriter {
         push.write(headers.toByteArray(), 0, headers.size());
         push.write(body, 0, body.length);
         return push.toByteArray();
+    }
+
+    /** SEC and MAC, as parameters of the content type. */
+    private static void security(byte[] body, EncodeOptions options, ByteArrayOutputStream out)
+            throws EncodingException {
+        SecurityMethod method = method(options);
+        if (method == SecurityMethod.NONE) {
+            return;
+        }
+        parameter(SEC, "SEC", options, out);
+        out.write(SHORT_INTEGER | method.ordinal() - SecurityMethod.NETWPIN.ordinal());
+        // The user is told that of USERPINMAC, apart from the message.
+        if (method != SecurityMethod.USERPINMAC) {
+            parameter(MAC, "MAC", options, out);
+            text(mac(method, body, options), out);
+        }
+    }
+
+    private static void parameter(
+            int token, String name, EncodeOptions options, ByteArrayOutputStream out) {
+        if (options.is(EncodeOption.PARAMETERS, "text")) {
+            text(name, out);
+        } else {
+            out.write(token);
+        }
+    }
+
+    /** The security method that the options ask for. */
+    static SecurityMethod method(EncodeOptions options) {
+        String name = options.value(EncodeOption.SEC);
+        return name == null
+                ? SecurityMethod.NONE
+                : SecurityMethod.valueOf(name.toUpperCase(Locale.ROOT));
+    }
+
+    private static String mac(SecurityMethod method, byte[] body, EncodeOptions options)
+            throws EncodingException {
+        if (options.value(EncodeOption.KEY) != null) {
+            byte[] key = hexadecimal(EncodeOption.KEY, options);
+            if (key.length == 0) {
+                throw EncodingException.in(null, "the key is empty");
+            }
+            return ProvisioningMac.compute(key, body);
+        }
+        String pin = options.value(EncodeOption.PIN);
+        String imsi = options.value(EncodeOption.IMSI);
+        String mac = ProvisioningMac.compute(method, body, pin, imsi);
+        if (mac == null) {
+            throw EncodingException.in(
+                    null,
+                    options.value(EncodeOption.SEC) + " needs " + needs(method),
+                    EncodeOption.PIN.optionName(),
+                    EncodeOption.IMSI.optionName(),
+                    EncodeOption.KEY.optionName());
+        }
+        return mac;
+    }
+
+    private static String needs(SecurityMethod method) {
+        switch (method) {
+            case NETWPIN:
+                return "an IMSI of 1 to 15 digits";
+            case USERPIN:
+                return "a PIN";
+            default:
+                return "a PIN and an IMSI of 1 to 15 digits";
+        }
     }
 
     private static void text(String text, ByteArrayOutputStream out) {

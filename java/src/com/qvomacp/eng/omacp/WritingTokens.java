@@ -80,7 +80,7 @@ final class WritingTokens {
     /**
      * Writes the tokens of a value.
      *
-     * @param type of the characteristic in which the parameter stands; null for none
+     * @param type of the characteristic in which the parameter stands
      * @return what has to follow as text; null for nothing
      */
     String writeValue(String type, String name, String value, int page, ByteArrayOutputStream out) {
@@ -89,7 +89,7 @@ final class WritingTokens {
             return value;
         }
         String rest = value;
-        if (name.equals(JOINED) && (!library || type != null && type.equals(JOINING))) {
+        if (name.equals(JOINED) && (!library || type.equals(JOINING))) {
             ByteArrayOutputStream first = new ByteArrayOutputStream();
             int comma = rest.indexOf(',');
             while (comma >= 0 && writePiece(row, page, rest.substring(0, comma), first)) {

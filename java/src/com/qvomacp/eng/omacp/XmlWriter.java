@@ -4,13 +4,14 @@ import java.util.Locale;
 import java.util.Map;
 
 /** Writes a document as XML. */
-final class XmlWriter implements DocumentSource.Steps {
+final class XmlWriter extends DocumentSource.Steps {
     private static final String DOCUMENT_TYPE =
             "<!DOCTYPE wap-provisioningdoc PUBLIC \"-//WAPFORUM//DTD PROV 1.0//EN\""
                     + " \"http://www.wapforum.org/DTD/prov.dtd\">\n";
 
+    private static final int DEEPEST_SHOWN = 20;
+
     private final StringBuilder out = new StringBuilder();
-    private int depth = 1;
 
     private XmlWriter() {}
 
@@ -42,17 +43,16 @@ final class XmlWriter implements DocumentSource.Steps {
     }
 
     @Override
-    public void characteristic(String type) throws EncodingException {
-        indent();
+    void characteristic(String type) throws EncodingException {
+        indent(depth() - 1);
         out.append("<characteristic");
         attribute("type", type);
         out.append(">\n");
-        ++depth;
     }
 
     @Override
-    public void parameter(String name, String value) throws EncodingException {
-        indent();
+    void parameter(String name, String value) throws EncodingException {
+        indent(depth());
         out.append("<parm");
         attribute("name", name);
         if (value != null) {
@@ -62,15 +62,14 @@ final class XmlWriter implements DocumentSource.Steps {
     }
 
     @Override
-    public void end() {
-        --depth;
-        indent();
+    void end() {
+        indent(depth() - 1);
         out.append("</characteristic>\n");
     }
 
     /** Deeper nesting is not shown by more blanks, which would grow with its square. */
-    private void indent() {
-        for (int i = Math.min(depth, 20); i > 0; --i) {
+    private void indent(int depth) {
+        for (int i = Math.min(depth, DEEPEST_SHOWN); i >= 0; --i) {
             out.append("  ");
         }
     }
@@ -80,27 +79,31 @@ final class XmlWriter implements DocumentSource.Steps {
         for (int i = 0; i < value.length(); ) {
             int c = value.codePointAt(i);
             i += Character.charCount(c);
-            character(c, value);
+            if (!isXmlCharacter(c)) {
+                throw EncodingException.in(
+                        path(), String.format(Locale.ROOT, "XML has no character U+%04X", c));
+            }
+            character(c);
         }
         out.append('"');
     }
 
-    private void character(int c, String value) throws EncodingException {
+    private void character(int c) {
         switch (c) {
             case '<':
                 out.append("&lt;");
-                return;
+                break;
             case '&':
                 out.append("&amp;");
-                return;
+                break;
             case '"':
                 out.append("&quot;");
-                return;
+                break;
             case '\t':
             case '\n':
             case '\r':
                 out.append("&#").append(c).append(';');
-                return;
+                break;
             default:
                 out.appendCodePoint(c);
         }
@@ -114,21 +117,5 @@ final class XmlWriter implements DocumentSource.Steps {
                 || c >= 0x20 && c < Character.MIN_SURROGATE
                 || c > Character.MAX_SURROGATE && c <= 0xFFFD
                 || c >= Character.MIN_SUPPLEMENTARY_CODE_POINT && c <= Character.MAX_CODE_POINT;
-    }
-
-    /** The first character of a text that XML does not have; -1 when there is none. */
-    static int unwritable(String text) {
-        for (int i = 0; i < text.length(); ) {
-            int c = text.codePointAt(i);
-            if (!isXmlCharacter(c)) {
-                return c;
-            }
-            i += Character.charCount(c);
-        }
-        return -1;
-    }
-
-    static String named(int c) {
-        return String.format(Locale.ROOT, "U+%04X", c);
     }
 }
