@@ -1,6 +1,7 @@
 package com.qvomacp.eng.omacp;
 
 import java.nio.charset.Charset;
+import java.nio.charset.CharsetEncoder;
 import java.nio.charset.IllegalCharsetNameException;
 import java.nio.charset.StandardCharsets;
 import java.nio.charset.UnsupportedCharsetException;
@@ -110,6 +111,27 @@ final class CharacterSet {
         } catch (IllegalCharsetNameException | UnsupportedCharsetException e) {
             return StandardCharsets.ISO_8859_1;
         }
+    }
+
+    /** The number of a name, in any case, or {@link #NOT_STATED} for one that is not known. */
+    static int number(String name) {
+        if (name.equalsIgnoreCase(UTF_8.name)) {
+            return UTF_8_NUMBER;
+        }
+        for (Object[] row : ROWS) {
+            if (name.equalsIgnoreCase((String) row[1])) {
+                return (Integer) row[0];
+            }
+        }
+        return NOT_STATED;
+    }
+
+    /** What encodes texts, without a byte order mark in each. */
+    CharsetEncoder newEncoder() {
+        if (unit > 1 && charset != StandardCharsets.UTF_16LE) {
+            return StandardCharsets.UTF_16BE.newEncoder();
+        }
+        return (charset == null ? StandardCharsets.UTF_8 : charset).newEncoder();
     }
 
     long number() {

@@ -322,4 +322,15 @@ final class CodePage {
     String value(int token) {
         return values[token - FIRST_VALUE];
     }
+
+    /** The token that begins an attribute with a value, or -1 when there is none. */
+    int token(Attribute attribute, String value) {
+        for (int token = 0; token < starts.length; ++token) {
+            Start start = starts[token];
+            if (start != null && start.attribute == attribute && value.equals(start.value)) {
+                return token;
+            }
+        }
+        return -1;
+    }
 }

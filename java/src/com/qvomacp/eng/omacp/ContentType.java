@@ -82,6 +82,11 @@ public final class ContentType {
         return end - offset;
     }
 
+    /** Where the media type begins: bytes from the start of what was read. */
+    int mediaTypeOffset() {
+        return mediaTypeOffset;
+    }
+
     void describe(ByteVisitor visitor) {
         int depth = 0;
         if (mediaTypeOffset > offset) {

@@ -187,6 +187,11 @@ public final class PushHeader {
         }
     }
 
+    /** A byte of what was read, 0 to 255. */
+    int byteAt(int offset) {
+        return bytes[offset] & 0xFF;
+    }
+
     /**
      * Compares all that the headers say.
      *
