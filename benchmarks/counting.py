@@ -12,12 +12,15 @@ BENCH = ROOT / "benchmarks"
 BUILD = ROOT / "build" / "bench"
 SOURCES = ROOT / "jni" / "src" / "ClientProv"
 
-# The documents, and how often each is parsed in the two runs whose difference counts. What only the
-# first rounds cost is in both.
+# The eight documents, and how often each is parsed in the two runs whose difference counts. What
+# only the first rounds cost is in both.
 ROUNDS = {
     "160": (50, 250), "300": (50, 250), "547": (50, 250), "2k": (20, 120), "8k": (10, 40),
     "29k": (4, 14), "200k": (2, 8), "1m": (2, 6),
 }
+
+# How often a sample is.
+SAMPLE_ROUNDS = 20, 120
 
 # A repeated string instruction counts once for each byte that it moves, which says nothing of what
 # it takes: memcpy and memset are told to do without, in the library and in the floor.
@@ -53,15 +56,23 @@ def made(paths, sources, command):
         subprocess.run([str(word) for word in command], check=True, stdout=subprocess.DEVNULL)
 
 
+def documents():
+    """Every document and how often it is parsed: the eight, then the samples."""
+    samples = sorted(path.stem for path in BUILD.glob("*.push") if path.stem not in ROUNDS)
+    return {**ROUNDS, **{name: SAMPLE_ROUNDS for name in samples}}
+
+
 def prepare():
     """Makes the documents and the steps of their floors."""
     BUILD.mkdir(parents=True, exist_ok=True)
     model = sorted((ROOT / "tests" / "model").glob("*.py"))
     encoder = ROOT / "tools" / "encode-sample"
-    documents = [BUILD / f"{name}.push" for name in ROUNDS]
-    made(documents, [BENCH / "documents", encoder], [BENCH / "documents"])
-    blocks = [BUILD / f"{name}.blocks" for name in ROUNDS]
-    made(blocks, [BENCH / "blocks", *model, *documents], [BENCH / "blocks"])
+    samples = sorted((ROOT / "samples").glob("*.xml"))
+    eight = [BUILD / f"{name}.push" for name in ROUNDS]
+    made(eight, [BENCH / "documents", encoder, *samples], [BENCH / "documents"])
+    messages = sorted(BUILD.glob("*.push"))
+    blocks = [path.with_suffix(".blocks") for path in messages]
+    made(blocks, [BENCH / "blocks", *model, *messages], [BENCH / "blocks"])
 
 
 def program(bits):

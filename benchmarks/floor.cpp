@@ -120,13 +120,8 @@ void Floor::add(const std::string &what, const std::string &argument)
             m_steps.push_back({Kind::Free, 0, 0, number});
             return;
         }
-        if (what == "buffer") {
-            // One that was made for the body has grown when the body had been appended to it.
-            const uint32_t grown = number + std::max(number + 256, 512U) + 1;
-            m_steps.push_back({Kind::Buffer, grown, number, 0});
-            m_lengths.push_back(0);
-        } else if (what == "table") {
-            m_steps.push_back({Kind::Buffer, number + 2, number, 0});
+        if (what == "table") {
+            m_steps.push_back({Kind::Table, number + 2, number, 0});
             m_lengths.push_back(0);
         } else if (what == "text") {
             m_steps.push_back({Kind::Text, number + 1, number + 1, 0});
@@ -150,7 +145,7 @@ void Floor::replay()
         case Kind::Record:
             *made++ = cleared(step.size);
             break;
-        case Kind::Buffer:
+        case Kind::Table:
             *made = cleared(step.size);
             memcpy(*made++, document, step.copied);
             break;

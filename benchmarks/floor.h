@@ -24,7 +24,7 @@ public:
     size_t blocks() const { return m_blocks.size(); }
 
 private:
-    enum class Kind : uint8_t { Record, Buffer, Text, Copy, Free };
+    enum class Kind : uint8_t { Record, Table, Text, Copy, Free };
 
     struct Step {
         Kind kind;

@@ -1,5 +1,6 @@
 // load LIBRARY: what it takes to load a library, and to register its natives with a virtual machine
-// that costs nothing; the fastest of many turns.
+// that costs nothing; the fastest of many turns, each with a copy of its own, since a library that
+// was loaded stays mapped.
 #include "quietvm.h"
 
 #include <dlfcn.h>
@@ -8,10 +9,12 @@
 #include <chrono>
 #include <cstdio>
 #include <cstdlib>
+#include <filesystem>
+#include <string>
 
 namespace {
 
-constexpr int kTurns = 2000;
+constexpr int kTurns = 300;
 
 using Clock = std::chrono::steady_clock;
 
@@ -36,25 +39,28 @@ int main(int argc, char **argv)
         fputs("usage: load LIBRARY\n", stderr);
         return 2;
     }
-    double opening = 1e9, registering = 1e9;
+    double fastestOpening = 1e9, fastestRegistering = 1e9;
     for (int i = 0; i < kTurns; i++) {
+        const std::string copy = argv[1] + ("." + std::to_string(i));
+        std::filesystem::copy_file(argv[1], copy);
         const auto start = Clock::now();
-        void *library = dlopen(argv[1], RTLD_NOW);
+        void *library = dlopen(copy.c_str(), RTLD_NOW);
         loaded =
             library ? reinterpret_cast<decltype(loaded)>(dlsym(library, "JNI_OnLoad")) : nullptr;
+        const auto opened = Clock::now();
+        std::filesystem::remove(copy);
         if (!loaded) {
             fprintf(stderr, "load: %s\n", dlerror());
             return 1;
         }
-        const auto opened = Clock::now();
+        const auto registering = Clock::now();
         {
             quietvm::Vm vm;
         }
         const auto registered = Clock::now();
-        dlclose(library);
-        opening = std::min(opening, microseconds(opened - start));
-        registering = std::min(registering, microseconds(registered - opened));
+        fastestOpening = std::min(fastestOpening, microseconds(opened - start));
+        fastestRegistering = std::min(fastestRegistering, microseconds(registered - registering));
     }
-    printf("loaded in %.1f us, JNI_OnLoad in %.1f us\n", opening, registering);
+    printf("loaded in %.1f us, JNI_OnLoad in %.1f us\n", fastestOpening, fastestRegistering);
     return 0;
 }

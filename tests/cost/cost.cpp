@@ -6,9 +6,9 @@
 // its family says. Under a tool that counts instructions, those of the function `session` are the
 // cost.
 #include "families.h"
-#include "heap.h"
 
 #include "qvsClientProvWbxmlDecoder.h"
+#include "support/heap.h"
 #include "support/quietvm.h"
 
 #include <sys/resource.h>
@@ -58,7 +58,7 @@ extern "C" __attribute__((noinline)) void session(quietvm::Vm *vm, const quietvm
                                                   Outcome *outcome)
 {
     outcome->parsed = vm->parse(*message);
-    outcome->blocks = cost::blocksInUse();
+    outcome->blocks = blocks::live();
     vm->query(1, 1);
     vm->query(1, INT_MAX);
     vm->query(INT_MAX, 1);
@@ -92,15 +92,13 @@ bool measure(const cost::Family &family, size_t size)
     const cost::Bytes bytes = cost::messageOf(family, size);
     const quietvm::Message message{bytes.data(), bytes.size()};
     Outcome outcome{};
-    if (countHeap) {
-        cost::startHeap();
-    }
+    blocks::counting = countHeap;
     const Clock::time_point start = Clock::now();
     session(&vm, &message, &outcome);
     const long time = static_cast<long>(
         std::chrono::duration_cast<std::chrono::microseconds>(Clock::now() - start).count());
     printf("%d %s %zu %zu %zu %zu %ld\n", static_cast<int>(getpid()), family.name.c_str(), size,
-           bytes.size(), cost::peakHeap(), cost::heapInUse(), time);
+           bytes.size(), blocks::peakBytesTaken(), blocks::liveBytesTaken(), time);
     return !countHeap || isAsExpected(family, size, bytes, outcome);
 }
 

@@ -1,8 +1,8 @@
 // The body of a message through the decoder's main function.
 #include "check.h"
 #include "context.h"
-#include "heap.h"
 #include "reading.h"
+#include "support/heap.h"
 #include "target.h"
 
 #include "qvsClientProvWbxmlDecoder.h"
@@ -37,9 +37,9 @@ void decode(const Input &input, const BodyReading &expected)
           "a decoder is made for any bytes");
     decodeWith(decoder, input, expected);
     (void)qvsClientProvWbxmlDeleteDecoder(decoder);
-    check(heap::live() == expected.kept, "a decode leaves no block but the kept ones", heap::live(),
-          " blocks instead of ", expected.kept);
-    heap::releaseAll();
+    check(blocks::live() == expected.kept, "a decode leaves no block but the kept ones",
+          blocks::live(), " blocks instead of ", expected.kept);
+    blocks::releaseAll();
 
     qvsWbxmlDecoder host = {};
     (void)smlBufferCreate(&host.ptBuffer, input.size());
@@ -47,9 +47,9 @@ void decode(const Input &input, const BodyReading &expected)
     decodeWith(&host, input, expected);
     qvsMemFree_debug(host.pStringTable);
     (void)smlBufferDelete(host.ptBuffer);
-    check(heap::live() == expected.kept, "a decode by a host's decoder leaves no block but these",
-          heap::live(), " blocks instead of ", expected.kept);
-    heap::releaseAll();
+    check(blocks::live() == expected.kept, "a decode by a host's decoder leaves no block but these",
+          blocks::live(), " blocks instead of ", expected.kept);
+    blocks::releaseAll();
 }
 
 // Makes the context of the body, overwrites the body, and lets the context go again. Returns what
@@ -62,21 +62,21 @@ std::string makeContext(const Input &input, const BodyReading &expected)
     check((context != nullptr) == expected.context, "the body is accepted as the format says",
           context ? "accepted" : "refused");
     if (!context) {
-        check(heap::live() == expected.kept, "a refused body leaves no block but the kept ones",
-              heap::live(), " blocks instead of ", expected.kept);
-        heap::releaseAll();
+        check(blocks::live() == expected.kept, "a refused body leaves no block but the kept ones",
+              blocks::live(), " blocks instead of ", expected.kept);
+        blocks::releaseAll();
         return "";
     }
     copy.overwrite();
     const ContextView view = viewOf(context);
     const size_t blocks = view.blocks + view.abandoned + expected.kept;
-    check(heap::live() == blocks, "a context is all that a body leaves", heap::live(),
+    check(blocks::live() == blocks, "a context is all that a body leaves", blocks::live(),
           " blocks instead of ", blocks);
     qvsClientProvCtxDelectContext(context);
-    check(heap::live() == view.kept + expected.kept,
-          "a released context leaves no block but the kept ones", heap::live(),
+    check(blocks::live() == view.kept + expected.kept,
+          "a released context leaves no block but the kept ones", blocks::live(),
           " blocks instead of ", view.kept, " + ", expected.kept);
-    heap::releaseAll();
+    blocks::releaseAll();
     return view.text;
 }
 

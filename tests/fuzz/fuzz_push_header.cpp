@@ -1,7 +1,7 @@
 // A message through the parser of its push header.
 #include "check.h"
-#include "heap.h"
 #include "reading.h"
+#include "support/heap.h"
 #include "target.h"
 
 #include "qvspushhandler.h"
@@ -45,10 +45,10 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size)
         copy.overwrite();
         if (info) {
             checkRecord(*info, expected, input);
-            check(heap::live() == 2, "a header is a record and a body", heap::live());
+            check(blocks::live() == 2, "a header is a record and a body", blocks::live());
             qvs::releasePushHeader(info);
         }
-        check(heap::live() == 0, "no block is left of a header", heap::live());
+        check(blocks::live() == 0, "no block is left of a header", blocks::live());
     }
     return 0;
 }

@@ -1,10 +1,10 @@
 // A message through the natives, as a virtual machine calls them.
 #include "check.h"
 #include "context.h"
-#include "heap.h"
 #include "queries.h"
 #include "reading.h"
 #include "support/fakevm.h"
+#include "support/heap.h"
 #include "target.h"
 
 #include "qvsJniParser.h"
@@ -84,17 +84,17 @@ std::string session(fakevm::Vm *vm, const Message &message, jlong length, jint n
     if (accepted) {
         const ContextView whole = viewOf(ptCtx);
         const size_t blocks = 2 + whole.blocks + whole.abandoned + kept;
-        check(heap::live() == blocks, "header, body and context are all that a parse leaves",
-              heap::live(), " blocks instead of ", blocks);
+        check(blocks::live() == blocks, "header, body and context are all that a parse leaves",
+              blocks::live(), " blocks instead of ", blocks);
         kept += moveStart(vm, n, &log);
         kept += moveStart(vm, 2, &log);
         kept += viewOf(ptCtx).kept;
     }
     (void)vm->call("qvomacp_parser_del");
     check(!ptCtx, "no context is left of a session");
-    check(heap::live() == kept, "a session leaves no block but the kept ones", heap::live(),
+    check(blocks::live() == kept, "a session leaves no block but the kept ones", blocks::live(),
           " blocks instead of ", kept);
-    heap::releaseAll();
+    blocks::releaseAll();
     return log;
 }
 
@@ -107,7 +107,7 @@ void headerOnly(fakevm::Vm *vm, const fakevm::Bytes &message, const HeaderReadin
     check(!ptCtx, "no context is made of a header");
     (void)vm->call("qvomacp_parser_del");
     (void)askHeader(vm, {}, message);
-    check(heap::live() == 0, "no block is left of a header", heap::live());
+    check(blocks::live() == 0, "no block is left of a header", blocks::live());
 }
 
 // A length that the array does not have.
@@ -118,7 +118,7 @@ void tooLong(fakevm::Vm *vm, const fakevm::Bytes &message)
         const jlong length = static_cast<jlong>(message.size()) + more;
         check(vm->parse(message, length, 0).number == 0, "no more is parsed than there is", length);
     }
-    check(heap::live() == 0, "nor is a block left", heap::live());
+    check(blocks::live() == 0, "nor is a block left", blocks::live());
 }
 
 fakevm::Vm *machine()

@@ -1,8 +1,8 @@
 // The readers of bytes, tokens and values, called in any order on any bytes.
 #include "check.h"
-#include "heap.h"
 #include "reading_value.h"
 #include "script.h"
+#include "support/heap.h"
 
 #include "qvsClientProvWbxmlDecoder.h"
 #include "qvsmemory.h"
@@ -218,7 +218,7 @@ private:
     {
         char *const before = text;
         same(ours(), theirs());
-        if (before && before != text && heap::isLive(before)) {
+        if (before && before != text && blocks::isLive(before)) {
             check(text && strlen(text) == 1 && static_cast<uint8_t>(*text) >= 0x80,
                   "only an unknown token takes the place of a text", textOf(text).value_or(""));
             qvsMemFree_debug(before);
@@ -263,7 +263,7 @@ private:
         const uint32_t theirs = pair(name, &read);
         same(qvsClientProvWbxmlDecoderParamString(decoder, &text, name), theirs);
         if (theirs == kOk) {
-            check(!before || heap::isLive(before),
+            check(!before || blocks::isLive(before),
                   "a repeated parameter leaves the text before it");
             qvsMemFree_debug(before);
             expected.own = read.own;

@@ -123,13 +123,13 @@ void numbers(const std::string &text, uint32_t word)
     check(qvsStrAtol(Exact<char>(text)) == expected, "qvsStrAtol");
     check(qvsStrAtoi(Exact<char>(text)) == static_cast<int>(expected), "qvsStrAtoi");
 
-    const auto number = static_cast<int32_t>(word);
+    const long number = static_cast<int32_t>(word);
     for (int base : {2, 8, 10, 16, 36}) {
-        char buffer[34];
+        char buffer[66];
         check(qvsStrLtoa(number, buffer, static_cast<uint32_t>(base)) == buffer &&
                   strtoll(buffer, nullptr, base) == number,
               "qvsStrLtoa");
-        check(qvsStrAtoi(qvsStrItoa(number, buffer, 10)) == number, "qvsStrItoa");
+        check(qvsStrAtol(qvsStrItoa(number, buffer, 10)) == number, "qvsStrItoa");
     }
 }
 

@@ -1,6 +1,6 @@
 #include "fake_vm.h"
 
-#include "blocks.h"
+#include "counting.h"
 
 #include <stdio.h>
 #include <stdlib.h>

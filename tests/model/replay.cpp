@@ -14,7 +14,7 @@
 // gives one line: CRC-32 of its answers, their size, the decoder's result code, the blocks that
 // were left and what was wrong with the calls. With --full its answers are written first, one a
 // line with its name.
-#include "blocks.h"
+#include "counting.h"
 #include "fake_vm.h"
 #include "walks.h"
 
@@ -96,7 +96,7 @@ const std::string kPrefix = "qvomacp_";
 template <class Result>
 Result call(const Method &method, const jint *i, size_t arguments)
 {
-    const Counting blocks;
+    const Counting counted;
     void *f = method.function;
     JNIEnv *e = &env;
     const jobject self = nullptr;
@@ -350,7 +350,7 @@ void parse(const Natives &natives, const Message &message)
     using Parse = jboolean(JNICALL *)(JNIEnv *, jobject, jbyteArray, jlong, jint);
     jboolean parsed = JNI_FALSE;
     {
-        const Counting blocks;
+        const Counting counted;
         parsed = reinterpret_cast<Parse>(natives.parse->function)(
             &env, nullptr, handleOf<jbyteArray>(&messageArray), message.length, message.mode);
     }
@@ -367,7 +367,7 @@ void replay(const Natives &natives, const Decoder &decoder, const Message &messa
 {
     answers.clear();
     faults.clear();
-    liveBlocks = 0;
+    const size_t liveBefore = blocks::live();
     fence.place(message.bytes);
     parse(natives, message);
     natives.askEverything("");
@@ -381,7 +381,8 @@ void replay(const Natives &natives, const Decoder &decoder, const Message &messa
         call<void>(*natives.remove, nullptr, 0);
         natives.askEverything(" after delete");
     }
-    const std::string blocks = blocksAreCounted ? std::to_string(liveBlocks) : "-";
+    const std::string blocks =
+        kBlocksAreCounted ? std::to_string(static_cast<long>(blocks::live() - liveBefore)) : "-";
     const std::string code = decoder.code(static_cast<uint32_t>(message.length));
     printf("%08x %zu %s %s %s\n", crc32Of(answers), answers.size(), code.c_str(), blocks.c_str(),
            faults.c_str());

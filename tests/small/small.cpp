@@ -7,10 +7,10 @@
 // runs the I-th of N parts of them; the seed says which inputs make a part.
 #include "check.h"
 #include "context.h"
-#include "heap.h"
 #include "queries.h"
 #include "reading.h"
 #include "support/fakevm.h"
+#include "support/heap.h"
 #include "target.h"
 #include "vocabulary.h"
 
@@ -127,9 +127,9 @@ private:
             kept += viewOf(ptCtx).kept;
             (void)vm.call("qvomacp_parser_del");
         }
-        check(heap::live() == kept, "no block is left but the kept ones", heap::live(),
+        check(blocks::live() == kept, "no block is left but the kept ones", blocks::live(),
               " blocks instead of ", kept);
-        heap::releaseAll();
+        blocks::releaseAll();
     }
 
     const Options options;

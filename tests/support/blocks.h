@@ -1,54 +1,14 @@
-// The heap of the library under the control of a test: its live blocks are counted, and any one of
-// its allocations can be made to fail. The test program is linked with
-// -Wl,--wrap=malloc,--wrap=calloc,--wrap=realloc,--wrap=free, which catches the calls of the object
-// files it is made of; the C++ library allocates elsewhere and is not counted.
+// What a test holds the blocks of the library to.
 #ifndef BLOCKS_H
 #define BLOCKS_H
+
+#include "heap.h"
 
 #include <gtest/gtest.h>
 
 #include <cstddef>
-#include <functional>
-#include <set>
 
 namespace blocks {
-
-// The number of allocations that still succeed before one fails; negative when none is to fail.
-extern long failAt;
-
-// Whether, once one has failed, all the following ones fail too, until failAt is set to 0 or more,
-// or reset() is called.
-extern bool failFromThenOn;
-
-// Lets every allocation succeed again.
-void reset();
-
-std::size_t live();        // blocks that were allocated and not released
-std::size_t liveBytes();   // their bytes, as asked for
-std::size_t peakBytes();   // the most that liveBytes() was since startCounting()
-std::size_t allocations(); // allocations that succeeded since startCounting()
-std::size_t allocated();   // their bytes
-void startCounting();
-
-// The live blocks themselves.
-std::set<void *> all();
-
-// Called with every live block before it is released, unless it is empty.
-extern std::function<void(const void *block)> onRelease;
-
-// While one lives, every block ends where its memory does, so far as its alignment lets it, so that
-// the first byte behind it can be neither read nor written, and no byte of it once it is released.
-// It takes pages, so it is for few blocks at a time; they may outlive it.
-class Fence {
-public:
-    Fence();
-    Fence(const Fence &) = delete;
-    Fence &operator=(const Fence &) = delete;
-    ~Fence();
-
-private:
-    bool before;
-};
 
 // Fails the test when more or fewer blocks are live at the end of the scope than at its start.
 class BlockCheck {

@@ -1,5 +1,7 @@
 // The limit of the texts that one message may be decoded to, 8 MiB and 100 times its length, at
 // both its edges: whole documents that stay just below it, and one step beyond.
+#include "losses.h"
+
 #include "support/blocks.h"
 #include "support/message.h"
 
@@ -166,6 +168,31 @@ TEST(TextLimit, EndsADocumentOfSkippedReferences)
     for (const size_t unused : kUnused) {
         expectEdge(skipped, unused, false);
     }
+}
+
+// What stays allocated of one parm again and again is bounded by the limit, which for a short
+// message is 8 MiB whatever its length.
+TEST(TextLimit, BoundsWhatAShortMessageLeaves)
+{
+    constexpr size_t kText = 7000;
+    constexpr size_t kCount = kAlways / kText;
+    Body body;
+    body.characteristic(message::kNapDef, [&] {
+        for (size_t i = 0; i < kCount; ++i) {
+            body.parm(message::kName, message::tableString(0));
+        }
+    });
+    const Bytes bytes = message::document(body, {.table = std::string(kText, 't') + '\0'});
+    const size_t before = blocks::liveBytesTaken();
+    sweep::Losses losses;
+    qvsClientProvCtx *context = contextOf(bytes);
+    ASSERT_NE(context, nullptr);
+    qvsClientProvCtxDelectContext(context);
+    const size_t left = blocks::liveBytesTaken() - before;
+    EXPECT_EQ(losses.count(), kCount - 1);
+    EXPECT_GT(left, (kCount - 1) * kText);
+    EXPECT_LT(left, (kCount - 1) * (kText + 32));
+    printf("%zu bytes leave %zu, %zu for each\n", bytes.size(), left, left / bytes.size());
 }
 
 } // namespace

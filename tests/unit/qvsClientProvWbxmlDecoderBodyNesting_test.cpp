@@ -338,6 +338,20 @@ TEST_F(SiblingRun, TraceAListThatFindsNoMemory)
               "[Error] [qvsClientProvWbxmlDecoderCharacterList] ptTmpList NULL\n");
 }
 
+TEST_F(SiblingRun, TracesNoMissingListWhereOneIsThereAndItsNodeIsNot)
+{
+    decoding::Decoder decoder(join({kLogical, {0x01}}));
+    qvsList *list = nullptr;
+    ASSERT_EQ(qvsListCreate(&list, nullptr), QVS_OK);
+    Traces traces;
+    blocks::failAt = 2; // the element and its record can be had
+    EXPECT_EQ(qvsClientProvWbxmlDecoderCharacterList(decoder, &list), 1U);
+    blocks::reset();
+    EXPECT_EQ(list->nCount, 0U);
+    EXPECT_FALSE(traces.has("[Error] [qvsClientProvWbxmlDecoderCharacterList] ptTmpList NULL\n"));
+    EXPECT_EQ(qvsListDeleteNodeAllAndList(list, nullptr), QVS_OK);
+}
+
 // ---- Documents that fail
 
 TEST_F(FailedDocument, IsReleasedWhereverTheDataEnds)

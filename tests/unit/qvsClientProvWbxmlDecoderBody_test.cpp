@@ -135,9 +135,9 @@ TEST_F(DocumentElement, EndsAtAStringThatPassesTheLimitOfAllTexts)
     for (const Bytes &bytes :
          {Bytes{0x45, 0x03, 'x', 0x00, 0x01}, join({{0x45}, kLogical, {0x03, 'x', 0x00, 0x01}})}) {
         decoding::Decoder decoder(bytes);
-        qvs::stateOf(decoder)->textRead = 8 * 1024 * 1024;
+        qvs::DecodeState state = {.textLeft = 0};
         qvsWapDoc *document = nullptr;
-        EXPECT_EQ(qvsClientProvWbxmlDecoderWbxmlBody(decoder, &document), 4111U);
+        EXPECT_EQ(qvs::decodeBody(decoder, &state, &document), 4111U);
         EXPECT_EQ(document, nullptr);
     }
 }

@@ -1,5 +1,6 @@
 // The parameters of proxies: PXLOGICAL, PXAUTHINFO, PORT, PXPHYSICAL.
 #include "qvsDecoding.h"
+#include "qvsParm.h"
 
 #include "parm_suite.h"
 
@@ -251,9 +252,9 @@ TEST_F(PxPhysicalParm, TakesADomainThatFoundNoMemoryForOneThatCannotBeRead)
 TEST_F(PxPhysicalParm, EndsAtADomainThatPassesTheLimitOfAllTexts)
 {
     Reading<PxPhysical> run(parm(0x17, "one more"));
-    qvs::stateOf(run.decoder)->textRead = 8 * 1024 * 1024;
+    qvs::DecodeState state = {.textLeft = 0};
     Traces traces;
-    EXPECT_EQ(run.read(), 4111U);
+    EXPECT_EQ(qvs::readParms(run.decoder, &state, run.record, qvs::kPxPhysicalParms), 4111U);
     EXPECT_EQ(run.record->ptDomainList, nullptr);
     EXPECT_EQ(traces.texts.back(), "[ERROR] qvsClientProvWbxmlDecoderParamListString Fail\n");
 }
@@ -268,11 +269,14 @@ TEST_F(PxPhysicalParm, EndsAtATextOrAValueTokenThatPassesTheLimitOfAllTexts)
         for (const size_t size : {bytes.size(), size_t{100000}}) {
             bytes.resize(size, 0x55);
             const uint64_t limit = std::max(kLimit, uint64_t{100} * size);
-            for (const uint64_t before : {limit - 5, limit - 4, limit - 3}) {
+            for (const uint64_t left : {5U, 4U, 3U}) {
                 Reading<PxPhysical> run(bytes);
-                qvs::stateOf(run.decoder)->textRead = before;
-                EXPECT_EQ(run.read(), before <= limit - 4 ? 0U : 4111U);
-                EXPECT_EQ(qvs::stateOf(run.decoder)->textRead, before + 4);
+                qvs::DecodeState state = qvs::wholeDecode(run.decoder);
+                EXPECT_EQ(state.textLeft, limit);
+                state.textLeft = left;
+                EXPECT_EQ(qvs::readParms(run.decoder, &state, run.record, qvs::kPxPhysicalParms),
+                          left < 4 ? 4111U : 0U);
+                EXPECT_EQ(state.textLimit, left < 4);
             }
         }
     }

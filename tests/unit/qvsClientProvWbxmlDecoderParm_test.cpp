@@ -1,10 +1,10 @@
-// The two ways to read a parameter: the usual ones in one go, all others step by step. Both read
-// the same, so what tells them apart is the line on which they ask for the block of a text.
+// The blocks of texts as memory checking reports them, by what a text is made of.
 #include "blocks.h"
 #include "decoding.h"
 #include "memcheck.h"
 #include "traces.h"
 
+#include <algorithm>
 #include <string>
 #include <vector>
 
@@ -14,91 +14,92 @@ using decoding::OwnText;
 
 namespace {
 
-class UsualParm : public blocks::BlockTest {};
+class BlockOfAText : public blocks::BlockTest {};
 
-constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvWbxmlDecoder";
-
-// The line on which the text of a parameter is asked for; 0 when it has no text.
-int lineOfText(const Bytes &bytes)
+// The size that is recorded for the text that `read` makes or continues; 0 for no block.
+template <class Read>
+int recordedFor(const Bytes &bytes, const char *before, Read read)
 {
     Decoder decoder(bytes);
     OwnText text;
-    const auto blocks = memcheck::reportedBy(
-        [&] { EXPECT_EQ(qvsClientProvWbxmlDecoderParamString(decoder, &text, 0x15), QVS_OK); });
-    EXPECT_EQ(decoder.position(), bytes.size() - 1) << "its END is left";
+    const auto blocks = memcheck::reportedBy([&] {
+        text.text = before ? qvsStrdup_debug(before, "test", 1) : nullptr;
+        (void)read(decoder, &text.text);
+    });
     if (blocks.empty()) {
         EXPECT_TRUE(text.isNull());
         return 0;
     }
     EXPECT_EQ(blocks.size(), 1U);
-    EXPECT_EQ(blocks[0].file, kModule);
-    EXPECT_EQ(static_cast<size_t>(blocks[0].size), text.str().size() + 1 + 4)
-        << "the text, its end and the spare zeros";
-    return blocks[0].line;
+    return blocks[0].size;
 }
 
-// The lines on which the texts of a list are asked for, in the order of its items.
-std::vector<int> linesOfList(const Bytes &bytes)
+int recorded(const Bytes &bytes, const char *before = nullptr)
 {
-    Decoder decoder(bytes);
-    qvsList *list = nullptr;
-    std::vector<int> lines;
-    for (const auto &block : memcheck::reportedBy([&] {
-             EXPECT_EQ(qvsClientProvWbxmlDecoderParamListString(decoder, &list, 0x15), QVS_OK);
-         })) {
-        if (block.file == kModule) {
-            lines.push_back(block.line);
-        }
-    }
-    EXPECT_EQ(qvsListDeleteNodeAllAndList(list, nullptr), QVS_OK);
-    return lines;
+    return recordedFor(bytes, before, qvsClientProvWbxmlDecoderContent);
 }
-
-const Bytes kString = {0x15, 0x06, 0x03, 'a', 'b', 0, 0x01};
-const Bytes kEmptyString = {0x15, 0x06, 0x03, 0, 0x01};
-const Bytes kToken = {0x15, 0x06, 0x85, 0x01};
-const Bytes kOpaque = {0x15, 0x06, 0xC3, 0x01, 'a', 0x01};
 
 } // namespace
 
-TEST_F(UsualParm, IsReadInOneGo)
+TEST_F(BlockOfAText, IsRecordedWithItsTerminator)
 {
-    const int line = lineOfText(kString);
-    EXPECT_GT(line, 0);
-    EXPECT_EQ(lineOfText(kEmptyString), line);
-    EXPECT_EQ(lineOfText(kToken), line);
-    EXPECT_EQ(lineOfText({0x15, 0x06, 0x95, 0x01}), line);
-    EXPECT_EQ(linesOfList(kString), std::vector<int>{line});
-    EXPECT_EQ(linesOfList(kToken), std::vector<int>{line});
+    EXPECT_EQ(recorded({0x03, 'a', 'b', 0, 0x01}), 3);
+    EXPECT_EQ(recorded({0x03, 0, 0x01}), 1);
+    EXPECT_EQ(recorded({0x85}), 5) << "IPV4";
+    EXPECT_EQ(recorded({0x03, 'a', 0, 0x03, 'b', 0, 0x9A, 0x01}), 7) << "ab,PAP";
+    EXPECT_EQ(recorded({0x03, 'c', 0, 0x01}, "ab"), 4);
+    EXPECT_EQ(recorded({0x92}, "ab"), 9) << "ab,BASIC";
+    EXPECT_EQ(recorded({0x85}, "ab"), 7) << "abIPV4";
 }
 
-TEST_F(UsualParm, IsWithoutPiecesSwitchesOrOtherKindsOfText)
+TEST_F(BlockOfAText, IsRecordedWithTwoMoreBytesForATokenOpaqueDataAndAJoinOutOfSight)
 {
-    const int step = lineOfText(kOpaque);
-    EXPECT_GT(step, 0);
-    EXPECT_NE(step, lineOfText(kString));
-    const Bytes others[] = {
-        {0x15, 0x06, 0x00, 0x01, 0x03, 'a', 0, 0x01}, // a page switch before the string
-        {0x15, 0x00, 0x01, 0x06, 0x03, 'a', 0, 0x01}, // a page switch before the VALUE
-    };
-    for (const Bytes &bytes : others) {
-        EXPECT_EQ(lineOfText(bytes), step) << testing::PrintToString(bytes);
+    EXPECT_EQ(recorded({0xFE}), 2);
+    EXPECT_EQ(recorded({0xC3, 0x03, 'a', 0, 'b'}), 5);
+    EXPECT_EQ(recorded({0xC3, 0x01, 'c'}, "ab"), 5);
+    EXPECT_EQ(recorded({0x94}, "ab"), 2 + 15 + 2) << "BIT-TRANSPARENT";
+    EXPECT_EQ(recorded({0x03, 'a', 0, 0x94, 0x9A, 0x01}), 6) << "a,PAP";
+}
+
+TEST_F(BlockOfAText, IsANewOneForEachJoinWhileBlocksAreTracked)
+{
+    // The first join would leave room for the second.
+    const Bytes joins = {0x90, 0x92, 0x90, 0x93};
+    EXPECT_EQ(recordedFor(joins, "A-text-of-some-length",
+                          [](qvsWbxmlDecoder *decoder, char **text) {
+                              (void)qvsCommaAdd(decoder, text);
+                              return qvsCommaAdd(decoder, text);
+                          }),
+              21 + 6 + 7 + 1);
+    EXPECT_EQ(recordedFor({0x90, 0x03, 'x', 0, 0x01}, "ab", qvsCommaAdd), 5) << "ab,x";
+}
+
+TEST_F(BlockOfAText, IsAskedForUnderOneSourceByAllReaders)
+{
+    for (const Bytes &bytes : {Bytes{0x03, 'a', 0, 0x01}, Bytes{0x85}, Bytes{0xC3, 0x01, 'a'},
+                               Bytes{0xFE}, Bytes{0x03, 'a', 0, 0x85, 0x01}}) {
+        Decoder decoder(bytes);
+        OwnText text;
+        const auto files = memcheck::filesOf(
+            [&] { EXPECT_EQ(qvsClientProvWbxmlDecoderContent(decoder, &text), QVS_OK); });
+        EXPECT_EQ(files, std::vector<std::string>{"jni/src/ClientProv/qvsClientProvWbxmlDecoder"});
     }
-    EXPECT_EQ(lineOfText({0x15, 0x01}), 0);
 }
 
-TEST_F(UsualParm, IsTheFirstOfAListAlone)
+// A value of several pieces continues the text of the pair before it in the same element.
+TEST_F(BlockOfAText, OfALaterPairTakesThePiecesOfBoth)
 {
-    const int line = lineOfText(kString);
-    const std::vector<int> lines = linesOfList({0x15, 0x06, 0x85, 0x15, 0x06, 0x03, 'a', 0, 0x01});
-    ASSERT_EQ(lines.size(), 2U);
-    EXPECT_NE(lines[0], line) << "something follows it";
-    EXPECT_EQ(lines[1], lines[0]) << "it goes on with the text before it";
-}
-
-TEST_F(UsualParm, IsReadStepByStepForWhoeverListens)
-{
-    Traces traces;
-    EXPECT_EQ(lineOfText(kString), lineOfText(kOpaque));
-    EXPECT_EQ(lineOfText(kToken), lineOfText(kOpaque));
+    Decoder decoder({0x15, 0x06, 0x85, 0x15, 0x06, 0x03, 'a', 0, 0x03, 'b', 0, 0x01});
+    qvsList *list = nullptr;
+    std::vector<int> sizes;
+    for (const auto &block : memcheck::reportedBy([&] {
+             EXPECT_EQ(qvsClientProvWbxmlDecoderParamListString(decoder, &list, 0x15), QVS_OK);
+         })) {
+        if (block.file != "jni/src/ClientProv/qvslist") {
+            sizes.push_back(block.size);
+        }
+    }
+    std::sort(sizes.begin(), sizes.end());
+    EXPECT_EQ(sizes, (std::vector<int>{5, 7})) << "IPV4 and IPV4ab";
+    EXPECT_EQ(qvsListDeleteNodeAllAndList(list, nullptr), QVS_OK);
 }

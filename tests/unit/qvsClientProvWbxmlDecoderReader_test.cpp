@@ -187,8 +187,29 @@ TEST_F(StringReader, NeverReadsOutsideAStorageWithoutASpareByte)
         EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(decoder, &text), 1U);
         EXPECT_EQ(text.str(), i == 0 ? "ab" : "");
     }
-    EXPECT_EQ(decoder.position(), 2U);
+    EXPECT_EQ(decoder.position(), 3U) << "behind the terminator that is not there, and no further";
     qvsMemFree_debug(storage);
+}
+
+TEST_F(StringReader, AdvancesByTheTerminatorAtTheVeryEnd)
+{
+    Decoder decoder({'a', 'b'});
+    smlBuffer *buffer = decoder->ptBuffer;
+    buffer->pHead = buffer->pEnd;
+    OwnText text;
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(decoder, &text), 1U);
+    EXPECT_EQ(text.str(), "");
+    EXPECT_EQ(buffer->pHead, buffer->pEnd + 1);
+    // A read position behind the end is one of a decoder without more data.
+    uint8_t byte = 0;
+    uint32_t number = 0;
+    EXPECT_EQ(qvsClientProvWbxmlDecoderBufferReadByte(decoder, &byte), 0U);
+    EXPECT_EQ(qvsClientProvWbxmlDecoderBufferReadUint32(decoder, &number), 0U);
+    EXPECT_EQ(qvsClientProvWbxmlDecoderCurAttr(decoder, &byte), 4103U);
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStrExtension(decoder, 0xC3, &text, &number), 0U);
+    EXPECT_EQ(qvsClientProvWbxmlDecoderContent(decoder, &text), 4103U);
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(decoder, &text), 1U);
+    EXPECT_EQ(buffer->pHead, buffer->pEnd + 1);
 }
 
 TEST_F(StringReader, AppendsToATextThatIsThereInANewBlock)
@@ -263,7 +284,7 @@ TEST_F(StringReader, RefusesAnyReferenceWithoutATable)
     }
 }
 
-TEST_F(StringReader, ReadsATableThatWasCutOffNoFurtherThanItsBlock)
+TEST_F(StringReader, RefusesAnyReferenceToATableThatWasCutOff)
 {
     Decoder decoder({0x05, 'a', 'b'}); // claims five bytes and has two
     decoder->nStrSize = static_cast<uint32_t>(
@@ -273,7 +294,7 @@ TEST_F(StringReader, ReadsATableThatWasCutOffNoFurtherThanItsBlock)
         decoder->ptBuffer->pHead = decoder->ptBuffer->pStorage;
         *decoder->ptBuffer->pHead = index;
         OwnText text;
-        EXPECT_EQ(qvsClientProvWbxmlDecoderGetStrTable(decoder, &text), index < 4 ? 1U : 0U);
+        EXPECT_EQ(qvsClientProvWbxmlDecoderGetStrTable(decoder, &text), 0U);
     }
 }
 

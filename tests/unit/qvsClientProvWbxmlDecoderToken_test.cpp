@@ -359,12 +359,13 @@ TEST(Kept, unknown_token_replaces)
 TEST_F(Content, KnowsTheLengthOfAnUnknownToken)
 {
     Decoder decoder({0xFE, 0x03, 'x', 0, 0x01});
+    qvs::DecodeState state;
     qvs::Text text;
-    ASSERT_EQ(qvs::content(decoder, &text), QVS_OK);
+    ASSERT_EQ(qvs::content(decoder, &state, &text), QVS_OK);
     EXPECT_EQ(text.length, 1U);
     EXPECT_EQ(text.capacity, 2U);
     // What is read next is joined to it.
-    ASSERT_EQ(qvs::content(decoder, &text), QVS_OK);
+    ASSERT_EQ(qvs::content(decoder, &state, &text), QVS_OK);
     EXPECT_STREQ(text.data, "\xFEx");
 }
 

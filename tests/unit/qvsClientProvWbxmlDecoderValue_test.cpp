@@ -1,5 +1,6 @@
 // The value tokens and their joins, single values, lists of values, and the comma join.
 #include "qvsDecoding.h"
+#include "qvsParm.h"
 
 #include "blocks.h"
 #include "decoding.h"
@@ -242,19 +243,18 @@ TEST_F(ParamString, ReadsInOneGoWhatItReadsStepByStep)
     }
 }
 
-TEST_F(ParamString, IsReadStepByStepAtTheLimitOfText)
+TEST_F(ParamString, EndsBehindTheLimitOfText)
 {
-    constexpr uint64_t kLimit = 8U << 20U;
     const Bytes usual[] = {{0x15, 0x06, 0x03, 'a', 'b', 0, 0x01}, {0x15, 0x06, 0x85, 0x01}};
     for (const Bytes &bytes : usual) {
         const uint64_t length = bytes[2] == 0x03 ? 2 : 4;
         for (const uint64_t beyond : {0, 1}) {
             Decoder decoder(bytes);
-            qvs::stateOf(decoder)->textRead = kLimit - length + beyond;
+            qvs::DecodeState state = {.textLeft = length - beyond};
             OwnText text;
-            EXPECT_EQ(qvsClientProvWbxmlDecoderParamString(decoder, &text, 0x15),
+            EXPECT_EQ(qvs::readText(decoder, &state, &text, 0x15),
                       beyond ? QVS_ERROR_NO_MEMORY : QVS_OK);
-            EXPECT_EQ(qvs::stateOf(decoder)->textLimit, beyond);
+            EXPECT_EQ(state.textLimit, beyond);
         }
     }
 }
@@ -537,6 +537,20 @@ TEST_F(ParamList, FailsCleanlyWithoutMemory)
     EXPECT_TRUE(traces.has("[Error] [qvsClientProvWbxmlDecoderParamListString] ptTmpList NULL\n"));
 }
 
+TEST_F(ParamList, TracesNoMissingListWhereOneIsThereAndItsNodeIsNot)
+{
+    OwnList own;
+    Decoder first({0x17, 0x06, 0x85, 0x01});
+    ASSERT_EQ(qvsClientProvWbxmlDecoderParamListString(first, &own.list, 0x17), QVS_OK);
+    Decoder second({0x17, 0x06, 0x86, 0x01});
+    Traces traces;
+    blocks::failAt = 1; // the text can be had
+    EXPECT_EQ(qvsClientProvWbxmlDecoderParamListString(second, &own.list, 0x17), 1U);
+    blocks::reset();
+    EXPECT_EQ(own.list->nCount, 1U);
+    EXPECT_FALSE(traces.has("[Error] [qvsClientProvWbxmlDecoderParamListString] ptTmpList NULL\n"));
+}
+
 TEST_F(CommaAdd, JoinsAStringBehindAComma)
 {
     Decoder decoder({0x90, 0x03, 'x', 0, 0x01});
@@ -611,19 +625,18 @@ TEST_F(CommaAdd, GoesOnWithALengthItAlreadyKnows)
 {
     qvs::JoinedText known = {};
     Decoder decoder({0x90, 0x92, 0x90, 0x03, 'x', 0, 0x06});
-    qvs::stateOf(decoder)->joined = &known;
+    qvs::DecodeState state;
     OwnText text("HTTP");
-    EXPECT_EQ(qvsCommaAdd(decoder, &text), QVS_OK);
+    EXPECT_EQ(qvs::commaAdd(decoder, &state, &text, &known), QVS_OK);
     EXPECT_EQ(known.text, text.text);
     EXPECT_EQ(known.length, 10U);
-    EXPECT_EQ(qvsCommaAdd(decoder, &text), QVS_OK);
+    EXPECT_EQ(qvs::commaAdd(decoder, &state, &text, &known), QVS_OK);
     EXPECT_EQ(text.str(), "HTTP,BASIC,x");
     EXPECT_EQ(known.length, 12U);
-    qvs::stateOf(decoder)->joined = nullptr;
 }
 
-// Three strings of one letter: the block of the first is doubled once, and then just long enough.
-TEST_F(ParamString, MovesATextOnlyWhereItsBlockIsTooShort)
+// Four pieces at a time: their block is as long as they are, and doubled for the next ones.
+TEST_F(ParamString, MakesOneBlockForTheFirstPieces)
 {
     const auto blocksFor = [](const Bytes &bytes) {
         Decoder decoder(bytes);
@@ -633,10 +646,13 @@ TEST_F(ParamString, MovesATextOnlyWhereItsBlockIsTooShort)
         return std::to_string(blocks::allocations()) + " for " + text.str();
     };
     EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x01}), "1 for a");
-    EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x03, 'b', 0, 0x01}), "2 for ab");
-    EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x03, 'b', 0, 0x03, 'c', 0, 0x01}), "2 for abc");
-    EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x03, 'b', 0, 0x03, 'c', 0, 0x03, 'd', 0, 0x01}),
-              "3 for abcd");
+    EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x03, 'b', 0, 0x01}), "1 for ab");
+    Bytes many = {0x15, 0x06};
+    for (char letter = 'a'; letter < 'n'; ++letter) {
+        many.insert(many.end(), {0x03, static_cast<uint8_t>(letter), 0});
+    }
+    many.push_back(0x01);
+    EXPECT_EQ(blocksFor(many), "3 for abcdefghijklm");
 }
 
 // A table of one megabyte, and references to it until the texts pass their limit.
@@ -652,12 +668,13 @@ TEST_F(TextLimit, EndsTheDecodeWith4111BeyondBothItsBounds)
             static_cast<char *>(qvsMemAllocSetZero_debug(kEntry + 1, "test", __LINE__));
         memset(decoder->pStringTable, 'a', kEntry);
         decoder->nStrSize = kEntry;
+        qvs::DecodeState state = qvs::wholeDecode(decoder);
         uint64_t total = 0;
         for (;;) {
             decoder->ptBuffer->pHead = decoder->ptBuffer->pStorage;
-            OwnText text;
+            qvs::Text text;
             total += kEntry;
-            const qvsResult result = qvsClientProvWbxmlDecoderContent(decoder, &text);
+            const qvsResult result = qvs::content(decoder, &state, &text);
             if (total > limit) {
                 EXPECT_EQ(result, 4111U);
                 break;
@@ -667,9 +684,16 @@ TEST_F(TextLimit, EndsTheDecodeWith4111BeyondBothItsBounds)
         // From then on no text is read at all.
         decoder->ptBuffer->pHead = decoder->ptBuffer->pStorage;
         OwnText text("x");
-        EXPECT_EQ(qvsClientProvWbxmlDecoderContent(decoder, &text), 4111U);
+        EXPECT_EQ(qvs::readValue(decoder, &state, &text), 4101U) << "there is no VALUE";
         decoder->ptBuffer->pHead = decoder->ptBuffer->pStorage;
-        EXPECT_EQ(qvsCommaAdd(decoder, &text), 4111U);
+        qvs::Text last;
+        EXPECT_EQ(qvs::lookAt(decoder, &state, &last), 4111U);
+        decoder->ptBuffer->pHead = decoder->ptBuffer->pStorage;
+        EXPECT_EQ(qvs::commaAdd(decoder, &state, &text, nullptr), 4111U);
+        // A single step that a host calls has no limit.
+        decoder->ptBuffer->pHead = decoder->ptBuffer->pStorage;
+        OwnText step;
+        EXPECT_EQ(qvsClientProvWbxmlDecoderContent(decoder, &step), QVS_OK);
     }
 }
 
@@ -682,6 +706,9 @@ TEST_F(TextLimit, CountsTheTextThatALaterPairContinues)
     }
     bytes.push_back(0x01);
     Decoder decoder(bytes);
-    OwnList own;
-    EXPECT_EQ(qvsClientProvWbxmlDecoderParamListString(decoder, &own.list, 0x17), 4111U);
+    qvs::DecodeState state = qvs::wholeDecode(decoder);
+    qvsWapPxPhysical record = {};
+    EXPECT_EQ(qvs::readList(decoder, &state, &record, QVS_FIELD(qvsWapPxPhysical, ptDomainList)),
+              4111U);
+    EXPECT_EQ(record.ptDomainList, nullptr);
 }

@@ -340,12 +340,37 @@ Bytes manyProxies()
     return message::document(body);
 }
 
-TEST_F(DecoderMain, SurvivesEveryFailingAllocation)
+// A context, or none when an allocation failed.
+void decodeWhole(const Bytes &bytes)
+{
+    qvsClientProvCtx *context = decodeMain(bytes);
+    EXPECT_EQ(context == nullptr, blocks::failAt < 0);
+    qvsClientProvCtxDelectContext(context);
+}
+
+TEST_F(DecoderMain, MakesNoSmallerContextWhenAnAllocationFails)
 {
     const Bytes bytes = manyProxies();
-    const auto attempt = [&] { qvsClientProvCtxDelectContext(decodeMain(bytes)); };
+    const auto attempt = [&] { decodeWhole(bytes); };
     EXPECT_GT(blocks::failEach(attempt), 200);
     EXPECT_GT(blocks::failEachFrom(attempt), 200);
+}
+
+TEST_F(DecoderMain, MakesNoSmallerContextWhileBlocksAreTracked)
+{
+    const Bytes bytes = manyProxies();
+    qvsMemStartMemCheck();
+    EXPECT_GT(blocks::failEach([&] { decodeWhole(bytes); }), 300);
+    qvsMemEndMemCheck();
+}
+
+TEST_F(DecoderMain, TracesTheContextThatItDidNotKeepAsNone)
+{
+    const Bytes bytes = manyProxies();
+    const Traces traces;
+    blocks::failAt = 10; // of the tree: the table, records and texts of its start
+    EXPECT_EQ(decodeMain(bytes), nullptr);
+    EXPECT_FALSE(traces.has("Success\n"));
 }
 
 // The body of a message in which every characteristic and parameter is.

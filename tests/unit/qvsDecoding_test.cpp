@@ -1,4 +1,4 @@
-// Decoders that a host makes, and the state behind those that the library makes.
+// Decoders that a host makes, with whatever lies between and behind their six fields.
 #include "qvsDecoding.h"
 
 #include "qvsClientProvWbxmlDecoder.h"
@@ -121,7 +121,6 @@ std::string decoded(const Decoder &decoder)
 }
 
 class HostsDecoder : public blocks::BlockTest {};
-class StateOfADecoder : public blocks::BlockTest {};
 
 } // namespace
 
@@ -138,7 +137,6 @@ TEST_F(HostsDecoder, DecodesAsOneOfTheLibraryDoes)
     EXPECT_EQ(host->nCodePage, own->nCodePage);
     EXPECT_EQ(host->nHasContent, own->nHasContent);
     EXPECT_EQ(host->nHasAttr, own->nHasAttr);
-    EXPECT_EQ(host->nMark, 0U);
     EXPECT_EQ(qvsClientProvWbxmlDecoderDecodingSize(host), bytes.size());
 }
 
@@ -212,35 +210,39 @@ TEST_F(HostsDecoder, RefersToNoTableThatWasCutOff)
     EXPECT_TRUE(text.isNull());
 }
 
-TEST_F(StateOfADecoder, StandsBehindOneOfTheLibraryAlone)
+TEST_F(HostsDecoder, ReadsTheSameWithEveryValueInItsPadding)
 {
-    const Decoder decoder({0x01});
-    ASSERT_NE(qvs::stateOf(decoder), nullptr);
-    EXPECT_EQ(static_cast<void *>(qvs::stateOf(decoder)),
-              reinterpret_cast<char *>(static_cast<qvsWbxmlDecoder *>(decoder)) +
-                  offsetof(qvs::Decoding, state));
-    const qvsWbxmlDecoder copies[2] = {*decoder, *decoder};
-    for (const qvsWbxmlDecoder &copy : copies) {
-        EXPECT_EQ(qvs::stateOf(&copy), nullptr);
+    constexpr size_t kPadding = offsetof(qvsWbxmlDecoder, nCodePage) + 1;
+    const Bytes bytes = {0x17, 0x06, 0x03, 'a', 0, 0x01};
+    const HostDecoder host(bytes);
+    uint8_t *const start = host->ptBuffer->pHead;
+    for (uint32_t value = 0; value < 0x10000; ++value) {
+        const uint8_t padding[3] = {static_cast<uint8_t>(value >> 4U), static_cast<uint8_t>(value),
+                                    static_cast<uint8_t>(value >> 8U)};
+        std::memcpy(reinterpret_cast<char *>(static_cast<qvsWbxmlDecoder *>(host)) + kPadding,
+                    padding, sizeof padding);
+        host->ptBuffer->pHead = start;
+        qvsList *list = nullptr;
+        ASSERT_EQ(qvsClientProvWbxmlDecoderParamListString(host, &list, 0x17), 0U) << value;
+        ASSERT_EQ(shown(list), "a ") << value;
+        ASSERT_EQ(qvsListDeleteNodeAllAndList(list, nullptr), 0U);
     }
-    EXPECT_EQ(qvs::stateOf(nullptr), nullptr);
-    const qvsWbxmlDecoder cleared = {};
-    EXPECT_EQ(qvs::stateOf(&cleared), nullptr);
 }
 
-TEST_F(StateOfADecoder, IsNotFoundAnyMoreInMemoryThatWasReleased)
+TEST_F(HostsDecoder, DecodesTheSameWithEveryValueInItsPadding)
 {
-    uint16_t mark = 1;
-    {
-        const Decoder decoder({0x01});
-        const qvsWbxmlDecoder *record = decoder;
-        EXPECT_NE(record->nMark, 0U);
-        blocks::onRelease = [&](const void *block) {
-            if (block == record) {
-                std::memcpy(&mark, static_cast<const char *>(block) + 14, sizeof mark);
-            }
-        };
+    constexpr size_t kPadding = offsetof(qvsWbxmlDecoder, nCodePage) + 1;
+    const message::Bytes bytes = everything();
+    const std::string answer = decoded(HostDecoder(bytes));
+    const HostDecoder host(bytes);
+    uint8_t *const start = host->ptBuffer->pHead;
+    for (uint32_t value = 0; value < 0x10000; value += 7) {
+        std::memcpy(reinterpret_cast<char *>(static_cast<qvsWbxmlDecoder *>(host)) + kPadding + 1,
+                    &value, 2);
+        host->ptBuffer->pHead = start;
+        host->nCodePage = 0;
+        ASSERT_EQ(decoded(host), answer) << value;
+        qvsMemFree_debug(host->pStringTable);
+        host->pStringTable = nullptr;
     }
-    blocks::onRelease = nullptr;
-    EXPECT_EQ(mark, 0U);
 }

@@ -287,6 +287,28 @@ TEST_F(List, DeletesTheNodeOfAnItem)
     }
 }
 
+TEST_F(List, HandsOnNoItemThatIsBeingDeleted)
+{
+    // The callback reads on: the cursor has left the node, which counts until it is gone.
+    static qvsList *list;
+    static void *next;
+    static uint32_t count;
+    list = listOf({a, b, c});
+    EXPECT_EQ(qvsListSetCurNodeFirst(list), QVS_OK);
+    EXPECT_EQ(qvsListDeleteNodeFindItem(list, a,
+                                        [](void *) {
+                                            EXPECT_EQ(qvsListGetItemNext(list, &next), QVS_OK);
+                                            count = qvsListGetCount(list);
+                                        }),
+              QVS_OK);
+    EXPECT_EQ(next, b);
+    EXPECT_EQ(count, 3U);
+    EXPECT_EQ(list->nCount, 2U);
+    EXPECT_EQ(qvsListGetItemNext(list, &next), QVS_OK);
+    EXPECT_EQ(next, c);
+    drop(list);
+}
+
 TEST_F(List, DeletesTheFirstOfSeveralNodesWithAnItem)
 {
     qvsList *list = listOf({a, b, a});

@@ -102,6 +102,34 @@ TEST_F(Memory, AllocWAsksForTheLargestCountThatCanBeCounted)
     blocks::reset();
 }
 
+TEST_F(Memory, CountsTheBlocksThatCouldNotBeHad)
+{
+    char text[] = "abc";
+    void *(*const requests[])(void *text) = {
+        [](void *) { return qvsMemAlloc_debug(8, kFile, 1); },
+        [](void *) { return qvsMemAllocSetZero_debug(8, kFile, 1); },
+        [](void *) { return qvsMemAllocSetZero_debug(4096, kFile, 1); },
+        [](void *) { return static_cast<void *>(qvsMemAllocW_debug(8, kFile, 1)); },
+        [](void *from) -> void * {
+            return qvsStrdup_debug(static_cast<const char *>(from), kFile, 1);
+        },
+        [](void *from) { return qvsMemDup_debug(from, 4, kFile, 1); },
+        [](void *from) { return qvsMemReAlloc_debug(from, 4, kFile, 1); },
+        [](void *) { return qvs::newBlock(8, kFile); },
+    };
+    for (const auto &request : requests) {
+        const uint32_t before = qvs::refusals;
+        blocks::failAt = 0;
+        EXPECT_EQ(request(text), nullptr);
+        EXPECT_EQ(qvs::refusals, before + 1);
+        blocks::reset();
+    }
+    const uint32_t before = qvs::refusals;
+    qvsMemFree_debug(qvsMemAlloc_debug(8, kFile, 1));
+    EXPECT_EQ(qvsStrdup_debug(nullptr, kFile, 1), nullptr);
+    EXPECT_EQ(qvs::refusals, before);
+}
+
 TEST_F(Memory, StrdupCopiesATextAndItsTerminator)
 {
     char text[] = "abc";

@@ -39,13 +39,13 @@ Units unitsOf(const std::string &text, std::size_t spare = 0)
     return units;
 }
 
-std::string numberOf(int32_t v, uint32_t base)
+std::string numberOf(long v, uint32_t base)
 {
-    std::array<char, 35> text;
+    std::array<char, 67> text;
     text.fill('#');
     EXPECT_EQ(qvsStrLtoa(v, text.data(), base), text.data());
     EXPECT_EQ(text.back(), '#');
-    std::array<char, 35> other;
+    std::array<char, 67> other;
     EXPECT_EQ(qvsStrItoa(v, other.data(), base), other.data());
     EXPECT_STREQ(other.data(), text.data());
     return text.data();
@@ -342,6 +342,9 @@ TEST(Numbers, LtoaWritesDigitsToABase)
     EXPECT_EQ(numberOf(-1, 10), "-1");
     EXPECT_EQ(numberOf(INT32_MIN, 10), "-2147483648");
     EXPECT_EQ(numberOf(INT32_MIN, 2), "-1" + std::string(31, '0'));
+    EXPECT_EQ(numberOf(LONG_MAX, 10), std::to_string(LONG_MAX));
+    EXPECT_EQ(numberOf(LONG_MIN, 10), std::to_string(LONG_MIN));
+    EXPECT_EQ(numberOf(LONG_MIN, 2), "-1" + std::string(8 * sizeof(long) - 1, '0'));
     EXPECT_EQ(numberOf(9, 16), "9");
     EXPECT_EQ(numberOf(10, 16), "a");
     EXPECT_EQ(numberOf(255, 16), "ff");
@@ -368,7 +371,11 @@ TEST(Numbers, LtoaToABaseBelow2WritesNoDigits)
 TEST(Numbers, DoNtoSWritesDigitsAndMovesOn)
 {
     std::vector<char> text(12, '#');
-    char *p = text.data();
+    std::vector<char> longest(20, '#');
+    char *p = longest.data();
+    qvsStrDoNtoS(ULONG_MAX, &p, 10);
+    EXPECT_EQ(std::string(longest.data(), p), std::to_string(ULONG_MAX));
+    p = text.data();
     qvsStrDoNtoS(4294967295U, &p, 10);
     EXPECT_EQ(p, text.data() + 10);
     EXPECT_EQ(bytesOf(text), "4294967295##");

@@ -24,13 +24,6 @@ char *copyOf(const char *text)
     return qvsStrdup_debug(text, kModule, __LINE__);
 }
 
-// The text of the tree, with the zero bytes behind it that those of a context have.
-char *withSpareZeros(char *text)
-{
-    memset(text + qvsStrlen(text) + 1, 0, kSpareZeros);
-    return text;
-}
-
 // The item under the cursor of a list, which moves on; null behind the last one.
 void *nextItem(qvsList *list)
 {
@@ -199,7 +192,7 @@ qvsCtxStrNode *qvs::copyTexts(qvsList *list, Texts texts)
         auto *text = static_cast<char *>(list->ptCursor->pItem);
         if (texts == Texts::kTaken) {
             list->ptCursor->pItem = nullptr;
-            node->pszValue = withSpareZeros(text);
+            node->pszValue = text;
         } else {
             node->pszValue = copyOf(text);
         }
@@ -241,7 +234,7 @@ void *qvs::copyRecord(void *record, const CopyKind &kind, Texts texts)
             auto *text = static_cast<char *>(field);
             if (texts == Texts::kTaken && row.type == CopyRow::kText) {
                 setPointer(record, row.from, nullptr);
-                setPointer(copy, row.to, withSpareZeros(text));
+                setPointer(copy, row.to, text);
             } else {
                 setPointer(copy, row.to, copyOf(text));
             }

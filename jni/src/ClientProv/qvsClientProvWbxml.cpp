@@ -1,9 +1,8 @@
 // Creation of the decoder, and the releases of the document tree: one table per kind of record, and
 // one loop for all that is nested in a record.
 #include "qvsClientProvWbxml.h"
-#include "qvsDecoding.h"
+#include "qvsArena.h"
 #include "qvsFields.h"
-#include "qvsTree.h"
 #include "qvslist.h"
 #include "qvsmemory.h"
 #include "qvstrace.h"
@@ -453,16 +452,15 @@ qvsResult qvsClientProvWbxmlInitDecoder(qvsWbxmlDecoder **decoder, const uint8_t
     if (!data) {
         return QVS_ERROR_BAD_ARGUMENT;
     }
-    auto *made = newRecord<Decoding>(kModule);
+    auto *made = newRecord<qvsWbxmlDecoder>(kModule);
     if (!made) {
         trace("[Error] [qvsClientProvWbxmlInitDecoder] ptTmp NULL");
         return QVS_ERROR_BAD_ARGUMENT;
     }
     // kept[decoder-buffer-unchecked]: a decoder without a buffer, or with an empty one, is handed
     // out as a good one.
-    (void)makeBuffer(&made->decoder.ptBuffer, data, length);
-    made->decoder.nMark = markOf(&made->decoder);
-    *decoder = &made->decoder;
+    (void)makeBuffer(&made->ptBuffer, data, length);
+    *decoder = made;
     return QVS_OK;
 }
 
@@ -471,7 +469,6 @@ qvsResult qvsClientProvWbxmlDeleteDecoder(qvsWbxmlDecoder *decoder)
     if (!decoder) {
         return QVS_ERROR_BAD_ARGUMENT;
     }
-    unmark(decoder);
     freeBlock(decoder->pStringTable);
     (void)smlBufferDelete(decoder->ptBuffer); // refuses only a buffer that is not there
     freeBlock(decoder);

@@ -18,7 +18,6 @@ typedef struct qvsWbxmlDecoder {
     uint32_t nHasAttr;    // 1 when it had bit 0x80
     uint32_t nStrSize;    // bytes of the string table; 0xFFFFFFFF when it could not be read
     uint8_t nCodePage;    // 0 or 1
-    uint16_t nMark;       // private: 0 but in a decoder that the library made
     char *pStringTable;   // private copy, NUL-terminated behind its last byte
     smlBuffer *ptBuffer;  // head is the read position, storage the start, size the data length
 } qvsWbxmlDecoder;
@@ -275,5 +274,20 @@ QVS_API qvsResult qvsClientProvWbxmlDeleteWifi(qvsWapWifi *record);
 QVS_API qvsResult qvsClientProvWbxmlDeleteVoWifi(qvsWapVoWifi *record);
 
 QVS_END_DECLS
+
+#ifdef __cplusplus
+struct qvsArena;
+
+namespace [[gnu::visibility("hidden")]] qvs {
+
+// Releases a node, a list of nodes, and a document, with all that is nested in them; null is
+// ignored. Nodes and lists are pieces of the arena, records and texts blocks: records may stay
+// allocated by design, and a context takes texts over.
+void releaseNode(qvsArena *arena, qvsWapCharacter *node);
+void releaseNodes(qvsArena *arena, qvsList *list);
+void releaseDocument(qvsArena *arena, qvsWapDoc *document);
+
+} // namespace qvs
+#endif
 
 #endif

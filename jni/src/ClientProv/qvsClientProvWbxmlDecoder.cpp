@@ -1,9 +1,10 @@
 // The decoder's entry: the WBXML header, the document type, and the way from bytes to a context.
 #include "qvsClientProvWbxmlDecoder.h"
+#include "qvsArena.h"
 #include "qvsCtxCopy.h"
 #include "qvsDecoding.h"
+#include "qvsText.h"
 #include "qvsTokens.h"
-#include "qvsTree.h"
 #include "qvsmemory.h"
 #include "qvsstring.h"
 #include "qvstrace.h"
@@ -37,17 +38,6 @@ qvsResult checkDocumentType(qvsWbxmlDecoder *decoder)
     return QVS_OK;
 }
 
-qvsResult decode(qvsWbxmlDecoder *decoder, qvsWapDoc **document)
-{
-    if (!decoder || smlBufferGetDataSize(decoder->ptBuffer) == 0) {
-        return QVS_ERROR_BAD_ARGUMENT;
-    }
-    if (qvsResult result = checkDocumentType(decoder)) {
-        return result;
-    }
-    return qvsClientProvWbxmlDecoderWbxmlBody(decoder, document);
-}
-
 // A buffer over bytes that stay the caller's, to be read only.
 smlBuffer bufferOver(const uint8_t *data, uint32_t length)
 {
@@ -65,16 +55,14 @@ qvsResult readDocument(const uint8_t *data, uint32_t length, qvsArena *arena, qv
         return QVS_ERROR_BAD_ARGUMENT;
     }
     smlBuffer buffer = bufferOver(data, length);
-    Decoding decoding = {.decoder = {}, .state = {.arena = arena}};
-    qvsWbxmlDecoder &decoder = decoding.decoder;
+    qvsWbxmlDecoder decoder = {};
     decoder.ptBuffer = &buffer;
-    decoder.nMark = markOf(&decoder);
-    const qvsResult result = qvsClientProvWbxmlDecoder(&decoder, document);
+    DecodeState state = wholeDecode(&decoder, arena);
+    const qvsResult result = decode(&decoder, &state, document);
     if (result != QVS_OK) {
         trace("ERROR : qvsClinetProvWbxmlDecoderMain qvsClientProvWbxmlDecoder[0x%x]\n", result);
     }
     qvsMemFree_debug(decoder.pStringTable);
-    unmark(&decoder);
     return result;
 }
 
@@ -102,23 +90,41 @@ qvsResult qvsClientProvWbxmlDecoderWbxmlHeader(qvsWbxmlDecoder *decoder, uint8_t
     return QVS_OK;
 }
 
-qvsResult qvsClientProvWbxmlDecoder(qvsWbxmlDecoder *decoder, qvsWapDoc **document)
+qvsResult qvs::decode(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapDoc **document)
 {
-    const qvsResult result = decode(decoder, document);
+    qvsResult result = QVS_ERROR_BAD_ARGUMENT;
+    if (decoder && smlBufferGetDataSize(decoder->ptBuffer) != 0) {
+        result = checkDocumentType(decoder);
+        if (result == QVS_OK) {
+            result = decodeBody(decoder, state, document);
+        }
+    }
     traceError(result);
     return result;
+}
+
+qvsResult qvsClientProvWbxmlDecoder(qvsWbxmlDecoder *decoder, qvsWapDoc **document)
+{
+    DecodeState state = wholeDecode(decoder);
+    return decode(decoder, &state, document);
 }
 
 qvsClientProvCtx *qvsClinetProvWbxmlDecoderMain(const uint8_t *data, uint32_t length)
 {
     qvsWapDoc *document = nullptr;
     qvsClientProvCtx *context = nullptr;
+    const uint32_t refusalsBefore = refusals;
     alignas(void *) char room[kTreeRoom];
     qvsArena pieces = {room, room + sizeof room};
     // While blocks are tracked each is one of its own, listed under the module that made it.
     qvsArena *arena = tracking ? nullptr : &pieces;
     if (readDocument(data, length, arena, &document) == QVS_OK) {
         context = arena ? takeContext(document) : qvsClientProvCtxMakeContext(document);
+        // hardened: without memory for all that the message holds there is no context.
+        if (context && refusals != refusalsBefore) {
+            qvsClientProvCtxDelectContext(context);
+            context = nullptr;
+        }
         if (context) {
             trace("Success");
         } else {

@@ -17,7 +17,7 @@ QVS_BEGIN_DECLS
 // ---- Whole bodies
 
 // qvsClinetProvWbxmlDecoderMain decodes `length` bytes at `data` into a new context, which the
-// caller owns; null on any failure.
+// caller owns; null on any failure, a single block that could not be had included.
 QVS_API qvsClientProvCtx *qvsClinetProvWbxmlDecoderMain(const uint8_t *data, uint32_t length);
 
 // qvsClientProvWbxmlDecoder reads header and body into a new document, which the caller owns.

@@ -1,11 +1,11 @@
 // The characteristics: which one a TYPE names, who reads its parameters, what may nest in it, and
 // the walk through elements of any depth in constant stack.
 // Elements and types are those of the OMA Client Provisioning content.
+#include "qvsArena.h"
 #include "qvsClientProvWbxmlDecoder.h"
 #include "qvsParm.h"
 #include "qvsText.h"
 #include "qvsTokens.h"
-#include "qvsTree.h"
 #include "qvstrace.h"
 
 using namespace qvs;
@@ -109,7 +109,7 @@ constexpr KindRows kRows = rowsByToken();
 const Kind *findNamedKind(const char *name)
 {
     for (const Kind &kind : kKinds) {
-        if (kind.name && name && qvsStrcmp(name, kind.name) == 0) {
+        if (kind.name && name && *name == *kind.name && qvsStrcmp(name, kind.name) == 0) {
             return &kind;
         }
     }
@@ -162,15 +162,16 @@ qvsList **childrenOf(Node *node, const Kind &kind)
 }
 
 // A TYPE given as text. Other names than the three known ones make no record.
-[[gnu::noinline, gnu::cold]] qvsResult readNamedType(qvsWbxmlDecoder *decoder, Node *node,
-                                                     ScopedText *name)
+qvsResult readNamedType(qvsWbxmlDecoder *decoder, DecodeState *state, ValueReader reader,
+                        Node *node, Text *name)
 {
     ++decoder->ptBuffer->pHead; // behind the attribute start
     Text read;
-    const qvsResult result = content(decoder, &read);
+    const qvsResult result = reader(decoder, state, &read);
     qvsMemFree_debug(name->take());
-    name->text = read.take();
-    if (const Kind *kind = findKind(attr::kType, decoder->nCodePage, name->text)) {
+    name->before = read.before;
+    name->data = read.take();
+    if (const Kind *kind = findKind(attr::kType, decoder->nCodePage, name->str())) {
         trace("%s", kind->created);
         if (qvsResult failure = create(node, *kind)) {
             return failure;
@@ -194,7 +195,8 @@ qvsResult readType(qvsWbxmlDecoder *decoder, Node *node, uint8_t token)
 }
 
 // Reads the attributes of a characteristic and the END behind them.
-qvsResult readAttributes(qvsWbxmlDecoder *decoder, Node *node, uint8_t *attrId, ScopedText *name)
+qvsResult readAttributes(qvsWbxmlDecoder *decoder, DecodeState *state, ValueReader reader,
+                         Node *node, uint8_t *attrId, Text *name)
 {
     uint8_t token = 0;
     while (peekByte(decoder, &token)) {
@@ -209,7 +211,7 @@ qvsResult readAttributes(qvsWbxmlDecoder *decoder, Node *node, uint8_t *attrId, 
         if (token == wbxml::kSwitchPage) {
             result = qvsClientProvWbxmlDecoderCheckCodePage(decoder);
         } else if (token == attr::kType) {
-            result = readNamedType(decoder, node, name);
+            result = readNamedType(decoder, state, reader, node, name);
         } else {
             result = readType(decoder, node, token);
         }
@@ -229,8 +231,7 @@ struct Open {
     Open *parent;
     const Kind *kind; // null: nothing but strings and page switches is accepted
     uint8_t attrId;
-    JoinedText joined;
-    qvsListNode *last[kMostLists]; // of the lists of its record, by their places
+    OpenRecord record;
 };
 static_assert(sizeof(Open) <= kLargestPiece);
 
@@ -238,7 +239,7 @@ static_assert(sizeof(Open) <= kLargestPiece);
 constexpr uint8_t kChildPlace = 0;
 
 // Reads the start of a characteristic. One with content becomes the innermost open one.
-qvsResult enter(qvsWbxmlDecoder *decoder, const DecodeState *state, Open **innermost)
+qvsResult enter(qvsWbxmlDecoder *decoder, DecodeState *state, Open **innermost)
 {
     if (qvsResult result = checkElement(decoder, tag::kCharacteristic)) {
         return result;
@@ -247,18 +248,19 @@ qvsResult enter(qvsWbxmlDecoder *decoder, const DecodeState *state, Open **inner
         return QVS_OK;
     }
     const bool hasAttributes = decoder->nHasAttr;
-    auto *open = static_cast<Open *>(newPiece(arenaOf(state), sizeof(Open), kDecoderModule));
+    auto *open = static_cast<Open *>(newPiece(state->arena, sizeof(Open), kDecoderModule));
     if (!open) {
         return QVS_ERROR_FAILED;
     }
     if (hasAttributes) {
-        ScopedText name;
-        if (qvsResult result = readAttributes(decoder, &open->node, &open->attrId, &name)) {
+        Text name;
+        if (qvsResult result =
+                readAttributes(decoder, state, lookAt, &open->node, &open->attrId, &name)) {
             // hardened: what a characteristic that fails has read is released with it.
-            releaseNode(arenaOf(state), &open->node);
+            releaseNode(state->arena, &open->node);
             return result;
         }
-        open->kind = findKind(open->attrId, decoder->nCodePage, name.text);
+        open->kind = findKind(open->attrId, decoder->nCodePage, name.str());
     }
     open->parent = *innermost;
     *innermost = open;
@@ -276,17 +278,8 @@ qvsResult readParmElement(qvsWbxmlDecoder *decoder, DecodeState *state, Open *op
         }
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
-    if (state) {
-        state->joined = &open->joined;
-        state->last = open->last;
-    }
-    const qvsResult result =
-        readParms(decoder, state, pointerAt(&open->node, open->kind->slot), *open->kind->parms);
-    if (state) {
-        state->joined = nullptr;
-        state->last = nullptr;
-    }
-    return result;
+    state->open = &open->record;
+    return readParms(decoder, state, pointerAt(&open->node, open->kind->slot), *open->kind->parms);
 }
 
 // Whether a characteristic may nest in an open one.
@@ -318,7 +311,7 @@ qvsResult readContent(qvsWbxmlDecoder *decoder, DecodeState *state, Open *open, 
             (void)takeSeenTag(decoder);
             return QVS_OK;
         case wbxml::kStrI:
-            result = dropInlineString(decoder);
+            result = dropInlineString(decoder, state);
             break;
         case wbxml::kSwitchPage:
             dropPageSwitch(decoder);
@@ -358,14 +351,14 @@ qvsResult addSibling(qvsArena *arena, qvsList **list, Node *node, qvsListNode **
 }
 
 // Whether a run goes on behind a sibling: up to an END, across one inline string.
-qvsResult hasNextSibling(qvsWbxmlDecoder *decoder, bool *next)
+qvsResult hasNextSibling(qvsWbxmlDecoder *decoder, DecodeState *state, bool *next)
 {
     uint8_t tag = 0;
     if (!peekTag(decoder, &tag)) {
         return QVS_ERROR_WBXML_NO_DATA;
     }
     if (tag == wbxml::kStrI) {
-        if (qvsResult result = dropInlineString(decoder)) {
+        if (qvsResult result = dropInlineString(decoder, state)) {
             return result;
         }
         if (!peekTag(decoder, &tag)) {
@@ -410,61 +403,72 @@ qvsResult hasNextSibling(qvsWbxmlDecoder *decoder, bool *next)
         Open *const parent = *innermost;
         qvsList **siblings = childrenOf(&parent->node, *parent->kind);
         if (qvsResult result =
-                addSibling(arenaOf(state), siblings, complete, parent->last + kChildPlace)) {
+                addSibling(state->arena, siblings, complete, parent->record.last + kChildPlace)) {
             return result;
         }
-        if (qvsResult result = hasNextSibling(decoder, &atStart)) {
+        if (qvsResult result = hasNextSibling(decoder, state, &atStart)) {
             return result;
         }
     }
 }
 
+// Reads a characteristic into a new node; null for an element without content.
+qvsResult readCharacter(qvsWbxmlDecoder *decoder, DecodeState *state, Node **node)
+{
+    Open *innermost = nullptr;
+    const qvsResult result = readSubtree(decoder, state, &innermost, node);
+    while (innermost) {
+        Open *parent = innermost->parent;
+        releaseNode(state->arena, &innermost->node);
+        innermost = parent;
+    }
+    return result;
+}
+
 } // namespace
 
-qvsResult qvsClientProvWbxmlDecoderCharacterList(qvsWbxmlDecoder *decoder, qvsList **list)
+qvsResult qvs::decodeCharacters(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list)
 {
-    qvsArena *arena = arenaOf(stateOf(decoder));
     qvsList *run = *list;
     qvsListNode *last = nullptr;
     qvsResult result = QVS_OK;
     for (bool next = true; next && result == QVS_OK;) {
         Node *node = nullptr;
-        result = qvsClientProvWbxmlDecoderCharacter(decoder, &node);
+        result = readCharacter(decoder, state, &node);
         if (result == QVS_OK) {
-            result = addSibling(arena, &run, node, &last);
+            result = addSibling(state->arena, &run, node, &last);
         }
         if (result == QVS_OK) {
-            result = hasNextSibling(decoder, &next);
+            result = hasNextSibling(decoder, state, &next);
         }
     }
     if (result == QVS_OK) {
         *list = run;
     } else if (!*list && run) {
-        releaseNodes(arena, run);
+        releaseNodes(state->arena, run);
     }
     return result;
 }
 
+qvsResult qvsClientProvWbxmlDecoderCharacterList(qvsWbxmlDecoder *decoder, qvsList **list)
+{
+    DecodeState state = wholeDecode(decoder);
+    return decodeCharacters(decoder, &state, list);
+}
+
 qvsResult qvsClientProvWbxmlDecoderCharacter(qvsWbxmlDecoder *decoder, qvsWapCharacter **node)
 {
-    DecodeState *state = stateOf(decoder);
-    qvsArena *arena = arenaOf(state);
-    Open *innermost = nullptr;
-    const qvsResult result = readSubtree(decoder, state, &innermost, node);
-    while (innermost) {
-        Open *parent = innermost->parent;
-        releaseNode(arena, &innermost->node);
-        innermost = parent;
-    }
-    return result;
+    DecodeState state = wholeDecode(decoder);
+    return readCharacter(decoder, &state, node);
 }
 
 qvsResult qvsClientProvWbxmlDecoderCharacterAttribute(qvsWbxmlDecoder *decoder,
                                                       qvsWapCharacter *node, uint8_t *attrId,
                                                       uint8_t *codePage, char **name)
 {
-    ScopedText type;
-    if (qvsResult result = readAttributes(decoder, node, attrId, &type)) {
+    DecodeState alone;
+    Text type;
+    if (qvsResult result = readAttributes(decoder, &alone, content, node, attrId, &type)) {
         return result;
     }
     *codePage = decoder->nCodePage;

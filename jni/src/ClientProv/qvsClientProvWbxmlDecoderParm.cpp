@@ -1,7 +1,6 @@
 // One parm element: the loop that reads it by the table of its characteristic, and its value, which
 // is a text or one more item of a list of texts.
 #include "qvsParm.h"
-#include "qvsTree.h"
 #include "qvsstring.h"
 
 using namespace qvs;
@@ -10,27 +9,28 @@ namespace {
 
 // ---- Values
 
-// Reads NAME and VALUE of one parameter onto `text`, step by step.
-[[gnu::noinline, gnu::cold]] qvsResult readAnyPair(qvsWbxmlDecoder *decoder, Text *text,
-                                                   uint8_t token)
+// Reads NAME and VALUE of one parameter into `*text`, which is null without a value: as a new text,
+// or as one that continues the text `before`.
+inline qvsResult readPair(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token,
+                          const char *before)
 {
     if (qvsResult result = checkAttr(decoder, token)) {
         return result;
     }
     uint8_t next = 0;
     qvsResult result = QVS_ERROR_WBXML_NO_DATA;
-    if (peekByte(decoder, &next)) {
-        result = QVS_OK;
+    if (peekByte(decoder->ptBuffer, &next)) {
         switch (next) {
-        case wbxml::kEnd:
-            trace("DecoderParam : Value is NULL\n");
-            break;
         case wbxml::kSwitchPage:
             (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
-            result = paramValue(decoder, text);
-            break;
+            [[fallthrough]];
         case attr::kValue:
-            result = paramValue(decoder, text);
+            result = readValue(decoder, state, text, before);
+            break;
+        case wbxml::kEnd:
+            trace("DecoderParam : Value is NULL\n");
+            *text = nullptr;
+            result = QVS_OK;
             break;
         default:
             trace("DecoderParam : Tag Code [%d] = QVS_ERROR_WBXML_UNKNOWN_ELEMENT\n", next);
@@ -42,85 +42,11 @@ namespace {
     return result;
 }
 
-constexpr uint32_t kPlainStart = 3; // NAME, VALUE, STR_I or a value token
-
-// The usual parameter: NAME and VALUE, of one inline string or one value token, and END.
-struct Plain {
-    const void *text; // null for any other parameter
-    uint32_t size;    // bytes of it, with its NUL
-    uint32_t read;    // bytes of the parameter up to the END
-};
-
-// Other parameters are read step by step, and so are all that have something to trace.
-Plain findPlain(const qvsWbxmlDecoder *decoder, uint8_t token)
-{
-    const uint32_t left = bytesLeft(decoder);
-    if (left <= kPlainStart || traceSink) {
-        return {};
-    }
-    const uint8_t *read = decoder->ptBuffer->pHead;
-    if (read[0] != token || read[1] != attr::kValue) {
-        return {};
-    }
-    if (read[2] != wbxml::kStrI) {
-        const char *text = read[kPlainStart] == wbxml::kEnd ? valueText(read[2]) : nullptr;
-        const uint32_t size = text ? qvsStrlen(text) + 1 : 0;
-        return {text, size, kPlainStart};
-    }
-    const uint8_t *text = read + kPlainStart;
-    const auto *nul = static_cast<const uint8_t *>(memchr(text, '\0', left - kPlainStart));
-    if (!nul || nul + 1 == read + left || nul[1] != wbxml::kEnd) {
-        return {};
-    }
-    const auto size = static_cast<uint32_t>(nul + 1 - text);
-    return {text, size, kPlainStart + size};
-}
-
-// Reads the usual parameter into `*text`, which the caller owns.
-// kept[repeated-parm]: the text that was there stays allocated.
-qvsResult takePlain(qvsWbxmlDecoder *decoder, DecodeState *state, const Plain &plain, char **text)
-{
-    auto *block = static_cast<char *>(newBlock(plain.size + kSpareZeros, kDecoderModule));
-    if (block) {
-        memcpy(block, plain.text, plain.size);
-    } else if (plain.read > kPlainStart) {
-        decoder->ptBuffer->pHead += kPlainStart;
-        return QVS_ERROR_WBXML_NO_DATA;
-    }
-    // kept[lookup-without-memory]: a value token counts as read also without memory for its text.
-    state->textRead += plain.size - 1;
-    decoder->ptBuffer->pHead += plain.read;
-    *text = block;
-    return QVS_OK;
-}
-
-[[gnu::noinline, gnu::cold]] qvsResult readAnyText(qvsWbxmlDecoder *decoder, char **text,
-                                                   uint8_t token)
-{
-    Text read;
-    if (qvsResult result = readAnyPair(decoder, &read, token)) {
-        return result;
-    }
-    *text = read.take();
-    return QVS_OK;
-}
-
-// Reads NAME and VALUE of one parameter into `*text`. The usual ones are read in one go, in half
-// the instructions. What comes near the limit of text is read step by step too.
-inline qvsResult readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token)
-{
-    const Plain plain = findPlain(decoder, token);
-    if (!state || !plain.text || state->textRead + plain.size > kTextAlways) {
-        return readAnyText(decoder, text, token);
-    }
-    return takePlain(decoder, state, plain, text);
-}
-
 // Adds a text to a list of texts, which takes it over. A null text adds nothing. `*end` is the
 // list's last node.
 qvsResult addText(const DecodeState *state, qvsList **list, char *text, qvsListNode **end)
 {
-    if (addItem(arenaOf(state), list, text, end) == QVS_OK) {
+    if (addItem(state->arena, list, text, end) == QVS_OK) {
         return QVS_OK;
     }
     if (!*list) {
@@ -136,19 +62,11 @@ qvsResult readItem(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
                    const char **last, qvsListNode **end)
 {
     char *item = nullptr;
-    if (!*last) {
-        if (qvsResult result = readText(decoder, state, &item, token)) {
-            return result;
-        }
+    if (qvsResult result = readPair(decoder, state, &item, token, *last)) {
+        return result;
+    }
+    if (item) {
         *last = item;
-    } else {
-        Text text;
-        text.before = *last;
-        if (qvsResult result = readAnyPair(decoder, &text, token)) {
-            return result;
-        }
-        *last = text.data ? text.data : text.before;
-        item = text.take();
     }
     return addText(state, list, item, end);
 }
@@ -177,7 +95,7 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
     if (result == QVS_OK) {
         *list = built;
     } else if (!*list && built) {
-        releaseTexts(arenaOf(state), built);
+        releaseTexts(state->arena, built);
         *end = nullptr;
     }
     return result;
@@ -253,34 +171,43 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
     case ParmType::kList:
         return readList(decoder, state, record, ListField{parm->field, parm->place});
     default:
-        return table.reader(decoder, record);
+        return table.reader(decoder, state, record);
     }
 }
 
 } // namespace
 
+// kept[repeated-parm]: the text that was there stays allocated.
+qvsResult qvs::readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token)
+{
+    return readPair(decoder, state, text, token, nullptr);
+}
+
 qvsResult qvsClientProvWbxmlDecoderParamString(qvsWbxmlDecoder *decoder, char **text, uint8_t token)
 {
-    return readText(decoder, stateOf(decoder), text, token);
+    DecodeState alone;
+    return readText(decoder, &alone, text, token);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvsList **list,
                                                    uint8_t /*token*/)
 {
+    DecodeState alone;
     qvsListNode *unknown = nullptr;
-    return readOnto(decoder, stateOf(decoder), list, &unknown);
+    return readOnto(decoder, &alone, list, &unknown);
 }
 
 qvsResult qvs::readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, ListField list)
 {
     qvsListNode *unknown = nullptr;
-    qvsListNode **end = state && state->last ? state->last + list.place : &unknown;
+    qvsListNode **end = state->open ? state->open->last + list.place : &unknown;
     return readOnto(decoder, state, listAt(record, list.number), end);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
 {
-    return readParms(decoder, stateOf(decoder), record, table);
+    DecodeState alone;
+    return readParms(decoder, &alone, record, table);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,

@@ -46,26 +46,21 @@ void traceParm(uint8_t token)
     trace("SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME%s%s", *name ? "_" : "", name);
 }
 
-qvsResult readAppNamed(qvsWbxmlDecoder *decoder, void *record)
-{
-    auto *application = static_cast<qvsWapApplication *>(record);
-    return qvsClientProvWbxmlDecoderParamAppNameString(decoder, &application, attr::kName);
-}
-
 // The comma token where a name is expected: one more value of AAUTHTYPE.
-qvsResult readComma(qvsWbxmlDecoder *decoder, void *record)
+qvsResult readComma(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 {
     char **types = &static_cast<qvsWapAppAuth *>(record)->pszAAuthType;
-    const qvsResult result = qvsCommaAdd(decoder, types);
+    const qvsResult result =
+        commaAdd(decoder, state, types, state->open ? &state->open->joined : nullptr);
     trace("--------------------------[%s]", *types ? *types : "");
     return result;
 }
 
 // kept[resource-startpage]: a STARTPAGE that leaves the field without a value stores "startpage".
-qvsResult readStartPage(qvsWbxmlDecoder *decoder, void *record)
+qvsResult readStartPage(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 {
     char **page = &static_cast<qvsWapResource *>(record)->pszStartPage;
-    if (qvsResult result = qvsClientProvWbxmlDecoderParamString(decoder, page, page1::kStartPage)) {
+    if (qvsResult result = readText(decoder, state, page, page1::kStartPage)) {
         return result;
     }
     if (!*page) {
@@ -98,6 +93,33 @@ constexpr NamedParm kNamed[] = {
     {"XCAP_TID_HEADER", QVS_FIELD(R, pszXcapTidHeader)},
     {"FROM", QVS_FIELD(R, pszFrom)},
 };
+
+// The value of a name that is not listed is read and dropped.
+qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag)
+{
+    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamNameString";
+    ParmName name;
+    if (qvsResult result = readParmName(decoder, state, tag, kLabel, false, &name)) {
+        return result;
+    }
+    if (name.next != attr::kValue) {
+        return QVS_OK;
+    }
+    if (char **field = findNamed(record, kNamed, name.text)) {
+        return readValue(decoder, state, field);
+    }
+    Text dropped;
+    const qvsResult result = paramValue(decoder, state, &dropped, lookAt);
+    if (result == QVS_OK) {
+        trace("[%s] pszValue [%s]", kLabel, dropped.str() ? dropped.str() : "");
+    }
+    return result;
+}
+
+qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
+{
+    return readNamed(decoder, state, record, attr::kName);
+}
 } // namespace application
 
 namespace appAddr {
@@ -139,7 +161,7 @@ constexpr Parm kParms[] = {
 constexpr ParmTable qvs::kApplicationParms = {
     .name = "Application",
     .rows = application::kParms,
-    .reader = readAppNamed,
+    .reader = application::readName,
     .onParm = traceParm,
     .onToken = traceToken,
 };
@@ -188,21 +210,6 @@ qvsResult qvsClientProvWbxmlDecoderParamResource(qvsWbxmlDecoder *decoder, qvsWa
 qvsResult qvsClientProvWbxmlDecoderParamAppNameString(qvsWbxmlDecoder *decoder,
                                                       qvsWapApplication **record, uint8_t tag)
 {
-    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamNameString";
-    ParmName name;
-    if (qvsResult result = readParmName(decoder, tag, kLabel, false, &name)) {
-        return result;
-    }
-    if (name.next != attr::kValue) {
-        return QVS_OK;
-    }
-    if (char **field = findNamed(*record, application::kNamed, name.text.data)) {
-        return readParmValue(decoder, field);
-    }
-    Text dropped;
-    const qvsResult result = paramValue(decoder, &dropped);
-    if (result == QVS_OK) {
-        trace("[%s] pszValue [%s]", kLabel, dropped.data ? dropped.data : "");
-    }
-    return result;
+    DecodeState alone;
+    return application::readNamed(decoder, &alone, *record, tag);
 }

@@ -15,6 +15,27 @@ constexpr Parm kNameAlone[] = {
     {attr::kName, kByReader},
 };
 
+// Reads one named parameter of `record`. A name that is not listed leaves its value to the loop,
+// which refuses it.
+qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag,
+                    const Rows<NamedParm> &names, const char *label)
+{
+    ParmName name;
+    if (qvsResult result = readParmName(decoder, state, tag, label, false, &name)) {
+        return result;
+    }
+    if (name.next == attr::kValue) {
+        // kept[named-unknown-refused]: the VALUE of an unknown name is not read.
+        if (char **field = findNamed(record, names, name.text)) {
+            if (qvsResult result = readValue(decoder, state, field)) {
+                return result;
+            }
+        }
+    }
+    trace("[%s] nID [0x%x]", label, name.next);
+    return QVS_OK;
+}
+
 namespace roaming {
 using R = qvsWapRoaming;
 constexpr NamedParm kNamed[] = {
@@ -22,10 +43,10 @@ constexpr NamedParm kNamed[] = {
     {"SYNC-DEFAULT", QVS_FIELD(R, pszSyncDefault)},
 };
 
-qvsResult read(qvsWbxmlDecoder *decoder, void *record)
+qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 {
-    auto *typed = static_cast<R *>(record);
-    return qvsClientProvWbxmlDecoderParamRoamingNameString(decoder, &typed, attr::kName);
+    return readNamed(decoder, state, record, attr::kName, kNamed,
+                     "qvsClientProvWbxmlDecoderParamRoamingNameString");
 }
 } // namespace roaming
 
@@ -46,10 +67,10 @@ constexpr NamedParm kNamed[] = {
     {"PRIORITY", QVS_FIELD(R, pszPriority)},
 };
 
-qvsResult read(qvsWbxmlDecoder *decoder, void *record)
+qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 {
-    auto *typed = static_cast<R *>(record);
-    return qvsClientProvWbxmlDecoderParamWifiNameString(decoder, &typed, attr::kName);
+    return readNamed(decoder, state, record, attr::kName, kNamed,
+                     "qvsClientProvWbxmlDecoderParamNameString");
 }
 } // namespace wifi
 
@@ -59,55 +80,35 @@ constexpr NamedParm kNamed[] = {
     {"ePDG FQDN", QVS_FIELD(R, pszEpdgFqdn)},
 };
 
-qvsResult read(qvsWbxmlDecoder *decoder, void *record)
+qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 {
-    auto *typed = static_cast<R *>(record);
-    return qvsClientProvWbxmlDecoderParamVoWifiNameString(decoder, &typed, attr::kName);
+    return readNamed(decoder, state, record, attr::kName, kNamed,
+                     "qvsClientProvWbxmlDecoderParamNameString");
 }
 } // namespace voWifi
 
-// Reads one named parameter of `record`. A name that is not listed leaves its value to the loop,
-// which refuses it.
-qvsResult readNamed(qvsWbxmlDecoder *decoder, void *record, uint8_t tag,
-                    const Rows<NamedParm> &names, const char *label)
-{
-    ParmName name;
-    if (qvsResult result = readParmName(decoder, tag, label, false, &name)) {
-        return result;
-    }
-    if (name.next == attr::kValue) {
-        // kept[named-unknown-refused]: the VALUE of an unknown name is not read.
-        if (char **field = findNamed(record, names, name.text.data)) {
-            if (qvsResult result = readParmValue(decoder, field)) {
-                return result;
-            }
-        }
-    }
-    trace("[%s] nID [0x%x]", label, name.next);
-    return QVS_OK;
-}
-
 } // namespace
 
-qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, uint8_t tag, const char *label,
-                            bool mayBeEmpty, ParmName *name)
+qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag,
+                            const char *label, bool isKept, ParmName *name)
 {
     trace("[%s] nTagID [0x%x]", label, tag);
-    if (qvsResult result = qvsClientProvWbxmlDecoderCheckAttr(decoder, tag)) {
+    if (qvsResult result = checkAttr(decoder, tag)) {
         return result;
     }
-    qvsResult result = content(decoder, &name->text);
-    if (result == QVS_OK && !mayBeEmpty && name->text.length == 0) {
+    qvsResult result =
+        isKept ? content(decoder, state, &name->text) : lookAt(decoder, state, &name->text);
+    if (result == QVS_OK && !isKept && name->text.length == 0) {
         result = QVS_ERROR_FAILED;
     }
     if (result != QVS_OK) {
         // Silent where not even a part of a name was read.
-        if (mayBeEmpty || name->text.data || result == QVS_ERROR_FAILED) {
+        if (isKept || name->text.str() || result == QVS_ERROR_FAILED) {
             trace("[%s] pszName NULL", label);
         }
         return result;
     }
-    trace("[%s] pszName [%s]", label, name->text.data ? name->text.data : "");
+    trace("[%s] pszName [%s]", label, name->text.str() ? name->text.str() : "");
     if (!peekByte(decoder, &name->next)) {
         return QVS_ERROR_WBXML_NO_DATA;
     }
@@ -115,20 +116,13 @@ qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, uint8_t tag, const char *l
     return QVS_OK;
 }
 
-qvsResult qvs::readParmValue(qvsWbxmlDecoder *decoder, char **field)
+char **qvs::findNamed(void *record, const Rows<NamedParm> &names, const Text &name)
 {
-    Text value;
-    if (qvsResult result = paramValue(decoder, &value)) {
-        return result;
-    }
-    *field = value.take();
-    return QVS_OK;
-}
-
-char **qvs::findNamed(void *record, const Rows<NamedParm> &names, const char *name)
-{
+    const char *const text = name.str();
+    const uint32_t length = name.length;
     for (const NamedParm &known : names) {
-        if (qvsStrcmp(name, known.name) == 0) {
+        if (known.name[0] == text[0] && length < sizeof known.name && known.name[length] == '\0' &&
+            memcmp(text, known.name, length) == 0) {
             return textAt(record, known.field.number);
         }
     }
@@ -164,7 +158,8 @@ qvsResult qvsClientProvWbxmlDecoderParamRoaming(qvsWbxmlDecoder *decoder, qvsWap
 qvsResult qvsClientProvWbxmlDecoderParamRoamingNameString(qvsWbxmlDecoder *decoder,
                                                           qvsWapRoaming **record, uint8_t tag)
 {
-    return readNamed(decoder, *record, tag, roaming::kNamed,
+    DecodeState alone;
+    return readNamed(decoder, &alone, *record, tag, roaming::kNamed,
                      "qvsClientProvWbxmlDecoderParamRoamingNameString");
 }
 
@@ -176,7 +171,8 @@ qvsResult qvsClientProvWbxmlDecoderParamWifi(qvsWbxmlDecoder *decoder, qvsWapWif
 qvsResult qvsClientProvWbxmlDecoderParamWifiNameString(qvsWbxmlDecoder *decoder,
                                                        qvsWapWifi **record, uint8_t tag)
 {
-    return readNamed(decoder, *record, tag, wifi::kNamed,
+    DecodeState alone;
+    return readNamed(decoder, &alone, *record, tag, wifi::kNamed,
                      "qvsClientProvWbxmlDecoderParamNameString");
 }
 
@@ -188,6 +184,7 @@ qvsResult qvsClientProvWbxmlDecoderParamVoWifi(qvsWbxmlDecoder *decoder, qvsWapV
 qvsResult qvsClientProvWbxmlDecoderParamVoWifiNameString(qvsWbxmlDecoder *decoder,
                                                          qvsWapVoWifi **record, uint8_t tag)
 {
-    return readNamed(decoder, *record, tag, voWifi::kNamed,
+    DecodeState alone;
+    return readNamed(decoder, &alone, *record, tag, voWifi::kNamed,
                      "qvsClientProvWbxmlDecoderParamNameString");
 }

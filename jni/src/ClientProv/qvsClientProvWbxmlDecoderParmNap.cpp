@@ -8,10 +8,29 @@ namespace {
 // What pszInit points at: never allocated, never released.
 char kInit[] = "empty";
 
-qvsResult readNapNamed(qvsWbxmlDecoder *decoder, void *record)
+qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapNapDef *record, uint8_t tag)
 {
-    auto *napDef = static_cast<qvsWapNapDef *>(record);
-    return qvsClientProvWbxmlDecoderParamNapNameString(decoder, &napDef, attr::kName);
+    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamNameString";
+    ParmName name;
+    if (qvsResult result = readParmName(decoder, state, tag, kLabel, false, &name)) {
+        return result;
+    }
+    // kept[napdef-init]: INIT is remembered when it has no value, as a constant text; the value of
+    // any named parameter is read and dropped.
+    if (name.next == wbxml::kEnd && qvsStrcmp(name.text.str(), "INIT") == 0) {
+        record->pszInit = kInit;
+        trace("[%s] INIT Value is NULL!!!!!!!!", kLabel);
+    }
+    if (name.next == attr::kValue) {
+        Text dropped;
+        return paramValue(decoder, state, &dropped, lookAt);
+    }
+    return QVS_OK;
+}
+
+qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
+{
+    return readNamed(decoder, state, static_cast<qvsWapNapDef *>(record), attr::kName);
 }
 
 namespace napDef {
@@ -77,7 +96,7 @@ constexpr Parm kParms[] = {
 constexpr ParmTable qvs::kNapDefParms = {
     .name = "NapDef",
     .rows = napDef::kParms,
-    .reader = readNapNamed,
+    .reader = readName,
     .onRefused = napDef::traceRefused,
 };
 
@@ -110,20 +129,6 @@ qvsResult qvsClientProvWbxmlDecoderParamValidity(qvsWbxmlDecoder *decoder, qvsWa
 qvsResult qvsClientProvWbxmlDecoderParamNapNameString(qvsWbxmlDecoder *decoder,
                                                       qvsWapNapDef **record, uint8_t tag)
 {
-    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamNameString";
-    ParmName name;
-    if (qvsResult result = readParmName(decoder, tag, kLabel, false, &name)) {
-        return result;
-    }
-    // kept[napdef-init]: INIT is remembered when it has no value, as a constant text; the value of
-    // any named parameter is read and dropped.
-    if (name.next == wbxml::kEnd && qvsStrcmp(name.text.data, "INIT") == 0) {
-        (*record)->pszInit = kInit;
-        trace("[%s] INIT Value is NULL!!!!!!!!", kLabel);
-    }
-    if (name.next == attr::kValue) {
-        Text dropped;
-        return paramValue(decoder, &dropped);
-    }
-    return QVS_OK;
+    DecodeState alone;
+    return readNamed(decoder, &alone, *record, tag);
 }

@@ -5,11 +5,34 @@ using namespace qvs;
 
 namespace {
 
-qvsResult readVendorNamed(qvsWbxmlDecoder *decoder, void *record)
+qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, char **name, char **value,
+                    uint8_t tag)
+{
+    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamVendorNameString";
+    ParmName read;
+    if (qvsResult result = readParmName(decoder, state, tag, kLabel, true, &read)) {
+        return result;
+    }
+    if (read.next == wbxml::kEnd) {
+        // kept[vendor-name-trace]: traced under the other readers' name.
+        trace("[qvsClientProvWbxmlDecoderParamNameString] nID [0x%x]", read.next);
+    }
+    if (read.next == attr::kValue) {
+        if (qvsResult result = readValue(decoder, state, value)) {
+            return result;
+        }
+        trace("--------------------------[%s]", *value ? *value : "");
+    }
+    // kept[vendor-any-name]: no name is compared; the last one and its value replace earlier ones,
+    // which stay allocated.
+    *name = read.text.take();
+    return QVS_OK;
+}
+
+qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 {
     auto *vendor = static_cast<qvsWapVendorConfig *>(record);
-    return qvsClientProvWbxmlDecoderParamVendorNameString(decoder, &vendor->pszParamName,
-                                                          &vendor->pszParamValue, attr::kName);
+    return readNamed(decoder, state, &vendor->pszParamName, &vendor->pszParamValue, attr::kName);
 }
 
 namespace bootstrap {
@@ -63,7 +86,7 @@ constexpr ParmTable qvs::kClientIdentityParms = {
 constexpr ParmTable qvs::kVendorConfigParms = {
     .name = "VendorConfig",
     .rows = vendorConfig::kParms,
-    .reader = readVendorNamed,
+    .reader = readName,
 };
 
 constexpr ParmTable qvs::kAccessParms = {
@@ -96,23 +119,6 @@ qvsResult qvsClientProvWbxmlDecoderParamAccess(qvsWbxmlDecoder *decoder, qvsWapA
 qvsResult qvsClientProvWbxmlDecoderParamVendorNameString(qvsWbxmlDecoder *decoder, char **name,
                                                          char **value, uint8_t tag)
 {
-    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamVendorNameString";
-    ParmName read;
-    if (qvsResult result = readParmName(decoder, tag, kLabel, true, &read)) {
-        return result;
-    }
-    if (read.next == wbxml::kEnd) {
-        // kept[vendor-name-trace]: traced under the other readers' name.
-        trace("[qvsClientProvWbxmlDecoderParamNameString] nID [0x%x]", read.next);
-    }
-    if (read.next == attr::kValue) {
-        if (qvsResult result = readParmValue(decoder, value)) {
-            return result;
-        }
-        trace("--------------------------[%s]", *value ? *value : "");
-    }
-    // kept[vendor-any-name]: no name is compared; the last one and its value replace earlier ones,
-    // which stay allocated.
-    *name = read.text.take();
-    return QVS_OK;
+    DecodeState alone;
+    return readNamed(decoder, &alone, name, value, tag);
 }

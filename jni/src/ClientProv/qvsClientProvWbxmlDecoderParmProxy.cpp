@@ -6,13 +6,12 @@ using namespace qvs;
 namespace {
 
 // kept[pxphysical-domain]: a DOMAIN that cannot be read is traced and the parm goes on.
-qvsResult readPhysicalDomain(qvsWbxmlDecoder *decoder, void *record)
+qvsResult readPhysicalDomain(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 {
-    if (readList(decoder, stateOf(decoder), record, QVS_FIELD(qvsWapPxPhysical, ptDomainList)) !=
-        QVS_OK) {
+    if (readList(decoder, state, record, QVS_FIELD(qvsWapPxPhysical, ptDomainList)) != QVS_OK) {
         trace("[ERROR] qvsClientProvWbxmlDecoderParamListString Fail");
     }
-    return textLimitPassed(decoder) ? QVS_ERROR_NO_MEMORY : QVS_OK;
+    return state->textLimit ? QVS_ERROR_NO_MEMORY : QVS_OK;
 }
 
 namespace pxLogical {

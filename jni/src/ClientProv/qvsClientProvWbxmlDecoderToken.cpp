@@ -16,96 +16,56 @@ uint8_t byteBefore(const qvsWbxmlDecoder *decoder)
     return buffer->pHead - buffer->pStorage >= 2 ? buffer->pHead[-2] : 0;
 }
 
-// A token that stands for no text: as a text of that one byte, or skipped with what follows.
-qvsResult unknownValue(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
+// Skips to the END that closes the nesting.
+qvsResult skipElement(qvsWbxmlDecoder *decoder, DecodeState *state)
 {
-    if (token < 0x80) {
-        trace("WARNING!!!!!!!! Not Support Type Numberic nTag=[%x]", byteBefore(decoder));
-        stepBack(decoder);
-        return qvsClientProvWbxmlDecoderSkipElement(decoder);
+    // kept[skip-counts-tokens]: every token that is no string and no END counts as one level, tags,
+    // attribute starts and value tokens alike; an END outside them counts below zero.
+    int64_t depth = 0;
+    for (;;) {
+        uint8_t token = 0;
+        if (!takeByte(decoder, &token)) {
+            trace("qvsClientProvWbxmlDecoderSkipElement Error Code:%d",
+                  static_cast<int>(QVS_ERROR_WBXML_NO_DATA));
+            return QVS_ERROR_WBXML_NO_DATA;
+        }
+        if (token == wbxml::kSwitchPage) {
+            (void)takeByte(decoder, &token);
+        } else if (token == wbxml::kEnd) {
+            --depth;
+            if (depth == 0) {
+                stepBack(decoder); // kept[skip-end-left]: the closing END is left for the caller.
+                return QVS_OK;
+            }
+        } else if (wbxml::isString(token) || token == wbxml::kOpaque) {
+            stepBack(decoder);
+            Text scratch;
+            if (qvsResult result = lookAt(decoder, state, &scratch)) {
+                return result;
+            }
+        } else {
+            ++depth;
+        }
     }
-    char *block = static_cast<char *>(qvsMemAlloc_debug(2 + kSpareZeros, kDecoderModule, __LINE__));
-    if (!block) {
-        return QVS_ERROR_WBXML_NO_DATA;
-    }
-    block[0] = static_cast<char>(token);
-    block[1] = '\0';
-    // kept[unknown-token-replaces]: the token takes the place of a text that was there, which
-    // stays allocated.
-    text->data = block;
-    text->length = 1;
-    text->capacity = 2;
-    return QVS_OK;
-}
-
-// Reads a string or opaque data, whose token has just been read.
-qvsResult readData(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
-{
-    if (wbxml::isString(token)) {
-        return getString(decoder, token, text) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
-    }
-    uint32_t length = 0;
-    return getStrExtension(decoder, token, text, &length) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
-}
-
-qvsResult readValue(qvsWbxmlDecoder *decoder, Text *text)
-{
-    uint8_t token = 0;
-    if (!takeByte(decoder, &token)) {
-        return QVS_ERROR_WBXML_NO_DATA;
-    }
-    if (wbxml::isString(token) || token == wbxml::kOpaque) {
-        return readData(decoder, token, text);
-    }
-    if (getParamTokenVal(decoder, token, text) == QVS_OK) {
-        return QVS_OK;
-    }
-    return unknownValue(decoder, token, text);
-}
-
-// The result of reading a value, traced.
-qvsResult endOfContent(const qvsWbxmlDecoder *decoder, qvsResult result)
-{
-    if (textLimitPassed(decoder)) {
-        result = QVS_ERROR_NO_MEMORY;
-    }
-    trace("qvsClientProvWbxmlDecoderContent Error:%d", static_cast<int>(result));
-    return result;
-}
-
-// Skips a string or opaque data, whose token has just been read.
-qvsResult skipValue(qvsWbxmlDecoder *decoder, uint8_t token)
-{
-    Text scratch;
-    return endOfContent(decoder, readData(decoder, token, &scratch));
 }
 
 } // namespace
 
-bool qvs::getString(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
+qvsResult qvs::readUnknown(qvsWbxmlDecoder *decoder, DecodeState *state, char **text)
 {
-    do {
-        bool joined = false;
-        switch (token) {
-        case wbxml::kStrI:
-            joined = getStr(decoder, text);
-            break;
-        case wbxml::kStrT:
-            joined = getStrTable(decoder, text);
-            break;
-        case wbxml::kEnd:
-        case attr::kValue:
-            stepBack(decoder);
-            return true;
-        default:
-            joined = getParamTokenVal(decoder, token, text) == QVS_OK;
-            break;
-        }
-        if (!joined) {
-            return false;
-        }
-    } while (takeByte(decoder, &token));
-    return false;
+    const uint8_t token = decoder->ptBuffer->pHead[-1];
+    if (token < 0x80) {
+        trace("WARNING!!!!!!!! Not Support Type Numberic nTag=[%x]", byteBefore(decoder));
+        stepBack(decoder);
+        return skipElement(decoder, state);
+    }
+    *text = newText(2, kDecoderModule);
+    if (!*text) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    memset(*text, 0, 2 + kSpareZeros);
+    **text = static_cast<char>(token);
+    return QVS_OK;
 }
 
 qvsResult qvs::noElement(const qvsWbxmlDecoder *decoder)
@@ -115,11 +75,6 @@ qvsResult qvs::noElement(const qvsWbxmlDecoder *decoder)
         return QVS_ERROR_FAILED;
     }
     return QVS_ERROR_WBXML_NO_DATA;
-}
-
-qvsResult qvs::content(qvsWbxmlDecoder *decoder, Text *text)
-{
-    return endOfContent(decoder, readValue(decoder, text));
 }
 
 qvsResult qvsClientProvWbxmlDecoderReadElement(qvsWbxmlDecoder *decoder, uint8_t *tag)
@@ -245,51 +200,31 @@ qvsResult qvsClientProvWbxmlDecoderCheckCodePage(qvsWbxmlDecoder *decoder)
 
 qvsResult qvsClientProvWbxmlDecoderContent(qvsWbxmlDecoder *decoder, char **text)
 {
+    if (!decoder || !decoder->ptBuffer) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    DecodeState alone;
     Text built(*text);
-    const qvsResult result = content(decoder, &built);
+    const qvsResult result = content(decoder, &alone, &built);
     *text = built.take();
     return result;
 }
 
 uint32_t qvsClientProvWbxmlDecoderGetString(qvsWbxmlDecoder *decoder, char **text)
 {
-    uint8_t token = 0;
-    stepBack(decoder);
-    if (!takeByte(decoder, &token)) {
+    if (!decoder || !decoder->ptBuffer) {
         return 0;
     }
+    stepBack(decoder);
+    DecodeState alone;
     Text built(*text);
-    const bool read = getString(decoder, token, &built);
+    const bool read = readRun(decoder, &alone, &built);
     *text = built.take();
     return read ? 1 : 0;
 }
 
 qvsResult qvsClientProvWbxmlDecoderSkipElement(qvsWbxmlDecoder *decoder)
 {
-    // kept[skip-counts-tokens]: every token that is no string and no END counts as one level, tags,
-    // attribute starts and value tokens alike; an END outside them counts below zero.
-    int64_t depth = 0;
-    for (;;) {
-        uint8_t token = 0;
-        if (!takeByte(decoder, &token)) {
-            trace("qvsClientProvWbxmlDecoderSkipElement Error Code:%d",
-                  static_cast<int>(QVS_ERROR_WBXML_NO_DATA));
-            return QVS_ERROR_WBXML_NO_DATA;
-        }
-        if (token == wbxml::kSwitchPage) {
-            (void)takeByte(decoder, &token);
-        } else if (token == wbxml::kEnd) {
-            --depth;
-            if (depth == 0) {
-                stepBack(decoder); // kept[skip-end-left]: the closing END is left for the caller.
-                return QVS_OK;
-            }
-        } else if (wbxml::isString(token) || token == wbxml::kOpaque) {
-            if (qvsResult result = skipValue(decoder, token)) {
-                return result;
-            }
-        } else {
-            ++depth;
-        }
-    }
+    DecodeState alone;
+    return skipElement(decoder, &alone);
 }

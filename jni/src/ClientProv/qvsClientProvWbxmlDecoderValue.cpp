@@ -9,15 +9,14 @@ using namespace qvs;
 
 namespace {
 
-// How a token's text joins a text that is already there.
-enum class Join : uint8_t {
-    kDirect, // right behind it
-    kComma,  // behind a comma
-    kHidden, // behind its terminator
-};
-
 struct ValueToken {
+    template <size_t N>
+    consteval ValueToken(uint8_t t, const char (&s)[N]) : token(t), length(N - 1), text(s)
+    {
+    }
+
     uint8_t token;
+    uint8_t length;
     const char *text;
 };
 
@@ -102,90 +101,22 @@ consteval Meanings firstHits()
 
 constexpr Meanings kMeanings = firstHits();
 
-Meaning meaningOf(uint8_t token)
-{
-    return token < kFirstValue ? Meaning{} : kMeanings.of[token - kFirstValue];
-}
+} // namespace
 
-bool joinText(qvsWbxmlDecoder *decoder, Text *text, const char *added, Join join)
+bool qvs::tokenPiece(uint8_t token, Piece *piece)
 {
-    const uint32_t length = qvsStrlen(added);
-    if (!text->holdsText() || join == Join::kDirect) {
-        return append(decoder, text, added, length);
-    }
-    char *end = reserve(decoder, text, length + 1);
-    if (!end) {
+    const Meaning meaning = token < kFirstValue ? Meaning{} : kMeanings.of[token - kFirstValue];
+    if (meaning.row == 0) {
         return false;
     }
-    end[0] = join == Join::kComma ? ',' : '\0';
-    (void)qvsStrcpy(end + 1, added);
-    if (join == Join::kComma) {
-        text->length += length + 1;
-    }
+    const ValueTable &table = kTables[meaning.table];
+    const ValueToken &row = table.rows[meaning.row - 1];
+    *piece = {row.text, row.length, table.join};
     return true;
 }
 
-} // namespace
-
-const char *qvs::valueText(uint8_t token)
-{
-    const Meaning meaning = meaningOf(token);
-    return meaning.row ? kTables[meaning.table].rows[meaning.row - 1].text : nullptr;
-}
-
-qvsResult qvs::getParamTokenVal(qvsWbxmlDecoder *decoder, uint8_t token, Text *text)
-{
-    const Meaning meaning = meaningOf(token);
-    if (meaning.row == 0) {
-        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
-    }
-    const ValueTable &table = kTables[meaning.table];
-    if (!joinText(decoder, text, table.rows[meaning.row - 1].text, table.join)) {
-        // kept[lookup-without-memory]: the text stays as it was and the token counts as read.
-        traceException("[Error] [qvsClientProvWbxmlDecoderGetParamTokenVal] pszData NULL",
-                       kDecoderModule, __LINE__);
-    }
-    return QVS_OK;
-}
-
-qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, Text *text)
-{
-    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
-        return result;
-    }
-    uint8_t next = 0;
-    bool present = peekByte(decoder, &next);
-    if (present && next == wbxml::kSwitchPage) {
-        (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
-        present = peekByte(decoder, &next);
-        next &= wbxml::kTagMask;
-    }
-    if (!present) {
-        return QVS_ERROR_WBXML_NO_DATA;
-    }
-    if (next == wbxml::kEnd) {
-        return QVS_OK;
-    }
-    return content(decoder, text);
-}
-
-qvsResult qvsClientProvWbxmlDecoderGetParamTokenVal(uint8_t token, char **text)
-{
-    Text built(*text);
-    const qvsResult result = getParamTokenVal(nullptr, token, &built);
-    *text = built.take();
-    return result;
-}
-
-qvsResult qvsClientProvWbxmlDecoderParamValue(qvsWbxmlDecoder *decoder, char **text)
-{
-    Text built(*text);
-    const qvsResult result = paramValue(decoder, &built);
-    *text = built.take();
-    return result;
-}
-
-qvsResult qvsCommaAdd(qvsWbxmlDecoder *decoder, char **text)
+qvsResult qvs::commaAdd(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                        JoinedText *known)
 {
     uint8_t token = 0;
     if (!takeByte(decoder, &token) || !peekByte(decoder, &token)) {
@@ -198,24 +129,52 @@ qvsResult qvsCommaAdd(qvsWbxmlDecoder *decoder, char **text)
             return QVS_ERROR_WBXML_NO_DATA;
         }
     }
-    const DecodeState *state = stateOf(decoder);
-    JoinedText *known = state ? state->joined : nullptr;
     Text joined(*text, known);
     qvsResult result = QVS_OK;
+    Piece piece = {",", 1};
     if (!behindSwitch && wbxml::isString(token)) {
-        if (append(decoder, &joined, ",", 1)) {
-            result = content(decoder, &joined);
-        } else {
-            traceException("[Error] [qvsClientProvWbxmlDecoderGetParamTokenVal] pszData NULL",
-                           kDecoderModule, __LINE__);
-            result = QVS_ERROR_NO_MEMORY;
+        const uint32_t length = joined.length;
+        (void)append(state, &joined, piece);
+        result = QVS_ERROR_NO_MEMORY;
+        if (joined.length > length) {
+            result = content(decoder, state, &joined);
         }
     } else {
         // kept[comma-drops-unknown]: a token that stands for no text is dropped.
-        (void)getParamTokenVal(decoder, token, &joined);
-        (void)takeByte(decoder, &token);
-        result = textLimitPassed(decoder) ? QVS_ERROR_NO_MEMORY : QVS_OK;
+        if (tokenPiece(token, &piece)) {
+            (void)append(state, &joined, piece);
+        }
+        ++decoder->ptBuffer->pHead;
+        result = state->textLimit ? QVS_ERROR_NO_MEMORY : QVS_OK;
     }
     *text = joined.takeKnown(known);
     return result;
+}
+
+qvsResult qvsClientProvWbxmlDecoderGetParamTokenVal(uint8_t token, char **text)
+{
+    Piece piece;
+    if (!tokenPiece(token, &piece)) {
+        return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    DecodeState alone;
+    Text built(*text);
+    (void)append(&alone, &built, piece); // counts as read in any case
+    *text = built.take();
+    return QVS_OK;
+}
+
+qvsResult qvsClientProvWbxmlDecoderParamValue(qvsWbxmlDecoder *decoder, char **text)
+{
+    DecodeState alone;
+    Text built(*text);
+    const qvsResult result = paramValue(decoder, &alone, &built);
+    *text = built.take();
+    return result;
+}
+
+qvsResult qvsCommaAdd(qvsWbxmlDecoder *decoder, char **text)
+{
+    DecodeState alone;
+    return commaAdd(decoder, &alone, text, nullptr);
 }

@@ -1,10 +1,11 @@
-// What the library remembers of a decode. A host may make the record of a decoder itself, with
-// nothing behind it; behind one that the library made stands the state of its decode. Private,
-// C++ only.
+// What the library remembers of a decode, and the layers of a decode that share it. It is a
+// parameter: the record of a decoder is a host's to make, and holds the six fields that hosts know.
+// Private, C++ only.
 #ifndef QVSDECODING_H
 #define QVSDECODING_H
 
 #include "qvsClientProvWbxml.h"
+#include "qvsFields.h"
 
 #include <stdint.h>
 
@@ -19,43 +20,40 @@ struct JoinedText {
     uint32_t capacity; // bytes of the block
 };
 
+// What is remembered of a record that the body reads.
+struct OpenRecord {
+    JoinedText joined;             // of an APPAUTH
+    qvsListNode *last[kMostLists]; // tails of its lists, by their places
+};
+
+// The state of one decode. As it is here it serves a single step that a host calls: its texts are
+// not limited, it walks to the tail of a list, and all it makes is a block.
 struct DecodeState {
-    uint64_t textRead = 0;        // bytes of all texts read or appended so far
-    uint32_t tableBlock = 0;      // bytes of the block at pStringTable that were read for it
-    bool textLimit = false;       // the texts of the message passed their limit
-    JoinedText *joined = nullptr; // of the APPAUTH being read by the body; null outside it
-    qvsListNode **last = nullptr; // of the lists of the record being read by the body; null outside
-    qvsArena *arena = nullptr;    // of nodes and lists; null: each is a block of its own
+    uint64_t textLeft = UINT64_MAX; // bytes of text that may still be read or appended
+    bool textLimit = false;         // the texts of the message passed their limit
+    OpenRecord *open = nullptr;     // the record being read by the body
+    qvsArena *arena = nullptr;      // of nodes and lists
 };
 
-// The record that the library makes of a decoder.
-struct Decoding {
-    qvsWbxmlDecoder decoder;
-    DecodeState state;
-};
+// The state of a whole decode, of which a decoder's data gives the limit.
+DecodeState wholeDecode(const qvsWbxmlDecoder *decoder, qvsArena *arena = nullptr);
 
-// The mark of a decoder that state stands behind. It is made of the address, so that a copy of the
-// record is not taken for one, and never 0.
-inline uint16_t markOf(const qvsWbxmlDecoder *decoder)
+// Counts text that is read or appended. False once there is too much of it.
+inline bool countText(DecodeState *state, uint64_t count)
 {
-    return static_cast<uint16_t>(reinterpret_cast<uintptr_t>(decoder) >> 4U | 1U);
+    if (count > state->textLeft) [[unlikely]] {
+        state->textLimit = true;
+        state->textLeft = 0;
+        return false;
+    }
+    state->textLeft -= count;
+    return true;
 }
 
-// The state behind a decoder; null for a null one and for one that a host made, whose single steps
-// do without: their texts are not limited, and each adds to a list with a walk.
-DecodeState *stateOf(const qvsWbxmlDecoder *decoder);
-
-// Where nodes and lists come from.
-inline qvsArena *arenaOf(const DecodeState *state)
-{
-    return state ? state->arena : nullptr;
-}
-
-// Whether the texts of the message passed their limit.
-bool textLimitPassed(const qvsWbxmlDecoder *decoder);
-
-// Takes the mark from a decoder whose memory goes.
-void unmark(qvsWbxmlDecoder *decoder);
+// Behind the exported functions of the same name.
+qvsResult decode(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapDoc **document);
+qvsResult decodeBody(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapDoc **document);
+qvsResult decodeCharacters(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list);
 
 } // namespace qvs
 

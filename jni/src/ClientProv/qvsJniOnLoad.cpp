@@ -1,6 +1,12 @@
 // The entry point of a load: gives the ten Java classes their natives.
 #include "qvsJni.h"
 
+#include <dlfcn.h>
+
+// Used where the C library itself has them: the library needs no other for their sake.
+#pragma weak dladdr
+#pragma weak dlopen
+
 namespace [[gnu::visibility("hidden")]] qvs {
 
 namespace {
@@ -30,6 +36,16 @@ constexpr JavaClass kClasses[] = {
     {"com/qvomacp/eng/parser/XCPCtxVoWifi", kVoWifiNatives},
 };
 
+// hardened: a VM lets go of a library whose load failed, or whose class loader went, though classes
+// may have natives of it: it stays mapped. A link with -z nodelete sees to it alone.
+void stayMapped()
+{
+    Dl_info self;
+    if (dladdr && dlopen && dladdr(kClasses, &self)) {
+        (void)dlopen(self.dli_fname, RTLD_LAZY | RTLD_NOLOAD | RTLD_NODELETE);
+    }
+}
+
 // False when the class is missing or refuses a native.
 bool registerNatives(JNIEnv *env, const JavaClass &known)
 {
@@ -48,9 +64,10 @@ bool registerNatives(JNIEnv *env, const JavaClass &known)
 
 // JNI_OnLoad registers class by class and answers the interface version that the library needs;
 // JNI_ERR without an environment of that version, and at the first class that is missing or refuses
-// its natives. Classes registered before it keep them.
+// its natives. Classes registered before it keep them, and the library stays mapped.
 JNIEXPORT jint JNICALL JNI_OnLoad(JavaVM *vm, void *)
 {
+    qvs::stayMapped();
     void *env = nullptr;
     if (vm->GetEnv(&env, JNI_VERSION_1_4) != JNI_OK || !env) {
         return JNI_ERR;

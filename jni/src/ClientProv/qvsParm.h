@@ -39,7 +39,8 @@ struct Parm {
 struct ParmTable {
     const char *name; // of its decoder, in the trace of a refused token
     Rows<Parm> rows;
-    qvsResult (*reader)(qvsWbxmlDecoder *decoder, void *record) = nullptr; // of kByReader
+    // Of kByReader.
+    qvsResult (*reader)(qvsWbxmlDecoder *decoder, DecodeState *state, void *record) = nullptr;
     bool freshTokenAfterSwitch = false;      // read it again instead of peeking at it masked
     const char *entered = nullptr;           // name of its decoder, traced before anything is read
     void (*onParm)(uint8_t token) = nullptr; // before a parameter of the table is read
@@ -68,13 +69,16 @@ extern const ParmTable kWifiParms;
 extern const ParmTable kVoWifiParms;
 
 // Reads one parm element into `record`. Stops at the END of its attributes, which it consumes,
-// or at the first token that is refused or cannot be read. `state` is that of the decoder.
+// or at the first token that is refused or cannot be read. Without a state it is a step alone.
 qvsResult readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
                     const ParmTable &table);
 qvsResult readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table);
 
+// Reads the parameter that the NAME attribute `token` announces into `*text`.
+qvsResult readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token);
+
 // Reads one parameter onto a list of `record`. On failure the list is as it was, but for the items
-// that it has got. `state` is that of the decoder.
+// that it has got.
 qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, ListField list);
 
 // ---- Parameters whose name is given as text
@@ -85,7 +89,7 @@ struct NamedParm {
     TextField field;
 };
 
-// The name of one parameter and the token behind it.
+// The name of one parameter, compared where it lies, and the token behind it.
 struct ParmName {
     Text text;
     uint8_t next = 0;
@@ -93,16 +97,12 @@ struct ParmName {
 
 // Reads the NAME attribute `tag` and the text behind it, and peeks at the next token. `label` is
 // what the traces are written under. QVS_ERROR_FAILED for a name that is not there; an empty one
-// is one for `mayBeEmpty` alone.
-qvsResult readParmName(qvsWbxmlDecoder *decoder, uint8_t tag, const char *label, bool mayBeEmpty,
-                       ParmName *name);
-
-// Reads a VALUE into `*field`, in place of what it held, which stays allocated. On failure the
-// field stays.
-qvsResult readParmValue(qvsWbxmlDecoder *decoder, char **field);
+// is one for `isKept` alone, whose name is a block.
+qvsResult readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag, const char *label,
+                       bool isKept, ParmName *name);
 
 // The field of `record` that the name selects; null for a name that is not listed.
-char **findNamed(void *record, const Rows<NamedParm> &names, const char *name);
+char **findNamed(void *record, const Rows<NamedParm> &names, const Text &name);
 
 } // namespace qvs
 

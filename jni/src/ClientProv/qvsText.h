@@ -1,4 +1,5 @@
-// A text under construction, and the bytes that the decoder has not read yet.
+// A text under construction, the pieces that it is made of, and the bytes that the decoder has not
+// read yet.
 #ifndef QVSTEXT_H
 #define QVSTEXT_H
 
@@ -24,9 +25,24 @@ inline constexpr char kDecoderModule[] = "jni/src/ClientProv/qvsClientProvWbxmlD
 constexpr uint64_t kTextAlways = 8U << 20U;
 constexpr uint64_t kTextPerByte = 100;
 
-// A text that grows at its end. Its block is exactly as long as the text until the second append,
-// from then on it doubles, so that a text made of many pieces costs no more than its length.
-// Owns its block until take().
+// How a piece joins a text that is already there.
+enum class Join : uint8_t {
+    kDirect, // right behind it
+    kComma,  // behind a comma
+    kHidden, // behind its terminator
+    kOpaque, // right behind it, with a zero byte more
+};
+
+// A part of a text as it lies in the message, in its string table, or in the table of value tokens.
+struct Piece {
+    const char *bytes; // they end the text at the first NUL among them
+    uint32_t length;
+    Join join = Join::kDirect;
+    uint8_t *unread = nullptr; // the read position when a string cannot be had; null for a token's
+};
+
+// A text that grows at its end, by as many pieces at a time as are known. Owns its block until
+// take().
 struct Text {
     Text() = default;
     // Goes on with a text that already is a block of its own. `known` may tell its length and
@@ -66,24 +82,21 @@ struct Text {
         return take();
     }
 
-    // Whether there is a text, be it empty, that another one would be joined to.
-    [[nodiscard]] bool holdsText() const { return data || before; }
+    // The text, be it empty, that another one would be joined to; null for none.
+    [[nodiscard]] const char *str() const { return data ? data : before; }
 
-    char *data = nullptr;         // NUL-terminated; null while nothing was read
+    char *data = nullptr;         // NUL-terminated
     uint32_t length = 0;          // bytes before the terminator
     uint32_t capacity = 0;        // bytes of the block
     const char *before = nullptr; // borrowed: the text that the first append continues
 };
 
-// Place for `count` more bytes and a terminator at the end of the text, which stays as it is;
-// null without memory, or once the texts of the decoder's message passed their limit.
-// A null decoder counts nothing.
-char *reserve(qvsWbxmlDecoder *decoder, Text *text, uint32_t count);
+// Appends a piece, in the block or in a new one that is twice as long; exactly as long as needed
+// for the first piece, and always new while blocks are tracked. False for a string without memory,
+// or once the texts of the message passed their limit; the text of a token counts as appended.
+bool append(DecodeState *state, Text *text, const Piece &piece);
 
-// Appends `count` bytes, which end the text at the first NUL among them. False as for reserve().
-bool append(qvsWbxmlDecoder *decoder, Text *text, const void *bytes, uint32_t count);
-
-// ---- The read position: the head of the buffer. It may stand one byte behind the data.
+// ---- The read position: the head of the buffer. It may stand one byte behind the storage.
 
 // Bytes not read yet; none without a decoder or a buffer.
 inline uint32_t bytesLeft(const qvsWbxmlDecoder *decoder)
@@ -198,21 +211,140 @@ inline void stepBack(qvsWbxmlDecoder *decoder)
     }
 }
 
-// ---- The readers of a text, behind the exported ones of the same name.
+// Takes an mb_u_int32 of at most five bytes from `*at` on, in 32-bit arithmetic: the high bits of a
+// long value fall off. False for one that does not end.
+inline bool takeUint32(uint8_t **at, const uint8_t *end, uint32_t *value)
+{
+    uint32_t read = 0;
+    for (int i = 0; i < 5 && *at != end; ++i) {
+        const uint8_t byte = *(*at)++;
+        read = (read << 7) + (byte & 0x7FU);
+        if ((byte & 0x80) == 0) {
+            *value = read;
+            return true;
+        }
+    }
+    return false;
+}
 
-bool getStr(qvsWbxmlDecoder *decoder, Text *text);
-bool getStrTable(qvsWbxmlDecoder *decoder, Text *text);
-bool getStrExtension(qvsWbxmlDecoder *decoder, uint8_t token, Text *text, uint32_t *length);
-bool getString(qvsWbxmlDecoder *decoder, uint8_t token, Text *text); // from `token` on, just read
-qvsResult content(qvsWbxmlDecoder *decoder, Text *text);
-qvsResult getParamTokenVal(qvsWbxmlDecoder *decoder, uint8_t token, Text *text);
-qvsResult paramValue(qvsWbxmlDecoder *decoder, Text *text);
+// ---- Pieces, read from `*at` on, which moves behind them; `end` is the end of the data.
 
-// What a value token stands for; null for a token that stands for no text.
-const char *valueText(uint8_t token);
+// An inline string. One that the data ends in is taken as it stands.
+inline void inlinePiece(uint8_t **at, const uint8_t *end, Piece *piece)
+{
+    const auto left = static_cast<uint32_t>(end - *at);
+    const void *nul = left ? memchr(*at, '\0', left) : nullptr;
+    const uint32_t length =
+        nul ? static_cast<uint32_t>(static_cast<const uint8_t *>(nul) - *at) : left;
+    *piece = {reinterpret_cast<const char *>(*at), length, Join::kDirect, *at};
+    *at += length + 1;
+}
+
+// Opaque data of `*length` bytes.
+inline bool takeOpaque(uint8_t **at, const uint8_t *end, uint32_t *length, Piece *piece)
+{
+    // hardened: data longer than what is left is refused.
+    if (!takeUint32(at, end, length) || *length > static_cast<size_t>(end - *at)) {
+        return false;
+    }
+    *piece = {reinterpret_cast<const char *>(*at), *length, Join::kOpaque, *at};
+    *at += *length;
+    return true;
+}
+
+// What a reference into the string table stands for. False for one that is none.
+bool tablePiece(const qvsWbxmlDecoder *decoder, uint8_t **at, const uint8_t *end, Piece *piece);
+
+// The text of a value token. False for a token that stands for no text.
+bool tokenPiece(uint8_t token, Piece *piece);
+
+// Whether a token ends a run of strings and value tokens.
+constexpr bool endsRun(uint8_t token)
+{
+    return token == wbxml::kEnd || token == attr::kValue;
+}
+
+// Takes a value of one piece, as most have. False, with nothing read, for any other. Inline, and
+// with what leaves its registers kept apart, since nothing is called as often.
+[[gnu::always_inline]] inline bool takeOnlyPiece(qvsWbxmlDecoder *decoder, Piece *piece)
+{
+    uint8_t *at = decoder->ptBuffer->pHead;
+    const uint8_t *const end = at + bytesLeft(decoder);
+    if (at != end && *at == wbxml::kStrI) {
+        ++at;
+        inlinePiece(&at, end, piece);
+    } else {
+        uint8_t *behind = at;
+        const uint8_t token = at != end ? *behind++ : 0;
+        Piece other = {};
+        if (token == wbxml::kStrT) {
+            if (!tablePiece(decoder, &behind, end, &other)) {
+                return false;
+            }
+        } else if (!tokenPiece(token, &other)) {
+            return false;
+        }
+        *piece = other;
+        at = behind;
+        if (token != wbxml::kStrT) {
+            decoder->ptBuffer->pHead = at;
+            return true;
+        }
+    }
+    if (at >= end || !endsRun(*at)) {
+        return false;
+    }
+    decoder->ptBuffer->pHead = at;
+    return true;
+}
+
+// ---- The readers of a text.
+
+// A run of strings and value tokens to an END or VALUE, which stays.
+bool readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
+
+// A value token just read that stands for no text: a block of that one byte, or what follows it is
+// skipped.
+[[gnu::cold]] qvsResult readUnknown(qvsWbxmlDecoder *decoder, DecodeState *state, char **text);
+
+// A value in any encoding: onto a text, or to be looked at, for which one of a single piece needs
+// no block but stays where it lies, as the text `before`.
+using ValueReader = qvsResult (*)(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
+qvsResult content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
+// The result of reading a value, traced.
+inline qvsResult endOfContent(const DecodeState *state, qvsResult result)
+{
+    if (state->textLimit) [[unlikely]] {
+        result = QVS_ERROR_NO_MEMORY;
+    }
+    trace("qvsClientProvWbxmlDecoderContent Error:%d", static_cast<int>(result));
+    return result;
+}
+
+inline qvsResult lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
+{
+    Piece piece;
+    if (!takeOnlyPiece(decoder, &piece)) {
+        return content(decoder, state, text);
+    }
+    (void)countText(state, piece.length); // the limit shows in the result
+    text->before = piece.bytes;
+    text->length = piece.length;
+    return endOfContent(state, QVS_OK);
+}
+
+// A VALUE and what it carries: as a reader has it, or as a new text, which may continue the text
+// `before` and is null for nothing.
+qvsResult paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text,
+                     ValueReader reader = content);
+qvsResult readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                    const char *before = nullptr);
+
+// qvsCommaAdd onto a text of which `known` may tell more.
+qvsResult commaAdd(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, JoinedText *known);
 
 // Reads an inline string at the read position, the byte there included, and drops it.
-qvsResult dropInlineString(qvsWbxmlDecoder *decoder);
+qvsResult dropInlineString(qvsWbxmlDecoder *decoder, DecodeState *state);
 
 } // namespace qvs
 

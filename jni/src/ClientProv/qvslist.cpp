@@ -1,18 +1,24 @@
 // The list: every walk is a loop.
 #include "qvslist.h"
 
-#include "qvsTree.h"
+#include "qvsArena.h"
 #include "qvsmemory.h"
 
 namespace {
 
 constexpr char kModule[] = "jni/src/ClientProv/qvslist";
 
+// A piece whose fields are written next.
+void *newUncleared(qvsArena *arena, uint32_t size, int line = __builtin_LINE())
+{
+    return arena ? qvs::takeRoom(arena, size) : qvsMemAllocSetZero_debug(size, kModule, line);
+}
+
 qvsListNode *newNode(qvsArena *arena, void *item)
 {
-    auto *node = static_cast<qvsListNode *>(qvs::newPiece(arena, sizeof(qvsListNode), kModule));
+    auto *node = static_cast<qvsListNode *>(newUncleared(arena, sizeof(qvsListNode)));
     if (node) {
-        node->pItem = item;
+        *node = {item, nullptr};
     }
     return node;
 }
@@ -50,12 +56,17 @@ void unlink(qvsList *list, qvsListNode *before, const qvsListNode *node)
     }
 }
 
-// Releases a node that was taken out, and moves a cursor that stood on it on.
-void releaseNode(qvsList *list, qvsListNode *node)
+// Moves a cursor that stands on a node on, before the node leaves the list.
+void leave(qvsList *list, const qvsListNode *node)
 {
     if (list->ptCursor == node) {
         list->ptCursor = node->ptNext;
     }
+}
+
+// Releases a node that was taken out.
+void releaseNode(qvsList *list, qvsListNode *node)
+{
     qvsMemFree_debug(node);
     --list->nCount;
 }
@@ -98,10 +109,11 @@ qvsResult addLast(qvsArena *arena, qvsList *list, void *item, qvsListNode **last
 qvsResult create(qvsArena *arena, qvsList **list, void *item, qvsListNode **last)
 {
     *last = nullptr;
-    auto *made = static_cast<qvsList *>(qvs::newPiece(arena, sizeof(qvsList), kModule));
+    auto *made = static_cast<qvsList *>(newUncleared(arena, sizeof(qvsList)));
     if (!made) {
         return QVS_ERROR_LIST_NO_MEMORY;
     }
+    *made = {};
     if (item) {
         if (qvsResult result = addLast(arena, made, item, last)) {
             if (!arena) {
@@ -187,6 +199,8 @@ qvsResult qvsListDeleteNodeFindItem(qvsList *list, void *item, qvsListFree freeI
     if (!node) {
         return QVS_ERROR_LIST_NOT_FOUND;
     }
+    // The callback finds a list without the item, and a cursor that is not on it.
+    leave(list, node);
     unlink(list, before, node);
     releaseItem(node->pItem, freeItem);
     releaseNode(list, node);
@@ -205,8 +219,7 @@ qvsResult qvsListDeleteNodeFirst(qvsList *list, qvsListFree freeItem)
     unlink(list, nullptr, node);
     releaseItem(node->pItem, freeItem);
     // kept[list-first-cursor]: a cursor on the node stays where it is.
-    qvsMemFree_debug(node);
-    --list->nCount;
+    releaseNode(list, node);
     return QVS_OK;
 }
 
@@ -272,6 +285,7 @@ qvsResult qvsListGetItemFirstAndDeleteNode(qvsList *list, void **item)
     }
     if (qvsListNode *node = list->ptFirst) {
         *item = node->pItem;
+        leave(list, node);
         unlink(list, nullptr, node);
         releaseNode(list, node);
     }
@@ -298,6 +312,7 @@ qvsResult qvsListGetItemNextAndDeleteNode(qvsList *list, void **item)
         }
     }
     *item = node->pItem;
+    leave(list, node);
     unlink(list, before, node);
     releaseNode(list, node);
     return QVS_OK;
@@ -327,8 +342,9 @@ qvsResult qvsListGetItemIndexAndDeleteNode(qvsList *list, void **item, uint32_t 
         return QVS_ERROR_LIST_NOT_FOUND;
     }
     // kept[list-index-delete]: the nodes before this one leave the list and stay allocated.
-    unlink(list, nullptr, node);
     // hardened: a cursor on the node moves to the next one.
+    leave(list, node);
+    unlink(list, nullptr, node);
     releaseNode(list, node);
     return QVS_OK;
 }

@@ -85,4 +85,21 @@ QVS_API uint32_t qvsListGetCount(const qvsList *list);
 
 QVS_END_DECLS
 
+#ifdef __cplusplus
+struct qvsArena;
+
+namespace [[gnu::visibility("hidden")]] qvs {
+
+// Adds `item` behind the last one of `*list`, which is made when there is none; node and list are
+// pieces of the arena. A null item adds nothing to a list. `*last` is the tail of the list, which
+// whoever builds it remembers; null when it is not known. QVS_ERROR_LIST_NO_MEMORY, with a list
+// that was not there still null.
+QVS_NODISCARD qvsResult addItem(qvsArena *arena, qvsList **list, void *item, qvsListNode **last);
+
+// Releases a list of texts.
+void releaseTexts(qvsArena *arena, qvsList *list);
+
+} // namespace qvs
+#endif
+
 #endif

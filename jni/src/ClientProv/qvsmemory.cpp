@@ -6,6 +6,13 @@
 #include <string.h>
 
 bool qvs::tracking = false;
+uint32_t qvs::refusals = 0;
+
+void *qvs::refused()
+{
+    ++refusals;
+    return nullptr;
+}
 
 namespace {
 
@@ -70,16 +77,17 @@ constexpr uint32_t kClearedByHand = 512;
 void *cleared(uint32_t size)
 {
     if (size > kClearedByHand) {
-        return calloc(1, size);
+        void *block = calloc(1, size);
+        return block ? block : qvs::refused();
     }
     void *block = malloc(size);
     asm("" : "+r"(block)); // keeps a compiler from making a calloc of the two
-    return block ? memset(block, 0, size) : nullptr;
+    return block ? memset(block, 0, size) : qvs::refused();
 }
 
 char *copyOf(const char *str, size_t length)
 {
-    char *block = static_cast<char *>(malloc(length + 1 + qvs::kSpareZeros));
+    char *block = static_cast<char *>(qvs::requested(length + 1 + qvs::kSpareZeros));
     if (block) {
         memcpy(block, str, length);
         // hardened: four zero bytes follow the terminator.
@@ -94,7 +102,13 @@ char *copyOf(const char *str, size_t length)
 
 void *qvsMemAlloc_debug(uint32_t size, const char *file, int line)
 {
-    return qvs::tracking ? remembered(malloc(size), size, file, line) : malloc(size);
+    void *block = qvs::requested(size);
+    return qvs::tracking ? remembered(block, size, file, line) : block;
+}
+
+void *qvs::newTrackedText(uint32_t size, const char *module, int line)
+{
+    return remembered(malloc(size + kSpareZeros), size, module, line);
 }
 
 void *qvsMemAllocSetZero_debug(uint32_t size, const char *file, int line)
@@ -108,7 +122,7 @@ uint16_t *qvsMemAllocW_debug(uint32_t count, const char *file, int line)
     if (count > UINT32_MAX / sizeof(uint16_t)) {
         return nullptr;
     }
-    void *block = malloc(count * sizeof(uint16_t));
+    void *block = qvs::requested(count * sizeof(uint16_t));
     // kept[memcheck-unit-count]: the size that is remembered is the count of units, not of bytes.
     return static_cast<uint16_t *>(qvs::tracking ? remembered(block, count, file, line) : block);
 }
@@ -134,7 +148,7 @@ void *qvsMemDup_debug(const void *src, uint32_t size, const char *file, int line
     if (!src) {
         return nullptr;
     }
-    void *block = malloc(size);
+    void *block = qvs::requested(size);
     // hardened: without memory nothing is copied.
     if (!block) {
         return nullptr;

@@ -74,11 +74,34 @@ constexpr uint32_t kSpareZeros = 4;
 // Whether blocks are tracked.
 extern bool tracking;
 
+// The blocks of all functions here that could not be had since the library was loaded. What was
+// made while it grew may lack something.
+extern uint32_t refusals;
+
+// Counts one; null.
+[[gnu::cold, gnu::noinline]] void *refused();
+
+// A block that is not tracked.
+inline void *requested(size_t size)
+{
+    void *block = malloc(size);
+    return block ? block : refused();
+}
+
 // qvsMemAlloc_debug and qvsMemFree_debug where a parse spends its time: with one test of tracking,
 // and no call but the C library's.
 inline void *newBlock(uint32_t size, const char *module, int line = __builtin_LINE())
 {
-    return tracking ? qvsMemAlloc_debug(size, module, line) : malloc(size);
+    return tracking ? qvsMemAlloc_debug(size, module, line) : requested(size);
+}
+
+// A block for a text of `size` bytes with its terminator, and kSpareZeros more, which its tracked
+// size leaves out.
+void *newTrackedText(uint32_t size, const char *module, int line);
+inline char *newText(uint32_t size, const char *module, int line = __builtin_LINE())
+{
+    return static_cast<char *>(tracking ? newTrackedText(size, module, line)
+                                        : malloc(size + kSpareZeros));
 }
 
 inline void freeBlock(void *block)

@@ -221,10 +221,10 @@ int qvsStrAtoi(const char *s)
     return static_cast<int>(qvsStrAtol(s));
 }
 
-char *qvsStrLtoa(int32_t v, char *buf, uint32_t base)
+char *qvsStrLtoa(long v, char *buf, uint32_t base)
 {
     char *p = buf;
-    uint32_t magnitude = static_cast<uint32_t>(v);
+    auto magnitude = static_cast<unsigned long>(v);
     if (v < 0) {
         *p++ = '-';
         magnitude = 0 - magnitude;
@@ -234,24 +234,24 @@ char *qvsStrLtoa(int32_t v, char *buf, uint32_t base)
     return buf;
 }
 
-char *qvsStrItoa(int32_t v, char *buf, uint32_t base)
+char *qvsStrItoa(long v, char *buf, uint32_t base)
 {
     return qvsStrLtoa(v, buf, base);
 }
 
-void qvsStrDoNtoS(uint32_t v, char **p, uint32_t base)
+void qvsStrDoNtoS(unsigned long v, char **p, uint32_t base)
 {
     // hardened: there are no digits to a base below 2.
     if (base < 2) {
         return;
     }
-    uint32_t scale = 1;
+    unsigned long scale = 1;
     while (v / scale >= base) {
         scale *= base;
     }
     for (; scale != 0; scale /= base) {
-        const uint32_t digit = v / scale % base;
-        const uint32_t character = digit > 9 ? 'a' + (digit - 10) : '0' + digit;
+        const unsigned long digit = v / scale % base;
+        const unsigned long character = digit > 9 ? 'a' + (digit - 10) : '0' + digit;
         *(*p)++ = static_cast<char>(character & 0x7F);
     }
 }

@@ -67,13 +67,13 @@ QVS_API long qvsStrAtol(const char *s);
 QVS_API int qvsStrAtoi(const char *s);
 
 // qvsStrLtoa and qvsStrItoa write `v` to the base `base`, with a terminator, and return `buf`,
-// which must hold up to 34 bytes.
-QVS_API char *qvsStrLtoa(int32_t v, char *buf, uint32_t base);
-QVS_API char *qvsStrItoa(int32_t v, char *buf, uint32_t base);
+// which must hold up to 66 bytes where a long has 64 bits.
+QVS_API char *qvsStrLtoa(long v, char *buf, uint32_t base);
+QVS_API char *qvsStrItoa(long v, char *buf, uint32_t base);
 
 // qvsStrDoNtoS writes the digits of `v` at *p, without a terminator, and leaves *p behind the last
 // one. No digits for a base below 2.
-QVS_API void qvsStrDoNtoS(uint32_t v, char **p, uint32_t base);
+QVS_API void qvsStrDoNtoS(unsigned long v, char **p, uint32_t base);
 
 // qvsStrToHexChar gives the digit 0 to 9 or A to F, "?" for any other number.
 QVS_API char qvsStrToHexChar(int n);

@@ -1,7 +1,8 @@
-// Pieces of a tree: blocks of their own, or parts of an arena that is released as a whole.
+// Pieces: blocks of their own, or parts of an arena that is released as a whole.
 #include "blocks.h"
 #include "memcheck.h"
-#include "qvsTree.h"
+#include "qvsArena.h"
+#include "qvslist.h"
 #include "qvsmemory.h"
 
 #include <algorithm>
@@ -89,7 +90,7 @@ TEST_F(Arena, AsksForItsBlocksUnderItsSource)
     piece();
     piece();
     const auto files = memcheck::filesOf([&] { piece(); });
-    EXPECT_EQ(files, std::vector<std::string>{"jni/src/ClientProv/qvsTree"});
+    EXPECT_EQ(files, std::vector<std::string>{"jni/src/ClientProv/qvsArena"});
 }
 
 TEST_F(Arena, AsksForBlocksThatTheCLibraryTakesForSmall)

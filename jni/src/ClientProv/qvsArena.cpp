@@ -1,5 +1,5 @@
-// Pieces of a tree and the blocks that they share.
-#include "qvsTree.h"
+// Pieces and the blocks that they share.
+#include "qvsArena.h"
 
 #include "qvsmemory.h"
 
@@ -10,13 +10,14 @@ namespace [[gnu::visibility("hidden")]] qvs {
 
 namespace {
 
-constexpr char kModule[] = "jni/src/ClientProv/qvsTree";
+constexpr char kModule[] = "jni/src/ClientProv/qvsArena";
 
 // From 1 KB on the C library joins its free small blocks for each that it is asked for.
 constexpr uint32_t kBlockSize = 960;
 static_assert(kBlockSize >= sizeof(void *) + kLargestPiece);
 
-// Makes room in a new block. False without memory.
+} // namespace
+
 bool addBlock(qvsArena *arena)
 {
     auto *block = static_cast<char *>(newBlock(kBlockSize, kModule));
@@ -30,19 +31,13 @@ bool addBlock(qvsArena *arena)
     return true;
 }
 
-} // namespace
-
 void *newPiece(qvsArena *arena, uint32_t size, const char *module, int line)
 {
     if (!arena) {
         return qvsMemAllocSetZero_debug(size, module, line);
     }
-    if (arena->end - arena->next < static_cast<ptrdiff_t>(size) && !addBlock(arena)) {
-        return nullptr;
-    }
-    char *piece = arena->next;
-    arena->next += size;
-    return memset(piece, 0, size);
+    char *piece = takeRoom(arena, size);
+    return piece ? memset(piece, 0, size) : nullptr;
 }
 
 void releaseArena(qvsArena *arena)

@@ -1,0 +1,303 @@
+// The text that strings and value tokens are appended to, and the one reader of all their runs.
+#include "qvsText.h"
+#include "qvsClientProvWbxmlDecoder.h"
+
+using namespace qvs;
+
+namespace {
+
+constexpr uint32_t kUnreadTable = 0xFFFFFFFF;
+
+// Pieces of a run that are looked at before they are appended.
+constexpr uint32_t kMostPieces = 4;
+
+// Bytes in front of a piece that joins a text.
+inline uint32_t separatorOf(const Piece &piece)
+{
+    return piece.join == Join::kComma || piece.join == Join::kHidden ? 1 : 0;
+}
+
+// Makes room for `added` bytes behind a text and a terminator, `spare` bytes more. False without
+// memory, or once the texts of the message passed their limit.
+[[gnu::always_inline]] inline bool reserve(DecodeState *state, Text *text, uint64_t added,
+                                           uint32_t spare)
+{
+    if (!countText(state, text->data ? added : text->length + added)) [[unlikely]] {
+        return false;
+    }
+    uint64_t needed = text->length + added + 1 + spare;
+    if (text->data && !tracking) {
+        if (needed <= text->capacity) {
+            return true;
+        }
+        needed = needed < uint64_t{text->capacity} * 2 ? uint64_t{text->capacity} * 2 : needed;
+    }
+    char *block = needed > UINT32_MAX - kSpareZeros
+                      ? nullptr
+                      : newText(static_cast<uint32_t>(needed), kDecoderModule);
+    if (!block) [[unlikely]] {
+        return false;
+    }
+    if (text->length) {
+        memcpy(block, text->str(), text->length);
+    }
+    if (text->data) {
+        freeBlock(text->data);
+    }
+    text->data = block;
+    text->capacity = static_cast<uint32_t>(needed);
+    return true;
+}
+
+// Writes a piece behind the text; answers the end of its bytes.
+[[gnu::always_inline]] inline char *write(Text *text, const Piece &piece, bool joins)
+{
+    char *at = text->data + text->length;
+    const uint32_t separator = joins ? separatorOf(piece) : 0;
+    if (separator) {
+        *at++ = piece.join == Join::kComma ? ',' : '\0';
+    }
+    memcpy(at, piece.bytes, piece.length);
+    if (piece.join == Join::kOpaque) [[unlikely]] {
+        const void *nul = memchr(at, '\0', piece.length);
+        text->length +=
+            nul ? static_cast<uint32_t>(static_cast<const char *>(nul) - at) : piece.length;
+    } else if (!joins || piece.join != Join::kHidden) {
+        text->length += separator + piece.length;
+    }
+    return at + piece.length;
+}
+
+// What there is of pieces without memory: up to the first string.
+[[gnu::noinline, gnu::cold]] const Piece *appendNone(const Piece *piece, const Piece *end)
+{
+    for (; piece != end && !piece->unread; ++piece) {
+        // kept[lookup-without-memory]: the text stays as it was and the token counts as read.
+        traceException("[Error] [qvsClientProvWbxmlDecoderGetParamTokenVal] pszData NULL",
+                       kDecoderModule, __LINE__);
+    }
+    if (piece != end) {
+        trace("[Error] [qvsClientProvWbxmlDecoderGetStr] pszData NULL");
+    }
+    return piece;
+}
+
+// Appends pieces that add so many bytes, in one block. Answers the first one that is not appended.
+[[gnu::always_inline]] inline const Piece *
+appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end, uint64_t added)
+{
+    bool joins = text->str() != nullptr;
+    if (!reserve(state, text, added, piece->join == Join::kOpaque ? 1 : 0)) [[unlikely]] {
+        return appendNone(piece, end);
+    }
+    char *last = nullptr;
+    do {
+        last = write(text, *piece, joins);
+        joins = true;
+    } while (++piece != end);
+    // Nobody sees what lies behind the terminator of a text in the tree of a session, and the
+    // context takes it over with its zeros.
+    memset(state->arena ? text->data + text->length : last, 0, 1 + kSpareZeros);
+    return piece;
+}
+
+// appendAll() where a text is not all that is read.
+[[gnu::noinline]] const Piece *appendMore(DecodeState *state, Text *text, const Piece *first,
+                                          const Piece *behind, uint64_t added)
+{
+    return appendAll(state, text, first, behind, added);
+}
+
+// The result of appending the only piece of a value, which has been taken.
+inline qvsResult endOfPiece(qvsWbxmlDecoder *decoder, const Piece &piece, bool appended)
+{
+    if (!appended) [[unlikely]] {
+        decoder->ptBuffer->pHead = piece.unread;
+    }
+    return appended ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+}
+
+// Reads a run, a value token, opaque data, or a token that stands for no text.
+qvsResult readAny(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
+{
+    uint8_t token = 0;
+    if (!peekByte(decoder->ptBuffer, &token)) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    if (wbxml::isString(token)) {
+        return readRun(decoder, state, text) ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+    }
+    uint8_t *&head = decoder->ptBuffer->pHead;
+    ++head;
+    const bool opaque = token == wbxml::kOpaque;
+    uint32_t length = 0;
+    Piece piece;
+    if (opaque ? takeOpaque(&head, head + bytesLeft(decoder), &length, &piece)
+               : tokenPiece(token, &piece)) {
+        return endOfPiece(decoder, piece, append(state, text, piece));
+    }
+    if (opaque) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
+    char *unknown = nullptr;
+    const qvsResult result = readUnknown(decoder, state, &unknown);
+    if (unknown) {
+        // kept[unknown-token-replaces]: the token takes the place of a text that was there, which
+        // stays allocated.
+        text->data = unknown;
+        text->length = 1;
+        text->capacity = 2;
+    }
+    return result;
+}
+
+// Hands a text that was read out; on failure `*text` stays.
+[[gnu::always_inline]] inline qvsResult keep(char **text, Text *read, qvsResult result)
+{
+    if (result == QVS_OK) {
+        *text = read->take();
+    }
+    return result;
+}
+
+// Takes a VALUE and a page switch behind it, up to the value. It may be none, where an END stands.
+inline qvsResult enterValue(qvsWbxmlDecoder *decoder, bool *present)
+{
+    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
+        return result;
+    }
+    uint8_t next = 0;
+    bool left = peekByte(decoder->ptBuffer, &next);
+    if (left && next == wbxml::kSwitchPage) {
+        (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
+        left = peekByte(decoder->ptBuffer, &next);
+        next &= wbxml::kTagMask;
+    }
+    *present = next != wbxml::kEnd;
+    return left ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+}
+
+} // namespace
+
+DecodeState qvs::wholeDecode(const qvsWbxmlDecoder *decoder, qvsArena *arena)
+{
+    const uint64_t forLength =
+        kTextPerByte * (decoder ? smlBufferGetDataSize(decoder->ptBuffer) : 0);
+    return {.textLeft = forLength > kTextAlways ? forLength : kTextAlways, .arena = arena};
+}
+
+bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
+{
+    const uint32_t separator = text->str() ? separatorOf(piece) : 0;
+    const uint64_t added = uint64_t{piece.length} + separator;
+    return appendMore(state, text, &piece, &piece + 1, added) != &piece;
+}
+
+bool qvs::tablePiece(const qvsWbxmlDecoder *decoder, uint8_t **at, const uint8_t *end, Piece *piece)
+{
+    uint32_t index = 0;
+    // hardened: a table that was cut off, whose length is not known, is referred to in vain.
+    if (!takeUint32(at, end, &index) || !decoder->pStringTable ||
+        decoder->nStrSize == kUnreadTable || index > decoder->nStrSize - 1) {
+        return false;
+    }
+    // kept[empty-table-index]: every index passes the check of an empty table; its block of two
+    // zero bytes answers 0 and 1 with the empty text. hardened: an index behind that block fails.
+    if (decoder->nStrSize == 0 && index > 1) {
+        return false;
+    }
+    const char *entry = decoder->pStringTable + index;
+    *piece = {entry, static_cast<uint32_t>(strlen(entry)), Join::kDirect, *at};
+    return true;
+}
+
+// All pieces are looked at before a block is made for them; of many, so many at a time, and while
+// blocks are tracked each by itself.
+bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
+{
+    Piece pieces[kMostPieces];
+    const Piece *const most = pieces + (tracking ? 1 : kMostPieces);
+    uint8_t *at = decoder->ptBuffer->pHead;
+    const uint8_t *const end = at + bytesLeft(decoder);
+    bool joins = text->str() != nullptr;
+    bool complete = false;
+    for (bool more = at != end; more;) {
+        Piece *piece = pieces;
+        uint64_t added = 0;
+        while (more && piece != most) {
+            const uint8_t token = *at++;
+            bool found = true;
+            if (token == wbxml::kStrI) {
+                inlinePiece(&at, end, piece);
+            } else if (token == wbxml::kStrT) {
+                found = tablePiece(decoder, &at, end, piece);
+            } else if (endsRun(token)) {
+                --at;
+                complete = true;
+                found = false;
+            } else if (tokenPiece(token, piece)) {
+                added += joins ? separatorOf(*piece) : 0;
+            } else {
+                found = false;
+            }
+            more = found && at < end;
+            added += found ? piece++->length : 0;
+            joins = true;
+        }
+        const Piece *const left =
+            piece != pieces ? appendMore(state, text, pieces, piece, added) : piece;
+        if (left != piece) [[unlikely]] {
+            decoder->ptBuffer->pHead = left->unread;
+            return false;
+        }
+    }
+    decoder->ptBuffer->pHead = at;
+    return complete;
+}
+
+qvsResult qvs::dropInlineString(qvsWbxmlDecoder *decoder, DecodeState *state)
+{
+    smlBuffer *buffer = decoder->ptBuffer;
+    Piece piece;
+    inlinePiece(&buffer->pHead, buffer->pHead + bytesLeft(decoder), &piece);
+    return countText(state, piece.length) ? QVS_OK : QVS_ERROR_NO_MEMORY;
+}
+
+qvsResult qvs::content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
+{
+    return endOfContent(state, readAny(decoder, state, text));
+}
+
+qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text,
+                          ValueReader reader)
+{
+    bool present = false;
+    const qvsResult result = enterValue(decoder, &present);
+    return result == QVS_OK && present ? reader(decoder, state, text) : result;
+}
+
+qvsResult qvs::readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                         const char *before)
+{
+    bool present = false;
+    qvsResult result = enterValue(decoder, &present);
+    if (result != QVS_OK) {
+        return result;
+    }
+    if (!present) {
+        *text = nullptr;
+        return QVS_OK;
+    }
+    Piece piece;
+    if (!before && takeOnlyPiece(decoder, &piece)) {
+        Text read;
+        const Piece *const end = &piece + 1;
+        const bool appended = appendAll(state, &read, &piece, end, piece.length) == end;
+        result = endOfPiece(decoder, piece, appended);
+        return keep(text, &read, endOfContent(state, result));
+    }
+    Text read;
+    read.before = before;
+    read.length = qvsStrlen(before);
+    return keep(text, &read, content(decoder, state, &read));
+}
