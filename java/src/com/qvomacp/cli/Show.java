@@ -54,8 +54,7 @@ final class Show extends Job {
             throw new UsageException("--bytes goes with none of --json, --header and --answers");
         }
         if (json && jsonLines || answers && header) {
-            throw new UsageException(
-                    (json ? "--json-lines goes not with --json" : "--answers goes not with --header"));
+            throw new UsageException("--json-lines goes not with --json, nor --answers with --header");
         }
         writer = new JsonWriter(console.out, jsonLines);
     }

@@ -29,6 +29,11 @@ final class BodyReader {
     private static final int ELEMENT = 0x3F;
     private static final int FIRST_VALUE = 0x80;
 
+    /** The token of a parm with attributes and without content, and that of VALUE on either page. */
+    private static final int PLAIN_PARM = 0x87;
+
+    private static final int VALUE = 0x06;
+
     /** The tokens that are a piece of text, in values as well as where elements stand. */
     private static final boolean[] PIECES = new boolean[0x100];
 
@@ -152,6 +157,9 @@ final class BodyReader {
         if (element == Element.DOCUMENT && depth > 0) {
             element = Element.OTHER;
         }
+        if (token == PLAIN_PARM && element == Element.PARM && depth > 0 && plainParm(from)) {
+            return;
+        }
         reading.element(from, cursor.at(), element, name, (token & ATTRIBUTES) != 0);
         ++depth;
         if ((token & ATTRIBUTES) != 0) {
@@ -159,6 +167,43 @@ final class BodyReader {
         } else if ((token & CONTENT) == 0) {
             end(cursor.at());
         }
+    }
+
+    /**
+     * Reads a parm whose attributes are what nearly all are, in one go: a token for its name, and as
+     * its value one token, or one text of ASCII in its place. Of another one it reads nothing.
+     */
+    private boolean plainParm(int from) throws ProvisioningException {
+        CodePage page = attributes;
+        int name = cursor.peek();
+        if (page == null || name < 0 || name >= FIRST_VALUE || cursor.peek(1) != VALUE) {
+            return false;
+        }
+        if (page.attribute(name) != Attribute.NAME || page.begin(name) == null || PIECES[name]) {
+            return false;
+        }
+        int value = cursor.peek(2);
+        String text = null;
+        Writing writing = Writing.TOKEN;
+        int ahead = 3;
+        if (value == STR_I) {
+            int start = cursor.at() + ahead;
+            int zero = asciiEnd(start);
+            if (zero >= 0 && cursor.peek(ahead + zero - start + 1) == END) {
+                charge(start - 1, zero - start);
+                text = CharacterSet.ascii(body, start, zero);
+                writing = Writing.INLINE;
+                ahead += zero - start + 1;
+            }
+        } else if (value >= FIRST_VALUE && !PIECES[value] && cursor.peek(ahead) == END) {
+            text = page.value(value);
+        }
+        if (text == null) {
+            return false;
+        }
+        cursor.skip(ahead + 1);
+        reading.parameter(from, cursor.at(), page.begin(name), text, writing);
+        return true;
     }
 
     private Element elementOf(int from, int token) {
@@ -333,26 +378,36 @@ final class BodyReader {
     }
 
     private String inline(int from) throws ProvisioningException {
-        byte[] body = this.body;
         int start = cursor.at();
-        int end = start + cursor.left();
-        int zero = start;
-        if (charset.isAscii()) {
-            while (zero < end && body[zero] > 0) {
-                ++zero;
-            }
-            if (zero < end && body[zero] == 0) {
-                cursor.skip(zero - start + 1);
-                charge(from, zero - start);
-                return zero == start ? "" : CharacterSet.ascii(body, start, zero);
-            }
+        int zero = asciiEnd(start);
+        if (zero >= 0) {
+            cursor.skip(zero - start + 1);
+            charge(from, zero - start);
+            return CharacterSet.ascii(body, start, zero);
         }
+        int end = start + cursor.left();
         zero = charset.zero(body, start, end);
         if (zero == end) {
             reading.deviation(from, Deviation.Kind.CUT_OFF);
         }
         cursor.skip(zero - start + charset.unit());
         return decode(from, start, zero);
+    }
+
+    /** Where the zero stands behind a text that is all ASCII; -1 for another text. */
+    private int asciiEnd(int start) {
+        byte[] body = this.body;
+        int end = body.length;
+        int at = start;
+        if (charset.isAscii()) {
+            while (at < end && body[at] > 0) {
+                ++at;
+            }
+            if (at < end && body[at] == 0) {
+                return at;
+            }
+        }
+        return -1;
     }
 
     private String opaque(int from) throws ProvisioningException {

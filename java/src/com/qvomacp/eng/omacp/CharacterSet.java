@@ -191,7 +191,7 @@ final class CharacterSet {
     /** The text of bytes that are all ASCII, by the constructor that is faster than any charset. */
     @SuppressWarnings("deprecation")
     static String ascii(byte[] bytes, int from, int to) {
-        return new String(bytes, 0, from, to - from);
+        return from == to ? "" : new String(bytes, 0, from, to - from);
     }
 
     /**

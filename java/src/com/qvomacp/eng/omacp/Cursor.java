@@ -33,6 +33,11 @@ final class Cursor {
         return at < end ? bytes[at] & 0xFF : -1;
     }
 
+    /** The byte so many behind the next, 0 to 255, or -1 from the end on; the place stays. */
+    int peek(int behind) {
+        return behind < end - at ? bytes[at + behind] & 0xFF : -1;
+    }
+
     /** The next byte, 0 to 255, or -1 at the end, where the place stays. */
     int take() {
         return at < end ? bytes[at++] & 0xFF : -1;

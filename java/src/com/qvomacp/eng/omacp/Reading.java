@@ -18,6 +18,18 @@ interface Reading {
     /** A piece of an attribute's value, or of text where elements stand. */
     void text(int from, int to, Writing writing, String text);
 
+    /**
+     * A parm with a token for its name, and one text or token for its value, each in its place. Who
+     * does not listen for that hears its parts.
+     */
+    default void parameter(int from, int to, String name, String value, Writing writing) {
+        element(from, from + 1, Element.PARM, Element.PARM.text, true);
+        attribute(from + 1, from + 2, Attribute.NAME, null, name);
+        attribute(from + 2, from + 3, Attribute.VALUE, null, null);
+        text(from + 3, to - 1, writing, value);
+        end(to - 1, to);
+    }
+
     /** The attributes of an element end, and its content begins. */
     void attributesEnd(int from, int to);
 

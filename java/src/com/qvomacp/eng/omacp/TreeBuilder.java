@@ -223,6 +223,12 @@ final class TreeBuilder implements Reading {
     }
 
     @Override
+    public void parameter(int from, int to, String name, String value, Writing writing) {
+        finishText();
+        add(new Parameter(from, to, Item.NONE, name, Writing.TOKEN, value, writing));
+    }
+
+    @Override
     public void attributesEnd(int from, int to) {
         finishText();
         push();
