@@ -8,7 +8,9 @@ enum Form {
     /** The WBXML body of a push alone. */
     BODY,
 
-    /** An SMS-DELIVER as a modem hands it out, with the address of the service centre or without. */
+    /**
+     * An SMS-DELIVER as a modem hands it out, with the address of the service centre or without.
+     */
     SMS,
 
     /** The user data of an SMS, from the length of its header on. */

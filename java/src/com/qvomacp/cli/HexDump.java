@@ -5,8 +5,8 @@ import java.util.Arrays;
 import java.util.List;
 
 /**
- * Reads a dump with a column of offsets, as hexdump, xxd, od and others print it. The offsets say how
- * many bytes a line has, so that a column of characters behind them is never taken for bytes.
+ * Reads a dump with a column of offsets, as hexdump, xxd, od and others print it. The offsets say
+ * how many bytes a line has, so that a column of characters behind them is never taken for bytes.
  */
 final class HexDump {
     private static final int[] RADIXES = {16, 8, 10};
@@ -146,8 +146,8 @@ final class HexDump {
         }
 
         /**
-         * Reads the bytes of the last line: up to a bar, a gap or what is no group, and no more than
-         * the lines before have. Eight bytes may be followed by a gap of two blanks.
+         * Reads the bytes of the last line: up to a bar, a gap or what is no group, and no more
+         * than the lines before have. Eight bytes may be followed by a gap of two blanks.
          */
         byte[] readToGap(int width) {
             ByteArrayOutputStream bytes = new ByteArrayOutputStream();
@@ -198,7 +198,8 @@ final class HexDump {
                 return null;
             }
             at = end;
-            // Words without a colon behind the offset are numbers, of a machine with its low byte first.
+            // Words without a colon behind the offset are numbers, of a machine with its low byte
+            // first.
             for (int low = 0, high = bytes.length - 1; !hasColon && low < high; ++low, --high) {
                 byte swapped = bytes[low];
                 bytes[low] = bytes[high];
@@ -207,17 +208,19 @@ final class HexDump {
             return bytes;
         }
 
-        /** The bytes of a group, the highest first; null when it has not as many digits as it must. */
+        /**
+         * The bytes of a group, the highest first; null when it has not as many digits as it must.
+         */
         private byte[] number(String group) {
-            boolean isOctal = group.length() == OCTAL_BYTE || group.length() == OCTAL_WORD && !hasColon;
-            if (!isOctal) {
+            boolean isWord = group.length() == OCTAL_WORD && !hasColon;
+            if (group.length() != OCTAL_BYTE && !isWord) {
                 return group.isEmpty() || group.length() % 2 != 0 ? null : HexText.bytes(group);
             }
             try {
                 int value = Integer.parseInt(group, 8);
-                return group.length() == OCTAL_BYTE
-                        ? new byte[] {(byte) value}
-                        : new byte[] {(byte) (value >> 8), (byte) value};
+                return isWord
+                        ? new byte[] {(byte) (value >> 8), (byte) value}
+                        : new byte[] {(byte) value};
             } catch (NumberFormatException other) {
                 return null;
             }

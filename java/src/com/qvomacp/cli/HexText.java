@@ -41,7 +41,9 @@ final class HexText {
 
     private static final char BYTE_ORDER_MARK = '\uFEFF';
 
-    /** Behind a label there are at least so many digits, lest words and times be taken for bytes. */
+    /**
+     * Behind a label there are at least so many digits, lest words and times be taken for bytes.
+     */
     private static final int FEWEST_BEHIND_LABEL = 16;
 
     private static final String SEPARATORS = ":,;-";
@@ -110,8 +112,8 @@ final class HexText {
     }
 
     /**
-     * The digits that a line ends with, separators, prefixes and brackets left out. Something else in
-     * front is a label. Null when there are none, or too few behind a label.
+     * The digits that a line ends with, separators, prefixes and brackets left out. Something else
+     * in front is a label. Null when there are none, or too few behind a label.
      */
     private static String behindLabel(String line) {
         int from = line.length();
@@ -135,8 +137,8 @@ final class HexText {
             from = hasLabel ? colon + 1 : from;
         }
         String digits = digitsOf(line.substring(from));
-        boolean isEnough = digits != null && digits.length() >= (hasLabel ? FEWEST_BEHIND_LABEL : 1);
-        return isEnough ? digits : null;
+        int fewest = hasLabel ? FEWEST_BEHIND_LABEL : 1;
+        return digits != null && digits.length() >= fewest ? digits : null;
     }
 
     private static boolean belongs(char c) {
@@ -260,8 +262,8 @@ final class HexText {
     }
 
     /**
-     * What base64 of either alphabet stands for, white space left out; null for anything else, and for
-     * what is nothing but hexadecimal digits.
+     * What base64 of either alphabet stands for, white space left out; null for anything else, and
+     * for what is nothing but hexadecimal digits.
      */
     static byte[] base64(String text) {
         StringBuilder letters = new StringBuilder(text.length());

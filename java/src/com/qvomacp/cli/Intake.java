@@ -44,7 +44,7 @@ final class Intake {
         List<Held> held = new ArrayList<>();
         String text = HexText.text(content);
         if (text == null) {
-            take(name, content, form, held);
+            take(Place.in(name), content, form, held);
         } else {
             takeText(name, content, text, held);
         }
@@ -71,11 +71,11 @@ final class Intake {
                         ? Collections.<HexText.Piece>emptyList()
                         : HexText.pieces(text);
         if (isMessage) {
-            take(name, base64, form, held);
+            take(Place.in(name), base64, form, held);
         } else if (pieces.isEmpty()) {
             held.add(Held.unknown(name, content, NO_MESSAGE + likeness(content)));
         } else {
-            takePieces(name, pieces, held);
+            takePieces(Place.in(name), pieces, held);
             nameWhole(name, content, held);
         }
     }
@@ -103,10 +103,10 @@ final class Intake {
     }
 
     /**
-     * Takes lines of digits. Each line may hold a message, or one message all lines that follow each
-     * other, or all lines of the text.
+     * Takes lines of digits. Each line may hold a message, or one message all lines that follow
+     * each other, or all lines of the text.
      */
-    private void takePieces(String name, List<HexText.Piece> pieces, List<Held> held) {
+    private void takePieces(Place input, List<HexText.Piece> pieces, List<Held> held) {
         List<Run> runs = Run.of(pieces);
         boolean areMessages = true;
         for (Run run : runs) {
@@ -119,28 +119,28 @@ final class Intake {
         for (Run run : runs) {
             if (run.isLineByLine(this)) {
                 for (HexText.Piece piece : run.pieces) {
-                    takeDigits(name + ", line " + piece.line, piece.digits, piece.isUserData, held);
+                    takeDigits(input.line(piece.line), piece.digits, piece.isUserData, held);
                 }
             } else {
                 HexText.Piece first = run.pieces.get(0);
-                String place = isAlone ? name : name + ", line " + first.line;
+                Place place = isAlone ? input : input.line(first.line);
                 takeDigits(place, run.digits(), first.isUserData, held);
             }
         }
     }
 
-    private void takeDigits(String name, String digits, boolean isUserData, List<Held> held) {
+    private void takeDigits(Place place, String digits, boolean isUserData, List<Held> held) {
         if (digits.length() % 2 != 0) {
             held.add(
                     Held.error(
-                            name,
+                            place.toString(),
                             NO_MESSAGE
                                     + HEXADECIMAL
                                     + " with an odd number of digits, "
                                     + digits.length()));
             return;
         }
-        take(name, HexText.bytes(digits), isUserData && form == null ? Form.UD : form, held);
+        take(place, HexText.bytes(digits), isUserData && form == null ? Form.UD : form, held);
     }
 
     /** Lines of digits that follow each other. */
@@ -201,7 +201,9 @@ final class Intake {
             return false;
         }
         byte[] bytes = HexText.bytes(digits);
-        return isShortMessage(bytes) || isKnownPush(bytes) && hasDocument(bytes) || isDocument(bytes, 0);
+        return isShortMessage(bytes)
+                || isKnownPush(bytes) && hasDocument(bytes)
+                || isDocument(bytes, 0);
     }
 
     private boolean isMessage(byte[] bytes) {
@@ -243,11 +245,12 @@ final class Intake {
         return message;
     }
 
-    private void take(String name, byte[] bytes, Form form, List<Held> held) {
+    private void take(Place place, byte[] bytes, Form form, List<Held> held) {
+        String name = place.toString();
         try {
             ShortMessage message = shortMessage(bytes, form);
             if (message != null) {
-                add(held, takeShortMessage(name, message));
+                add(held, takeShortMessage(place, message));
                 return;
             }
         } catch (ShortMessage.OtherException other) {
@@ -272,12 +275,12 @@ final class Intake {
         }
     }
 
-    private Held takeShortMessage(String name, ShortMessage message) {
+    private Held takeShortMessage(Place place, ShortMessage message) {
         String fault = message.fault();
         if (fault != null) {
-            return Held.error(name, NO_MESSAGE + fault);
+            return Held.error(place.toString(), NO_MESSAGE + fault);
         }
-        Held whole = parts.take(name, message);
+        Held whole = parts.take(place, message);
         boolean isOther =
                 whole != null
                         && whole.bytes != null

@@ -10,7 +10,7 @@ final class JsonWriter {
     private static final String INDENT = "  ";
 
     /** Deeper values are indented no further: the brackets tell how deep they are. */
-    private static final int DEEPEST = 32;
+    private static final int DEEPEST = 12;
 
     private final PrintWriter out;
     private final boolean onOneLine;

@@ -180,9 +180,9 @@ final class ShortMessage {
         if ((kind & KIND) == ALPHANUMERIC) {
             int letters = digits * 4 / 7;
             for (int i = 0; i < letters; ++i) {
-                int bit = 7 * i;
-                int pair = at(bytes, from + bit / 8) | Math.max(at(bytes, from + bit / 8 + 1), 0) << 8;
-                int letter = pair >> bit % 8 & 0x7F;
+                int low = from + 7 * i / 8;
+                int pair = at(bytes, low) | Math.max(at(bytes, low + 1), 0) << 8;
+                int letter = pair >> 7 * i % 8 & 0x7F;
                 text.append(letter > ' ' && letter < 0x7F ? (char) letter : '?');
             }
             return text.toString();
@@ -205,7 +205,9 @@ final class ShortMessage {
                 return null;
             }
         }
-        return port == NO_PORT ? null : "an SMS for port " + port + ", and not for pushes (2948, 2949)";
+        return port == NO_PORT
+                ? null
+                : "an SMS for port " + port + ", and not for pushes (2948, 2949)";
     }
 
     boolean hasPort() {

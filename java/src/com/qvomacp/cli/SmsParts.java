@@ -14,14 +14,14 @@ final class SmsParts {
     private static final class Push {
         final ShortMessage any;
         final byte[][] parts;
-        final String[] names;
+        final Place[] places;
         final List<String> notes = new ArrayList<>();
         boolean isFinished;
 
         Push(ShortMessage first) {
             any = first;
             parts = new byte[first.total()][];
-            names = new String[first.total()];
+            places = new Place[first.total()];
         }
 
         List<Integer> missing() {
@@ -34,24 +34,24 @@ final class SmsParts {
             return missing;
         }
 
-        /** Where the parts come from, in their order, each once. */
+        /** Where the parts come from, in their order. */
         String name() {
-            List<String> different = new ArrayList<>();
-            for (String name : names) {
-                if (name != null && !different.contains(name)) {
-                    different.add(name);
+            List<Place> known = new ArrayList<>();
+            for (Place place : places) {
+                if (place != null) {
+                    known.add(place);
                 }
             }
-            return String.join(" + ", different);
+            return Place.names(known);
         }
     }
 
     private final Map<String, Push> pushes = new LinkedHashMap<>();
 
     /** Takes a short message. Answers the push that is whole with it, an error, or null. */
-    Held take(String name, ShortMessage message) {
+    Held take(Place place, ShortMessage message) {
         if (!message.isPart()) {
-            return Held.message(name, message.data, true);
+            return Held.message(place.toString(), message.data, true);
         }
         Push push = pushes.get(message.key());
         if (push == null) {
@@ -61,10 +61,10 @@ final class SmsParts {
         int index = message.number() - 1;
         String part = "part " + message.number() + " of " + message.description();
         if (push.parts[index] != null) {
-            return again(push, name, message, part);
+            return again(push, place, message, part);
         }
         push.parts[index] = message.data;
-        push.names[index] = name;
+        push.places[index] = place;
         if (push.isFinished || !push.missing().isEmpty()) {
             return null;
         }
@@ -76,8 +76,9 @@ final class SmsParts {
         return Held.push(push.name(), whole.toByteArray(), push.notes);
     }
 
-    private static Held again(Push push, String name, ShortMessage message, String part) {
-        String first = push.names[message.number() - 1];
+    private static Held again(Push push, Place place, ShortMessage message, String part) {
+        String name = place.toString();
+        Place first = push.places[message.number() - 1];
         if (Arrays.equals(push.parts[message.number() - 1], message.data)) {
             String sentence = part + " is there twice: in " + first + " and in " + name;
             if (push.isFinished) {
@@ -88,7 +89,8 @@ final class SmsParts {
         }
         push.isFinished = true;
         return Held.error(
-                name, part + " is there twice with different bytes: in " + first + " and in " + name);
+                name,
+                part + " is there twice with different bytes: in " + first + " and in " + name);
     }
 
     /** Names what is missing of the pushes that are not whole. */
@@ -101,7 +103,7 @@ final class SmsParts {
                         Held.error(
                                 push.name(),
                                 (missing.size() == 1 ? "part " : "parts ")
-                                        + listed(missing)
+                                        + Place.listed(missing)
                                         + " of "
                                         + push.parts.length
                                         + " of "
@@ -111,13 +113,5 @@ final class SmsParts {
             }
         }
         return errors.isEmpty() ? Collections.<Held>emptyList() : errors;
-    }
-
-    private static String listed(List<Integer> numbers) {
-        StringBuilder text = new StringBuilder();
-        for (int i = 0; i < numbers.size(); ++i) {
-            text.append(i == 0 ? "" : i + 1 < numbers.size() ? ", " : " and ").append(numbers.get(i));
-        }
-        return text.toString();
     }
 }

@@ -65,7 +65,7 @@ final class Verify extends Job {
         if (result == MacResult.RIGHT) {
             console.out.println(Visible.of(held.name) + ": verified (" + method + ")");
         } else {
-            say(held, statusOf(result), reasonFor(result, method, held.bytes));
+            say(held, statusOf(result), reasonFor(result, header, held.bytes));
         }
     }
 
@@ -77,7 +77,8 @@ final class Verify extends Job {
         return isUnusable ? Console.FAILED : Console.REFUSED;
     }
 
-    private String reasonFor(MacResult result, SecurityMethod method, byte[] message) {
+    private String reasonFor(MacResult result, PushHeader header, byte[] message) {
+        SecurityMethod method = header.securityMethod();
         switch (result) {
             case WRONG:
                 return "the MAC is wrong (" + method + ")";
@@ -86,7 +87,7 @@ final class Verify extends Job {
                         ? "the message states no security method"
                         : "the message states a security method that is not known";
             case NO_MAC:
-                int at = digitsAt(message);
+                int at = digitsAt(message, header.length());
                 return "no MAC was found ("
                         + method
                         + (at < 0 ? ")" : "), but what may be one stands at message offset " + at);
@@ -108,14 +109,14 @@ final class Verify extends Job {
         }
     }
 
-    /** Where as many hexadecimal digits stand as a MAC has; -1 when they stand nowhere. */
-    private static int digitsAt(byte[] message) {
+    /** Where in the body as many hexadecimal digits stand as a MAC has, with a NUL behind; or -1. */
+    private static int digitsAt(byte[] message, int from) {
         int digits = 0;
-        for (int i = 0; i < message.length; ++i) {
-            digits = Character.digit(message[i], 16) < 0 ? 0 : digits + 1;
-            if (digits == MAC_DIGITS) {
-                return i + 1 - MAC_DIGITS;
+        for (int at = from; at < message.length; ++at) {
+            if (message[at] == 0 && digits == MAC_DIGITS) {
+                return at - MAC_DIGITS;
             }
+            digits = Character.digit(message[at], 16) < 0 ? 0 : digits + 1;
         }
         return -1;
     }

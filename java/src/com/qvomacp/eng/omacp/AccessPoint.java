@@ -21,347 +21,217 @@ public final class AccessPoint extends TypedCharacteristic {
     }
 
     /**
-     * Names the access point; proxies and applications refer to it by this name.
-     *
-     * @return NAPID; {@code null} when it is not set
+     * {@return NAPID: the name of the access point; proxies and applications refer to it by this
+     *     name}
      */
     public String napId() {
         return value("NAPID");
     }
 
-    /**
-     * Tells the name to show to the user.
-     *
-     * @return NAME; {@code null} when it is not set
-     */
+    /** {@return NAME: the name to show to the user} */
     public String name() {
         return value("NAME");
     }
 
     /**
-     * Tells whether INTERNET stands here, with or without a value: by the standard, whether the
-     * access point leads to the Internet.
-     *
-     * @return true when it does
+     * {@return whether INTERNET stands here, with or without a value: by the standard, whether the
+     *     access point leads to the Internet}
      */
     public boolean hasInternet() {
         return has("INTERNET");
     }
 
-    /**
-     * Tells the value of INTERNET, which by the standard has none.
-     *
-     * @return INTERNET; {@code null} when it has no value, and when it is not set
-     */
+    /** {@return the value of INTERNET, which by the standard has none} */
     public String internet() {
         return value("INTERNET");
     }
 
     /**
-     * Tells the address, such as the access point name of GPRS or a telephone number.
-     *
-     * @return NAP-ADDRESS; {@code null} when it is not set
+     * {@return NAP-ADDRESS: the address, such as the access point name of GPRS or a telephone
+     *     number}
      */
     public String address() {
         return value("NAP-ADDRESS");
     }
 
-    /**
-     * Tells what kind of address {@link #address} is.
-     *
-     * @return NAP-ADDRTYPE, {@link AddressType#UNKNOWN} for a text that is none of the kinds;
-     *     {@code null} when it is not set
-     */
+    /** {@return NAP-ADDRTYPE: what kind of address {@link #address} is} */
     public AddressType addressType() {
         return AddressType.of(addressTypeText());
     }
 
-    /**
-     * Tells what kind of address {@link #address} is, as the message says it.
-     *
-     * @return NAP-ADDRTYPE; {@code null} when it is not set
-     */
+    /** {@return NAP-ADDRTYPE as the message says it} */
     public String addressTypeText() {
         return value("NAP-ADDRTYPE");
     }
 
-    /**
-     * Lists the bearers, such as {@code GSM-GPRS}.
-     *
-     * @return every BEARER, in the order of the message; not modifiable
-     */
+    /** {@return every BEARER: the bearers, such as {@code GSM-GPRS}} */
     public List<String> bearers() {
         return values("BEARER");
     }
 
-    /**
-     * Lists the addresses of the name servers.
-     *
-     * @return every DNS-ADDR, in the order of the message; not modifiable
-     */
+    /** {@return every DNS-ADDR: the addresses of the name servers} */
     public List<String> dnsAddresses() {
         return values("DNS-ADDR");
     }
 
-    /**
-     * Tells the protocol of the call, such as {@code ANALOG-MODEM}.
-     *
-     * @return CALLTYPE; {@code null} when it is not set
-     */
+    /** {@return CALLTYPE: the protocol of the call, such as {@code ANALOG-MODEM}} */
     public String callType() {
         return value("CALLTYPE");
     }
 
-    /**
-     * Tells the address of the device itself.
-     *
-     * @return LOCAL-ADDR; {@code null} when it is not set
-     */
+    /** {@return LOCAL-ADDR: the address of the device itself} */
     public String localAddress() {
         return value("LOCAL-ADDR");
     }
 
-    /**
-     * Tells what kind of address {@link #localAddress} is.
-     *
-     * @return LOCAL-ADDRTYPE, {@link AddressType#UNKNOWN} for a text that is none of the kinds;
-     *     {@code null} when it is not set
-     */
+    /** {@return LOCAL-ADDRTYPE: what kind of address {@link #localAddress} is} */
     public AddressType localAddressType() {
         return AddressType.of(localAddressTypeText());
     }
 
-    /**
-     * Tells what kind of address {@link #localAddress} is, as the message says it.
-     *
-     * @return LOCAL-ADDRTYPE; {@code null} when it is not set
-     */
+    /** {@return LOCAL-ADDRTYPE as the message says it} */
     public String localAddressTypeText() {
         return value("LOCAL-ADDRTYPE");
     }
 
-    /**
-     * Tells the speed of the connection in bit/s, or {@code AUTOBAUDING}.
-     *
-     * @return LINKSPEED; {@code null} when it is not set
-     */
+    /** {@return LINKSPEED: the speed of the connection in bit/s, or {@code AUTOBAUDING}} */
     public String linkSpeed() {
         return value("LINKSPEED");
     }
 
     /**
-     * Tells the speed of the connection towards the device in bit/s, or {@code AUTOBAUDING}.
-     *
-     * @return DNLINKSPEED; {@code null} when it is not set
+     * {@return DNLINKSPEED: the speed of the connection towards the device in bit/s, or {@code
+     *     AUTOBAUDING}}
      */
     public String downlinkSpeed() {
         return value("DNLINKSPEED");
     }
 
-    /**
-     * Tells for how many seconds an idle connection is kept.
-     *
-     * @return LINGER; {@code null} when it is not set
-     */
+    /** {@return LINGER: for how many seconds an idle connection is kept} */
     public String linger() {
         return value("LINGER");
     }
 
-    /**
-     * Tells how erroneous packets are dealt with.
-     *
-     * @return DELIVERY-ERR-SDU; {@code null} when it is not set
-     */
+    /** {@return DELIVERY-ERR-SDU: how erroneous packets are dealt with} */
     public String deliveryOfErroneousSdus() {
         return value("DELIVERY-ERR-SDU");
     }
 
-    /**
-     * Tells whether packets are delivered in order.
-     *
-     * @return DELIVERY-ORDER; {@code null} when it is not set
-     */
+    /** {@return DELIVERY-ORDER: whether packets are delivered in order} */
     public String deliveryOrder() {
         return value("DELIVERY-ORDER");
     }
 
-    /**
-     * Tells the class of the traffic.
-     *
-     * @return TRAFFIC-CLASS; {@code null} when it is not set
-     */
+    /** {@return TRAFFIC-CLASS: the class of the traffic} */
     public String trafficClass() {
         return value("TRAFFIC-CLASS");
     }
 
-    /**
-     * Tells the size of the largest packet, as 3GPP codes it.
-     *
-     * @return MAX-SDU-SIZE; {@code null} when it is not set
-     */
+    /** {@return MAX-SDU-SIZE: the size of the largest packet, as 3GPP codes it} */
     public String maxSduSize() {
         return value("MAX-SDU-SIZE");
     }
 
-    /**
-     * Tells the highest rate from the device, as 3GPP codes it.
-     *
-     * @return MAX-BITRATE-UPLINK; {@code null} when it is not set
-     */
+    /** {@return MAX-BITRATE-UPLINK: the highest rate from the device, as 3GPP codes it} */
     public String maxBitrateUplink() {
         return value("MAX-BITRATE-UPLINK");
     }
 
-    /**
-     * Tells the highest rate towards the device, as 3GPP codes it.
-     *
-     * @return MAX-BITRATE-DNLINK; {@code null} when it is not set
-     */
+    /** {@return MAX-BITRATE-DNLINK: the highest rate towards the device, as 3GPP codes it} */
     public String maxBitrateDownlink() {
         return value("MAX-BITRATE-DNLINK");
     }
 
-    /**
-     * Tells the rate of bit errors that are not detected, as 3GPP codes it.
-     *
-     * @return RESIDUAL-BER; {@code null} when it is not set
-     */
+    /** {@return RESIDUAL-BER: the rate of bit errors that are not detected, as 3GPP codes it} */
     public String residualBitErrorRatio() {
         return value("RESIDUAL-BER");
     }
 
     /**
-     * Tells the rate of packets that are lost or erroneous, as 3GPP codes it.
-     *
-     * @return SDU-ERROR-RATIO; {@code null} when it is not set
+     * {@return SDU-ERROR-RATIO: the rate of packets that are lost or erroneous, as 3GPP codes it}
      */
     public String sduErrorRatio() {
         return value("SDU-ERROR-RATIO");
     }
 
-    /**
-     * Tells the priority of the traffic.
-     *
-     * @return TRAFFIC-HANDL-PRIO; {@code null} when it is not set
-     */
+    /** {@return TRAFFIC-HANDL-PRIO: the priority of the traffic} */
     public String trafficHandlingPriority() {
         return value("TRAFFIC-HANDL-PRIO");
     }
 
-    /**
-     * Tells the longest delay of a packet, as 3GPP codes it.
-     *
-     * @return TRANSFER-DELAY; {@code null} when it is not set
-     */
+    /** {@return TRANSFER-DELAY: the longest delay of a packet, as 3GPP codes it} */
     public String transferDelay() {
         return value("TRANSFER-DELAY");
     }
 
     /**
-     * Tells the guaranteed rate from the device, as 3GPP codes it.
-     *
-     * @return GUARANTEED-BITRATE-UPLINK; {@code null} when it is not set
+     * {@return GUARANTEED-BITRATE-UPLINK: the guaranteed rate from the device, as 3GPP codes it}
      */
     public String guaranteedBitrateUplink() {
         return value("GUARANTEED-BITRATE-UPLINK");
     }
 
     /**
-     * Tells the guaranteed rate towards the device, as 3GPP codes it.
-     *
-     * @return GUARANTEED-BITRATE-DNLINK; {@code null} when it is not set
+     * {@return GUARANTEED-BITRATE-DNLINK: the guaranteed rate towards the device, as 3GPP codes it}
      */
     public String guaranteedBitrateDownlink() {
         return value("GUARANTEED-BITRATE-DNLINK");
     }
 
-    /**
-     * Tells how often a registration of Mobile IP is tried again.
-     *
-     * @return MAX-NUM-RETRY; {@code null} when it is not set
-     */
+    /** {@return MAX-NUM-RETRY: how often a registration of Mobile IP is tried again} */
     public String maxRetries() {
         return value("MAX-NUM-RETRY");
     }
 
-    /**
-     * Tells how long to wait before the first further try.
-     *
-     * @return FIRST-RETRY-TIMEOUT; {@code null} when it is not set
-     */
+    /** {@return FIRST-RETRY-TIMEOUT: how long to wait before the first further try} */
     public String firstRetryTimeout() {
         return value("FIRST-RETRY-TIMEOUT");
     }
 
-    /**
-     * Tells how long before its end a registration is renewed.
-     *
-     * @return REREG-THRESHOLD; {@code null} when it is not set
-     */
+    /** {@return REREG-THRESHOLD: how long before its end a registration is renewed} */
     public String reregistrationThreshold() {
         return value("REREG-THRESHOLD");
     }
 
-    /**
-     * Tells whether T-BIT stands here, with or without a value.
-     *
-     * @return true when it does
-     */
+    /** {@return whether T-BIT stands here, with or without a value} */
     public boolean hasTBit() {
         return has("T-BIT");
     }
 
-    /**
-     * Tells the value of T-BIT.
-     *
-     * @return T-BIT; {@code null} when it has no value, and when it is not set
-     */
+    /** {@return the value of T-BIT} */
     public String tBit() {
         return value("T-BIT");
     }
 
-    /**
-     * Tells whether INIT stands here, with or without a value.
-     *
-     * @return true when it does
-     */
+    /** {@return whether INIT stands here, with or without a value} */
     public boolean hasInit() {
         return has("INIT");
     }
 
-    /**
-     * Tells the value of INIT.
-     *
-     * @return INIT; {@code null} when it has no value, and when it is not set
-     */
+    /** {@return the value of INIT} */
     public String init() {
         return value("INIT");
     }
 
     /**
-     * Lists how to authenticate towards the access point.
-     *
-     * @return every NAPAUTHINFO that stands directly in this characteristic, in its order; not
-     *     modifiable
+     * {@return every NAPAUTHINFO directly in this characteristic: how to authenticate towards the
+     *     access point}
      */
     public List<AccessPointAuthentication> authentications() {
         return views(AccessPointAuthentication.TYPE, AccessPointAuthentication::new);
     }
 
     /**
-     * Lists where and until when the access point may be used.
-     *
-     * @return every VALIDITY that stands directly in this characteristic, in its order; not
-     *     modifiable
+     * {@return every VALIDITY directly in this characteristic: where and until when the access
+     *     point may be used}
      */
     public List<Validity> validities() {
         return views(Validity.TYPE, Validity::new);
     }
 
     /**
-     * Lists the wireless networks behind the access point.
-     *
-     * @return every WLAN that stands directly in this characteristic, in its order; not modifiable
+     * {@return every WLAN directly in this characteristic: the wireless networks behind the access
+     *     point}
      */
     public List<Wlan> wlans() {
         return views(Wlan.TYPE, Wlan::new);

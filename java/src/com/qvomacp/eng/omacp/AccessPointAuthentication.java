@@ -19,47 +19,30 @@ public final class AccessPointAuthentication extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the scheme, such as {@code PAP} or {@code CHAP}.
-     *
-     * @return AUTHTYPE; {@code null} when it is not set
-     */
+    /** {@return AUTHTYPE: the scheme, such as {@code PAP} or {@code CHAP}} */
     public String type() {
         return value("AUTHTYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return AUTHNAME; {@code null} when it is not set
-     */
+    /** {@return AUTHNAME: the name of the user} */
     public String name() {
         return value("AUTHNAME");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return AUTHSECRET; {@code null} when it is not set
-     */
+    /** {@return AUTHSECRET: the password} */
     public String secret() {
         return value("AUTHSECRET");
     }
 
     /**
-     * Lists the entities that ask for the authentication, such as {@code AAA}.
-     *
-     * @return every AUTH-ENTITY, in the order of the message; not modifiable
+     * {@return every AUTH-ENTITY: the entities that ask for the authentication, such as {@code
+     *     AAA}}
      */
     public List<String> entities() {
         return values("AUTH-ENTITY");
     }
 
-    /**
-     * Tells the security parameter index of Mobile IP.
-     *
-     * @return SPI; {@code null} when it is not set
-     */
+    /** {@return SPI: the security parameter index of Mobile IP} */
     public String securityParameterIndex() {
         return value("SPI");
     }

@@ -19,56 +19,32 @@ public final class AccessRule extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Lists the rules.
-     *
-     * @return every RULE, in the order of the message; not modifiable
-     */
+    /** {@return every RULE: the rules} */
     public List<String> rules() {
         return values("RULE");
     }
 
-    /**
-     * Lists the applications that the rule is about.
-     *
-     * @return every APPID, in the order of the message; not modifiable
-     */
+    /** {@return every APPID: the applications that the rule is about} */
     public List<String> appIds() {
         return values("APPID");
     }
 
-    /**
-     * Lists the ports that the rule is about.
-     *
-     * @return every PORTNBR, in the order of the message; not modifiable
-     */
+    /** {@return every PORTNBR: the ports that the rule is about} */
     public List<String> portNumbers() {
         return values("PORTNBR");
     }
 
-    /**
-     * Lists the domains that the rule is about.
-     *
-     * @return every DOMAIN, in the order of the message; not modifiable
-     */
+    /** {@return every DOMAIN: the domains that the rule is about} */
     public List<String> domains() {
         return values("DOMAIN");
     }
 
-    /**
-     * Lists the access points to take, by their names.
-     *
-     * @return every TO-NAPID, in the order of the message; not modifiable
-     */
+    /** {@return every TO-NAPID: the access points to take, by their names} */
     public List<String> toNapIds() {
         return values("TO-NAPID");
     }
 
-    /**
-     * Lists the proxies to take, by their names.
-     *
-     * @return every TO-PROXY, in the order of the message; not modifiable
-     */
+    /** {@return every TO-PROXY: the proxies to take, by their names} */
     public List<String> toProxies() {
         return values("TO-PROXY");
     }

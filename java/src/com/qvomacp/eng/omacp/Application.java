@@ -22,203 +22,133 @@ public final class Application extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells which application it is, such as {@code w4} for multimedia messages.
-     *
-     * @return APPID; {@code null} when it is not set
-     */
+    /** {@return APPID: which application it is, such as {@code w4} for multimedia messages} */
     public String appId() {
         return value("APPID");
     }
 
-    /**
-     * Names the provider of the service.
-     *
-     * @return PROVIDER-ID; {@code null} when it is not set
-     */
+    /** {@return PROVIDER-ID: the name of the provider of the service} */
     public String providerId() {
         return value("PROVIDER-ID");
     }
 
-    /**
-     * Tells the name to show to the user.
-     *
-     * @return NAME; {@code null} when it is not set
-     */
+    /** {@return NAME: the name to show to the user} */
     public String name() {
         return value("NAME");
     }
 
     /**
-     * Tells the content types that the application accepts, with commas between them.
-     *
-     * @return AACCEPT; {@code null} when it is not set
+     * {@return AACCEPT: the content types that the application accepts, with commas between them}
      */
     public String accept() {
         return value("AACCEPT");
     }
 
-    /**
-     * Tells the protocol that the application speaks.
-     *
-     * @return APROTOCOL; {@code null} when it is not set
-     */
+    /** {@return APROTOCOL: the protocol that the application speaks} */
     public String protocol() {
         return value("APROTOCOL");
     }
 
-    /**
-     * Lists the proxies through which the application goes, by their names.
-     *
-     * @return every TO-PROXY, in the order of the message; not modifiable
-     */
+    /** {@return every TO-PROXY: the proxies through which the application goes, by their names} */
     public List<String> toProxies() {
         return values("TO-PROXY");
     }
 
     /**
-     * Lists the access points through which the application goes, by their names.
-     *
-     * @return every TO-NAPID, in the order of the message; not modifiable
+     * {@return every TO-NAPID: the access points through which the application goes, by their
+     *     names}
      */
     public List<String> toNapIds() {
         return values("TO-NAPID");
     }
 
     /**
-     * Lists the addresses of the service that are given without further properties.
-     *
-     * @return every ADDR, in the order of the message; not modifiable
+     * {@return every ADDR: the addresses of the service that are given without further properties}
      */
     public List<String> simpleAddresses() {
         return values("ADDR");
     }
 
-    /**
-     * Names the settings; others refer to them by this name.
-     *
-     * @return APPREF; {@code null} when it is not set
-     */
+    /** {@return APPREF: the name of the settings; others refer to them by this name} */
     public String reference() {
         return value("APPREF");
     }
 
     /**
-     * Lists the settings of other applications that belong to these, by their names.
-     *
-     * @return every TO-APPREF, in the order of the message; not modifiable
+     * {@return every TO-APPREF: the settings of other applications that belong to these, by their
+     *     names}
      */
     public List<String> toReferences() {
         return values("TO-APPREF");
     }
 
-    /**
-     * Tells whether INTERNET stands here, with or without a value.
-     *
-     * @return true when it does
-     */
+    /** {@return whether INTERNET stands here, with or without a value} */
     public boolean hasInternet() {
         return has("INTERNET");
     }
 
-    /**
-     * Tells the value of INTERNET.
-     *
-     * @return INTERNET; {@code null} when it has no value, and when it is not set
-     */
+    /** {@return the value of INTERNET} */
     public String internet() {
         return value("INTERNET");
     }
 
-    /**
-     * Tells the sender that the application uses.
-     *
-     * @return FROM; {@code null} when it is not set
-     */
+    /** {@return FROM: the sender that the application uses} */
     public String from() {
         return value("FROM");
     }
 
-    /**
-     * Tells the first of the XCAP application identifiers.
-     *
-     * @return XCAP_AUID_DCS; {@code null} when it is not set
-     */
+    /** {@return XCAP_AUID_DCS: the first of the XCAP application identifiers} */
     public String xcapAuidDcs() {
         return value("XCAP_AUID_DCS");
     }
 
-    /**
-     * Tells the second of the XCAP application identifiers.
-     *
-     * @return XCAP_AUID_PMS; {@code null} when it is not set
-     */
+    /** {@return XCAP_AUID_PMS: the second of the XCAP application identifiers} */
     public String xcapAuidPms() {
         return value("XCAP_AUID_PMS");
     }
 
-    /**
-     * Tells the third of the XCAP application identifiers.
-     *
-     * @return XCAP_AUID_CDMS; {@code null} when it is not set
-     */
+    /** {@return XCAP_AUID_CDMS: the third of the XCAP application identifiers} */
     public String xcapAuidCdms() {
         return value("XCAP_AUID_CDMS");
     }
 
-    /**
-     * Tells the XCAP header for the identity of the device.
-     *
-     * @return XCAP_IMEI_HEADER; {@code null} when it is not set
-     */
+    /** {@return XCAP_IMEI_HEADER: the XCAP header for the identity of the device} */
     public String xcapImeiHeader() {
         return value("XCAP_IMEI_HEADER");
     }
 
-    /**
-     * Tells the XCAP header for the identity of the transaction.
-     *
-     * @return XCAP_TID_HEADER; {@code null} when it is not set
-     */
+    /** {@return XCAP_TID_HEADER: the XCAP header for the identity of the transaction} */
     public String xcapTidHeader() {
         return value("XCAP_TID_HEADER");
     }
 
     /**
-     * Lists the addresses of the service that have ports or a type.
-     *
-     * @return every APPADDR that stands directly in this characteristic, in its order; not
-     *     modifiable
+     * {@return every APPADDR directly in this characteristic: the addresses of the service that
+     *     have ports or a type}
      */
     public List<ApplicationAddress> addresses() {
         return views(ApplicationAddress.TYPE, ApplicationAddress::new);
     }
 
     /**
-     * Lists how application and service authenticate themselves.
-     *
-     * @return every APPAUTH that stands directly in this characteristic, in its order; not
-     *     modifiable
+     * {@return every APPAUTH directly in this characteristic: how application and service
+     *     authenticate themselves}
      */
     public List<ApplicationAuthentication> authentications() {
         return views(ApplicationAuthentication.TYPE, ApplicationAuthentication::new);
     }
 
     /**
-     * Lists the resources of the service, such as bookmarks and databases.
-     *
-     * @return every RESOURCE that stands directly in this characteristic, in its order; not
-     *     modifiable
+     * {@return every RESOURCE directly in this characteristic: the resources of the service, such
+     *     as bookmarks and databases}
      */
     public List<Resource> resources() {
         return views(Resource.TYPE, Resource::new);
     }
 
     /**
-     * Lists what the application may do while roaming.
-     *
-     * @return every ROAMING that stands directly in this characteristic, in its order; not
-     *     modifiable
+     * {@return every ROAMING directly in this characteristic: what the application may do while
+     *     roaming}
      */
     public List<Roaming> roamings() {
         return views(Roaming.TYPE, Roaming::new);

@@ -19,38 +19,24 @@ public final class ApplicationAddress extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the address.
-     *
-     * @return ADDR; {@code null} when it is not set
-     */
+    /** {@return ADDR: the address} */
     public String address() {
         return value("ADDR");
     }
 
-    /**
-     * Tells what kind of address {@link #address} is.
-     *
-     * @return ADDRTYPE, {@link AddressType#UNKNOWN} for a text that is none of the kinds; {@code
-     *     null} when it is not set
-     */
+    /** {@return ADDRTYPE: what kind of address {@link #address} is} */
     public AddressType addressType() {
         return AddressType.of(addressTypeText());
     }
 
-    /**
-     * Tells what kind of address {@link #address} is, as the message says it.
-     *
-     * @return ADDRTYPE; {@code null} when it is not set
-     */
+    /** {@return ADDRTYPE as the message says it} */
     public String addressTypeText() {
         return value("ADDRTYPE");
     }
 
     /**
-     * Lists the ports of the service at this address.
-     *
-     * @return every PORT that stands directly in this characteristic, in its order; not modifiable
+     * {@return every PORT directly in this characteristic: the ports of the service at this
+     *     address}
      */
     public List<Port> ports() {
         return views(Port.TYPE, Port::new);

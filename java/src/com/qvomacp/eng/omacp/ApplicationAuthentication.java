@@ -18,46 +18,29 @@ public final class ApplicationAuthentication extends TypedCharacteristic {
     }
 
     /**
-     * Tells who authenticates itself, such as {@code APPSRV}, {@code CLIENT} or {@code OBEX}.
-     *
-     * @return AAUTHLEVEL; {@code null} when it is not set
+     * {@return AAUTHLEVEL: who authenticates itself, such as {@code APPSRV}, {@code CLIENT} or
+     *     {@code OBEX}}
      */
     public String level() {
         return value("AAUTHLEVEL");
     }
 
-    /**
-     * Tells the scheme, such as {@code HTTP-BASIC}.
-     *
-     * @return AAUTHTYPE; {@code null} when it is not set
-     */
+    /** {@return AAUTHTYPE: the scheme, such as {@code HTTP-BASIC}} */
     public String type() {
         return value("AAUTHTYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return AAUTHNAME; {@code null} when it is not set
-     */
+    /** {@return AAUTHNAME: the name of the user} */
     public String name() {
         return value("AAUTHNAME");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return AAUTHSECRET; {@code null} when it is not set
-     */
+    /** {@return AAUTHSECRET: the password} */
     public String secret() {
         return value("AAUTHSECRET");
     }
 
-    /**
-     * Tells what else the scheme needs, such as a nonce.
-     *
-     * @return AAUTHDATA; {@code null} when it is not set
-     */
+    /** {@return AAUTHDATA: what else the scheme needs, such as a nonce} */
     public String data() {
         return value("AAUTHDATA");
     }

@@ -55,7 +55,8 @@ final class BodyHeader {
         publicIdentifier = integer(body, cursor, "document type");
         long typeIndex = publicIdentifier == 0 ? integer(body, cursor, "document type") : 0;
         charsetAt = cursor.at();
-        charset = CharacterSet.of(version == FIRST_VERSION ? 0 : integer(body, cursor, "character set"));
+        long number = version == FIRST_VERSION ? 0 : integer(body, cursor, "character set");
+        charset = CharacterSet.of(number);
         tableLengthAt = cursor.at();
         long length = integer(body, cursor, "string table");
         tableAt = cursor.at();
@@ -114,7 +115,8 @@ final class BodyHeader {
             int root = cursor.peek();
             boolean literal = root >= 0 && (root & ROOT_MASK) == BodyReader.LITERAL;
             if (root >= 0 && !literal && (root & ROOT_MASK) != ROOT_TOKEN) {
-                throw otherType(body, "the document type is not stated, and its first token is another's");
+                throw otherType(
+                        body, "the document type is not stated, and its first token is another's");
             }
         }
     }

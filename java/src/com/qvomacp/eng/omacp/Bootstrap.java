@@ -19,56 +19,32 @@ public final class Bootstrap extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the name to show to the user.
-     *
-     * @return NAME; {@code null} when it is not set
-     */
+    /** {@return NAME: the name to show to the user} */
     public String name() {
         return value("NAME");
     }
 
-    /**
-     * Lists the proxies that may provision, by their names.
-     *
-     * @return every PROXY-ID, in the order of the message; not modifiable
-     */
+    /** {@return every PROXY-ID: the proxies that may provision, by their names} */
     public List<String> proxyIds() {
         return values("PROXY-ID");
     }
 
-    /**
-     * Tells the mobile country code.
-     *
-     * @return COUNTRY; {@code null} when it is not set
-     */
+    /** {@return COUNTRY: the mobile country code} */
     public String country() {
         return value("COUNTRY");
     }
 
-    /**
-     * Lists the networks for which this holds.
-     *
-     * @return every NETWORK, in the order of the message; not modifiable
-     */
+    /** {@return every NETWORK: the networks for which this holds} */
     public List<String> networks() {
         return values("NETWORK");
     }
 
-    /**
-     * Names the trusted provisioning server.
-     *
-     * @return PROVURL; {@code null} when it is not set
-     */
+    /** {@return PROVURL: the name of the trusted provisioning server} */
     public String provisioningUrl() {
         return value("PROVURL");
     }
 
-    /**
-     * Tells how many further contexts the server may make.
-     *
-     * @return CONTEXT-ALLOW; {@code null} when it is not set
-     */
+    /** {@return CONTEXT-ALLOW: how many further contexts the server may make} */
     public String contextAllow() {
         return value("CONTEXT-ALLOW");
     }

@@ -17,11 +17,7 @@ public final class ClientIdentity extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the identity.
-     *
-     * @return CLIENT-ID; {@code null} when it is not set
-     */
+    /** {@return CLIENT-ID: the identity} */
     public String clientId() {
         return value("CLIENT-ID");
     }

@@ -39,8 +39,8 @@ public final class ContentType {
     /**
      * Tells the media type.
      *
-     * @return in lower case, such as {@code application/vnd.wap.connectivity-wbxml}; a printable name
-     *     for a number that stands for none
+     * @return in lower case, such as {@code application/vnd.wap.connectivity-wbxml}; a printable
+     *     name for a number that stands for none
      */
     public String mediaType() {
         return mediaType;
@@ -89,7 +89,10 @@ public final class ContentType {
             depth = 1;
         }
         visitor.visit(
-                mediaTypeOffset, mediaTypeEnd - mediaTypeOffset, depth, "content type: " + mediaType);
+                mediaTypeOffset,
+                mediaTypeEnd - mediaTypeOffset,
+                depth,
+                "content type: " + mediaType);
         int at = mediaTypeEnd;
         for (HeaderField parameter : parameters) {
             describeGap(visitor, at, parameter.offset());

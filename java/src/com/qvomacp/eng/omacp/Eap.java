@@ -19,119 +19,67 @@ public final class Eap extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the type of EAP.
-     *
-     * @return EAPTYPE; {@code null} when it is not set
-     */
+    /** {@return EAPTYPE: the type of EAP} */
     public String type() {
         return value("EAPTYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return USERNAME; {@code null} when it is not set
-     */
+    /** {@return USERNAME: the name of the user} */
     public String userName() {
         return value("USERNAME");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return PASSWORD; {@code null} when it is not set
-     */
+    /** {@return PASSWORD: the password} */
     public String password() {
         return value("PASSWORD");
     }
 
-    /**
-     * Tells the realm of the user.
-     *
-     * @return REALM; {@code null} when it is not set
-     */
+    /** {@return REALM: the realm of the user} */
     public String realm() {
         return value("REALM");
     }
 
-    /**
-     * Tells whether pseudonyms are used.
-     *
-     * @return USE-PSEUD; {@code null} when it is not set
-     */
+    /** {@return USE-PSEUD: whether pseudonyms are used} */
     public String usePseudonym() {
         return value("USE-PSEUD");
     }
 
-    /**
-     * Tells whether the realm of the server is verified.
-     *
-     * @return VER-SER-REALM; {@code null} when it is not set
-     */
+    /** {@return VER-SER-REALM: whether the realm of the server is verified} */
     public String verifyServerRealm() {
         return value("VER-SER-REALM");
     }
 
-    /**
-     * Tells whether the client authenticates itself.
-     *
-     * @return CLIENT-AUTH; {@code null} when it is not set
-     */
+    /** {@return CLIENT-AUTH: whether the client authenticates itself} */
     public String clientAuthentication() {
         return value("CLIENT-AUTH");
     }
 
-    /**
-     * Tells how long a session holds.
-     *
-     * @return SES-VAL-TIME; {@code null} when it is not set
-     */
+    /** {@return SES-VAL-TIME: how long a session holds} */
     public String sessionValidityTime() {
         return value("SES-VAL-TIME");
     }
 
-    /**
-     * Tells the cipher suites.
-     *
-     * @return CIP-SUIT; {@code null} when it is not set
-     */
+    /** {@return CIP-SUIT: the cipher suites} */
     public String cipherSuites() {
         return value("CIP-SUIT");
     }
 
-    /**
-     * Tells whether version 0 of PEAP may be used.
-     *
-     * @return PEAP-V0; {@code null} when it is not set
-     */
+    /** {@return PEAP-V0: whether version 0 of PEAP may be used} */
     public String peapVersion0() {
         return value("PEAP-V0");
     }
 
-    /**
-     * Tells whether version 1 of PEAP may be used.
-     *
-     * @return PEAP-V1; {@code null} when it is not set
-     */
+    /** {@return PEAP-V1: whether version 1 of PEAP may be used} */
     public String peapVersion1() {
         return value("PEAP-V1");
     }
 
-    /**
-     * Tells whether version 2 of PEAP may be used.
-     *
-     * @return PEAP-V2; {@code null} when it is not set
-     */
+    /** {@return PEAP-V2: whether version 2 of PEAP may be used} */
     public String peapVersion2() {
         return value("PEAP-V2");
     }
 
-    /**
-     * Lists the certificates.
-     *
-     * @return every CERT that stands directly in this characteristic, in its order; not modifiable
-     */
+    /** {@return every CERT directly in this characteristic: the certificates} */
     public List<EapCertificate> certificates() {
         return views(EapCertificate.TYPE, EapCertificate::new);
     }

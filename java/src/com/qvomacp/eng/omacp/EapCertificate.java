@@ -18,56 +18,32 @@ public final class EapCertificate extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Names the issuer.
-     *
-     * @return ISS-NAME; {@code null} when it is not set
-     */
+    /** {@return ISS-NAME: the name of the issuer} */
     public String issuerName() {
         return value("ISS-NAME");
     }
 
-    /**
-     * Names the subject.
-     *
-     * @return SUB-NAME; {@code null} when it is not set
-     */
+    /** {@return SUB-NAME: the name of the subject} */
     public String subjectName() {
         return value("SUB-NAME");
     }
 
-    /**
-     * Tells whose certificate it is.
-     *
-     * @return CERT-TYPE; {@code null} when it is not set
-     */
+    /** {@return CERT-TYPE: whose certificate it is} */
     public String type() {
         return value("CERT-TYPE");
     }
 
-    /**
-     * Tells the serial number.
-     *
-     * @return SER-NUM; {@code null} when it is not set
-     */
+    /** {@return SER-NUM: the serial number} */
     public String serialNumber() {
         return value("SER-NUM");
     }
 
-    /**
-     * Tells the identifier of the key.
-     *
-     * @return SUB-KEY-ID; {@code null} when it is not set
-     */
+    /** {@return SUB-KEY-ID: the identifier of the key} */
     public String subjectKeyId() {
         return value("SUB-KEY-ID");
     }
 
-    /**
-     * Tells the thumbprint.
-     *
-     * @return THUMBPRINT; {@code null} when it is not set
-     */
+    /** {@return THUMBPRINT: the thumbprint} */
     public String thumbprint() {
         return value("THUMBPRINT");
     }

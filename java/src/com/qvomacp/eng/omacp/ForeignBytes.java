@@ -4,8 +4,8 @@ import java.nio.charset.StandardCharsets;
 import java.util.Locale;
 
 /**
- * Says what bytes look like that are no provisioning message, for the sentence that refuses them. It
- * is a guess, and nothing is read by it.
+ * Says what bytes look like that are no provisioning message, for the sentence that refuses them.
+ * It is a guess, and nothing is read by it.
  *
  * <pre>{@code
  * String likeness = ForeignBytes.describe(bytes);
@@ -178,8 +178,8 @@ public final class ForeignBytes {
         if (name == null) {
             return null;
         }
-        boolean isWhole = (version == 0 || cursor.integer() >= 0) && cursor.integer() <= cursor.left();
-        return isWhole ? name + " in WBXML" : null;
+        boolean hasCharset = version == 0 || cursor.integer() >= 0;
+        return hasCharset && cursor.integer() <= cursor.left() ? name + " in WBXML" : null;
     }
 
     /** Whether the lengths of a message between handset and network, or of its data, come out. */
@@ -289,8 +289,8 @@ public final class ForeignBytes {
         for (String[] row : ELEMENTS) {
             int at = lower.indexOf("<" + row[0].toLowerCase(Locale.ROOT));
             int after = at + 1 + row[0].length();
-            boolean isName = after < start.length() && " \t\r\n>/".indexOf(start.charAt(after)) >= 0;
-            if (at >= 0 && at < found && isName) {
+            boolean isFirst = at >= 0 && at < found && after < start.length();
+            if (isFirst && " \t\r\n>/".indexOf(start.charAt(after)) >= 0) {
                 found = at;
                 name = row[1];
             }
@@ -306,7 +306,9 @@ public final class ForeignBytes {
             char c = content.charAt(i);
             if (c < 0x80 && Character.digit(c, 16) >= 0) {
                 ++digits;
-            } else if (c >= 'A' && c <= 'Z' || c >= 'a' && c <= 'z' || "0123456789+/=-_".indexOf(c) >= 0) {
+            } else if (c >= 'A' && c <= 'Z'
+                    || c >= 'a' && c <= 'z'
+                    || "+/=-_".indexOf(c) >= 0) {
                 ++letters;
             } else if (!Character.isWhitespace(c)) {
                 ++others;
@@ -317,7 +319,7 @@ public final class ForeignBytes {
                     ? "hexadecimal text"
                     : "hexadecimal text with an odd number of digits, " + digits;
         }
-        boolean isBase64 = others == 0 && content.indexOf(' ') < 0 && digits + letters >= SHORTEST_BASE64;
-        return isBase64 ? "base64 text" : "text";
+        boolean isLong = digits + letters >= SHORTEST_BASE64;
+        return isLong && others == 0 && content.indexOf(' ') < 0 ? "base64 text" : "text";
     }
 }

@@ -35,8 +35,8 @@ public final class HeaderField {
 
     /**
      * Tells the value: a number in decimal digits or by the name that it stands for, a date in UTC
-     * as ISO 8601 writes it, a text without the quotes of its form, and anything else in hexadecimal
-     * digits.
+     * as ISO 8601 writes it, a text without the quotes of its form, and anything else in
+     * hexadecimal digits.
      *
      * @return the value as text; {@code null} when there is none
      */

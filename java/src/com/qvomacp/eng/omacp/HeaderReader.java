@@ -89,7 +89,8 @@ final class HeaderReader {
         }
         if (length > start.left()) {
             throw none(
-                    2, "the header length is " + length + ", and " + start.left() + " bytes follow");
+                    2,
+                    "the header length is " + length + ", and " + start.left() + " bytes follow");
         }
         int from = start.at();
         return new HeaderReader(push, from, from + (int) length).read(transaction, from);
@@ -296,8 +297,7 @@ final class HeaderReader {
     }
 
     private static int secOrMac(String name) {
-        int number = WspTable.PARAMETERS.number(name);
-        return number == SEC || number == MAC ? number : -1;
+        return name.equalsIgnoreCase("SEC") ? SEC : name.equalsIgnoreCase("MAC") ? MAC : -1;
     }
 
     /**
@@ -393,7 +393,9 @@ final class HeaderReader {
             }
             number = number << 8 | bytes[at] & 0xFF;
         }
-        return isLong && mayBeNumber && !isCutOff ? number(number, kind) : hexadecimal(from, length);
+        return isLong && mayBeNumber && !isCutOff
+                ? number(number, kind)
+                : hexadecimal(from, length);
     }
 
     private static String number(long number, Kind kind) {

@@ -19,102 +19,60 @@ public final class PhysicalProxy extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Names the machine.
-     *
-     * @return PHYSICAL-PROXY-ID; {@code null} when it is not set
-     */
+    /** {@return PHYSICAL-PROXY-ID: the name of the machine} */
     public String physicalProxyId() {
         return value("PHYSICAL-PROXY-ID");
     }
 
-    /**
-     * Lists the domains that are reached through the machine.
-     *
-     * @return every DOMAIN, in the order of the message; not modifiable
-     */
+    /** {@return every DOMAIN: the domains that are reached through the machine} */
     public List<String> domains() {
         return values("DOMAIN");
     }
 
-    /**
-     * Tells the address.
-     *
-     * @return PXADDR; {@code null} when it is not set
-     */
+    /** {@return PXADDR: the address} */
     public String address() {
         return value("PXADDR");
     }
 
-    /**
-     * Tells what kind of address {@link #address} is.
-     *
-     * @return PXADDRTYPE, {@link AddressType#UNKNOWN} for a text that is none of the kinds; {@code
-     *     null} when it is not set
-     */
+    /** {@return PXADDRTYPE: what kind of address {@link #address} is} */
     public AddressType addressType() {
         return AddressType.of(addressTypeText());
     }
 
-    /**
-     * Tells what kind of address {@link #address} is, as the message says it.
-     *
-     * @return PXADDRTYPE; {@code null} when it is not set
-     */
+    /** {@return PXADDRTYPE as the message says it} */
     public String addressTypeText() {
         return value("PXADDRTYPE");
     }
 
-    /**
-     * Tells the full domain name.
-     *
-     * @return PXADDR-FQDN; {@code null} when it is not set
-     */
+    /** {@return PXADDR-FQDN: the full domain name} */
     public String hostName() {
         return value("PXADDR-FQDN");
     }
 
-    /**
-     * Tells the version of WSP that the machine speaks.
-     *
-     * @return WSP-VERSION; {@code null} when it is not set
-     */
+    /** {@return WSP-VERSION: the version of WSP that the machine speaks} */
     public String wspVersion() {
         return value("WSP-VERSION");
     }
 
-    /**
-     * Tells whether the machine supports push: {@code 1} when it does.
-     *
-     * @return PUSHENABLED; {@code null} when it is not set
-     */
+    /** {@return PUSHENABLED: whether the machine supports push: {@code 1} when it does} */
     public String pushEnabled() {
         return value("PUSHENABLED");
     }
 
-    /**
-     * Tells whether the machine supports pull: {@code 1} when it does.
-     *
-     * @return PULLENABLED; {@code null} when it is not set
-     */
+    /** {@return PULLENABLED: whether the machine supports pull: {@code 1} when it does} */
     public String pullEnabled() {
         return value("PULLENABLED");
     }
 
     /**
-     * Lists the access points through which the machine is reached, by their names.
-     *
-     * @return every TO-NAPID, in the order of the message; not modifiable
+     * {@return every TO-NAPID: the access points through which the machine is reached, by their
+     *     names}
      */
     public List<String> toNapIds() {
         return values("TO-NAPID");
     }
 
-    /**
-     * Lists the ports of the machine.
-     *
-     * @return every PORT that stands directly in this characteristic, in its order; not modifiable
-     */
+    /** {@return every PORT directly in this characteristic: the ports of the machine} */
     public List<Port> ports() {
         return views(Port.TYPE, Port::new);
     }

@@ -19,20 +19,12 @@ public final class Port extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the number of the port, as the message writes it.
-     *
-     * @return PORTNBR; {@code null} when it is not set
-     */
+    /** {@return PORTNBR: the number of the port, as the message writes it} */
     public String number() {
         return value("PORTNBR");
     }
 
-    /**
-     * Lists the services of the port, such as {@code CO-WSP}.
-     *
-     * @return every SERVICE, in the order of the message; not modifiable
-     */
+    /** {@return every SERVICE: the services of the port, such as {@code CO-WSP}} */
     public List<String> services() {
         return values("SERVICE");
     }

@@ -15,9 +15,9 @@ import javax.crypto.spec.SecretKeySpec;
  *   <li>{@link SecurityMethod#NETWPIN}: the IMSI in semi-octets, as it stands on a SIM card.
  *   <li>{@link SecurityMethod#USERPIN}: the characters of the PIN.
  *   <li>{@link SecurityMethod#USERNETWPIN}: that of the IMSI and then that of the PIN.
- *   <li>{@link SecurityMethod#USERPINMAC}: the first half of the digits that the user has been told.
- *       Their second half is the MAC, a decimal digit for each of its first bytes, and the message
- *       carries none; one that stands in it all the same is not looked at.
+ *   <li>{@link SecurityMethod#USERPINMAC}: the first half of the digits that the user has been
+ *       told. Their second half is the MAC, a decimal digit for each of its first bytes, and the
+ *       message carries none; one that stands in it all the same is not looked at.
  * </ul>
  *
  * <pre>{@code
@@ -42,8 +42,8 @@ public final class ProvisioningMac {
     private ProvisioningMac() {}
 
     /**
-     * Checks a MAC with what the user and the network know. MACs are compared in a time that does not
-     * depend on where they differ. Small and capital hexadecimal digits are the same.
+     * Checks a MAC with what the user and the network know. MACs are compared in a time that does
+     * not depend on where they differ. Small and capital hexadecimal digits are the same.
      *
      * @param method the security method that the message states
      * @param mac the MAC that the message carries; {@code null} when it carries none
@@ -69,14 +69,15 @@ public final class ProvisioningMac {
     }
 
     /**
-     * Checks a MAC with a key that the caller has made, for a network whose subscribers have no IMSI.
+     * Checks a MAC with a key that the caller has made, for a network whose subscribers have no
+     * IMSI.
      *
      * @param method the security method that the message states
      * @param mac the MAC that the message carries; {@code null} when it carries none
      * @param body the body, over which the MAC is computed
      * @param key the bytes of the key
-     * @return what comes of it, never {@code null}; {@link MacResult#NO_MAC} for USERPINMAC, whose MAC
-     *     the user has been told
+     * @return what comes of it, never {@code null}; {@link MacResult#NO_MAC} for USERPINMAC, whose
+     *     MAC the user has been told
      */
     public static MacResult verify(SecurityMethod method, String mac, byte[] body, byte[] key) {
         MacResult missing = missing(method, mac);
@@ -97,8 +98,8 @@ public final class ProvisioningMac {
      * @param pin the PIN; for USERPINMAC all the digits that the user has been told
      * @param imsi the subscriber's number
      * @return 40 capital hexadecimal digits; for USERPINMAC the decimal digits that should be the
-     *     second half of the PIN; {@code null} for NONE and UNKNOWN, and without a usable PIN or IMSI
-     *     that the method needs
+     *     second half of the PIN; {@code null} for NONE and UNKNOWN, and without a usable PIN or
+     *     IMSI that the method needs
      */
     public static String compute(SecurityMethod method, byte[] body, String pin, String imsi) {
         if (!isKnown(method) || unusable(method, pin, imsi) != null) {
@@ -138,8 +139,8 @@ public final class ProvisioningMac {
      *
      * @param key the digits that are to be the key, 5 to 20
      * @param body the body of the message
-     * @return the key and as many digits again, which are the MAC; {@code null} when the key is not as
-     *     said
+     * @return the key and as many digits again, which are the MAC; {@code null} when the key is not
+     *     as said
      */
     public static String digitsToTell(String key, byte[] body) {
         return isHalf(key) ? key + told(key, body) : null;
@@ -167,12 +168,17 @@ public final class ProvisioningMac {
                 }
                 return isPin(pin) ? null : MacResult.UNUSABLE_PIN;
             case USERPINMAC:
-                boolean isTold =
-                        pin != null && pin.length() % 2 == 0 && isHalf(firstHalf(pin)) && isDigits(pin);
-                return isTold ? null : MacResult.UNUSABLE_PIN;
+                return isTold(pin) ? null : MacResult.UNUSABLE_PIN;
             default:
                 return isPin(pin) ? null : MacResult.UNUSABLE_PIN;
         }
+    }
+
+    private static boolean isTold(String pin) {
+        return isPin(pin)
+                && pin.length() % 2 == 0
+                && isHalf(firstHalf(pin))
+                && isHalf(secondHalf(pin));
     }
 
     private static boolean isPin(String pin) {

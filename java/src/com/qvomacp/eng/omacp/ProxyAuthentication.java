@@ -17,29 +17,17 @@ public final class ProxyAuthentication extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the scheme, such as {@code HTTP-BASIC}.
-     *
-     * @return PXAUTH-TYPE; {@code null} when it is not set
-     */
+    /** {@return PXAUTH-TYPE: the scheme, such as {@code HTTP-BASIC}} */
     public String type() {
         return value("PXAUTH-TYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return PXAUTH-ID; {@code null} when it is not set
-     */
+    /** {@return PXAUTH-ID: the name of the user} */
     public String id() {
         return value("PXAUTH-ID");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return PXAUTH-PW; {@code null} when it is not set
-     */
+    /** {@return PXAUTH-PW: the password} */
     public String password() {
         return value("PXAUTH-PW");
     }

@@ -9,9 +9,9 @@ import java.util.List;
  *
  * <p>There is no header without the type of a push, a header length that the data has, and a media
  * type. Of anything else what is there is read: a length inside the header that runs beyond it ends
- * with it, as does a text without its NUL; a parameter that begins inside the content type is read to
- * its own end; an octet that can begin nothing is passed over. SEC and MAC are found as parameters and
- * as headers, by number or by name in any case; the first one counts.
+ * with it, as does a text without its NUL; a parameter that begins inside the content type is read
+ * to its own end; an octet that can begin nothing is passed over. SEC and MAC are found as
+ * parameters and as headers, by number or by name in any case; the first one counts.
  *
  * <pre>{@code
  * PushHeader header = PushHeader.parse(push);

@@ -17,84 +17,50 @@ public final class Resource extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the address of the resource.
-     *
-     * @return URI; {@code null} when it is not set
-     */
+    /** {@return URI: the address of the resource} */
     public String uri() {
         return value("URI");
     }
 
-    /**
-     * Tells the name to show to the user.
-     *
-     * @return NAME; {@code null} when it is not set
-     */
+    /** {@return NAME: the name to show to the user} */
     public String name() {
         return value("NAME");
     }
 
-    /**
-     * Tells the content types of the resource, with commas between them.
-     *
-     * @return AACCEPT; {@code null} when it is not set
-     */
+    /** {@return AACCEPT: the content types of the resource, with commas between them} */
     public String accept() {
         return value("AACCEPT");
     }
 
-    /**
-     * Tells the authentication scheme.
-     *
-     * @return AAUTHTYPE; {@code null} when it is not set
-     */
+    /** {@return AAUTHTYPE: the authentication scheme} */
     public String authenticationType() {
         return value("AAUTHTYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return AAUTHNAME; {@code null} when it is not set
-     */
+    /** {@return AAUTHNAME: the name of the user} */
     public String authenticationName() {
         return value("AAUTHNAME");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return AAUTHSECRET; {@code null} when it is not set
-     */
+    /** {@return AAUTHSECRET: the password} */
     public String authenticationSecret() {
         return value("AAUTHSECRET");
     }
 
-    /**
-     * Tells what else the scheme needs.
-     *
-     * @return AAUTHDATA; {@code null} when it is not set
-     */
+    /** {@return AAUTHDATA: what else the scheme needs} */
     public String authenticationData() {
         return value("AAUTHDATA");
     }
 
     /**
-     * Tells whether STARTPAGE stands here, with or without a value: by the standard, whether this
-     * is the resource to begin with.
-     *
-     * @return true when it does
+     * {@return whether STARTPAGE stands here, with or without a value: by the standard, whether
+     *     this is the resource to begin with}
      */
     public boolean hasStartPage() {
         return has("STARTPAGE");
     }
 
-    /**
-     * Tells the value of STARTPAGE, which by the standard has none.
-     *
-     * @return STARTPAGE; {@code null} when it has no value, and when it is not set
-     */
+    /** {@return the value of STARTPAGE, which by the standard has none} */
     public String startPage() {
         return value("STARTPAGE");
     }

@@ -17,20 +17,12 @@ public final class Roaming extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells whether synchronisation is allowed.
-     *
-     * @return SYNC-ALLOWED; {@code null} when it is not set
-     */
+    /** {@return SYNC-ALLOWED: whether synchronisation is allowed} */
     public String syncAllowed() {
         return value("SYNC-ALLOWED");
     }
 
-    /**
-     * Tells whether synchronisation is on unless the user says otherwise.
-     *
-     * @return SYNC-DEFAULT; {@code null} when it is not set
-     */
+    /** {@return SYNC-DEFAULT: whether synchronisation is on unless the user says otherwise} */
     public String syncDefault() {
         return value("SYNC-DEFAULT");
     }

@@ -17,29 +17,17 @@ public final class SecondarySsid extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Names the network.
-     *
-     * @return S-SSID; {@code null} when it is not set
-     */
+    /** {@return S-SSID: the name of the network} */
     public String ssid() {
         return value("S-SSID");
     }
 
-    /**
-     * Tells whether S-U-SSID stands here, with or without a value.
-     *
-     * @return true when it does
-     */
+    /** {@return whether S-U-SSID stands here, with or without a value} */
     public boolean hasUse() {
         return has("S-U-SSID");
     }
 
-    /**
-     * Tells the value of S-U-SSID.
-     *
-     * @return S-U-SSID; {@code null} when it has no value, and when it is not set
-     */
+    /** {@return the value of S-U-SSID} */
     public String use() {
         return value("S-U-SSID");
     }

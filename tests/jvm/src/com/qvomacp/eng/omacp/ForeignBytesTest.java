@@ -51,7 +51,8 @@ class ForeignBytesTest {
             value = {
                 "''|no bytes at all",
                 "' \n'|nothing but blanks",
-                "<?xml version='1.0'?><!DOCTYPE x><wap-provisioningdoc/>|a provisioning document in XML, which is not encoded yet",
+                "<?xml version='1.0'?><!DOCTYPE x><wap-provisioningdoc/>"
+                        + "|a provisioning document in XML, which is not encoded yet",
                 "<SI><indication/></SI>|a service indication in XML",
                 "<syncml:SyncML>|XML",
                 "<six/>|XML",
@@ -67,7 +68,8 @@ class ForeignBytesTest {
         assertEquals(name, ForeignBytes.describe(text.getBytes(StandardCharsets.UTF_8)));
         if (!name.startsWith("no")) {
             assertEquals(name, ForeignBytes.describe(text.getBytes(StandardCharsets.UTF_16)));
-            assertEquals(name, ForeignBytes.describe(("\uFEFF" + text).getBytes(StandardCharsets.UTF_8)));
+            byte[] marked = ("\uFEFF" + text).getBytes(StandardCharsets.UTF_8);
+            assertEquals(name, ForeignBytes.describe(marked));
         }
     }
 
@@ -76,17 +78,17 @@ class ForeignBytesTest {
         byte[] data = Sms.userData(new byte[] {1, 6, 1, 2}, Sms.PORTS);
         assertEquals("the user data of an SMS", ForeignBytes.describe(data));
         assertEquals("an SMS (SMS-DELIVER)", ForeignBytes.describe(new Sms().deliver(data)));
-        assertEquals("an SMS (SMS-DELIVER)", ForeignBytes.describe(new Sms().centre("").deliver(data)));
-        assertEquals(
-                "an SMS that is being sent (SMS-SUBMIT)",
-                ForeignBytes.describe(Sms.bytes("00 41 00 0B915348000000F0 00 04 0B", Sms.hex(data))));
+        byte[] withoutCentre = new Sms().centre("").deliver(data);
+        assertEquals("an SMS (SMS-DELIVER)", ForeignBytes.describe(withoutCentre));
+        byte[] submit = Sms.bytes("00 41 00 0B915348000000F0 00 04 0B", Sms.hex(data));
+        assertEquals("an SMS that is being sent (SMS-SUBMIT)", ForeignBytes.describe(submit));
         assertNull(ForeignBytes.describe(new Sms().deliver(data, data.length + 1)));
     }
 
     @Test
     void namesBase64() {
-        byte[] text = Base64.getEncoder().encode("provisioning, of a kind".getBytes(StandardCharsets.UTF_8));
-        assertEquals("base64 text", ForeignBytes.describe(text));
+        byte[] words = "provisioning, of a kind".getBytes(StandardCharsets.UTF_8);
+        assertEquals("base64 text", ForeignBytes.describe(Base64.getEncoder().encode(words)));
     }
 
     @Test
@@ -95,7 +97,8 @@ class ForeignBytesTest {
                 assertThrows(
                         ProvisioningException.class,
                         () -> PushHeader.parse("<si></si>".getBytes(StandardCharsets.US_ASCII)));
-        assertTrue(refused.getMessage().contains("a service indication in XML"), refused.getMessage());
+        String message = refused.getMessage();
+        assertTrue(message.contains("a service indication in XML"), message);
     }
 
     @Test

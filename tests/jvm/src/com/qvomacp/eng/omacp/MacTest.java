@@ -186,7 +186,8 @@ class MacTest {
             String wrong = HMAC.substring(0, i) + other + HMAC.substring(i + 1);
             assertEquals(MacResult.WRONG, new Pushed(0x81, wrong, DATA).verify(KEY, null), wrong);
         }
-        for (String wrong : List.of(HMAC.substring(1), HMAC.substring(0, 39), HMAC + "0", "\u00df")) {
+        String shorter = HMAC.substring(1);
+        for (String wrong : List.of(shorter, HMAC.substring(0, 39), HMAC + "0", "\u00df")) {
             assertEquals(MacResult.WRONG, new Pushed(0x81, wrong, DATA).verify(KEY, null), wrong);
         }
     }

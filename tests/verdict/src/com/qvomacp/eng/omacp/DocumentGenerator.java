@@ -403,6 +403,15 @@ final class DocumentGenerator {
         put(oddly(0.05) ? 0x41 : 0x01);
     }
 
+    private void characteristics() {
+        for (int more = draw.of(1, 1, 2, 2, 3, 4, 6); more > 0; --more) {
+            characteristic(draw.chance(0.8) ? draw.one(TOP) : draw.one(KINDS), 0);
+            if (draw.chance(0.02)) {
+                inline("\n");
+            }
+        }
+    }
+
     private void document() {
         if (!draw.chance(0.05)) {
             switch (draw.below(3)) {
@@ -418,12 +427,7 @@ final class DocumentGenerator {
             }
             between();
         }
-        for (int more = draw.of(1, 1, 2, 2, 3, 4, 6); more > 0; --more) {
-            characteristic(draw.chance(0.8) ? draw.one(TOP) : draw.one(KINDS), 0);
-            if (draw.chance(0.02)) {
-                inline("\n");
-            }
-        }
+        characteristics();
         put(0x01);
         if (draw.chance(0.05)) {
             pieces.add(draw.bytes(draw.between(1, 5)));
@@ -446,7 +450,13 @@ final class DocumentGenerator {
         return header;
     }
 
-    /** The pieces of a body, of which so many are the header's. */
+    /** The pieces of a run of characteristics. */
+    List<byte[]> run() {
+        characteristics();
+        return pieces;
+    }
+
+    /** The pieces of a body. */
     List<byte[]> body() {
         List<byte[]> body = header();
         document();

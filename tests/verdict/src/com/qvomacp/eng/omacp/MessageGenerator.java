@@ -290,6 +290,31 @@ final class MessageGenerator {
         return joined(pieces);
     }
 
+    /** A body whose texts pass the limit somewhere in a run of characteristics at its end. */
+    byte[] nearLimit() {
+        List<byte[]> pieces = new ArrayList<>();
+        byte[] text = new byte[59900];
+        Arrays.fill(text, (byte) 'x');
+        pieces.add(new byte[] {3, 11, 106});
+        pieces.add(Draw.integer(text.length, 0));
+        pieces.add(text);
+        pieces.add(new byte[] {0x45, (byte) 0xC6, 0x5B, 1});
+        for (int i = 0; i < (8 << 20) / text.length; ++i) {
+            pieces.add(new byte[] {(byte) 0x87, 0x3B, 6, (byte) 0x83, 0, 1});
+        }
+        pieces.add(new byte[] {(byte) 0x87, 0x3B, 6, 3});
+        byte[] filling = new byte[draw.below((8 << 20) % text.length)];
+        if (draw.chance(0.9)) {
+            filling = new byte[(8 << 20) % text.length - draw.below(draw.of(30, 100, 400))];
+        }
+        Arrays.fill(filling, (byte) 'y');
+        pieces.add(filling);
+        pieces.add(new byte[] {0, 1, 1});
+        pieces.addAll(new DocumentGenerator(draw, draw.of(0, 3) / 10.0).run());
+        pieces.add(new byte[] {1});
+        return joined(pieces);
+    }
+
     // ---- Pushes
 
     byte[] push() {
@@ -313,7 +338,7 @@ final class MessageGenerator {
             push.write(content.size());
         }
         write(push, content.toByteArray());
-        write(push, draw.chance(0.7) ? new byte[] {3, 11, 106, 0, 0x45, 1} : draw.bytes(draw.below(3)));
+        write(push, draw.chance(0.6) ? new byte[] {3, 11, 106, 0, 0x45, 1} : draw.bytes(draw.below(3)));
         byte[] whole = push.toByteArray();
         double how = draw.part();
         if (how < 0.15) {
@@ -360,7 +385,7 @@ final class MessageGenerator {
         if (draw.chance(0.6)) {
             String name = draw.one("\u0092", "\u0092", "MAC\0", "mac\0", "mAc?");
             int digits = draw.chance(0.8) ? 40 : draw.of(0, 1, 42, 43, 44, 60);
-            parts.add(latin(name + "7".repeat(digits) + "\0"));
+            parts.add(latin(draw.chance(0.95) ? name + "7".repeat(digits) + "\0" : name));
         }
         if (draw.chance(0.1)) {
             java.util.Collections.reverse(parts);

@@ -21,6 +21,7 @@ import java.util.List;
  */
 final class WriteVerdicts {
     private static final int HEAD = 14;
+    private static final int NEAR_LIMIT = 1000;
 
     private final OutputStream out;
 
@@ -48,6 +49,9 @@ final class WriteVerdicts {
             }
             for (byte[] body : MessageGenerator.large()) {
                 verdicts.body(body);
+            }
+            for (int i = 0; i < NEAR_LIMIT; ++i) {
+                verdicts.body(generator.nearLimit());
             }
             for (long i = 0; i < headers; ++i) {
                 verdicts.header(generator.push());
