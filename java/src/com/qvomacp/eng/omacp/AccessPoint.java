@@ -218,7 +218,7 @@ public final class AccessPoint extends TypedCharacteristic {
      *     access point}
      */
     public List<AccessPointAuthentication> authentications() {
-        return views(AccessPointAuthentication.TYPE, AccessPointAuthentication::new);
+        return views(AccessPointAuthentication.class, AccessPointAuthentication.TYPE);
     }
 
     /**
@@ -226,7 +226,7 @@ public final class AccessPoint extends TypedCharacteristic {
      *     point may be used}
      */
     public List<Validity> validities() {
-        return views(Validity.TYPE, Validity::new);
+        return views(Validity.class, Validity.TYPE);
     }
 
     /**
@@ -234,6 +234,6 @@ public final class AccessPoint extends TypedCharacteristic {
      *     point}
      */
     public List<Wlan> wlans() {
-        return views(Wlan.TYPE, Wlan::new);
+        return views(Wlan.class, Wlan.TYPE);
     }
 }

@@ -127,7 +127,7 @@ public final class Application extends TypedCharacteristic {
      *     have ports or a type}
      */
     public List<ApplicationAddress> addresses() {
-        return views(ApplicationAddress.TYPE, ApplicationAddress::new);
+        return views(ApplicationAddress.class, ApplicationAddress.TYPE);
     }
 
     /**
@@ -135,7 +135,7 @@ public final class Application extends TypedCharacteristic {
      *     authenticate themselves}
      */
     public List<ApplicationAuthentication> authentications() {
-        return views(ApplicationAuthentication.TYPE, ApplicationAuthentication::new);
+        return views(ApplicationAuthentication.class, ApplicationAuthentication.TYPE);
     }
 
     /**
@@ -143,7 +143,7 @@ public final class Application extends TypedCharacteristic {
      *     as bookmarks and databases}
      */
     public List<Resource> resources() {
-        return views(Resource.TYPE, Resource::new);
+        return views(Resource.class, Resource.TYPE);
     }
 
     /**
@@ -151,6 +151,6 @@ public final class Application extends TypedCharacteristic {
      *     roaming}
      */
     public List<Roaming> roamings() {
-        return views(Roaming.TYPE, Roaming::new);
+        return views(Roaming.class, Roaming.TYPE);
     }
 }

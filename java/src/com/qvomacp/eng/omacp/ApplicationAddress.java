@@ -39,6 +39,6 @@ public final class ApplicationAddress extends TypedCharacteristic {
      *     address}
      */
     public List<Port> ports() {
-        return views(Port.TYPE, Port::new);
+        return views(Port.class, Port.TYPE);
     }
 }

@@ -81,6 +81,6 @@ public final class Eap extends TypedCharacteristic {
 
     /** {@return every CERT directly in this characteristic: the certificates} */
     public List<EapCertificate> certificates() {
-        return views(EapCertificate.TYPE, EapCertificate::new);
+        return views(EapCertificate.class, EapCertificate.TYPE);
     }
 }

@@ -74,6 +74,6 @@ public final class PhysicalProxy extends TypedCharacteristic {
 
     /** {@return every PORT directly in this characteristic: the ports of the machine} */
     public List<Port> ports() {
-        return views(Port.TYPE, Port::new);
+        return views(Port.class, Port.TYPE);
     }
 }

@@ -223,7 +223,7 @@ public final class ProvisioningMessage {
      * @return every PXLOGICAL, in the order of the message; not modifiable
      */
     public List<Proxy> proxies() {
-        return views(Proxy.TYPE, Proxy::new);
+        return views(Proxy.class, Proxy.TYPE);
     }
 
     /**
@@ -232,7 +232,7 @@ public final class ProvisioningMessage {
      * @return every NAPDEF, in the order of the message; not modifiable
      */
     public List<AccessPoint> accessPoints() {
-        return views(AccessPoint.TYPE, AccessPoint::new);
+        return views(AccessPoint.class, AccessPoint.TYPE);
     }
 
     /**
@@ -241,7 +241,7 @@ public final class ProvisioningMessage {
      * @return every BOOTSTRAP, in the order of the message; not modifiable
      */
     public List<Bootstrap> bootstraps() {
-        return views(Bootstrap.TYPE, Bootstrap::new);
+        return views(Bootstrap.class, Bootstrap.TYPE);
     }
 
     /**
@@ -250,7 +250,7 @@ public final class ProvisioningMessage {
      * @return every CLIENTIDENTITY, in the order of the message; not modifiable
      */
     public List<ClientIdentity> clientIdentities() {
-        return views(ClientIdentity.TYPE, ClientIdentity::new);
+        return views(ClientIdentity.class, ClientIdentity.TYPE);
     }
 
     /**
@@ -269,7 +269,7 @@ public final class ProvisioningMessage {
      * @return every VENDORCONFIG, in the order of the message; not modifiable
      */
     public List<VendorConfiguration> vendorConfigurations() {
-        return views(VendorConfiguration.TYPE, VendorConfiguration::new);
+        return views(VendorConfiguration.class, VendorConfiguration.TYPE);
     }
 
     /**
@@ -278,7 +278,7 @@ public final class ProvisioningMessage {
      * @return every APPLICATION, in the order of the message; not modifiable
      */
     public List<Application> applications() {
-        return views(Application.TYPE, Application::new);
+        return views(Application.class, Application.TYPE);
     }
 
     /**
@@ -287,7 +287,7 @@ public final class ProvisioningMessage {
      * @return every ACCESS, in the order of the message; not modifiable
      */
     public List<AccessRule> accessRules() {
-        return views(AccessRule.TYPE, AccessRule::new);
+        return views(AccessRule.class, AccessRule.TYPE);
     }
 
     /**
@@ -296,7 +296,7 @@ public final class ProvisioningMessage {
      * @return every WI-FI, in the order of the message; not modifiable
      */
     public List<Wifi> wifis() {
-        return views(Wifi.TYPE, Wifi::new);
+        return views(Wifi.class, Wifi.TYPE);
     }
 
     /**
@@ -305,11 +305,11 @@ public final class ProvisioningMessage {
      * @return every such characteristic, in the order of the message; not modifiable
      */
     public List<VoWifi> voWifis() {
-        return views(VoWifi.TYPE, VoWifi::new);
+        return views(VoWifi.class, VoWifi.TYPE);
     }
 
-    private <V> List<V> views(String type, TypedCharacteristic.Maker<V> maker) {
-        return TypedCharacteristic.views(document.root(), type, maker);
+    private <V> List<V> views(Class<V> kind, String type) {
+        return TypedCharacteristic.views(document.root(), kind, type);
     }
 
     /**

@@ -113,7 +113,7 @@ public final class Proxy extends TypedCharacteristic {
      *     proxy}
      */
     public List<ProxyAuthentication> authentications() {
-        return views(ProxyAuthentication.TYPE, ProxyAuthentication::new);
+        return views(ProxyAuthentication.class, ProxyAuthentication.TYPE);
     }
 
     /**
@@ -121,11 +121,11 @@ public final class Proxy extends TypedCharacteristic {
      *     proxy without ports of its own}
      */
     public List<Port> ports() {
-        return views(Port.TYPE, Port::new);
+        return views(Port.class, Port.TYPE);
     }
 
     /** {@return every PXPHYSICAL directly in this characteristic: the machines behind the proxy} */
     public List<PhysicalProxy> physicalProxies() {
-        return views(PhysicalProxy.TYPE, PhysicalProxy::new);
+        return views(PhysicalProxy.class, PhysicalProxy.TYPE);
     }
 }

@@ -26,13 +26,65 @@ public abstract class TypedCharacteristic {
         this.characteristic = characteristic;
     }
 
-    /** What makes a view of a characteristic. */
-    interface Maker<V> {
-        V of(Characteristic characteristic);
+    /**
+     * The view of a characteristic of a type. A switch: for the first method reference a new virtual
+     * machine takes longer than for everything else of a message.
+     */
+    private static TypedCharacteristic of(String type, Characteristic characteristic) {
+        switch (type) {
+            case AccessPoint.TYPE:
+                return new AccessPoint(characteristic);
+            case AccessPointAuthentication.TYPE:
+                return new AccessPointAuthentication(characteristic);
+            case AccessRule.TYPE:
+                return new AccessRule(characteristic);
+            case Application.TYPE:
+                return new Application(characteristic);
+            case ApplicationAddress.TYPE:
+                return new ApplicationAddress(characteristic);
+            case ApplicationAuthentication.TYPE:
+                return new ApplicationAuthentication(characteristic);
+            case Bootstrap.TYPE:
+                return new Bootstrap(characteristic);
+            case ClientIdentity.TYPE:
+                return new ClientIdentity(characteristic);
+            case Eap.TYPE:
+                return new Eap(characteristic);
+            case EapCertificate.TYPE:
+                return new EapCertificate(characteristic);
+            case PhysicalProxy.TYPE:
+                return new PhysicalProxy(characteristic);
+            case Port.TYPE:
+                return new Port(characteristic);
+            case Proxy.TYPE:
+                return new Proxy(characteristic);
+            case ProxyAuthentication.TYPE:
+                return new ProxyAuthentication(characteristic);
+            case Resource.TYPE:
+                return new Resource(characteristic);
+            case Roaming.TYPE:
+                return new Roaming(characteristic);
+            case SecondarySsid.TYPE:
+                return new SecondarySsid(characteristic);
+            case Validity.TYPE:
+                return new Validity(characteristic);
+            case VendorConfiguration.TYPE:
+                return new VendorConfiguration(characteristic);
+            case VoWifi.TYPE:
+                return new VoWifi(characteristic);
+            case WepKey.TYPE:
+                return new WepKey(characteristic);
+            case Wifi.TYPE:
+                return new Wifi(characteristic);
+            case Wlan.TYPE:
+                return new Wlan(characteristic);
+            default:
+                throw new AssertionError(type);
+        }
     }
 
     /** A view of each characteristic of a type directly in an item, in a list that stays as it is. */
-    static <V> List<V> views(Item item, String type, Maker<V> maker) {
+    static <V> List<V> views(Item item, Class<V> kind, String type) {
         // Most messages lack most kinds: the list is made for the first.
         List<V> views = Collections.emptyList();
         for (Item child : item.inside()) {
@@ -40,7 +92,7 @@ public abstract class TypedCharacteristic {
                 if (views.isEmpty()) {
                     views = new ArrayList<>();
                 }
-                views.add(maker.of((Characteristic) child));
+                views.add(kind.cast(of(type, (Characteristic) child)));
             }
         }
         return views.isEmpty() ? views : Collections.unmodifiableList(views);
@@ -67,8 +119,8 @@ public abstract class TypedCharacteristic {
         return characteristic.values(name);
     }
 
-    final <V> List<V> views(String type, Maker<V> maker) {
-        return views(characteristic, type, maker);
+    final <V> List<V> views(Class<V> kind, String type) {
+        return views(characteristic, kind, type);
     }
 
     /**

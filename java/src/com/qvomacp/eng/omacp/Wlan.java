@@ -46,7 +46,7 @@ public final class Wlan extends TypedCharacteristic {
 
     /** {@return every SEC-SSID directly in this characteristic: further names of networks} */
     public List<SecondarySsid> secondarySsids() {
-        return views(SecondarySsid.TYPE, SecondarySsid::new);
+        return views(SecondarySsid.class, SecondarySsid.TYPE);
     }
 
     /** {@return NETMODE: whether the network has an access point} */
@@ -101,11 +101,11 @@ public final class Wlan extends TypedCharacteristic {
 
     /** {@return every EAP directly in this characteristic: how to authenticate by EAP} */
     public List<Eap> eaps() {
-        return views(Eap.TYPE, Eap::new);
+        return views(Eap.class, Eap.TYPE);
     }
 
     /** {@return every WEPKEY directly in this characteristic: the WEP keys} */
     public List<WepKey> wepKeys() {
-        return views(WepKey.TYPE, WepKey::new);
+        return views(WepKey.class, WepKey.TYPE);
     }
 }
