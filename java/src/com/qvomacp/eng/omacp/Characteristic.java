@@ -31,28 +31,21 @@ public final class Characteristic extends Item {
     }
 
     /**
-     * Tells the type.
-     *
-     * @return TYPE as the OMA documents write it, such as {@code NAPDEF}; {@code null} when the
-     *     characteristic has none
+     * {@return the type: TYPE as the OMA documents write it, such as {@code NAPDEF}; {@code null}
+     * when the characteristic has none}
      */
     public String type() {
         return type;
     }
 
-    /**
-     * Tells how the type is written.
-     *
-     * @return how; {@code null} without a type
-     */
+    /** {@return how the type is written: how; {@code null} without a type} */
     public Writing typeWriting() {
         return Writing.of(typeWriting);
     }
 
     /**
-     * Lists the parameters that stand directly in the characteristic.
-     *
-     * @return every parameter, in the order of the message; not modifiable
+     * {@return the parameters that stand directly in the characteristic: every parameter, in the
+     * order of the message; not modifiable}
      */
     public List<Parameter> parameters() {
         List<Parameter> parameters = new ArrayList<>();
@@ -65,9 +58,8 @@ public final class Characteristic extends Item {
     }
 
     /**
-     * Lists the characteristics that stand directly in this one.
-     *
-     * @return every characteristic, in the order of the message; not modifiable
+     * {@return the characteristics that stand directly in this one: every characteristic, in the
+     * order of the message; not modifiable}
      */
     public List<Characteristic> characteristics() {
         return in(this);
@@ -186,11 +178,7 @@ public final class Characteristic extends Item {
         return Objects.hashCode(type);
     }
 
-    /**
-     * Shows the characteristic, without what is in it.
-     *
-     * @return one line of text
-     */
+    /** {@return the characteristic, without what is in it: one line of text} */
     @Override
     public String toString() {
         return "Characteristic{type="

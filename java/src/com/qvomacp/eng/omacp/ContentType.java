@@ -37,47 +37,35 @@ public final class ContentType {
     }
 
     /**
-     * Tells the media type.
-     *
-     * @return in lower case, such as {@code application/vnd.wap.connectivity-wbxml}; a printable
-     *     name for a number that stands for none
+     * {@return the media type: in lower case, such as {@code
+     * application/vnd.wap.connectivity-wbxml}; a printable name for a number that stands for none}
      */
     public String mediaType() {
         return mediaType;
     }
 
     /**
-     * Tells the number that WSP assigns to the media type.
-     *
-     * @return the number, such as 54; -1 when the media type is given as text and has none
+     * {@return the number that WSP assigns to the media type: the number, such as 54; -1 when the
+     * media type is given as text and has none}
      */
     public int code() {
         return code;
     }
 
-    /**
-     * Lists the parameters.
-     *
-     * @return every parameter, in the order of the message; not modifiable
-     */
+    /** {@return the parameters: every parameter, in the order of the message; not modifiable} */
     public List<HeaderField> parameters() {
         return parameters;
     }
 
     /**
-     * Tells where the content type begins, with the length that may stand in front of it.
-     *
-     * @return bytes from the start of what was read, counted from 0
+     * {@return where the content type begins, with the length that may stand in front of it: bytes
+     * from the start of what was read, counted from 0}
      */
     public int offset() {
         return offset;
     }
 
-    /**
-     * Tells how long the content type is, with its parameters.
-     *
-     * @return bytes
-     */
+    /** {@return how long the content type is, with its parameters: bytes} */
     public int length() {
         return end - offset;
     }
@@ -134,9 +122,8 @@ public final class ContentType {
     }
 
     /**
-     * Shows the media type and how many parameters there are, which may go to a log.
-     *
-     * @return one line of text
+     * {@return the media type and how many parameters there are, which may go to a log: one line of
+     * text}
      */
     @Override
     public String toString() {

@@ -68,31 +68,21 @@ public final class Deviation {
         return kind;
     }
 
-    /**
-     * Tells where it is.
-     *
-     * @return bytes from the start of the body, counted from 0
-     */
+    /** {@return where it is: bytes from the start of the body, counted from 0} */
     public int offset() {
         return offset;
     }
 
     /**
-     * Tells in which element it is, such as {@code wap-provisioningdoc / NAPDEF 1 / BEARER}:
+     * {@return in which element it is, such as {@code wap-provisioningdoc / NAPDEF 1 / BEARER}:
      * characteristics with their number among those of their type in the same element, counted from
-     * 1. Of more than eight elements the innermost eight are told.
-     *
-     * @return the path, never {@code null}
+     * 1: the path, never {@code null}} Of more than eight elements the innermost eight are told.
      */
     public String path() {
         return ItemPath.of(item);
     }
 
-    /**
-     * Says what it is.
-     *
-     * @return a sentence without a full stop, without any value of the message
-     */
+    /** {@return what it is: a sentence without a full stop, without any value of the message} */
     public String sentence() {
         return kind.sentence;
     }
@@ -111,11 +101,7 @@ public final class Deviation {
         return 31 * offset + kind.ordinal();
     }
 
-    /**
-     * Shows the deviation in one line, which may go to a log.
-     *
-     * @return offset, path and sentence
-     */
+    /** {@return the deviation in one line, which may go to a log: offset, path and sentence} */
     @Override
     public String toString() {
         return "offset " + offset + ", " + path() + ": " + sentence();

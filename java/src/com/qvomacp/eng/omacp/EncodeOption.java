@@ -7,6 +7,12 @@ import java.util.List;
 /**
  * What can be chosen when a document is encoded. Each has a name, under which a document may state
  * it in its {@code <?omacp-push?>} instruction, and a text as its value.
+ *
+ * <pre>{@code
+ * for (EncodeOption option : EncodeOption.values()) {
+ *     System.out.println(option.optionName() + " " + option.choices());
+ * }
+ * }</pre>
  */
 public enum EncodeOption {
     /**
@@ -58,28 +64,19 @@ public enum EncodeOption {
         this.choices = Collections.unmodifiableList(Arrays.asList(choices));
     }
 
-    /**
-     * Tells the name.
-     *
-     * @return such as {@code content-type}
-     */
+    /** {@return the name: such as {@code content-type}} */
     public String optionName() {
         return optionName;
     }
 
-    /**
-     * Tells the value of an option that is not set.
-     *
-     * @return the value; {@code null} for none
-     */
+    /** {@return the value of an option that is not set: the value; {@code null} for none} */
     public String defaultValue() {
         return defaultValue;
     }
 
     /**
-     * Lists the values that the option takes.
-     *
-     * @return the values; not modifiable, empty for an option that takes any text of its kind
+     * {@return the values that the option takes: the values; not modifiable, empty for an option
+     * that takes any text of its kind}
      */
     public List<String> choices() {
         return choices;

@@ -81,9 +81,7 @@ public final class EncodeOptions {
     }
 
     /**
-     * Shows the options that are set, without the values of PIN, IMSI and key.
-     *
-     * @return one line of text
+     * {@return the options that are set, without the values of PIN, IMSI and key: one line of text}
      */
     @Override
     public String toString() {

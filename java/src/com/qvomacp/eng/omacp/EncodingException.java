@@ -8,13 +8,28 @@ import java.util.List;
 /**
  * Says that a document cannot be encoded, or cannot be written as XML, and where and why. Of a
  * document in XML it tells line and column, of any other the path.
+ *
+ * <pre>{@code
+ * try {
+ *     push = ProvisioningEncoder.ofXml(xml, EncodeOptions.NONE).push();
+ * } catch (EncodingException e) {
+ *     System.err.println(e.line() + ":" + e.column() + ": " + e.getMessage());
+ * }
+ * }</pre>
  */
 public final class EncodingException extends Exception {
     private static final long serialVersionUID = 1L;
 
+    /** Counted from 1, or 0. */
     private final int line;
+
+    /** Counted from 1, or 0. */
     private final int column;
+
+    /** Null for XML. */
     private final String path;
+
+    /** What would have been taken. */
     private final ArrayList<String> expected;
 
     private EncodingException(
@@ -36,37 +51,30 @@ public final class EncodingException extends Exception {
         return new EncodingException(0, 0, path, sentence, expected);
     }
 
-    /**
-     * Tells the line of a document in XML.
-     *
-     * @return the line, counted from 1; 0 for anything else
-     */
+    /** {@return the line of a document in XML: the line, counted from 1; 0 for anything else} */
     public int line() {
         return line;
     }
 
     /**
-     * Tells the column of a document in XML.
-     *
-     * @return characters of the line, counted from 1; 0 for anything else
+     * {@return the column of a document in XML: characters of the line, counted from 1; 0 for
+     * anything else}
      */
     public int column() {
         return column;
     }
 
     /**
-     * Tells the element, as {@link Deviation#path} does.
-     *
-     * @return the path; {@code null} for a document in XML, and outside an element
+     * {@return the element, as {@link Deviation#path} does: the path; {@code null} for a document
+     * in XML, and outside an element}
      */
     public String path() {
         return path;
     }
 
     /**
-     * Lists what would have been taken.
-     *
-     * @return what would have been taken; not modifiable, empty when that cannot be said
+     * {@return what would have been taken: what would have been taken; not modifiable, empty when
+     * that cannot be said}
      */
     public List<String> expected() {
         return Collections.unmodifiableList(expected);

@@ -23,41 +23,29 @@ public final class HeaderField {
     }
 
     /**
-     * Tells the name.
-     *
-     * @return the name, such as {@code charset}, as the standard writes it when it is sent as a
-     *     number, as the message writes it when it is sent as text; a printable one for a number
-     *     that stands for none
+     * {@return the name: the name, such as {@code charset}, as the standard writes it when it is
+     * sent as a number, as the message writes it when it is sent as text; a printable one for a
+     * number that stands for none}
      */
     public String name() {
         return name;
     }
 
     /**
-     * Tells the value: a number in decimal digits or by the name that it stands for, a date in UTC
-     * as ISO 8601 writes it, a text without the quotes of its form, and anything else in
-     * hexadecimal digits.
-     *
-     * @return the value as text; {@code null} when there is none
+     * {@return the value: a number in decimal digits or by the name that it stands for, a date in
+     * UTC as ISO 8601 writes it, a text without the quotes of its form, and anything else in
+     * hexadecimal digits: the value as text; {@code null} when there is none}
      */
     public String value() {
         return value;
     }
 
-    /**
-     * Tells where the field begins.
-     *
-     * @return bytes from the start of what was read, counted from 0
-     */
+    /** {@return where the field begins: bytes from the start of what was read, counted from 0} */
     public int offset() {
         return offset;
     }
 
-    /**
-     * Tells how long the field is, name and value.
-     *
-     * @return bytes
-     */
+    /** {@return how long the field is, name and value: bytes} */
     public int length() {
         return length;
     }
@@ -87,11 +75,7 @@ public final class HeaderField {
         return 31 * name.hashCode() + (value == null ? 0 : value.hashCode());
     }
 
-    /**
-     * Shows the name, which may go to a log; the value may be a secret.
-     *
-     * @return one line of text
-     */
+    /** {@return the name, which may go to a log; the value may be a secret: one line of text} */
     @Override
     public String toString() {
         return "HeaderField{" + Printable.of(name) + "}";

@@ -34,29 +34,20 @@ public abstract class Item {
         }
     }
 
-    /**
-     * Tells where the item begins.
-     *
-     * @return bytes from the start of the body, counted from 0
-     */
+    /** {@return where the item begins: bytes from the start of the body, counted from 0} */
     public final int offset() {
         return offset;
     }
 
-    /**
-     * Tells how long the item is, with everything in it and its END.
-     *
-     * @return bytes of the body
-     */
+    /** {@return how long the item is, with everything in it and its END: bytes of the body} */
     public final int length() {
         return end - offset;
     }
 
     /**
-     * Lists what stands in the item. The format has parameters and characteristics in a
-     * characteristic, and nothing in a parameter; attributes that it does not have come first.
-     *
-     * @return every item, in the order of the message; not modifiable
+     * {@return what stands in the item: every item, in the order of the message; not modifiable}
+     * The format has parameters and characteristics in a characteristic, and nothing in a
+     * parameter; attributes that it does not have come first.
      */
     public final List<Item> children() {
         return Collections.unmodifiableList(Arrays.asList(children));

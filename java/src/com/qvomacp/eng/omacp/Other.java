@@ -56,39 +56,28 @@ public final class Other extends Item {
         this.textWriting = Writing.code(textWriting);
     }
 
-    /**
-     * Tells what it is.
-     *
-     * @return the kind, never {@code null}
-     */
+    /** {@return what it is: the kind, never {@code null}} */
     public Kind kind() {
         return Kind.ALL[kind];
     }
 
     /**
-     * Tells the name of an element, an attribute or the target of an instruction.
-     *
-     * @return the name; a printable one for a token that stands for nothing; {@code null} for what
-     *     has none
+     * {@return the name of an element, an attribute or the target of an instruction: the name; a
+     * printable one for a token that stands for nothing; {@code null} for what has none}
      */
     public String name() {
         return name;
     }
 
     /**
-     * Tells the text, or the value of an attribute or instruction.
-     *
-     * @return the text; {@code null} for what has none
+     * {@return the text, or the value of an attribute or instruction: the text; {@code null} for
+     * what has none}
      */
     public String text() {
         return text;
     }
 
-    /**
-     * Tells how the text is written.
-     *
-     * @return how; {@code null} without a text
-     */
+    /** {@return how the text is written: how; {@code null} without a text} */
     public Writing textWriting() {
         return Writing.of(textWriting);
     }
@@ -111,11 +100,7 @@ public final class Other extends Item {
         return 31 * (31 * Objects.hashCode(name) + Objects.hashCode(text)) + kind;
     }
 
-    /**
-     * Shows the item, without its text, which may be a secret.
-     *
-     * @return one line of text
-     */
+    /** {@return the item, without its text, which may be a secret: one line of text} */
     @Override
     public String toString() {
         return "Other{kind="

@@ -34,38 +34,24 @@ public final class Parameter extends Item {
     }
 
     /**
-     * Tells the name.
-     *
-     * @return NAME as the OMA documents write it, such as {@code NAP-ADDRESS}; {@code null} when
-     *     the parameter has none
+     * {@return the name: NAME as the OMA documents write it, such as {@code NAP-ADDRESS}; {@code
+     * null} when the parameter has none}
      */
     public String name() {
         return name;
     }
 
-    /**
-     * Tells the value.
-     *
-     * @return VALUE, which may be empty; {@code null} when the parameter has none
-     */
+    /** {@return the value: VALUE, which may be empty; {@code null} when the parameter has none} */
     public String value() {
         return value;
     }
 
-    /**
-     * Tells how the name is written.
-     *
-     * @return how; {@code null} without a name
-     */
+    /** {@return how the name is written: how; {@code null} without a name} */
     public Writing nameWriting() {
         return Writing.of(nameWriting);
     }
 
-    /**
-     * Tells how the value is written.
-     *
-     * @return how; {@code null} without a value
-     */
+    /** {@return how the value is written: how; {@code null} without a value} */
     public Writing valueWriting() {
         return Writing.of(valueWriting);
     }
@@ -87,11 +73,7 @@ public final class Parameter extends Item {
         return 31 * Objects.hashCode(name) + Objects.hashCode(value);
     }
 
-    /**
-     * Shows the parameter, without its value, which may be a secret.
-     *
-     * @return one line of text
-     */
+    /** {@return the parameter, without its value, which may be a secret: one line of text} */
     @Override
     public String toString() {
         return "Parameter{name="

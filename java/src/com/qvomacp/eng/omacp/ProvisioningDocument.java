@@ -67,83 +67,67 @@ public final class ProvisioningDocument {
         return document;
     }
 
-    /**
-     * Tells the version of WBXML.
-     *
-     * @return such as {@code 1.3}
-     */
+    /** {@return the version of WBXML: such as {@code 1.3}} */
     public String wbxmlVersion() {
         return header.versionText();
     }
 
     /**
-     * Tells the public identifier of the document type.
-     *
-     * @return the number, 11 for a provisioning document; 0 when it is given as text
+     * {@return the public identifier of the document type: the number, 11 for a provisioning
+     * document; 0 when it is given as text}
      */
     public int publicIdentifier() {
         return (int) header.publicIdentifier;
     }
 
     /**
-     * Tells the name of the document type.
-     *
-     * @return such as {@code -//WAPFORUM//DTD PROV 1.0//EN}; {@code null} when the number stands for
-     *     none, or the text cannot be had
+     * {@return the name of the document type: such as {@code -//WAPFORUM//DTD PROV 1.0//EN}; {@code
+     * null} when the number stands for none, or the text cannot be had}
      */
     public String documentType() {
         return header.documentType;
     }
 
     /**
-     * Tells the character set of the texts.
-     *
-     * @return the MIBenum that IANA assigns, 106 for UTF-8; 0 when it is not stated
+     * {@return the character set of the texts: the MIBenum that IANA assigns, 106 for UTF-8; 0 when
+     * it is not stated}
      */
     public int charset() {
         return (int) header.charset.number();
     }
 
     /**
-     * Tells the name of the character set.
-     *
-     * @return such as {@code UTF-8}; {@code null} when the number stands for none that is known
+     * {@return the name of the character set: such as {@code UTF-8}; {@code null} when the number
+     * stands for none that is known}
      */
     public String charsetName() {
         return header.charset.name();
     }
 
-    /**
-     * Tells the string table.
-     *
-     * @return a new array, empty when there is none
-     */
+    /** {@return the string table: a new array, empty when there is none} */
     public byte[] stringTable() {
         return Arrays.copyOfRange(body, header.tableAt, header.elementsAt);
     }
 
     /**
-     * Tells the version attribute of the document element.
-     *
-     * @return such as {@code 1.0}; {@code null} when there is none
+     * {@return the version attribute of the document element: such as {@code 1.0}; {@code null}
+     * when there is none}
      */
     public String version() {
         return version;
     }
 
     /**
-     * Lists what stands in the document element.
-     *
-     * @return every item, in the order of the message; not modifiable
+     * {@return what stands in the document element: every item, in the order of the message; not
+     * modifiable}
      */
     public List<Item> children() {
         return root.children();
     }
 
     /**
-     * Lists the characteristics that stand directly in the document element.
-     *
-     * @return every characteristic, in the order of the message; not modifiable
+     * {@return the characteristics that stand directly in the document element: every
+     * characteristic, in the order of the message; not modifiable}
      */
     public List<Characteristic> characteristics() {
         return Characteristic.in(root);
@@ -180,9 +164,8 @@ public final class ProvisioningDocument {
     }
 
     /**
-     * Lists where the body departs from the format.
-     *
-     * @return every deviation, in the order of the body; not modifiable, empty when there is none
+     * {@return where the body departs from the format: every deviation, in the order of the body;
+     * not modifiable, empty when there is none}
      */
     public List<Deviation> deviations() {
         DeviationFinder finder = new DeviationFinder(root, body.length);
@@ -190,11 +173,7 @@ public final class ProvisioningDocument {
         return finder.found();
     }
 
-    /**
-     * Tells the body that was read.
-     *
-     * @return a new array
-     */
+    /** {@return the body that was read: a new array} */
     public byte[] body() {
         return body.clone();
     }
@@ -288,11 +267,7 @@ public final class ProvisioningDocument {
         return 31 * Objects.hashCode(version) + root.hashCode();
     }
 
-    /**
-     * Shows the document, without any value.
-     *
-     * @return one line of text
-     */
+    /** {@return the document, without any value: one line of text} */
     @Override
     public String toString() {
         return "ProvisioningDocument{WBXML "

@@ -8,8 +8,9 @@ import java.util.List;
  * wap-provisioningdoc in XML. Immutable.
  *
  * <pre>{@code
- * byte[] push = ProvisioningEncoder.ofXml(xml, EncodeOptions.NONE).push();
- * String xml = ProvisioningEncoder.of(document, EncodeOptions.NONE).xml();
+ * ProvisioningEncoder encoder = ProvisioningEncoder.of(document, EncodeOptions.NONE);
+ * byte[] encoded = encoder.push();
+ * String text = encoder.xml();
  * }</pre>
  */
 public final class ProvisioningEncoder {
@@ -67,9 +68,8 @@ public final class ProvisioningEncoder {
     }
 
     /**
-     * Tells the options, those of the instruction or the message included.
-     *
-     * @return the options, never {@code null}
+     * {@return the options, those of the instruction or the message included: the options, never
+     * {@code null}}
      */
     public EncodeOptions options() {
         return options;

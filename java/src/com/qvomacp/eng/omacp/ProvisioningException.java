@@ -90,46 +90,40 @@ public final class ProvisioningException extends Exception {
     }
 
     /**
-     * Tells why the message is not read. {@link #getMessage} says the same in words.
-     *
-     * @return the reason, never {@code null}
+     * {@return why the message is not read: the reason, never {@code null}} {@link #getMessage}
+     * says the same in words.
      */
     public Reason reason() {
         return reason;
     }
 
     /**
-     * Tells the native library's result code for a body that it refuses: {@link Verdict#code}.
-     *
-     * @return the code; 0 for any other reason
+     * {@return the native library's result code for a body that it refuses: {@link Verdict#code}:
+     * the code; 0 for any other reason}
      */
     public int code() {
         return code;
     }
 
     /**
-     * Tells where the reading ends: in the message for {@link Reason#NO_PUSH_HEADER} and for a header
-     * that is refused, in the body otherwise.
-     *
-     * @return bytes from the start, counted from 0
+     * {@return where the reading ends: in the message for {@link Reason#NO_PUSH_HEADER} and for a
+     * header that is refused, in the body otherwise: bytes from the start, counted from 0}
      */
     public int offset() {
         return offset;
     }
 
     /**
-     * Tells in which element the reading ends, as {@link Deviation#path} does.
-     *
-     * @return the path; {@code null} outside a document
+     * {@return in which element the reading ends, as {@link Deviation#path} does: the path; {@code
+     * null} outside a document}
      */
     public String path() {
         return path;
     }
 
     /**
-     * Lists what would have been taken where the reading ends.
-     *
-     * @return what would have been taken; not modifiable, empty when that cannot be said
+     * {@return what would have been taken where the reading ends: what would have been taken; not
+     * modifiable, empty when that cannot be said}
      */
     public List<String> expected() {
         return Collections.unmodifiableList(expected);

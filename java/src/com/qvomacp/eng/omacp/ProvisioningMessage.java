@@ -124,20 +124,12 @@ public final class ProvisioningMessage {
         return message;
     }
 
-    /**
-     * Tells the push header.
-     *
-     * @return the header; {@code null} when a body alone was read
-     */
+    /** {@return the push header: the header; {@code null} when a body alone was read} */
     public PushHeader header() {
         return header;
     }
 
-    /**
-     * Tells the document, with all that the message says.
-     *
-     * @return the document, never {@code null}
-     */
+    /** {@return the document, with all that the message says: the document, never {@code null}} */
     public ProvisioningDocument document() {
         return document;
     }
@@ -217,46 +209,38 @@ public final class ProvisioningMessage {
                         header.securityMethod(), header.mac(), document.bytes(), key);
     }
 
-    /**
-     * Lists the proxies.
-     *
-     * @return every PXLOGICAL, in the order of the message; not modifiable
-     */
+    /** {@return the proxies: every PXLOGICAL, in the order of the message; not modifiable} */
     public List<Proxy> proxies() {
         return views(Proxy.class, Proxy.TYPE);
     }
 
     /**
-     * Lists the network access points.
-     *
-     * @return every NAPDEF, in the order of the message; not modifiable
+     * {@return the network access points: every NAPDEF, in the order of the message; not
+     * modifiable}
      */
     public List<AccessPoint> accessPoints() {
         return views(AccessPoint.class, AccessPoint.TYPE);
     }
 
     /**
-     * Lists where further provisioning comes from.
-     *
-     * @return every BOOTSTRAP, in the order of the message; not modifiable
+     * {@return where further provisioning comes from: every BOOTSTRAP, in the order of the message;
+     * not modifiable}
      */
     public List<Bootstrap> bootstraps() {
         return views(Bootstrap.class, Bootstrap.TYPE);
     }
 
     /**
-     * Lists the identities that the client gets.
-     *
-     * @return every CLIENTIDENTITY, in the order of the message; not modifiable
+     * {@return the identities that the client gets: every CLIENTIDENTITY, in the order of the
+     * message; not modifiable}
      */
     public List<ClientIdentity> clientIdentities() {
         return views(ClientIdentity.class, ClientIdentity.TYPE);
     }
 
     /**
-     * Tells the identity that the client gets.
-     *
-     * @return CLIENT-ID of the first CLIENTIDENTITY; {@code null} when it is not set
+     * {@return the identity that the client gets: CLIENT-ID of the first CLIENTIDENTITY; {@code
+     * null} when it is not set}
      */
     public String clientId() {
         List<ClientIdentity> identities = clientIdentities();
@@ -264,45 +248,37 @@ public final class ProvisioningMessage {
     }
 
     /**
-     * Lists what vendors' own software is told.
-     *
-     * @return every VENDORCONFIG, in the order of the message; not modifiable
+     * {@return what vendors' own software is told: every VENDORCONFIG, in the order of the message;
+     * not modifiable}
      */
     public List<VendorConfiguration> vendorConfigurations() {
         return views(VendorConfiguration.class, VendorConfiguration.TYPE);
     }
 
     /**
-     * Lists the settings of applications.
-     *
-     * @return every APPLICATION, in the order of the message; not modifiable
+     * {@return the settings of applications: every APPLICATION, in the order of the message; not
+     * modifiable}
      */
     public List<Application> applications() {
         return views(Application.class, Application.TYPE);
     }
 
     /**
-     * Lists which traffic takes which way.
-     *
-     * @return every ACCESS, in the order of the message; not modifiable
+     * {@return which traffic takes which way: every ACCESS, in the order of the message; not
+     * modifiable}
      */
     public List<AccessRule> accessRules() {
         return views(AccessRule.class, AccessRule.TYPE);
     }
 
-    /**
-     * Lists the Wi-Fi networks.
-     *
-     * @return every WI-FI, in the order of the message; not modifiable
-     */
+    /** {@return the Wi-Fi networks: every WI-FI, in the order of the message; not modifiable} */
     public List<Wifi> wifis() {
         return views(Wifi.class, Wifi.TYPE);
     }
 
     /**
-     * Lists the settings for voice over Wi-Fi.
-     *
-     * @return every such characteristic, in the order of the message; not modifiable
+     * {@return the settings for voice over Wi-Fi: every such characteristic, in the order of the
+     * message; not modifiable}
      */
     public List<VoWifi> voWifis() {
         return views(VoWifi.class, VoWifi.TYPE);
@@ -328,11 +304,7 @@ public final class ProvisioningMessage {
                 && document.equals(that.document);
     }
 
-    /**
-     * Answers a number that fits {@link #equals}.
-     *
-     * @return the same number for equal messages
-     */
+    /** {@return a number that fits {@link #equals}: the same number for equal messages} */
     @Override
     public int hashCode() {
         return 31 * (header == null ? 0 : header.hashCode()) + document.hashCode();

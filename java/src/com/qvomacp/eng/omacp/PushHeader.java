@@ -82,67 +82,48 @@ public final class PushHeader {
         return bytes;
     }
 
-    /**
-     * Tells the transaction identifier.
-     *
-     * @return 0 to 255; -1 when the headers were read alone
-     */
+    /** {@return the transaction identifier: 0 to 255; -1 when the headers were read alone} */
     public int transactionIdentifier() {
         return transactionIdentifier;
     }
 
-    /**
-     * Tells how long the header is.
-     *
-     * @return bytes from the start of what was read to the body
-     */
+    /** {@return how long the header is: bytes from the start of what was read to the body} */
     public int length() {
         return bytes.length;
     }
 
-    /**
-     * Tells the content type with its parameters.
-     *
-     * @return the content type, never {@code null}
-     */
+    /** {@return the content type with its parameters: the content type, never {@code null}} */
     public ContentType contentType() {
         return contentType;
     }
 
     /**
-     * Tells the security method.
-     *
-     * @return the method that SEC states; {@link SecurityMethod#NONE} without SEC, {@link
-     *     SecurityMethod#UNKNOWN} for a SEC that states none of them; never {@code null}
+     * {@return the security method: the method that SEC states; {@link SecurityMethod#NONE} without
+     * SEC, {@link SecurityMethod#UNKNOWN} for a SEC that states none of them; never {@code null}}
      */
     public SecurityMethod securityMethod() {
         return securityMethod;
     }
 
     /**
-     * Tells the MAC as the message states it, which does not say that it is right.
-     *
-     * @return the MAC, 40 hexadecimal digits when it can be one; {@code null} when the message
-     *     carries none
+     * {@return the MAC as the message states it, which does not say that it is right: the MAC, 40
+     * hexadecimal digits when it can be one; {@code null} when the message carries none}
      */
     public String mac() {
         return mac;
     }
 
     /**
-     * Tells where the MAC stands.
-     *
-     * @return bytes from the start of what was read to the parameter, counted from 0; -1 when the
-     *     message carries none
+     * {@return where the MAC stands: bytes from the start of what was read to the parameter,
+     * counted from 0; -1 when the message carries none}
      */
     public int macOffset() {
         return macOffset;
     }
 
     /**
-     * Lists the headers behind the content type.
-     *
-     * @return every header, in the order of the message; not modifiable
+     * {@return the headers behind the content type: every header, in the order of the message; not
+     * modifiable}
      */
     public List<HeaderField> fields() {
         return fields;
@@ -215,9 +196,8 @@ public final class PushHeader {
     }
 
     /**
-     * Shows the media type, the security method and whether there is a MAC, which may go to a log.
-     *
-     * @return one line of text
+     * {@return the media type, the security method and whether there is a MAC, which may go to a
+     * log: one line of text}
      */
     @Override
     public String toString() {

@@ -22,29 +22,20 @@ public final class ReadOptions {
         this.acceptedOnly = acceptedOnly;
     }
 
-    /**
-     * Tells how long a message or body may be.
-     *
-     * @return bytes
-     */
+    /** {@return how long a message or body may be: bytes} */
     public int inputLimit() {
         return inputLimit;
     }
 
     /**
-     * Tells how much text a document may hold, references to the string table counted each time.
-     *
-     * @return bytes of text, as the body writes it
+     * {@return how much text a document may hold, references to the string table counted each time:
+     * bytes of text, as the body writes it}
      */
     public int textLimit() {
         return textLimit;
     }
 
-    /**
-     * Tells whether a message that the native library refuses is refused.
-     *
-     * @return true when it is
-     */
+    /** {@return whether a message that the native library refuses is refused} */
     public boolean acceptedOnly() {
         return acceptedOnly;
     }
@@ -104,11 +95,7 @@ public final class ReadOptions {
         return 31 * (31 * inputLimit + textLimit) + (acceptedOnly ? 1 : 0);
     }
 
-    /**
-     * Shows the options.
-     *
-     * @return one line of text
-     */
+    /** {@return the options: one line of text} */
     @Override
     public String toString() {
         return "ReadOptions{inputLimit="

@@ -99,9 +99,8 @@ public abstract class TypedCharacteristic {
     }
 
     /**
-     * Tells the characteristic, with everything that stands in it.
-     *
-     * @return the characteristic of the tree, never {@code null}
+     * {@return the characteristic, with everything that stands in it: the characteristic of the
+     * tree, never {@code null}}
      */
     public final Characteristic characteristic() {
         return characteristic;
@@ -136,11 +135,7 @@ public abstract class TypedCharacteristic {
                 && ((TypedCharacteristic) other).characteristic.equals(characteristic);
     }
 
-    /**
-     * Answers a number that fits {@link #equals}.
-     *
-     * @return the same number for equal objects
-     */
+    /** {@return a number that fits {@link #equals}: the same number for equal objects} */
     @Override
     public final int hashCode() {
         return characteristic.hashCode();

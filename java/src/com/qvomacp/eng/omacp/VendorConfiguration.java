@@ -28,9 +28,8 @@ public final class VendorConfiguration extends TypedCharacteristic {
     }
 
     /**
-     * Lists the parameters by their names, NAME included.
-     *
-     * @return every parameter, in the order of the message; not modifiable
+     * {@return the parameters by their names, NAME included: every parameter, in the order of the
+     * message; not modifiable}
      */
     public List<Parameter> parameters() {
         return characteristic().parameters();

@@ -87,38 +87,28 @@ public final class Verdict {
         return new Verdict(false, code, bytesRead, refusal, body, document, shift);
     }
 
-    /**
-     * Tells whether the library takes the message.
-     *
-     * @return true when it does
-     */
+    /** {@return whether the library takes the message} */
     public boolean isAccepted() {
         return refusal == null;
     }
 
-    /**
-     * Tells whether it is the push header that the library refuses.
-     *
-     * @return true when it does not get as far as the body
-     */
+    /** {@return whether it is the push header that the library refuses} */
     public boolean isHeaderRefused() {
         return headerRefused;
     }
 
     /**
-     * Tells the result code of the library's decoder.
-     *
-     * @return the code, such as 4101; 0 for a body that is taken, and for one that can be decoded
-     *     and holds no document; 0 too when the header is refused, for which there is no code
+     * {@return the result code of the library's decoder: the code, such as 4101; 0 for a body that
+     * is taken, and for one that can be decoded and holds no document; 0 too when the header is
+     * refused, for which there is no code}
      */
     public int code() {
         return code;
     }
 
     /**
-     * Tells the name of the result code.
-     *
-     * @return such as {@code QVS_ERROR_WBXML_UNKNOWN_ELEMENT}; never {@code null}
+     * {@return the name of the result code: such as {@code QVS_ERROR_WBXML_UNKNOWN_ELEMENT}; never
+     * {@code null}}
      */
     public String codeName() {
         switch (code) {
@@ -141,65 +131,54 @@ public final class Verdict {
         }
     }
 
-    /**
-     * Tells how much of the body the decoder has read when it ends.
-     *
-     * @return bytes
-     */
+    /** {@return how much of the body the decoder has read when it ends: bytes} */
     public int bytesRead() {
         return bytesRead;
     }
 
     /**
-     * Tells where what is refused stands: in the body, or in the message when the header is refused.
-     *
-     * @return bytes from its start, counted from 0; -1 when the message is accepted
+     * {@return where what is refused stands: in the body, or in the message when the header is
+     * refused: bytes from its start, counted from 0; -1 when the message is accepted}
      */
     public int offset() {
         return refusal == null ? -1 : refusal.offset;
     }
 
     /**
-     * Tells in which element what is refused stands, as {@link Deviation#path} does.
-     *
-     * @return the path; {@code null} when the message is accepted or the header is refused
+     * {@return in which element what is refused stands, as {@link Deviation#path} does: the path;
+     * {@code null} when the message is accepted or the header is refused}
      */
     public String path() {
         return refusal == null ? null : refusal.path;
     }
 
     /**
-     * Tells what stands there.
-     *
-     * @return such as {@code SWITCH_PAGE (0x00)}; {@code null} when the message is accepted
+     * {@return what stands there: such as {@code SWITCH_PAGE (0x00)}; {@code null} when the message
+     * is accepted}
      */
     public String found() {
         return refusal == null ? null : refusal.found;
     }
 
     /**
-     * Lists what would have been taken there.
-     *
-     * @return what would have been taken, in the order of the tokens; not modifiable, empty when the
-     *     message is accepted and when nothing would have been
+     * {@return what would have been taken there: what would have been taken, in the order of the
+     * tokens; not modifiable, empty when the message is accepted and when nothing would have been}
      */
     public List<String> expected() {
         return refusal == null ? Collections.<String>emptyList() : refusal.expected;
     }
 
     /**
-     * Says why the message is refused.
-     *
-     * @return a sentence without a full stop; {@code null} when the message is accepted
+     * {@return why the message is refused: a sentence without a full stop; {@code null} when the
+     * message is accepted}
      */
     public String reason() {
         return refusal == null ? null : refusal.reason;
     }
 
     /**
-     * Lists the items that the library skips or reads as something else, up to where it ends.
-     *
-     * @return the items of the document, in its order; not modifiable
+     * {@return the items that the library skips or reads as something else, up to where it ends:
+     * the items of the document, in its order; not modifiable}
      */
     public List<Item> readOtherwise() {
         if (headerRefused || document == null) {
@@ -232,9 +211,8 @@ public final class Verdict {
     }
 
     /**
-     * Shows the verdict in one line, which may go to a log.
-     *
-     * @return the code and where and why the message is refused
+     * {@return the verdict in one line, which may go to a log: the code and where and why the
+     * message is refused}
      */
     @Override
     public String toString() {

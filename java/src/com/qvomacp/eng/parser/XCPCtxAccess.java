@@ -15,11 +15,7 @@ public class XCPCtxAccess {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxAccess() {}
 
-    /**
-     * Counts the ACCESS of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the ACCESS of the message: their number} */
     public native int qvomacp_GetPxCtxAccessCount();
 
     /**

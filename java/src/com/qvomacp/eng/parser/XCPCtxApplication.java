@@ -18,11 +18,7 @@ public class XCPCtxApplication {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxApplication() {}
 
-    /**
-     * Counts the APPLICATION of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the APPLICATION of the message: their number} */
     public native int qvomacp_GetPxApplicationCount();
 
     /**

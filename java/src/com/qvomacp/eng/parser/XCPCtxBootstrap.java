@@ -14,11 +14,7 @@ public class XCPCtxBootstrap {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxBootstrap() {}
 
-    /**
-     * Counts the BOOTSTRAP of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the BOOTSTRAP of the message: their number} */
     public native int qvomacp_GetPxBootstrapCount();
 
     /**

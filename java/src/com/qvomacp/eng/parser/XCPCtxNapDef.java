@@ -19,10 +19,8 @@ public class XCPCtxNapDef {
     public XCPCtxNapDef() {}
 
     /**
-     * Counts the NAPDEF of the message, from the one on that {@link #qvomacp_SetPxNapDefIndex} has
-     * made the first.
-     *
-     * @return their number
+     * {@return the number of the NAPDEF of the message, from the one on that {@link
+     * #qvomacp_SetPxNapDefIndex} has made the first: their number}
      */
     public native int qvomacp_GetPxNapDefCount();
 

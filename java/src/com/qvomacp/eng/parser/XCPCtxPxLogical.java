@@ -19,11 +19,7 @@ public class XCPCtxPxLogical {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxPxLogical() {}
 
-    /**
-     * Counts the PXLOGICAL of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the PXLOGICAL of the message: their number} */
     public native int qvomacp_GetPxLogicalCount();
 
     /**

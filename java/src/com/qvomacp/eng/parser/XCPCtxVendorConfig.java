@@ -14,11 +14,7 @@ public class XCPCtxVendorConfig {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxVendorConfig() {}
 
-    /**
-     * Counts the VENDORCONFIG of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the VENDORCONFIG of the message: their number} */
     public native int qvomacp_GetPxVenderConfigCount();
 
     /**

@@ -14,11 +14,7 @@ public class XCPCtxVoWifi {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxVoWifi() {}
 
-    /**
-     * Counts the voice-over-Wi-Fi characteristics of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the voice-over-Wi-Fi characteristics of the message: their number} */
     public native int qvomacp_GetPxVoWifiCount();
 
     /**

@@ -14,11 +14,7 @@ public class XCPCtxWifi {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxWifi() {}
 
-    /**
-     * Counts the WI-FI of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the WI-FI of the message: their number} */
     public native int qvomacp_GetPxWifiCount();
 
     /**

@@ -50,6 +50,7 @@ class ExamplesTest {
                 static byte[] push;
                 static byte[] headers;
                 static byte[] body;
+                static byte[] xml;
                 static ProvisioningMessage message;
                 static ProvisioningDocument document;
                 static PushHeader header;
@@ -63,6 +64,7 @@ class ExamplesTest {
                     header = message.header();
                     headers = Arrays.copyOfRange(push, 3, header.length());
                     body = document.body();
+                    xml = "<wap-provisioningdoc/>".getBytes("UTF-8");
                     characteristic = document.characteristics().get(0);
                 }
             """;
