@@ -102,8 +102,8 @@ struct Naming {
 
 template <class Record>
 struct NamingOf : Naming {
-    consteval NamingOf() = default;
-    consteval NamingOf(char *Record::*text, const char *(*name)(const char *value))
+    constexpr NamingOf() = default;
+    constexpr NamingOf(char *Record::*text, const char *(*name)(const char *value))
         : Naming{numberOf(text), name}
     {
     }
