@@ -211,8 +211,9 @@ bool qvs::tablePiece(const qvsWbxmlDecoder *decoder, uint8_t **at, const uint8_t
     return true;
 }
 
-// All pieces are looked at before a block is made for them; of many, so many at a time, and while
-// blocks are tracked each by itself.
+// All pieces are looked at before a block is made for them; of many, so many at a time. Each by
+// itself while blocks are tracked, and where the texts of the message come near their limit: what
+// is in front of the piece that passes it is read.
 bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
     Piece pieces[kMostPieces];
@@ -244,8 +245,14 @@ bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
             added += found ? piece++->length : 0;
             joins = true;
         }
-        const Piece *const left =
-            piece != pieces ? appendMore(state, text, pieces, piece, added) : piece;
+        const Piece *left = piece;
+        if (added + text->length > state->textLeft) [[unlikely]] {
+            for (left = pieces; left != piece && append(state, text, *left);) {
+                ++left;
+            }
+        } else if (piece != pieces) {
+            left = appendMore(state, text, pieces, piece, added);
+        }
         if (left != piece) [[unlikely]] {
             decoder->ptBuffer->pHead = left->unread;
             return false;

@@ -327,9 +327,12 @@ inline qvsResult lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text
     if (!takeOnlyPiece(decoder, &piece)) {
         return content(decoder, state, text);
     }
-    (void)countText(state, piece.length); // the limit shows in the result
-    text->before = piece.bytes;
-    text->length = piece.length;
+    if (countText(state, piece.length)) {
+        text->before = piece.bytes;
+        text->length = piece.length;
+    } else if (piece.unread) {
+        decoder->ptBuffer->pHead = piece.unread;
+    }
     return endOfContent(state, QVS_OK);
 }
 
