@@ -103,22 +103,34 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
 
 // ---- The loop
 
-// The token behind page switches. False at the end of the data.
-[[gnu::noinline, gnu::cold]] bool skipSwitches(qvsWbxmlDecoder *decoder, const ParmTable &table,
-                                               uint8_t *token)
+// The token behind page switches; another switch at the end of the data.
+[[gnu::noinline, gnu::cold]] uint8_t skipSwitches(qvsWbxmlDecoder *decoder, const ParmTable &table)
 {
+    uint8_t token = 0;
     do {
         // kept[parm-switch-ignored]: a switch to an unknown page is no failure by itself.
         (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
-        if (!peekByte(decoder->ptBuffer, token)) {
-            return false;
+        if (!peekByte(decoder->ptBuffer, &token)) {
+            return wbxml::kSwitchPage;
         }
         if (!table.style.freshTokenAfterSwitch) {
             // kept[parm-switch-masked]: behind a switch the token is seen without its top bits.
-            *token &= wbxml::kTagMask;
+            token &= wbxml::kTagMask;
         }
-    } while (*token == wbxml::kSwitchPage);
-    return true;
+    } while (token == wbxml::kSwitchPage);
+    return token;
+}
+
+// Takes the END of a parm element, whose flags the decoder keeps: it has none unless it was masked.
+inline void takeEnd(qvsWbxmlDecoder *decoder, bool isMasked)
+{
+    if (isMasked) [[unlikely]] {
+        (void)takeSeenTag(decoder);
+        return;
+    }
+    ++decoder->ptBuffer->pHead;
+    decoder->nHasContent = 0;
+    decoder->nHasAttr = 0;
 }
 
 const ParmRow *findParm(const ParmTable &table, uint8_t token)
@@ -200,14 +212,13 @@ qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvs
 qvsResult qvs::readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t field,
                         uint8_t place)
 {
-    qvsListNode *unknown = nullptr;
-    qvsListNode **end = state->open ? state->open->last + place : &unknown;
-    return readOnto(decoder, state, listAt(record, field), end);
+    return readOnto(decoder, state, listAt(record, field), state->open->last + place);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
 {
-    DecodeState alone;
+    OpenRecord open = {};
+    DecodeState alone = {.open = &open};
     return readParms(decoder, &alone, record, table);
 }
 
@@ -225,13 +236,17 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *rec
     }
     uint8_t token = 0;
     while (peekByte(decoder->ptBuffer, &token)) {
-        if (token == wbxml::kSwitchPage && !skipSwitches(decoder, table, &token)) {
-            break;
+        const bool behindSwitch = token == wbxml::kSwitchPage;
+        if (behindSwitch) {
+            token = skipSwitches(decoder, table);
+            if (token == wbxml::kSwitchPage) {
+                break;
+            }
         }
         qvsResult result = QVS_OK;
         const bool end = token == wbxml::kEnd;
         if (end) {
-            (void)takeSeenTag(decoder);
+            takeEnd(decoder, behindSwitch);
         } else {
             result = readParm(decoder, state, record, table, token);
         }

@@ -50,8 +50,7 @@ void traceParm(uint8_t token)
 qvsResult readComma(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapAppAuth *record)
 {
     char **types = &record->pszAAuthType;
-    const qvsResult result =
-        commaAdd(decoder, state, types, state->open ? &state->open->joined : nullptr);
+    const qvsResult result = commaAdd(decoder, state, types, &state->open->joined);
     trace("--------------------------[%s]", *types ? *types : "");
     return result;
 }
@@ -85,7 +84,7 @@ constexpr auto kParms = tableOf<Parm<R>>({
 });
 
 // Parameters whose name is given as text.
-constexpr auto kNamed = tableOf<NamedParm<R>>({
+constexpr auto kNames = tableOf<NamedParm<R>>({
     {"XCAP_AUID_DCS", &R::pszXcapAuidDcs},
     {"XCAP_AUID_PMS", &R::pszXcapAuidPms},
     {"XCAP_AUID_CDMS", &R::pszXcapAuidCdms},
@@ -94,31 +93,11 @@ constexpr auto kNamed = tableOf<NamedParm<R>>({
     {"FROM", &R::pszFrom},
 });
 
-// The value of a name that is not listed is read and dropped.
-qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, R *record, uint8_t tag)
-{
-    static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamNameString";
-    ParmName name;
-    if (qvsResult result = readParmName(decoder, state, tag, kLabel, false, &name)) {
-        return result;
-    }
-    if (name.next != attr::kValue) {
-        return QVS_OK;
-    }
-    if (char **field = findNamed(record, kNamed, name.text)) {
-        return readValue(decoder, state, field);
-    }
-    Text dropped;
-    const qvsResult result = paramValue(decoder, state, &dropped, lookAt);
-    if (result == QVS_OK) {
-        trace("[%s] pszValue [%s]", kLabel, dropped.str() ? dropped.str() : "");
-    }
-    return result;
-}
+constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamNameString", true};
 
 qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
 {
-    return readNamed(decoder, state, record, attr::kName);
+    return readNamed(decoder, state, record, attr::kName, kNamed);
 }
 } // namespace application
 
@@ -200,5 +179,5 @@ qvsResult qvsClientProvWbxmlDecoderParamAppNameString(qvsWbxmlDecoder *decoder,
                                                       qvsWapApplication **record, uint8_t tag)
 {
     DecodeState alone;
-    return application::readNamed(decoder, &alone, *record, tag);
+    return readNamed(decoder, &alone, *record, tag, application::kNamed);
 }

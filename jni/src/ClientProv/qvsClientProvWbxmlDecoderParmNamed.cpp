@@ -14,89 +14,10 @@ constexpr char kRefusedBy[] = "Access";
 template <class Record>
 constexpr auto kNameAlone = tableOf<Parm<Record>>({{attr::kName, kByReader}});
 
-// Reads one named parameter of `record`. A name that is not listed leaves its value to the loop,
-// which refuses it.
-qvsResult readAnyNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag,
-                       const Rows<NamedRow> &names, const char *label)
-{
-    ParmName name;
-    if (qvsResult result = readParmName(decoder, state, tag, label, false, &name)) {
-        return result;
-    }
-    if (name.next == attr::kValue) {
-        // kept[named-unknown-refused]: the VALUE of an unknown name is not read.
-        if (char **field = findNamed(record, names, name.text)) {
-            if (qvsResult result = readValue(decoder, state, field)) {
-                return result;
-            }
-        }
-    }
-    trace("[%s] nID [0x%x]", label, name.next);
-    return QVS_OK;
-}
-
-template <class Record, size_t N>
-qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, Record *record, uint8_t tag,
-                    const Table<Record, NamedRow, N> &names, const char *label)
-{
-    return readAnyNamed(decoder, state, record, tag, rowsFor<Record>(names), label);
-}
-
-namespace roaming {
-using R = qvsWapRoaming;
-constexpr auto kNamed = tableOf<NamedParm<R>>({
-    {"SYNC-ALLOWED", &R::pszSyncAllowed},
-    {"SYNC-DEFAULT", &R::pszSyncDefault},
-});
-
-qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
-{
-    return readNamed(decoder, state, record, attr::kName, kNamed,
-                     "qvsClientProvWbxmlDecoderParamRoamingNameString");
-}
-} // namespace roaming
-
-namespace wifi {
-using R = qvsWapWifi;
-constexpr auto kNamed = tableOf<NamedParm<R>>({
-    {"NETSSID", &R::pszNetSsid},
-    {"SECMODE", &R::pszSecMode},
-    {"EAPMETHOD", &R::pszEapMethod},
-    {"EAPTYPE", &R::pszEapType},
-    {"USERNAME", &R::pszUserName},
-    {"ANONUSERNAME", &R::pszAnonUserName},
-    {"PASSWORD", &R::pszPassword},
-    {"CACERT", &R::pszCaCert},
-    {"USERCERT", &R::pszUserCert},
-    {"PHASE1", &R::pszPhase1},
-    {"AUTHALGORITHM", &R::pszAuthAlgorithm},
-    {"PRIORITY", &R::pszPriority},
-});
-
-qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
-{
-    return readNamed(decoder, state, record, attr::kName, kNamed,
-                     "qvsClientProvWbxmlDecoderParamNameString");
-}
-} // namespace wifi
-
-namespace voWifi {
-using R = qvsWapVoWifi;
-constexpr auto kNamed = tableOf<NamedParm<R>>({
-    {"ePDG FQDN", &R::pszEpdgFqdn},
-});
-
-qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
-{
-    return readNamed(decoder, state, record, attr::kName, kNamed,
-                     "qvsClientProvWbxmlDecoderParamNameString");
-}
-} // namespace voWifi
-
-} // namespace
-
-qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag,
-                            const char *label, bool isKept, ParmName *name)
+// readParmName() where it is known whether the name is kept.
+[[gnu::always_inline]] inline qvsResult readNameOf(qvsWbxmlDecoder *decoder, DecodeState *state,
+                                                   uint8_t tag, const char *label, bool isKept,
+                                                   ParmName *name)
 {
     trace("[%s] nTagID [0x%x]", label, tag);
     if (qvsResult result = checkAttr(decoder, tag)) {
@@ -122,17 +43,115 @@ qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_
     return QVS_OK;
 }
 
-char **qvs::findNamed(void *record, const Rows<NamedRow> &names, const Text &name)
+// The field of `record` that the name selects; null for a name that is not listed.
+char **findNamed(void *record, const Rows<NamedRow> &names, const Text &name)
 {
     const char *const text = name.str();
     const uint32_t length = name.length;
     for (const NamedRow &known : names) {
-        if (known.name[0] == text[0] && length < sizeof known.name && known.name[length] == '\0' &&
-            memcmp(text, known.name, length) == 0) {
+        if (known.length == length && known.name[0] == *text &&
+            memcmp(known.name, text, length) == 0) {
             return textAt(record, known.field);
         }
     }
     return nullptr;
+}
+
+// Reads a value and drops it.
+[[gnu::noinline]] qvsResult dropValue(qvsWbxmlDecoder *decoder, DecodeState *state,
+                                      const char *label)
+{
+    Text dropped;
+    const qvsResult result = paramValue(decoder, state, &dropped, lookAt);
+    if (result == QVS_OK) {
+        trace("[%s] pszValue [%s]", label, dropped.str() ? dropped.str() : "");
+    }
+    return result;
+}
+
+namespace roaming {
+using R = qvsWapRoaming;
+constexpr auto kNames = tableOf<NamedParm<R>>({
+    {"SYNC-ALLOWED", &R::pszSyncAllowed},
+    {"SYNC-DEFAULT", &R::pszSyncDefault},
+});
+
+constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamRoamingNameString"};
+
+qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
+{
+    return readNamed(decoder, state, record, attr::kName, kNamed);
+}
+} // namespace roaming
+
+namespace wifi {
+using R = qvsWapWifi;
+constexpr auto kNames = tableOf<NamedParm<R>>({
+    {"NETSSID", &R::pszNetSsid},
+    {"SECMODE", &R::pszSecMode},
+    {"EAPMETHOD", &R::pszEapMethod},
+    {"EAPTYPE", &R::pszEapType},
+    {"USERNAME", &R::pszUserName},
+    {"ANONUSERNAME", &R::pszAnonUserName},
+    {"PASSWORD", &R::pszPassword},
+    {"CACERT", &R::pszCaCert},
+    {"USERCERT", &R::pszUserCert},
+    {"PHASE1", &R::pszPhase1},
+    {"AUTHALGORITHM", &R::pszAuthAlgorithm},
+    {"PRIORITY", &R::pszPriority},
+});
+
+constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamNameString"};
+
+qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
+{
+    return readNamed(decoder, state, record, attr::kName, kNamed);
+}
+} // namespace wifi
+
+namespace voWifi {
+using R = qvsWapVoWifi;
+constexpr auto kNames = tableOf<NamedParm<R>>({
+    {"ePDG FQDN", &R::pszEpdgFqdn},
+});
+
+constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamNameString"};
+
+qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
+{
+    return readNamed(decoder, state, record, attr::kName, kNamed);
+}
+} // namespace voWifi
+
+} // namespace
+
+qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag,
+                            const char *label, bool isKept, ParmName *name)
+{
+    return readNameOf(decoder, state, tag, label, isKept, name);
+}
+
+qvsResult qvs::readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag,
+                         const NamedParms &parms)
+{
+    ParmName name;
+    if (qvsResult result = readNameOf(decoder, state, tag, parms.label, false, &name)) {
+        return result;
+    }
+    if (name.next == attr::kValue) {
+        if (char **field = findNamed(record, parms.names, name.text)) {
+            if (qvsResult result = readValue(decoder, state, field)) {
+                return result;
+            }
+        } else if (parms.dropsUnknown) {
+            return dropValue(decoder, state, parms.label);
+        }
+        // kept[named-unknown-refused]: the VALUE of another unknown name is not read.
+    }
+    if (!parms.dropsUnknown) {
+        trace("[%s] nID [0x%x]", parms.label, name.next);
+    }
+    return QVS_OK;
 }
 
 constexpr ParmsOf<qvsWapRoaming> qvs::kRoamingParms = {{.name = kRefusedBy, .entered = "Roming"},
@@ -156,8 +175,7 @@ qvsResult qvsClientProvWbxmlDecoderParamRoamingNameString(qvsWbxmlDecoder *decod
                                                           qvsWapRoaming **record, uint8_t tag)
 {
     DecodeState alone;
-    return readNamed(decoder, &alone, *record, tag, roaming::kNamed,
-                     "qvsClientProvWbxmlDecoderParamRoamingNameString");
+    return readNamed(decoder, &alone, *record, tag, roaming::kNamed);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamWifi(qvsWbxmlDecoder *decoder, qvsWapWifi *record)
@@ -169,8 +187,7 @@ qvsResult qvsClientProvWbxmlDecoderParamWifiNameString(qvsWbxmlDecoder *decoder,
                                                        qvsWapWifi **record, uint8_t tag)
 {
     DecodeState alone;
-    return readNamed(decoder, &alone, *record, tag, wifi::kNamed,
-                     "qvsClientProvWbxmlDecoderParamNameString");
+    return readNamed(decoder, &alone, *record, tag, wifi::kNamed);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamVoWifi(qvsWbxmlDecoder *decoder, qvsWapVoWifi *record)
@@ -182,6 +199,5 @@ qvsResult qvsClientProvWbxmlDecoderParamVoWifiNameString(qvsWbxmlDecoder *decode
                                                          qvsWapVoWifi **record, uint8_t tag)
 {
     DecodeState alone;
-    return readNamed(decoder, &alone, *record, tag, voWifi::kNamed,
-                     "qvsClientProvWbxmlDecoderParamNameString");
+    return readNamed(decoder, &alone, *record, tag, voWifi::kNamed);
 }

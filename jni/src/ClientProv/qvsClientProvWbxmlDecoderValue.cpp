@@ -9,36 +9,30 @@ using namespace qvs;
 
 namespace {
 
-struct ValueToken {
-    template <size_t N>
-    consteval ValueToken(uint8_t t, const char (&s)[N]) : token(t), length(N - 1), text(s)
-    {
-    }
-
-    uint8_t token;
-    uint8_t length;
-    const char *text;
-};
-
+// kept[call-type-join]: a call type joins out of sight, so that the text reads as before.
 constexpr ValueToken kCallTypes[] = {
-    {0x90, "ANALOG-MODEM"}, {0x91, "V.120"},           {0x92, "V.110"},
-    {0x93, "X.31"},         {0x94, "BIT-TRANSPARENT"}, {0x95, "DIRECT-ASYNCHRONOUS-DATA-SERVICE"},
+    {0x90, "ANALOG-MODEM", Join::kHidden},
+    {0x91, "V.120", Join::kHidden},
+    {0x92, "V.110", Join::kHidden},
+    {0x93, "X.31", Join::kHidden},
+    {0x94, "BIT-TRANSPARENT", Join::kHidden},
+    {0x95, "DIRECT-ASYNCHRONOUS-DATA-SERVICE", Join::kHidden},
 };
 
 constexpr ValueToken kAuthSchemes[] = {
-    {0x91, "HTTP"},
-    {0x92, "BASIC"},
-    {0x93, "DIGEST"},
+    {0x91, "HTTP", Join::kComma},
+    {0x92, "BASIC", Join::kComma},
+    {0x93, "DIGEST", Join::kComma},
 };
 
 constexpr ValueToken kAuthTypes[] = {
-    {0x9A, "PAP"},
-    {0x9B, "CHAP"},
-    {0x9C, "HTTP-BASIC"},
-    {0x9D, "HTTP-DIGEST"},
+    {0x9A, "PAP", Join::kComma},
+    {0x9B, "CHAP", Join::kComma},
+    {0x9C, "HTTP-BASIC", Join::kComma},
+    {0x9D, "HTTP-DIGEST", Join::kComma},
     // kept[wtls-underscore]: written with an underscore.
-    {0x9E, "WTLS_SS"},
-    {0x9F, "MD5"},
+    {0x9E, "WTLS_SS", Join::kComma},
+    {0x9F, "MD5", Join::kComma},
 };
 
 constexpr ValueToken kAddressTypes[] = {
@@ -47,25 +41,17 @@ constexpr ValueToken kAddressTypes[] = {
 };
 
 struct ValueTable {
+    template <size_t N>
+    consteval ValueTable(const ValueToken (&tokens)[N]) : rows(tokens), count(N)
+    {
+    }
+
     const ValueToken *rows;
     size_t count;
-    Join join;
 };
-
-template <size_t N>
-consteval ValueTable table(const ValueToken (&rows)[N], Join join)
-{
-    return {rows, N, join};
-}
 
 // In the order in which rows of the same number are compared.
-constexpr ValueTable kTables[] = {
-    table(kAddressTypes, Join::kDirect),
-    table(kAuthTypes, Join::kComma),
-    table(kAuthSchemes, Join::kComma),
-    // kept[call-type-join]: a call type joins out of sight, so that the text reads as before.
-    table(kCallTypes, Join::kHidden),
-};
+constexpr ValueTable kTables[] = {kAddressTypes, kAuthTypes, kAuthSchemes, kCallTypes};
 
 // What a token stands for: a row of a table, counted from 1; row 0 for nothing.
 struct Meaning {
@@ -103,16 +89,10 @@ constexpr Meanings kMeanings = firstHits();
 
 } // namespace
 
-bool qvs::tokenPiece(uint8_t token, Piece *piece)
+const ValueToken *qvs::findValue(uint8_t token)
 {
     const Meaning meaning = token < kFirstValue ? Meaning{} : kMeanings.of[token - kFirstValue];
-    if (meaning.row == 0) {
-        return false;
-    }
-    const ValueTable &table = kTables[meaning.table];
-    const ValueToken &row = table.rows[meaning.row - 1];
-    *piece = {row.text, row.length, table.join};
-    return true;
+    return meaning.row ? kTables[meaning.table].rows + (meaning.row - 1) : nullptr;
 }
 
 qvsResult qvs::commaAdd(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,

@@ -134,7 +134,8 @@ qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, Record *record,
 
 // A name, and the text that its value goes to.
 struct NamedRow {
-    char name[18];
+    uint8_t length; // of the name
+    char name[17];
     uint8_t field;
 };
 
@@ -144,9 +145,9 @@ struct NamedParm {
     using Row = NamedRow;
 
     template <size_t N>
-    consteval NamedParm(const char (&text)[N], char *Record::*to) : row{{}, numberOf(to)}
+    consteval NamedParm(const char (&text)[N], char *Record::*to) : row{N - 1, {}, numberOf(to)}
     {
-        for (size_t i = 0; i < N; ++i) {
+        for (size_t i = 0; i < N - 1; ++i) {
             row.name[i] = text[i];
         }
     }
@@ -166,12 +167,33 @@ struct ParmName {
 qvsResult readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag, const char *label,
                        bool isKept, ParmName *name);
 
-// The field of `record` that the name selects; null for a name that is not listed.
-char **findNamed(void *record, const Rows<NamedRow> &names, const Text &name);
-template <class Record, size_t N>
-char **findNamed(Record *record, const Table<Record, NamedRow, N> &names, const Text &name)
+// The named parameters of one kind of characteristic.
+struct NamedParms {
+    Rows<NamedRow> names;
+    const char *label;
+    bool dropsUnknown; // the value of a name that is not listed; the loop refuses it otherwise
+};
+
+template <class Record>
+struct NamedOf {
+    template <size_t N>
+    consteval NamedOf(const Table<Record, NamedRow, N> &names, const char *label,
+                      bool dropsUnknown = false)
+        : parms{rowsFor<Record>(names), label, dropsUnknown}
+    {
+    }
+
+    NamedParms parms;
+};
+
+// Reads one named parameter of `record`.
+qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag,
+                    const NamedParms &parms);
+template <class Record>
+qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, Record *record, uint8_t tag,
+                    const NamedOf<Record> &named)
 {
-    return findNamed(record, rowsFor<Record>(names), name);
+    return readNamed(decoder, state, record, tag, named.parms);
 }
 
 } // namespace qvs

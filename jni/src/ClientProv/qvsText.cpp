@@ -6,8 +6,6 @@ using namespace qvs;
 
 namespace {
 
-constexpr uint32_t kUnreadTable = 0xFFFFFFFF;
-
 // Pieces of a run that are looked at before they are appended.
 constexpr uint32_t kMostPieces = 4;
 
@@ -83,8 +81,8 @@ inline uint32_t separatorOf(const Piece &piece)
 }
 
 // Appends pieces that add so many bytes, in one block. Answers the first one that is not appended.
-[[gnu::always_inline]] inline const Piece *
-appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end, uint64_t added)
+const Piece *appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end,
+                       uint64_t added)
 {
     bool joins = text->str() != nullptr;
     if (!reserve(state, text, added, piece->join == Join::kOpaque ? 1 : 0)) [[unlikely]] {
@@ -101,20 +99,30 @@ appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end, 
     return piece;
 }
 
-// appendAll() where a text is not all that is read.
-[[gnu::noinline]] const Piece *appendMore(DecodeState *state, Text *text, const Piece *first,
-                                          const Piece *behind, uint64_t added)
+// The result where the only piece of a value, which has been taken, is not appended.
+[[gnu::noinline, gnu::cold]] qvsResult lackPiece(qvsWbxmlDecoder *decoder, uint8_t *unread)
 {
-    return appendAll(state, text, first, behind, added);
+    const Piece piece = {nullptr, 0, Join::kDirect, unread};
+    if (appendNone(&piece, &piece + 1) != &piece) {
+        return QVS_OK;
+    }
+    decoder->ptBuffer->pHead = unread;
+    return QVS_ERROR_WBXML_NO_DATA;
 }
 
-// The result of appending the only piece of a value, which has been taken.
-inline qvsResult endOfPiece(qvsWbxmlDecoder *decoder, const Piece &piece, bool appended)
+// A block with a copy of the only piece of a value; null without memory, or once the texts of the
+// message passed their limit.
+inline char *copyOf(DecodeState *state, const Piece &piece)
 {
-    if (!appended) [[unlikely]] {
-        decoder->ptBuffer->pHead = piece.unread;
+    const uint32_t length = piece.length;
+    char *block = countText(state, length) && length < UINT32_MAX - kSpareZeros
+                      ? newText(length + 1, kDecoderModule)
+                      : nullptr;
+    if (block) {
+        memcpy(block, piece.bytes, length);
+        memset(block + length, 0, 1 + kSpareZeros);
     }
-    return appended ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+    return block;
 }
 
 // Reads a run, a value token, opaque data, or a token that stands for no text.
@@ -134,7 +142,7 @@ qvsResult readAny(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
     Piece piece;
     if (opaque ? takeOpaque(&head, head + bytesLeft(decoder), &length, &piece)
                : tokenPiece(token, &piece)) {
-        return endOfPiece(decoder, piece, append(state, text, piece));
+        return append(state, text, piece) ? qvsResult{QVS_OK} : lackPiece(decoder, piece.unread);
     }
     if (opaque) {
         return QVS_ERROR_WBXML_NO_DATA;
@@ -151,21 +159,19 @@ qvsResult readAny(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
     return result;
 }
 
-// Hands a text that was read out; on failure `*text` stays.
-[[gnu::always_inline]] inline qvsResult keep(char **text, Text *read, qvsResult result)
+// The result of reading a value, traced.
+inline qvsResult endOfContent(const DecodeState *state, qvsResult result)
 {
-    if (result == QVS_OK) {
-        *text = read->take();
+    if (state->textLimit) [[unlikely]] {
+        result = QVS_ERROR_NO_MEMORY;
     }
+    trace("qvsClientProvWbxmlDecoderContent Error:%d", static_cast<int>(result));
     return result;
 }
 
-// Takes a VALUE and a page switch behind it, up to the value. It may be none, where an END stands.
+// Takes a page switch behind a VALUE, up to the value. It may be none, where an END stands.
 inline qvsResult enterValue(qvsWbxmlDecoder *decoder, bool *present)
 {
-    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
-        return result;
-    }
     uint8_t next = 0;
     bool left = peekByte(decoder->ptBuffer, &next);
     if (left && next == wbxml::kSwitchPage) {
@@ -175,6 +181,24 @@ inline qvsResult enterValue(qvsWbxmlDecoder *decoder, bool *present)
     }
     *present = next != wbxml::kEnd;
     return left ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
+}
+
+// Reads what a VALUE carries, as readValue() does.
+[[gnu::noinline]] qvsResult readNew(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                                    const char *before)
+{
+    bool present = false;
+    qvsResult result = enterValue(decoder, &present);
+    Text read;
+    if (result == QVS_OK && present) {
+        read.before = before;
+        read.length = qvsStrlen(before);
+        result = content(decoder, state, &read);
+    }
+    if (result == QVS_OK) {
+        *text = read.take();
+    }
+    return result;
 }
 
 } // namespace
@@ -190,25 +214,7 @@ bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
 {
     const uint32_t separator = text->str() ? separatorOf(piece) : 0;
     const uint64_t added = uint64_t{piece.length} + separator;
-    return appendMore(state, text, &piece, &piece + 1, added) != &piece;
-}
-
-bool qvs::tablePiece(const qvsWbxmlDecoder *decoder, uint8_t **at, const uint8_t *end, Piece *piece)
-{
-    uint32_t index = 0;
-    // hardened: a table that was cut off, whose length is not known, is referred to in vain.
-    if (!takeUint32(at, end, &index) || !decoder->pStringTable ||
-        decoder->nStrSize == kUnreadTable || index > decoder->nStrSize - 1) {
-        return false;
-    }
-    // kept[empty-table-index]: every index passes the check of an empty table; its block of two
-    // zero bytes answers 0 and 1 with the empty text. hardened: an index behind that block fails.
-    if (decoder->nStrSize == 0 && index > 1) {
-        return false;
-    }
-    const char *entry = decoder->pStringTable + index;
-    *piece = {entry, static_cast<uint32_t>(strlen(entry)), Join::kDirect, *at};
-    return true;
+    return appendAll(state, text, &piece, &piece + 1, added) != &piece;
 }
 
 // All pieces are looked at before a block is made for them; of many, so many at a time. Each by
@@ -251,7 +257,7 @@ bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
                 ++left;
             }
         } else if (piece != pieces) {
-            left = appendMore(state, text, pieces, piece, added);
+            left = appendAll(state, text, pieces, piece, added);
         }
         if (left != piece) [[unlikely]] {
             decoder->ptBuffer->pHead = left->unread;
@@ -275,9 +281,27 @@ qvsResult qvs::content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
     return endOfContent(state, readAny(decoder, state, text));
 }
 
+qvsResult qvs::lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
+{
+    Piece piece;
+    if (!takeOnlyPiece(decoder, &piece)) {
+        return content(decoder, state, text);
+    }
+    if (countText(state, piece.length)) {
+        text->before = piece.bytes;
+        text->length = piece.length;
+    } else if (piece.unread) {
+        decoder->ptBuffer->pHead = piece.unread;
+    }
+    return endOfContent(state, QVS_OK);
+}
+
 qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text,
                           ValueReader reader)
 {
+    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
+        return result;
+    }
     bool present = false;
     const qvsResult result = enterValue(decoder, &present);
     return result == QVS_OK && present ? reader(decoder, state, text) : result;
@@ -286,25 +310,20 @@ qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *te
 qvsResult qvs::readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
                          const char *before)
 {
-    bool present = false;
-    qvsResult result = enterValue(decoder, &present);
-    if (result != QVS_OK) {
+    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
         return result;
     }
-    if (!present) {
-        *text = nullptr;
-        return QVS_OK;
-    }
     Piece piece;
-    if (!before && takeOnlyPiece(decoder, &piece)) {
-        Text read;
-        const Piece *const end = &piece + 1;
-        const bool appended = appendAll(state, &read, &piece, end, piece.length) == end;
-        result = endOfPiece(decoder, piece, appended);
-        return keep(text, &read, endOfContent(state, result));
+    if (before || !takeOnlyPiece(decoder, &piece)) {
+        return readNew(decoder, state, text, before);
     }
-    Text read;
-    read.before = before;
-    read.length = qvsStrlen(before);
-    return keep(text, &read, content(decoder, state, &read));
+    char *read = copyOf(state, piece);
+    const qvsResult result =
+        endOfContent(state, read ? qvsResult{QVS_OK} : lackPiece(decoder, piece.unread));
+    if (result == QVS_OK) {
+        *text = read;
+    } else if (read) {
+        freeBlock(read);
+    }
+    return result;
 }

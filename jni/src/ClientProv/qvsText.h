@@ -25,6 +25,9 @@ inline constexpr char kDecoderModule[] = "jni/src/ClientProv/qvsClientProvWbxmlD
 constexpr uint64_t kTextAlways = 8U << 20U;
 constexpr uint64_t kTextPerByte = 100;
 
+// The length of a string table that could not be read.
+constexpr uint32_t kUnreadTable = 0xFFFFFFFF;
+
 // How a piece joins a text that is already there.
 enum class Join : uint8_t {
     kDirect, // right behind it
@@ -253,10 +256,52 @@ inline bool takeOpaque(uint8_t **at, const uint8_t *end, uint32_t *length, Piece
 }
 
 // What a reference into the string table stands for. False for one that is none.
-bool tablePiece(const qvsWbxmlDecoder *decoder, uint8_t **at, const uint8_t *end, Piece *piece);
+inline bool tablePiece(const qvsWbxmlDecoder *decoder, uint8_t **at, const uint8_t *end,
+                       Piece *piece)
+{
+    uint32_t index = 0;
+    // hardened: a table that was cut off, whose length is not known, is referred to in vain.
+    if (!takeUint32(at, end, &index) || !decoder->pStringTable ||
+        decoder->nStrSize == kUnreadTable || index > decoder->nStrSize - 1) {
+        return false;
+    }
+    // kept[empty-table-index]: every index passes the check of an empty table; its block of two
+    // zero bytes answers 0 and 1 with the empty text. hardened: an index behind that block fails.
+    if (decoder->nStrSize == 0 && index > 1) {
+        return false;
+    }
+    const char *entry = decoder->pStringTable + index;
+    *piece = {entry, static_cast<uint32_t>(strlen(entry)), Join::kDirect, *at};
+    return true;
+}
+
+// What a value token stands for.
+struct ValueToken {
+    template <size_t N>
+    consteval ValueToken(uint8_t t, const char (&s)[N], Join j = Join::kDirect)
+        : token(t), length(N - 1), join(j), text(s)
+    {
+    }
+
+    uint8_t token;
+    uint8_t length;
+    Join join;
+    const char *text;
+};
+
+// The row of a value token; null for a token that stands for no text.
+const ValueToken *findValue(uint8_t token);
 
 // The text of a value token. False for a token that stands for no text.
-bool tokenPiece(uint8_t token, Piece *piece);
+inline bool tokenPiece(uint8_t token, Piece *piece)
+{
+    const ValueToken *value = findValue(token);
+    if (!value) {
+        return false;
+    }
+    *piece = {value->text, value->length, value->join};
+    return true;
+}
 
 // Whether a token ends a run of strings and value tokens.
 constexpr bool endsRun(uint8_t token)
@@ -264,32 +309,23 @@ constexpr bool endsRun(uint8_t token)
     return token == wbxml::kEnd || token == attr::kValue;
 }
 
-// Takes a value of one piece, as most have. False, with nothing read, for any other. Inline, and
-// with what leaves its registers kept apart, since nothing is called as often.
+// Takes a value of one piece, as most have. False, with nothing read, for any other. Inline, with
+// nothing that a function outside writes to, since nothing is called as often.
 [[gnu::always_inline]] inline bool takeOnlyPiece(qvsWbxmlDecoder *decoder, Piece *piece)
 {
     uint8_t *at = decoder->ptBuffer->pHead;
     const uint8_t *const end = at + bytesLeft(decoder);
-    if (at != end && *at == wbxml::kStrI) {
-        ++at;
+    const uint8_t token = at != end ? *at++ : 0;
+    if (token == wbxml::kStrI) {
         inlinePiece(&at, end, piece);
-    } else {
-        uint8_t *behind = at;
-        const uint8_t token = at != end ? *behind++ : 0;
-        Piece other = {};
-        if (token == wbxml::kStrT) {
-            if (!tablePiece(decoder, &behind, end, &other)) {
-                return false;
-            }
-        } else if (!tokenPiece(token, &other)) {
+    } else if (token != wbxml::kStrT) {
+        if (!tokenPiece(token, piece)) {
             return false;
         }
-        *piece = other;
-        at = behind;
-        if (token != wbxml::kStrT) {
-            decoder->ptBuffer->pHead = at;
-            return true;
-        }
+        decoder->ptBuffer->pHead = at;
+        return true;
+    } else if (!tablePiece(decoder, &at, end, piece)) {
+        return false;
     }
     if (at >= end || !endsRun(*at)) {
         return false;
@@ -311,30 +347,7 @@ bool readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
 // no block but stays where it lies, as the text `before`.
 using ValueReader = qvsResult (*)(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
 qvsResult content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
-// The result of reading a value, traced.
-inline qvsResult endOfContent(const DecodeState *state, qvsResult result)
-{
-    if (state->textLimit) [[unlikely]] {
-        result = QVS_ERROR_NO_MEMORY;
-    }
-    trace("qvsClientProvWbxmlDecoderContent Error:%d", static_cast<int>(result));
-    return result;
-}
-
-inline qvsResult lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
-{
-    Piece piece;
-    if (!takeOnlyPiece(decoder, &piece)) {
-        return content(decoder, state, text);
-    }
-    if (countText(state, piece.length)) {
-        text->before = piece.bytes;
-        text->length = piece.length;
-    } else if (piece.unread) {
-        decoder->ptBuffer->pHead = piece.unread;
-    }
-    return endOfContent(state, QVS_OK);
-}
+qvsResult lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
 
 // A VALUE and what it carries: as a reader has it, or as a new text, which may continue the text
 // `before` and is null for nothing.

@@ -101,7 +101,7 @@ void *newTrackedText(uint32_t size, const char *module, int line);
 inline char *newText(uint32_t size, const char *module, int line = __builtin_LINE())
 {
     return static_cast<char *>(tracking ? newTrackedText(size, module, line)
-                                        : malloc(size + kSpareZeros));
+                                        : requested(size + kSpareZeros));
 }
 
 inline void freeBlock(void *block)
