@@ -1,5 +1,6 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Collections;
 import java.util.List;
 
 /**
@@ -33,7 +34,7 @@ public final class ContentType {
         this.mediaTypeOffset = mediaTypeOffset;
         this.mediaTypeEnd = mediaTypeEnd;
         this.end = end;
-        this.parameters = parameters;
+        this.parameters = Collections.unmodifiableList(parameters);
     }
 
     /**
@@ -81,11 +82,8 @@ public final class ContentType {
             visitor.visit(offset, mediaTypeOffset - offset, 0, "length of the content type");
             depth = 1;
         }
-        visitor.visit(
-                mediaTypeOffset,
-                mediaTypeEnd - mediaTypeOffset,
-                depth,
-                "content type: " + mediaType);
+        int length = mediaTypeEnd - mediaTypeOffset;
+        visitor.visit(mediaTypeOffset, length, depth, "content type: " + mediaType);
         int at = mediaTypeEnd;
         for (HeaderField parameter : parameters) {
             describeGap(visitor, at, parameter.offset());

@@ -4,7 +4,7 @@ package com.qvomacp.eng.omacp;
  * Where a walk has ended: the elements around, innermost eight at most. To number them the body is
  * walked once more, since counting while nobody asks would cost every walk.
  */
-final class LibraryPath implements LibraryTrace {
+final class LibraryPath extends LibraryTrace {
     private static final int LONGEST = 8;
     private static final String SEPARATOR = " / ";
     private static final String UNTYPED = "characteristic";
@@ -34,7 +34,7 @@ final class LibraryPath implements LibraryTrace {
 
     /** Counts a characteristic that stands in front of one of those around, of the same type. */
     @Override
-    public void characteristic(int depth, int start, LibraryKind kind, String type) {
+    void characteristic(int depth, int start, LibraryKind kind, String type) {
         if (depth < numbers.length
                 && start < ended.starts[depth]
                 && (depth == 0 || start > ended.starts[depth - 1])
@@ -84,30 +84,5 @@ final class LibraryPath implements LibraryTrace {
             }
         }
         return path.toString();
-    }
-
-    @Override
-    public void characteristicEnd(int start, int end) {
-        // Counted where it begins.
-    }
-
-    @Override
-    public void parm(int start) {
-        // Not numbered.
-    }
-
-    @Override
-    public void name(String name) {
-        // Not numbered.
-    }
-
-    @Override
-    public void value(int start, int end) {
-        // Not numbered.
-    }
-
-    @Override
-    public void parmEnd(int start, int end) {
-        // Not numbered.
     }
 }

@@ -1,6 +1,7 @@
 package com.qvomacp.eng.omacp;
 
 import java.util.Arrays;
+import java.util.Collections;
 import java.util.List;
 
 /**
@@ -33,26 +34,40 @@ public final class PushHeader {
     private final ContentType contentType;
     private final List<HeaderField> fields;
     private final SecurityMethod securityMethod;
-    private final String mac;
-    private final int macOffset;
+
+    /** Null when the message carries none. */
+    private final HeaderField mac;
 
     PushHeader(
             int transactionIdentifier,
             int from,
             byte[] bytes,
             ContentType contentType,
-            List<HeaderField> fields,
-            SecurityMethod securityMethod,
-            String mac,
-            int macOffset) {
+            List<HeaderField> fields) {
         this.transactionIdentifier = transactionIdentifier;
         this.from = from;
         this.bytes = bytes;
         this.contentType = contentType;
-        this.fields = fields;
-        this.securityMethod = securityMethod;
-        this.mac = mac;
-        this.macOffset = macOffset;
+        this.fields = Collections.unmodifiableList(fields);
+        HeaderField sec = first("SEC", false);
+        securityMethod =
+                sec == null ? SecurityMethod.NONE : SecurityMethod.stated(sec.value());
+        mac = first("MAC", true);
+    }
+
+    /** The first parameter or header of a name; null without one. */
+    private HeaderField first(String name, boolean hasValue) {
+        HeaderField found = first(contentType.parameters(), name, hasValue);
+        return found != null ? found : first(fields, name, hasValue);
+    }
+
+    private static HeaderField first(List<HeaderField> list, String name, boolean hasValue) {
+        for (HeaderField field : list) {
+            if (field.name().equalsIgnoreCase(name) && (!hasValue || field.value() != null)) {
+                return field;
+            }
+        }
+        return null;
     }
 
     /**
@@ -110,7 +125,7 @@ public final class PushHeader {
      * hexadecimal digits when it can be one; {@code null} when the message carries none}
      */
     public String mac() {
-        return mac;
+        return mac == null ? null : mac.value();
     }
 
     /**
@@ -118,7 +133,7 @@ public final class PushHeader {
      * counted from 0; -1 when the message carries none}
      */
     public int macOffset() {
-        return macOffset;
+        return mac == null ? -1 : mac.offset();
     }
 
     /**

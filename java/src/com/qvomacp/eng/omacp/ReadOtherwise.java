@@ -6,7 +6,7 @@ import java.util.List;
 import java.util.Objects;
 
 /** Compares the elements that the native library's walk reads with the items of the tree. */
-final class ReadOtherwise implements LibraryTrace {
+final class ReadOtherwise extends LibraryTrace {
     private static final int OPEN = -1;
 
     /** The elements in the order in which they begin. */
@@ -113,27 +113,18 @@ final class ReadOtherwise implements LibraryTrace {
         areParms[count++] = isParm;
     }
 
-    private void end(int end) {
-        ends[open[--depth]] = end;
-    }
-
     @Override
-    public void characteristic(int depth, int start, LibraryKind kind, String type) {
+    void characteristic(int depth, int start, LibraryKind kind, String type) {
         begin(start, kind == null ? null : type, false);
     }
 
     @Override
-    public void characteristicEnd(int start, int end) {
-        end(end);
-    }
-
-    @Override
-    public void parm(int start) {
+    void parm(int start) {
         begin(start, null, true);
     }
 
     @Override
-    public void name(String name) {
+    void name(String name) {
         int parm = count - 1;
         if (pairs[parm]++ == 0) {
             names[parm] = name;
@@ -141,12 +132,12 @@ final class ReadOtherwise implements LibraryTrace {
     }
 
     @Override
-    public void value(int start, int end) {
+    void value(int end) {
         valueEnds[count - 1] = end;
     }
 
     @Override
-    public void parmEnd(int start, int end) {
-        end(end);
+    void end(int end) {
+        ends[open[--depth]] = end;
     }
 }

@@ -17,16 +17,14 @@ import java.util.Objects;
  * }</pre>
  */
 public final class Verdict {
-    private static final byte[] NO_BODY = {};
+    /** Null when the library refuses the header. */
+    private final byte[] body;
 
-    private final boolean headerRefused;
     private final int code;
     private final int bytesRead;
 
     /** Null when the message is accepted. */
     private final Refusal refusal;
-
-    private final byte[] body;
 
     /** Null when the body could not be read. */
     private final ProvisioningDocument document;
@@ -34,19 +32,17 @@ public final class Verdict {
     /** Where the document begins in what the library takes for the body. */
     private final int shift;
 
-    private Verdict(
-            boolean headerRefused,
+    Verdict(
+            byte[] body,
             int code,
             int bytesRead,
             Refusal refusal,
-            byte[] body,
             ProvisioningDocument document,
             int shift) {
-        this.headerRefused = headerRefused;
+        this.body = body;
         this.code = code;
         this.bytesRead = bytesRead;
         this.refusal = refusal;
-        this.body = body;
         this.document = document;
         this.shift = shift;
     }
@@ -73,20 +69,6 @@ public final class Verdict {
         return LibraryRules.verdictOnBody(body.clone(), null);
     }
 
-    static Verdict onHeader(Refusal refusal) {
-        return new Verdict(true, 0, 0, refusal, NO_BODY, null, 0);
-    }
-
-    static Verdict onBody(
-            byte[] body,
-            int code,
-            int bytesRead,
-            Refusal refusal,
-            ProvisioningDocument document,
-            int shift) {
-        return new Verdict(false, code, bytesRead, refusal, body, document, shift);
-    }
-
     /** {@return whether the library takes the message} */
     public boolean isAccepted() {
         return refusal == null;
@@ -94,7 +76,7 @@ public final class Verdict {
 
     /** {@return whether it is the push header that the library refuses} */
     public boolean isHeaderRefused() {
-        return headerRefused;
+        return body == null;
     }
 
     /**
@@ -114,17 +96,17 @@ public final class Verdict {
         switch (code) {
             case 0:
                 return "QVS_OK";
-            case LibraryWalk.FAILED:
+            case LibraryStop.FAILED:
                 return "QVS_ERROR_FAILED";
-            case LibraryWalk.BAD_ARGUMENT:
+            case LibraryStop.BAD_ARGUMENT:
                 return "QVS_ERROR_BAD_ARGUMENT";
-            case LibraryWalk.UNKNOWN_ELEMENT:
+            case LibraryStop.UNKNOWN_ELEMENT:
                 return "QVS_ERROR_WBXML_UNKNOWN_ELEMENT";
-            case LibraryWalk.NO_DATA:
+            case LibraryStop.NO_DATA:
                 return "QVS_ERROR_WBXML_NO_DATA";
-            case LibraryWalk.WRONG_DOCUMENT_TYPE:
+            case LibraryStop.WRONG_DOCUMENT_TYPE:
                 return "QVS_ERROR_WBXML_DOCUMENT_TYPE";
-            case LibraryWalk.NO_MEMORY:
+            case LibraryStop.NO_MEMORY:
                 return "QVS_ERROR_NO_MEMORY";
             default:
                 throw new AssertionError(code);
@@ -181,7 +163,7 @@ public final class Verdict {
      * the items of the document, in its order; not modifiable}
      */
     public List<Item> readOtherwise() {
-        if (headerRefused || document == null) {
+        if (body == null || document == null) {
             return Collections.emptyList();
         }
         return Collections.unmodifiableList(ReadOtherwise.of(body, document, shift));
@@ -193,8 +175,7 @@ public final class Verdict {
             return false;
         }
         Verdict that = (Verdict) other;
-        return headerRefused == that.headerRefused
-                && code == that.code
+        return code == that.code
                 && bytesRead == that.bytesRead
                 && offset() == that.offset()
                 && Objects.equals(path(), that.path())
@@ -221,7 +202,7 @@ public final class Verdict {
         }
         return "refused: "
                 + reason()
-                + (headerRefused ? "" : ", " + code + " " + codeName())
+                + (body == null ? "" : ", " + code + " " + codeName())
                 + ", offset "
                 + offset()
                 + (path() == null ? "" : ", " + path());
