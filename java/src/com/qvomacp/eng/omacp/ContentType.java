@@ -53,15 +53,12 @@ public final class ContentType {
         return code;
     }
 
-    /** {@return the parameters: every parameter, in the order of the message; not modifiable} */
+    /** {@return the parameters, in the order of the message; not modifiable} */
     public List<HeaderField> parameters() {
         return parameters;
     }
 
-    /**
-     * {@return where the content type begins, with the length that may stand in front of it: bytes
-     * from the start of what was read, counted from 0}
-     */
+    /** {@return where it begins, its length in front included: bytes from the start of what was read} */
     public int offset() {
         return offset;
     }
@@ -99,12 +96,7 @@ public final class ContentType {
         }
     }
 
-    /**
-     * Compares media types and parameters.
-     *
-     * @param other what to compare with
-     * @return true for a content type that says the same, however it is written
-     */
+    /** {@return whether it is a content type that says the same, however it is written} */
     @Override
     public boolean equals(Object other) {
         if (!(other instanceof ContentType)) {
@@ -119,10 +111,7 @@ public final class ContentType {
         return 31 * mediaType.hashCode() + parameters.hashCode();
     }
 
-    /**
-     * {@return the media type and how many parameters there are, which may go to a log: one line of
-     * text}
-     */
+    /** {@return the media type and how many parameters there are, in a line for a log} */
     @Override
     public String toString() {
         return "ContentType{" + Printable.of(mediaType) + ", " + parameters.size() + " parameters}";

@@ -2,6 +2,7 @@ package com.qvomacp.eng.omacp;
 
 import java.nio.charset.StandardCharsets;
 import java.util.Locale;
+import java.util.regex.Pattern;
 
 /**
  * Says what bytes look like that are no provisioning message, for the sentence that refuses them.
@@ -17,6 +18,9 @@ public final class ForeignBytes {
     private static final int CONFIRMED_PUSH = 0x07;
     private static final int LAST_WBXML_VERSION = 0x03;
     private static final int SHORTEST_BASE64 = 16;
+    private static final Pattern BLANKS = Pattern.compile("\\s+");
+    private static final Pattern HEXADECIMAL = Pattern.compile("[0-9A-Fa-f]+");
+    private static final Pattern BASE64 = Pattern.compile("[0-9A-Za-z+/=_-]+");
     private static final char BYTE_ORDER_MARK = '\uFEFF';
     private static final int LONGEST_LOOK = 4096;
 
@@ -253,25 +257,13 @@ public final class ForeignBytes {
     }
 
     private static String encoded(String content) {
-        int digits = 0;
-        int letters = 0;
-        int others = 0;
-        for (int i = 0; i < content.length(); ++i) {
-            char c = content.charAt(i);
-            if (c < 0x80 && Character.digit(c, 16) >= 0) {
-                ++digits;
-            } else if (c >= 'A' && c <= 'Z' || c >= 'a' && c <= 'z' || "+/=-_".indexOf(c) >= 0) {
-                ++letters;
-            } else if (!Character.isWhitespace(c)) {
-                ++others;
-            }
-        }
-        if (letters == 0 && others == 0) {
-            return digits % 2 == 0
+        String packed = BLANKS.matcher(content).replaceAll("");
+        if (HEXADECIMAL.matcher(packed).matches()) {
+            return packed.length() % 2 == 0
                     ? "hexadecimal text"
-                    : "hexadecimal text with an odd number of digits, " + digits;
+                    : "hexadecimal text with an odd number of digits, " + packed.length();
         }
-        boolean isLong = digits + letters >= SHORTEST_BASE64;
-        return isLong && others == 0 && content.indexOf(' ') < 0 ? "base64 text" : "text";
+        boolean isLong = packed.length() >= SHORTEST_BASE64 && content.indexOf(' ') < 0;
+        return isLong && BASE64.matcher(packed).matches() ? "base64 text" : "text";
     }
 }

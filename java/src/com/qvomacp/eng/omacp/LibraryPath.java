@@ -34,11 +34,11 @@ final class LibraryPath extends LibraryTrace {
 
     /** Counts a characteristic that stands in front of one of those around, of the same type. */
     @Override
-    void characteristic(int depth, int start, LibraryKind kind, String type) {
+    void characteristic(LibraryWalk walk, int depth, int start, LibraryKind kind) {
         if (depth < numbers.length
                 && start < ended.starts[depth]
                 && (depth == 0 || start > ended.starts[depth - 1])
-                && typeText(type).equals(type(depth))) {
+                && typeText(kind == null ? walk.nameText() : kind.type).equals(type(depth))) {
             ++numbers[depth];
         }
     }
@@ -56,16 +56,6 @@ final class LibraryPath extends LibraryTrace {
         return typeText(ended.isTyped ? ended.nameText() : null);
     }
 
-    private String parm() {
-        String name = null;
-        if (ended.parmToken == LibraryWalk.NAME_AS_TEXT) {
-            name = ended.nameText();
-        } else if (ended.parmToken >= 0) {
-            name = ended.kinds[ended.depth - 1].parm(ended.parmToken);
-        }
-        return name == null || name.isEmpty() ? Element.PARM.text : Printable.of(name);
-    }
-
     private String text() {
         StringBuilder path = new StringBuilder();
         int steps = 1 + ended.depth + (ended.inParm ? 1 : 0);
@@ -80,7 +70,9 @@ final class LibraryPath extends LibraryTrace {
             } else if (step <= ended.depth) {
                 path.append(type(step - 1)).append(' ').append(numbers[step - 1] + 1);
             } else {
-                path.append(parm());
+                String name = ended.parmName();
+                boolean isNamed = name != null && !name.isEmpty();
+                path.append(isNamed ? Printable.of(name) : Element.PARM.text);
             }
         }
         return path.toString();

@@ -38,7 +38,7 @@ final class LibraryRules {
 
     /** The same of a body, in which the document begins so many bytes from its start. */
     private static Verdict verdictOn(byte[] body, ProvisioningDocument document, int shift) {
-        LibraryWalk walk = new LibraryWalk(body, null);
+        LibraryWalk walk = new LibraryWalk(body, LibraryTrace.NONE);
         Refusal refusal = null;
         int code = 0;
         try {

@@ -32,73 +32,36 @@ final class LibraryStop extends Exception {
 
     /** Why the walk ends. */
     enum Cause {
-        EMPTY_BODY,
-        DOCUMENT_TYPE,
-        ENDED,
-        MISPLACED,
-        NO_SUCH_PAGE,
-        NO_SUCH_STRING,
-        OPAQUE_TOO_LONG,
-        OPAQUE_WITHOUT_LENGTH,
-        EMPTY_NAME,
-        UNKNOWN_NAME,
-        TOO_MUCH_TEXT
+        EMPTY_BODY, DOCUMENT_TYPE, ENDED, MISPLACED, NO_SUCH_PAGE, NO_SUCH_STRING, OPAQUE_TOO_LONG,
+        OPAQUE_WITHOUT_LENGTH, EMPTY_NAME, UNKNOWN_NAME, TOO_MUCH_TEXT
     }
 
     /** Where in the grammar it ends, which says what would have been taken. */
     enum Place {
         DOCUMENT(IN_PARM, "cannot begin a document", LibraryStop.DOCUMENT, CHARACTERISTIC),
-        VERSION(
-                IN_ATTRIBUTES,
-                "is no attribute of wap-provisioningdoc",
-                "VERSION (0x45)",
-                "VERSION=1.0 (0x46)"),
+        VERSION(IN_ATTRIBUTES, "is no attribute of wap-provisioningdoc",
+                "VERSION (0x45)", "VERSION=1.0 (0x46)"),
         BEHIND_VERSION(IN_ATTRIBUTES, "cannot stand behind the version", END, STR_I),
-        IN_DOCUMENT(
-                "within wap-provisioningdoc",
-                "cannot stand in wap-provisioningdoc",
-                SWITCH_PAGE,
-                END,
-                STR_I,
-                CHARACTERISTIC),
-        NEXT_CHARACTERISTIC(
-                "behind a characteristic",
-                "cannot stand behind a characteristic",
-                END,
-                STR_I,
-                CHARACTERISTIC),
-        BEHIND_TEXT(
-                "behind a characteristic",
-                "cannot stand behind a characteristic and a text",
-                END,
-                CHARACTERISTIC),
-        TYPE(
-                "within the attributes of a characteristic",
-                "is no TYPE of a characteristic",
-                SWITCH_PAGE,
-                END),
+        IN_DOCUMENT("within wap-provisioningdoc", "cannot stand in wap-provisioningdoc",
+                SWITCH_PAGE, END, STR_I, CHARACTERISTIC),
+        NEXT_CHARACTERISTIC("behind a characteristic", "cannot stand behind a characteristic",
+                END, STR_I, CHARACTERISTIC),
+        BEHIND_TEXT("behind a characteristic", "cannot stand behind a characteristic and a text",
+                END, CHARACTERISTIC),
+        TYPE("within the attributes of a characteristic", "is no TYPE of a characteristic",
+                SWITCH_PAGE, END),
         IN_CHARACTERISTIC("within", "cannot stand in", SWITCH_PAGE, END, STR_I),
         PARM(IN_PARM, "is no parameter of", SWITCH_PAGE, END),
-        MASKED_NAME(
-                IN_PARM, "is not found behind a SWITCH_PAGE, being above 0x3F", SWITCH_PAGE, END),
-        BEHIND_NAME(
-                "behind the name of a parameter",
-                "cannot stand behind the name of a parameter",
-                SWITCH_PAGE,
-                END,
-                LibraryStop.VALUE),
+        MASKED_NAME(IN_PARM, "is not found behind a SWITCH_PAGE, being above 0x3F",
+                SWITCH_PAGE, END),
+        BEHIND_NAME("behind the name of a parameter", "cannot stand behind the name of a parameter",
+                SWITCH_PAGE, END, LibraryStop.VALUE),
         VALUE_START(IN_PARM, "stands in place of VALUE", LibraryStop.VALUE),
-        VALUE(
-                "in front of a value",
-                NOT_IN_STRING,
-                STR_I,
-                STR_T,
-                "OPAQUE (0xC3)",
-                "a value token"),
-        IN_VALUE(
-                IN_A_VALUE, NOT_IN_STRING, END, STR_I, LibraryStop.VALUE, STR_T, TOKEN_WITH_TEXT),
-        IN_SKIPPED(
-                "before the END up to which an unknown value is skipped", NOT_IN_STRING, END),
+        VALUE("in front of a value", NOT_IN_STRING,
+                STR_I, STR_T, "OPAQUE (0xC3)", "a value token"),
+        IN_VALUE(IN_A_VALUE, NOT_IN_STRING,
+                END, STR_I, LibraryStop.VALUE, STR_T, TOKEN_WITH_TEXT),
+        IN_SKIPPED("before the END up to which an unknown value is skipped", NOT_IN_STRING, END),
         COMMA_VALUE(IN_A_VALUE, NOT_IN_STRING, STR_I, STR_T, TOKEN_WITH_TEXT);
 
         /** Where a body ends that ends here. */

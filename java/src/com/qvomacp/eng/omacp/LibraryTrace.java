@@ -1,22 +1,24 @@
 package com.qvomacp.eng.omacp;
 
 /** Hears of the elements that a {@link LibraryWalk} reads, in the order of the body. */
-abstract class LibraryTrace {
+class LibraryTrace {
+    /** Hears nothing. */
+    static final LibraryTrace NONE = new LibraryTrace();
+
     /**
      * The attributes of a characteristic have been read.
      *
      * @param depth how many characteristics it stands in
      * @param start where it begins
      * @param kind null when its type is none that the library knows
-     * @param type as the message names it; null when there is none
      */
-    abstract void characteristic(int depth, int start, LibraryKind kind, String type);
+    void characteristic(LibraryWalk walk, int depth, int start, LibraryKind kind) {}
 
     /** A parm begins. */
     void parm(int start) {}
 
-    /** The name of a parameter is known; null when it is none that the library knows. */
-    void name(String name) {}
+    /** The name of a parameter has been read. */
+    void name(LibraryWalk walk) {}
 
     /** The value of a parameter has been read. */
     void value(int end) {}

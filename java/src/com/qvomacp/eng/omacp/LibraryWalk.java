@@ -10,7 +10,7 @@ import java.util.Arrays;
  * ends. It costs no stack, however deep the elements nest.
  */
 final class LibraryWalk extends LibraryText {
-    static final int NAME_AS_TEXT = 0x05;
+    private static final int NAME_AS_TEXT = 0x05;
     static final String DOCUMENT_TYPE = "-//WAPFORUM//DTD PROV 1.0//EN";
 
     private static final int LITERAL = 0x04;
@@ -59,12 +59,6 @@ final class LibraryWalk extends LibraryText {
     /** How long the text of the innermost characteristic is that commas go on with; -1 for none. */
     private long continuedLength;
 
-    /**
-     * Begins a walk.
-     *
-     * @param data the body
-     * @param trace may be null
-     */
     LibraryWalk(byte[] data, LibraryTrace trace) {
         super(data);
         this.trace = trace;
@@ -229,7 +223,8 @@ final class LibraryWalk extends LibraryText {
                     isOpen = false;
                     continue;
                 }
-                leave();
+                --depth;
+                trace.end(at);
             }
             isOpen = !hasNext();
             if (isOpen && depth == 0) {
@@ -254,10 +249,9 @@ final class LibraryWalk extends LibraryText {
         int start = at;
         int tag = element(TAG_CHARACTERISTIC, Place.NEXT_CHARACTERISTIC);
         if ((tag & HAS_CONTENT) == 0) {
-            if (trace != null) {
-                trace.characteristic(depth, start, null, null);
-                trace.end(at);
-            }
+            nameLength = -1;
+            trace.characteristic(this, depth, start, null);
+            trace.end(at);
             return false;
         }
         if (depth == starts.length) {
@@ -272,17 +266,8 @@ final class LibraryWalk extends LibraryText {
         isTyped = true;
         kinds[depth - 1] = kind;
         continuedLength = -1;
-        if (trace != null) {
-            trace.characteristic(depth - 1, start, kind, kind == null ? nameText() : kind.type);
-        }
+        trace.characteristic(this, depth - 1, start, kind);
         return true;
-    }
-
-    private void leave() {
-        --depth;
-        if (trace != null) {
-            trace.end(at);
-        }
     }
 
     /** Reads the attributes of a characteristic; whatever comes last is its type. */
@@ -345,25 +330,21 @@ final class LibraryWalk extends LibraryText {
         inParm = true;
         parmToken = -1;
         element(TAG_PARM, Place.IN_CHARACTERISTIC);
-        if (trace != null) {
-            trace.parm(start);
-        }
+        trace.parm(start);
         for (; ; ) {
             int token = peek(Place.PARM);
             while (token == SWITCH_PAGE) {
                 switchPage();
                 token = kind.readsTokenAfresh() ? peek(Place.PARM) : peekTag(Place.PARM);
             }
-            if (trace == null && takePlain(kind, token)) {
+            if (trace == LibraryTrace.NONE && takePlain(kind, token)) {
                 inParm = false;
                 return;
             }
             if (token == END) {
                 ++at;
                 inParm = false;
-                if (trace != null) {
-                    trace.end(at);
-                }
+                trace.end(at);
                 return;
             }
             parameter(kind, token);
@@ -428,9 +409,7 @@ final class LibraryWalk extends LibraryText {
     private void pair(LibraryKind kind, int token) throws LibraryStop {
         expect(token, Place.MASKED_NAME);
         parmToken = token;
-        if (trace != null) {
-            trace.name(kind.parm(token));
-        }
+        trace.name(this);
         int next = peek(Place.BEHIND_NAME);
         if (next == SWITCH_PAGE) {
             switchPage();
@@ -452,10 +431,18 @@ final class LibraryWalk extends LibraryText {
         }
         if (next != END) {
             content();
-            if (trace != null && held) {
+            if (held) {
                 trace.value(at);
             }
         }
+    }
+
+    /** The name of the parameter that is read; null for one that the library does not know. */
+    String parmName() {
+        if (parmToken == NAME_AS_TEXT) {
+            return nameText();
+        }
+        return parmToken < 0 ? null : kinds[depth - 1].parm(parmToken);
     }
 
     /** Reads pairs up to END, each onto the text of the one before it. */
@@ -489,12 +476,11 @@ final class LibraryWalk extends LibraryText {
         if (nameLength <= 0 && !kind.takesEmptyName()) {
             throw new LibraryStop(LibraryStop.FAILED, Cause.EMPTY_NAME, Place.PARM, start);
         }
-        if (trace != null) {
-            trace.name(nameText());
-        }
+        trace.name(this);
         if (peek(Place.BEHIND_NAME) == VALUE) {
             if (!kind.takesName(name, keptLength())) {
-                throw new LibraryStop(LibraryStop.UNKNOWN_ELEMENT, Cause.UNKNOWN_NAME, Place.PARM, at);
+                throw new LibraryStop(
+                        LibraryStop.UNKNOWN_ELEMENT, Cause.UNKNOWN_NAME, Place.PARM, at);
             }
             newText();
             value();
@@ -522,8 +508,6 @@ final class LibraryWalk extends LibraryText {
             checkLimit(Place.COMMA_VALUE, start);
         }
         continuedLength = held ? length : -1;
-        if (trace != null) {
-            trace.value(at);
-        }
+        trace.value(at);
     }
 }

@@ -80,18 +80,14 @@ public final class Verdict {
     }
 
     /**
-     * {@return the result code of the library's decoder: the code, such as 4101; 0 for a body that
-     * is taken, and for one that can be decoded and holds no document; 0 too when the header is
-     * refused, for which there is no code}
+     * {@return the result code of the library's decoder, such as 4101; 0 for a body that it can
+     * decode, with a document or without, and when the header is refused}
      */
     public int code() {
         return code;
     }
 
-    /**
-     * {@return the name of the result code: such as {@code QVS_ERROR_WBXML_UNKNOWN_ELEMENT}; never
-     * {@code null}}
-     */
+    /** {@return the name of the result code, such as {@code QVS_ERROR_WBXML_UNKNOWN_ELEMENT}} */
     public String codeName() {
         switch (code) {
             case 0:
@@ -119,54 +115,44 @@ public final class Verdict {
     }
 
     /**
-     * {@return where what is refused stands: in the body, or in the message when the header is
-     * refused: bytes from its start, counted from 0; -1 when the message is accepted}
+     * {@return where what is refused stands: bytes from the start of the body, or of the message
+     * when the header is refused, counted from 0; -1 when the message is accepted}
      */
     public int offset() {
         return refusal == null ? -1 : refusal.offset;
     }
 
     /**
-     * {@return in which element what is refused stands, as {@link Deviation#path} does: the path;
-     * {@code null} when the message is accepted or the header is refused}
+     * {@return in which element what is refused stands, as {@link Deviation#path} tells it; {@code
+     * null} when the message is accepted or the header is refused}
      */
     public String path() {
         return refusal == null ? null : refusal.path;
     }
 
-    /**
-     * {@return what stands there: such as {@code SWITCH_PAGE (0x00)}; {@code null} when the message
-     * is accepted}
-     */
+    /** {@return what stands there, such as {@code SWITCH_PAGE (0x00)}; {@code null} if accepted} */
     public String found() {
         return refusal == null ? null : refusal.found;
     }
 
-    /**
-     * {@return what would have been taken there: what would have been taken, in the order of the
-     * tokens; not modifiable, empty when the message is accepted and when nothing would have been}
-     */
+    /** {@return what would have been taken there, in the order of the tokens; not modifiable} */
     public List<String> expected() {
         return refusal == null ? Collections.<String>emptyList() : refusal.expected;
     }
 
-    /**
-     * {@return why the message is refused: a sentence without a full stop; {@code null} when the
-     * message is accepted}
-     */
+    /** {@return why it is refused, a sentence without a full stop; {@code null} if accepted} */
     public String reason() {
         return refusal == null ? null : refusal.reason;
     }
 
     /**
-     * {@return the items that the library skips or reads as something else, up to where it ends:
-     * the items of the document, in its order; not modifiable}
+     * {@return the items of the document that the library skips or reads as something else, up to
+     * where it ends, in the order of the document; not modifiable}
      */
     public List<Item> readOtherwise() {
-        if (body == null || document == null) {
-            return Collections.emptyList();
-        }
-        return Collections.unmodifiableList(ReadOtherwise.of(body, document, shift));
+        return body == null || document == null
+                ? Collections.<Item>emptyList()
+                : Collections.unmodifiableList(ReadOtherwise.of(body, document, shift));
     }
 
     @Override
@@ -191,20 +177,14 @@ public final class Verdict {
         return 31 * (31 * (31 * code + bytesRead) + offset()) + Objects.hashCode(reason());
     }
 
-    /**
-     * {@return the verdict in one line, which may go to a log: the code and where and why the
-     * message is refused}
-     */
+    /** {@return code, place and reason of a refusal, in a line for a log} */
     @Override
     public String toString() {
         if (isAccepted()) {
             return "accepted";
         }
-        return "refused: "
-                + reason()
-                + (body == null ? "" : ", " + code + " " + codeName())
-                + ", offset "
-                + offset()
-                + (path() == null ? "" : ", " + path());
+        String result = body == null ? "" : ", " + code + " " + codeName();
+        String where = path() == null ? "" : ", " + path();
+        return "refused: " + reason() + result + ", offset " + offset() + where;
     }
 }
