@@ -58,7 +58,7 @@ public final class ContentType {
         return parameters;
     }
 
-    /** {@return where it begins, its length in front included: bytes from the start of what was read} */
+    /** {@return where it begins, with its length in front: bytes from the start of what was read} */
     public int offset() {
         return offset;
     }

@@ -6,9 +6,9 @@ import java.util.Collections;
 import java.util.List;
 
 /**
- * What the native library makes of a push header: PDU type, length, content type, SEC and MAC, which
- * it knows in a few forms only. The length of the headers bounds none of these, it only finds the
- * body.
+ * What the native library makes of a push header: PDU type, length, content type, SEC and MAC,
+ * which it knows in a few forms only. The length of the headers bounds none of these, it only finds
+ * the body.
  */
 final class LibraryHeader {
     private static final int PDU_TYPE = 1;
@@ -23,7 +23,7 @@ final class LibraryHeader {
     private static final int NAME_LENGTH = 3;
     private static final int LONGEST_MAC = 43;
 
-    /** The content types that it knows, as a short code, with or without its high bit, and by name. */
+    /** The content types that it knows, by number, with or without its high bit, and by name. */
     private static final int[] CODES = {0x36, 0x35, 0x44, 0x4E, 0x42};
 
     private static final String[] MEDIA_TYPES = {

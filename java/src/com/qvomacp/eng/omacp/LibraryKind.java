@@ -54,23 +54,15 @@ enum LibraryKind {
     /** The TYPE whose name follows as text. */
     static final int TYPE_AS_TEXT = 0x50;
 
-    /** How a parameter is read, by {@link #shapes}. */
-    static final byte UNKNOWN = 0;
+    // How a parameter is read, by `shapes`.
 
+    static final byte UNKNOWN = 0;
     static final byte TEXT = 1;
     static final byte LIST = 2;
-
-    /** A list that is left out when it cannot be read. */
-    static final byte OPTIONAL_LIST = 3;
-
-    /** A text that commas go on with. */
-    static final byte CONTINUED_TEXT = 4;
-
-    /** The name is given as text. */
-    static final byte NAMED = 5;
-
-    /** One more value of the text that goes on. */
-    static final byte COMMA = 6;
+    static final byte OPTIONAL_LIST = 3; // left out when it cannot be read
+    static final byte CONTINUED_TEXT = 4; // commas go on with it
+    static final byte NAMED = 5; // the name is given as text
+    static final byte COMMA = 6; // one more value of the text that goes on
 
     private static final String MARKS = "*?+";
     private static final int LAST_TYPE = 0x5B;

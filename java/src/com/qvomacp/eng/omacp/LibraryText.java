@@ -33,7 +33,7 @@ abstract class LibraryText {
 
     private static final char OUT_OF_SIGHT = '-';
 
-    /** The value tokens that have a text: {@code ,} stands in front of one that joins by a comma. */
+    /** The value tokens that have a text, with a comma in front of one that joins by it. */
     private static final byte[][] VALUE_TEXTS =
             values(
                     "85=IPV4 86=IPV6 87=E164 88=ALPHA 89=APN 8A=SCODE 8B=TETRA-ITSI 8C=MAN"
@@ -248,7 +248,7 @@ abstract class LibraryText {
         at = Math.min(nul + 1, size);
     }
 
-    /** An empty table answers its own two zero bytes. Behind one that is cut off nothing is read. */
+    /** An empty table has two zero bytes of its own. Of one that is cut off no more is read. */
     private void tableReference(int tokenAt) throws LibraryStop {
         long index = integer();
         long readable = unreadItem != null ? 0 : tableLength == 0 ? 2 : tablePresent;

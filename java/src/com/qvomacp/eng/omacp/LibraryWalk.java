@@ -214,7 +214,7 @@ final class LibraryWalk extends LibraryText {
 
     // ---- Characteristics
 
-    /** Reads a run of characteristics with all that is nested in them, up to an END, which stays. */
+    /** Reads a run of characteristics with all that is nested in them, up to an END. */
     private void characteristics() throws LibraryStop {
         boolean isOpen = false;
         for (; ; ) {

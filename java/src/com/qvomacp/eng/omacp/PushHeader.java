@@ -132,7 +132,7 @@ public final class PushHeader {
         return mac == null ? -1 : mac.offset();
     }
 
-    /** {@return the headers behind the content type, in the order of the message; not modifiable} */
+    /** {@return the headers behind the content type, in their order; not modifiable} */
     public List<HeaderField> fields() {
         return fields;
     }
