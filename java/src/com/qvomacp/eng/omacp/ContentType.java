@@ -1,5 +1,6 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Collections;
 import java.util.List;
 
 /**
@@ -33,7 +34,7 @@ public final class ContentType {
         this.mediaTypeOffset = mediaTypeOffset;
         this.mediaTypeEnd = mediaTypeEnd;
         this.end = end;
-        this.parameters = parameters;
+        this.parameters = Collections.unmodifiableList(parameters);
     }
 
     /**
@@ -52,15 +53,12 @@ public final class ContentType {
         return code;
     }
 
-    /** {@return the parameters: every parameter, in the order of the message; not modifiable} */
+    /** {@return the parameters, in the order of the message; not modifiable} */
     public List<HeaderField> parameters() {
         return parameters;
     }
 
-    /**
-     * {@return where the content type begins, with the length that may stand in front of it: bytes
-     * from the start of what was read, counted from 0}
-     */
+    /** {@return where it begins, with its length in front: bytes from the start of what was read} */
     public int offset() {
         return offset;
     }
@@ -81,11 +79,8 @@ public final class ContentType {
             visitor.visit(offset, mediaTypeOffset - offset, 0, "length of the content type");
             depth = 1;
         }
-        visitor.visit(
-                mediaTypeOffset,
-                mediaTypeEnd - mediaTypeOffset,
-                depth,
-                "content type: " + mediaType);
+        int length = mediaTypeEnd - mediaTypeOffset;
+        visitor.visit(mediaTypeOffset, length, depth, "content type: " + mediaType);
         int at = mediaTypeEnd;
         for (HeaderField parameter : parameters) {
             describeGap(visitor, at, parameter.offset());
@@ -101,12 +96,7 @@ public final class ContentType {
         }
     }
 
-    /**
-     * Compares media types and parameters.
-     *
-     * @param other what to compare with
-     * @return true for a content type that says the same, however it is written
-     */
+    /** {@return whether it is a content type that says the same, however it is written} */
     @Override
     public boolean equals(Object other) {
         if (!(other instanceof ContentType)) {
@@ -121,10 +111,7 @@ public final class ContentType {
         return 31 * mediaType.hashCode() + parameters.hashCode();
     }
 
-    /**
-     * {@return the media type and how many parameters there are, which may go to a log: one line of
-     * text}
-     */
+    /** {@return the media type and how many parameters there are, in a line for a log} */
     @Override
     public String toString() {
         return "ContentType{" + Printable.of(mediaType) + ", " + parameters.size() + " parameters}";

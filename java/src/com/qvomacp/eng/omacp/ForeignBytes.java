@@ -2,6 +2,7 @@ package com.qvomacp.eng.omacp;
 
 import java.nio.charset.StandardCharsets;
 import java.util.Locale;
+import java.util.regex.Pattern;
 
 /**
  * Says what bytes look like that are no provisioning message, for the sentence that refuses them.
@@ -16,87 +17,60 @@ public final class ForeignBytes {
     private static final int PUSH = 0x06;
     private static final int CONFIRMED_PUSH = 0x07;
     private static final int LAST_WBXML_VERSION = 0x03;
-    private static final int PROVISIONING = 0x0B;
     private static final int SHORTEST_BASE64 = 16;
+    private static final Pattern BLANKS = Pattern.compile("\\s+");
+    private static final Pattern HEXADECIMAL = Pattern.compile("[0-9A-Fa-f]+");
+    private static final Pattern BASE64 = Pattern.compile("[0-9A-Za-z+/=_-]+");
     private static final char BYTE_ORDER_MARK = '\uFEFF';
     private static final int LONGEST_LOOK = 4096;
 
-    /** Document types of WBXML, by their public identifiers. */
-    private static final Object[][] DOCUMENTS = {
-        {0x02, "WML 1.0"},
-        {0x03, "WTA 1.0"},
-        {0x04, "WML 1.1"},
-        {0x05, "a service indication (SI 1.0)"},
-        {0x06, "a service loading (SL 1.0)"},
-        {0x07, "a cache operation (CO 1.0)"},
-        {0x08, "a channel (CHANNEL 1.1)"},
-        {0x09, "WML 1.2"},
-        {0x0A, "WML 1.3"},
-        {PROVISIONING, "a provisioning document (PROV 1.0)"},
-        {0x0C, "WTA-WML 1.2"},
-        {0x0D, "an e-mail notification (EMN 1.0)"},
-        {0x0E, "DRM rights (DRMREL 1.0)"},
-        {0x0F, "instant messaging (CSP 1.0)"},
-        {0x10, "instant messaging (CSP 1.1)"},
-        {0x11, "instant messaging (CSP 1.2)"},
-        {0x12, "instant messaging (CSP 1.3)"},
-        {0x13, "DRM (DRM 2.1)"},
-        {0xFD1, "SyncML 1.0"},
-        {0xFD2, "device information (DevInf 1.0)"},
-        {0xFD3, "SyncML 1.1, as of synchronisation or device management"},
-        {0xFD4, "device information (DevInf 1.1)"},
-        {0x1201, "SyncML 1.2, as of synchronisation or device management"},
-        {0x1202, "meta information (MetInf 1.2)"},
-        {0x1203, "device information (DevInf 1.2)"},
+    /** What is in WBXML under a public identifier. */
+    private static final Object[] DOCUMENTS = {
+        0x02, "WML 1.0", 0x03, "WTA 1.0", 0x04, "WML 1.1",
+        0x05, "a service indication (SI 1.0)", 0x06, "a service loading (SL 1.0)",
+        0x07, "a cache operation (CO 1.0)", 0x08, "a channel (CHANNEL 1.1)",
+        0x09, "WML 1.2", 0x0A, "WML 1.3", 0x0B, "a provisioning document (PROV 1.0)",
+        0x0C, "WTA-WML 1.2", 0x0D, "an e-mail notification (EMN 1.0)",
+        0x0E, "DRM rights (DRMREL 1.0)", 0x0F, "instant messaging (CSP 1.0)",
+        0x10, "instant messaging (CSP 1.1)", 0x11, "instant messaging (CSP 1.2)",
+        0x12, "instant messaging (CSP 1.3)", 0x13, "DRM (DRM 2.1)",
+        0xFD1, "SyncML 1.0", 0xFD2, "device information (DevInf 1.0)",
+        0xFD3, "SyncML 1.1, as of synchronisation or device management",
+        0xFD4, "device information (DevInf 1.1)",
+        0x1201, "SyncML 1.2, as of synchronisation or device management",
+        0x1202, "meta information (MetInf 1.2)", 0x1203, "device information (DevInf 1.2)",
     };
 
-    /** What is pushed under a media type. */
-    private static final String[][] PUSHED = {
-        {"text/vnd.wap.si", "a service indication in XML"},
-        {"application/vnd.wap.sic", "a service indication"},
-        {"text/vnd.wap.sl", "a service loading in XML"},
-        {"application/vnd.wap.slc", "a service loading"},
-        {"text/vnd.wap.co", "a cache operation in XML"},
-        {"application/vnd.wap.coc", "a cache operation"},
-        {"application/vnd.wap.sia", "a session initiation"},
-        {"application/vnd.wap.mms-message", "an MMS notification"},
-        {"text/vnd.wap.emn+xml", "an e-mail notification in XML"},
-        {"application/vnd.wap.emn+wbxml", "an e-mail notification"},
-        {"text/vnd.wap.connectivity-xml", "a provisioning document in XML"},
-        {"application/vnd.wap.connectivity-xml", "a provisioning document in XML"},
-        {"application/vnd.wap.connectivity-wbxml", "a provisioning document"},
-        {"application/vnd.syncml.dm+wbxml", "a device management message"},
-        {"application/vnd.syncml.dm+xml", "a device management message in XML"},
-        {"application/vnd.syncml.notification", "a device management notification"},
-        {"application/vnd.syncml.ds.notification", "a synchronisation notification"},
-        {"application/vnd.oma.drm.message", "a DRM message"},
-        {"application/vnd.oma.drm.rights+xml", "DRM rights in XML"},
-        {"application/vnd.oma.drm.rights+wbxml", "DRM rights"},
-        {"application/vnd.omaloc-supl-init", "a location request (SUPL)"},
+    /** What is pushed under the number of a media type. */
+    private static final Object[] PUSHED = {
+        0x2D, "a service indication in XML", 0x2E, "a service indication",
+        0x2F, "a service loading in XML", 0x30, "a service loading",
+        0x31, "a cache operation in XML", 0x32, "a cache operation",
+        0x34, "a session initiation", 0x35, "a provisioning document in XML",
+        0x36, "a provisioning document", 0x3E, "an MMS notification",
+        0x42, "a device management message", 0x43, "a device management message in XML",
+        0x44, "a device management notification", 0x48, "a DRM message",
+        0x4A, "DRM rights in XML", 0x4B, "DRM rights", 0x4E, "a synchronisation notification",
+        0x304, "an e-mail notification in XML", 0x30A, "an e-mail notification",
+        0x312, "a location request (SUPL)",
     };
 
     /** How XML begins, by the names of its document elements. */
-    private static final String[][] ELEMENTS = {
-        {"wap-provisioningdoc", "a provisioning document in XML, which is not encoded yet"},
-        {"si", "a service indication in XML"},
-        {"sl", "a service loading in XML"},
-        {"co", "a cache operation in XML"},
-        {"emn", "an e-mail notification in XML"},
-        {"SyncML", "SyncML in XML"},
-        {"html", "a page in HTML"},
+    private static final String[] ELEMENTS = {
+        "wap-provisioningdoc", "a provisioning document in XML, which is not encoded yet",
+        "si", "a service indication in XML", "sl", "a service loading in XML",
+        "co", "a cache operation in XML", "emn", "an e-mail notification in XML",
+        "syncml", "SyncML in XML", "html", "a page in HTML",
     };
 
     /** How files of other kinds begin. */
-    private static final String[][] FILES = {
-        {"\u008C\u0082", "an MMS notification"},
-        {"\u00D4\u00C3\u00B2\u00A1", "a capture of packets (pcap)"},
-        {"\u00A1\u00B2\u00C3\u00D4", "a capture of packets (pcap)"},
-        {"\n\r\r\n", "a capture of packets (pcapng)"},
-        {"PK\u0003\u0004", "a ZIP archive"},
-        {"\u001F\u008B", "data compressed by gzip"},
-        {"\u0089PNG", "a picture (PNG)"},
-        {"\u00FF\u00D8\u00FF", "a picture (JPEG)"},
-        {"%PDF", "a PDF document"},
+    private static final String[] FILES = {
+        "\u008C\u0082", "an MMS notification",
+        "\u00D4\u00C3\u00B2\u00A1", "a capture of packets (pcap)",
+        "\u00A1\u00B2\u00C3\u00D4", "a capture of packets (pcap)",
+        "\n\r\r\n", "a capture of packets (pcapng)", "PK\u0003\u0004", "a ZIP archive",
+        "\u001F\u008B", "data compressed by gzip", "\u0089PNG", "a picture (PNG)",
+        "\u00FF\u00D8\u00FF", "a picture (JPEG)", "%PDF", "a PDF document",
     };
 
     private ForeignBytes() {}
@@ -118,20 +92,16 @@ public final class ForeignBytes {
             return text(text);
         }
         String name = push(bytes);
-        if (name == null) {
-            name = sms(bytes);
-        }
-        if (name == null) {
-            name = wbxml(bytes);
-        }
+        name = name != null ? name : sms(bytes);
+        name = name != null ? name : wbxml(bytes);
         return name != null ? name : file(bytes);
     }
 
-    /** The name of a document type by its public identifier; null for one that is not known. */
-    static String document(long publicIdentifier) {
-        for (Object[] row : DOCUMENTS) {
-            if ((Integer) row[0] == publicIdentifier) {
-                return (String) row[1];
+    /** What a row of a number tells; null without such a row. */
+    private static String told(Object[] rows, long number) {
+        for (int i = 0; i < rows.length; i += 2) {
+            if ((Integer) rows[i] == number) {
+                return (String) rows[i + 1];
             }
         }
         return null;
@@ -142,40 +112,31 @@ public final class ForeignBytes {
         if (type != PUSH && type != CONFIRMED_PUSH) {
             return null;
         }
-        String mediaType;
+        ContentType content;
         try {
             byte[] push = bytes.clone();
             push[1] = PUSH;
-            mediaType = PushHeader.parse(push).contentType().mediaType();
+            content = PushHeader.parse(push).contentType();
         } catch (ProvisioningException none) {
             return null;
         }
+        String mediaType = content.mediaType();
         if (mediaType.indexOf('/') < 0) {
             return null;
         }
-        String pushed = value(PUSHED, mediaType);
+        // A name that no standard has, and senders use.
+        boolean isNamed = mediaType.equals("application/vnd.wap.connectivity-xml");
+        String pushed = told(PUSHED, isNamed ? 0x35 : content.code());
         return (type == PUSH ? "a push of " : "a confirmed push of ")
                 + (pushed != null ? pushed : "the type " + Printable.of(mediaType));
-    }
-
-    private static String value(String[][] rows, String key) {
-        for (String[] row : rows) {
-            if (row[0].equals(key)) {
-                return row[1];
-            }
-        }
-        return null;
     }
 
     private static String wbxml(byte[] bytes) {
         Cursor cursor = new Cursor(bytes, 0, bytes.length);
         int version = cursor.take();
         long type = cursor.integer();
-        if (version > LAST_WBXML_VERSION || type < 0) {
-            return null;
-        }
-        String name = document(type);
-        if (name == null) {
+        String name = told(DOCUMENTS, type);
+        if (version > LAST_WBXML_VERSION || name == null) {
             return null;
         }
         boolean hasCharset = version == 0 || cursor.integer() >= 0;
@@ -185,13 +146,10 @@ public final class ForeignBytes {
     /** Whether the lengths of a message between handset and network, or of its data, come out. */
     private static String sms(byte[] bytes) {
         int centre = bytes[0];
-        if (centre == 0 || centre > 1 && centre <= 12 && bytes.length > 1 && bytes[1] < 0) {
-            String name = transferUnit(new Cursor(bytes, centre + 1, bytes.length));
-            if (name != null) {
-                return name;
-            }
-        }
-        String name = transferUnit(new Cursor(bytes, 0, bytes.length));
+        boolean isCentre =
+                centre == 0 || centre > 1 && centre <= 12 && bytes.length > 1 && bytes[1] < 0;
+        String name = isCentre ? transferUnit(new Cursor(bytes, centre + 1, bytes.length)) : null;
+        name = name != null ? name : transferUnit(new Cursor(bytes, 0, bytes.length));
         return name == null && isUserData(bytes) ? "the user data of an SMS" : name;
     }
 
@@ -241,9 +199,9 @@ public final class ForeignBytes {
     private static String file(byte[] bytes) {
         int length = Math.min(bytes.length, 8);
         String start = new String(bytes, 0, length, StandardCharsets.ISO_8859_1);
-        for (String[] row : FILES) {
-            if (start.startsWith(row[0])) {
-                return row[1];
+        for (int i = 0; i < FILES.length; i += 2) {
+            if (start.startsWith(FILES[i])) {
+                return FILES[i + 1];
             }
         }
         return null;
@@ -286,40 +244,26 @@ public final class ForeignBytes {
         String lower = start.toLowerCase(Locale.ROOT);
         int found = start.length();
         String name = "XML";
-        for (String[] row : ELEMENTS) {
-            int at = lower.indexOf("<" + row[0].toLowerCase(Locale.ROOT));
-            int after = at + 1 + row[0].length();
+        for (int i = 0; i < ELEMENTS.length; i += 2) {
+            int at = lower.indexOf("<" + ELEMENTS[i]);
+            int after = at + 1 + ELEMENTS[i].length();
             boolean isFirst = at >= 0 && at < found && after < start.length();
             if (isFirst && " \t\r\n>/".indexOf(start.charAt(after)) >= 0) {
                 found = at;
-                name = row[1];
+                name = ELEMENTS[i + 1];
             }
         }
         return name;
     }
 
     private static String encoded(String content) {
-        int digits = 0;
-        int letters = 0;
-        int others = 0;
-        for (int i = 0; i < content.length(); ++i) {
-            char c = content.charAt(i);
-            if (c < 0x80 && Character.digit(c, 16) >= 0) {
-                ++digits;
-            } else if (c >= 'A' && c <= 'Z'
-                    || c >= 'a' && c <= 'z'
-                    || "+/=-_".indexOf(c) >= 0) {
-                ++letters;
-            } else if (!Character.isWhitespace(c)) {
-                ++others;
-            }
-        }
-        if (letters == 0 && others == 0) {
-            return digits % 2 == 0
+        String packed = BLANKS.matcher(content).replaceAll("");
+        if (HEXADECIMAL.matcher(packed).matches()) {
+            return packed.length() % 2 == 0
                     ? "hexadecimal text"
-                    : "hexadecimal text with an odd number of digits, " + digits;
+                    : "hexadecimal text with an odd number of digits, " + packed.length();
         }
-        boolean isLong = digits + letters >= SHORTEST_BASE64;
-        return isLong && others == 0 && content.indexOf(' ') < 0 ? "base64 text" : "text";
+        boolean isLong = packed.length() >= SHORTEST_BASE64 && content.indexOf(' ') < 0;
+        return isLong && BASE64.matcher(packed).matches() ? "base64 text" : "text";
     }
 }

@@ -1,5 +1,7 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Objects;
+
 /**
  * A header of a push, or a parameter of its content type. Immutable.
  *
@@ -54,25 +56,19 @@ public final class HeaderField {
         visitor.visit(offset, length, depth, value == null ? name : name + ": " + value);
     }
 
-    /**
-     * Compares name and value.
-     *
-     * @param other what to compare with
-     * @return true for a field that says the same, wherever it stands and however it is written
-     */
+    /** {@return whether name and value are the same, wherever and however they are written} */
     @Override
     public boolean equals(Object other) {
         if (!(other instanceof HeaderField)) {
             return false;
         }
         HeaderField that = (HeaderField) other;
-        return name.equals(that.name)
-                && (value == null ? that.value == null : value.equals(that.value));
+        return name.equals(that.name) && Objects.equals(value, that.value);
     }
 
     @Override
     public int hashCode() {
-        return 31 * name.hashCode() + (value == null ? 0 : value.hashCode());
+        return 31 * name.hashCode() + Objects.hashCode(value);
     }
 
     /** {@return the name, which may go to a log; the value may be a secret: one line of text} */

@@ -6,10 +6,11 @@ import java.nio.charset.StandardCharsets;
 import java.text.SimpleDateFormat;
 import java.util.ArrayList;
 import java.util.Arrays;
-import java.util.Collections;
 import java.util.Date;
+import java.util.EnumSet;
 import java.util.List;
 import java.util.Locale;
+import java.util.Set;
 import java.util.TimeZone;
 
 /**
@@ -36,8 +37,8 @@ final class HeaderReader {
     private static final int METHODS = 4;
     private static final int FIRST_PAGE = 1;
 
-    /** Content types that the native library takes without their high bit. */
-    private static final int[] BARE_TOKENS = {0x35, 0x36, 0x42, 0x44, 0x4E};
+    private static final Set<Kind> LONG_IN_HEADERS =
+            EnumSet.of(Kind.INTEGER, Kind.DATE, Kind.APPLICATION, Kind.SEC);
 
     private static final String NO_MEDIA_TYPE = "the content type has no media type";
     private static final long LAST_SECOND_OF_9999 = 253402300799L;
@@ -53,11 +54,6 @@ final class HeaderReader {
     /** Whether the length of a value that was read last was more than was left. */
     private boolean isCutOff;
 
-    private final List<HeaderField> parameters = new ArrayList<>(4);
-    private final List<HeaderField> fields = new ArrayList<>(0);
-    private String sec;
-    private String mac;
-    private int macOffset = -1;
 
     private HeaderReader(byte[] bytes, int from, int end) {
         this.bytes = bytes;
@@ -75,12 +71,9 @@ final class HeaderReader {
         }
         if (type != PUSH) {
             String likeness = ForeignBytes.describe(push);
-            throw none(
-                    start.at(),
-                    "the second byte is "
-                            + hexadecimal(type)
-                            + ", and in a push 06"
-                            + (likeness == null ? "" : "; this looks like " + likeness));
+            String second = "the second byte is " + hexadecimal(type) + ", and in a push 06";
+            String look = likeness == null ? "" : "; this looks like " + likeness;
+            throw none(start.at(), second + look);
         }
         start.skip(1);
         long length = start.integer();
@@ -88,9 +81,8 @@ final class HeaderReader {
             throw none(2, "the header length is cut off or too large");
         }
         if (length > start.left()) {
-            throw none(
-                    2,
-                    "the header length is " + length + ", and " + start.left() + " bytes follow");
+            String stated = "the header length is " + length + ", and ";
+            throw none(2, stated + start.left() + " bytes follow");
         }
         int from = start.at();
         return new HeaderReader(push, from, from + (int) length).read(transaction, from);
@@ -107,22 +99,8 @@ final class HeaderReader {
 
     private PushHeader read(int transaction, int from) throws ProvisioningException {
         ContentType contentType = readContentType();
-        readFields();
         return new PushHeader(
-                transaction,
-                from,
-                Arrays.copyOf(bytes, end),
-                contentType,
-                listOf(fields),
-                sec == null ? SecurityMethod.NONE : SecurityMethod.stated(sec),
-                mac,
-                macOffset);
-    }
-
-    private static List<HeaderField> listOf(List<HeaderField> fields) {
-        return fields.isEmpty()
-                ? Collections.<HeaderField>emptyList()
-                : Collections.unmodifiableList(fields);
+                transaction, from, Arrays.copyOf(bytes, end), contentType, readFields());
     }
 
     private void goTo(int at) {
@@ -145,12 +123,14 @@ final class HeaderReader {
         if (first <= 0 || first == LENGTH_QUOTE) {
             throw none(mediaTypeAt, NO_MEDIA_TYPE);
         }
+        List<HeaderField> parameters = new ArrayList<>(4);
         int code;
         String mediaType;
         int mediaTypeEnd;
         if (first >= FIRST_TEXT && first < FIRST_SHORT) {
             String text = text();
-            if (text.indexOf('/') < 0 && isBareToken(first)) {
+            // The native library takes these without their high bit, and senders send them so.
+            if (text.indexOf('/') < 0 && LibraryHeader.isCode(first)) {
                 goTo(mediaTypeAt + 1);
                 text = WspTable.MEDIA_TYPES.name(first);
             }
@@ -163,7 +143,7 @@ final class HeaderReader {
             code = WspTable.MEDIA_TYPES.number(mediaType);
             mediaTypeEnd = nameEnd < 0 ? cursor.at() : textAt + nameEnd;
             if (nameEnd >= 0) {
-                readTextParameters(text, nameEnd);
+                readTextParameters(parameters, text, nameEnd);
             }
         } else {
             long number = integer();
@@ -175,29 +155,14 @@ final class HeaderReader {
             mediaTypeEnd = cursor.at();
         }
         while (cursor.at() < valueEnd) {
-            readParameter();
+            readParameter(parameters);
         }
-        return new ContentType(
-                mediaType,
-                code,
-                from,
-                mediaTypeAt,
-                mediaTypeEnd,
-                cursor.at(),
-                listOf(parameters));
-    }
-
-    private static boolean isBareToken(int octet) {
-        for (int token : BARE_TOKENS) {
-            if (token == octet) {
-                return true;
-            }
-        }
-        return false;
+        int to = cursor.at();
+        return new ContentType(mediaType, code, from, mediaTypeAt, mediaTypeEnd, to, parameters);
     }
 
     /** Reads what a gateway has left as text: {@code ; SEC=1; MAC="..."}. */
-    private void readTextParameters(String text, int firstSemicolon) {
+    private void readTextParameters(List<HeaderField> list, String text, int firstSemicolon) {
         int textAt = this.textAt;
         int from = firstSemicolon;
         while (from < text.length()) {
@@ -208,7 +173,7 @@ final class HeaderReader {
             String name = text.substring(from + 1, hasValue ? equals : to).trim();
             if (!name.isEmpty()) {
                 String value = hasValue ? unquoted(text.substring(equals + 1, to).trim()) : null;
-                add(parameters, name, value, textAt + from, textAt + to);
+                list.add(new HeaderField(name, value, textAt + from, to - from));
             }
             from = to;
         }
@@ -219,7 +184,7 @@ final class HeaderReader {
         return isQuoted ? value.substring(1, value.length() - 1) : value;
     }
 
-    private void readParameter() {
+    private void readParameter(List<HeaderField> list) {
         int at = cursor.at();
         int first = cursor.peek();
         String name;
@@ -237,8 +202,9 @@ final class HeaderReader {
             name = WspTable.PARAMETERS.nameOrDigits((int) number);
             kind = WspTable.PARAMETERS.kind((int) number);
         }
-        String value = kind == Kind.SEC && isBareMethod() ? bareMethod() : parameterValue(kind);
-        add(parameters, name, value, at, cursor.at());
+        boolean isBare = kind == Kind.SEC && isBareMethod();
+        String value = isBare ? SecurityMethod.nameOf(cursor.take()) : value(kind, true);
+        list.add(new HeaderField(name, value, at, cursor.at() - at));
     }
 
     /** Goes on by an octet that begins nothing. */
@@ -250,18 +216,11 @@ final class HeaderReader {
     /** Whether a sender has forgotten the high bit of SEC: the token of MAC follows at once. */
     private boolean isBareMethod() {
         int method = cursor.peek();
-        int at = cursor.at();
-        return method > 0
-                && method < METHODS
-                && cursor.left() > 1
-                && bytes[at + 1] == (byte) (FIRST_SHORT | MAC);
+        return method > 0 && method < METHODS && cursor.peek(1) == (FIRST_SHORT | MAC);
     }
 
-    private String bareMethod() {
-        return number(cursor.take(), Kind.SEC);
-    }
-
-    private void readFields() {
+    private List<HeaderField> readFields() {
+        List<HeaderField> fields = new ArrayList<>(0);
         int page = FIRST_PAGE;
         while (cursor.left() > 0) {
             int first = cursor.peek();
@@ -273,18 +232,20 @@ final class HeaderReader {
                 passOver();
                 page = cursor.take();
             } else {
-                readField(first, page);
+                fields.add(readField(first, page));
             }
         }
+        return fields;
     }
 
-    private void readField(int first, int page) {
+    private HeaderField readField(int first, int page) {
         int at = cursor.at();
         String name;
         Kind kind = Kind.PLAIN;
         if (first < FIRST_SHORT) {
             name = text();
-            kind = WspTable.PARAMETERS.kind(secOrMac(name));
+            int number = WspTable.PARAMETERS.number(name);
+            kind = number == SEC || number == MAC ? WspTable.PARAMETERS.kind(number) : kind;
         } else if (page == FIRST_PAGE) {
             int number = cursor.take() & 0x7F;
             WspTable table = isMisplaced(number) ? WspTable.PARAMETERS : WspTable.HEADERS;
@@ -293,11 +254,8 @@ final class HeaderReader {
         } else {
             name = "0x" + hexadecimal(cursor.take() & 0x7F) + " of code page " + page;
         }
-        add(fields, name, fieldValue(kind), at, cursor.at());
-    }
-
-    private static int secOrMac(String name) {
-        return name.equalsIgnoreCase("SEC") ? SEC : name.equalsIgnoreCase("MAC") ? MAC : -1;
+        String value = value(kind, false);
+        return new HeaderField(name, value, at, cursor.at() - at);
     }
 
     /**
@@ -326,19 +284,8 @@ final class HeaderReader {
         return octet <= 0 && ahead.at() > from + 1;
     }
 
-    private void add(List<HeaderField> list, String name, String value, int from, int to) {
-        list.add(new HeaderField(name, value, from, to - from));
-        int number = secOrMac(name);
-        if (number == SEC && sec == null) {
-            sec = value == null ? "" : value;
-        } else if (number == MAC && mac == null && value != null) {
-            mac = value;
-            macOffset = from;
-        }
-    }
-
-    /** The value of a parameter, null when it has none. */
-    private String parameterValue(Kind kind) {
+    /** A value, null when there is none. Only some headers may have a number of several octets. */
+    private String value(Kind kind, boolean isParameter) {
         if (kind == Kind.QUALITY) {
             return quality();
         }
@@ -348,27 +295,9 @@ final class HeaderReader {
         }
         if (first <= 0) {
             cursor.skip(1);
-            return null;
+            return isParameter || first < 0 ? null : "";
         }
-        return data(kind, kind != Kind.MAC);
-    }
-
-    /** The value of a header. Only some of them may have a number of several octets. */
-    private String fieldValue(Kind kind) {
-        int first = cursor.peek();
-        if (first >= FIRST_TEXT) {
-            return first >= FIRST_SHORT ? shortNumber(kind) : text();
-        }
-        if (first <= 0) {
-            cursor.skip(1);
-            return first < 0 ? null : "";
-        }
-        return data(
-                kind,
-                kind == Kind.INTEGER
-                        || kind == Kind.DATE
-                        || kind == Kind.APPLICATION
-                        || kind == Kind.SEC);
+        return data(kind, isParameter ? kind != Kind.MAC : LONG_IN_HEADERS.contains(kind));
     }
 
     private String shortNumber(Kind kind) {
@@ -389,13 +318,13 @@ final class HeaderReader {
         long number = 0;
         for (int at = from; at < from + length; ++at) {
             if (number >> 55 != 0) {
-                return hexadecimal(from, length);
+                return hexadecimal(bytes, from, length);
             }
             number = number << 8 | bytes[at] & 0xFF;
         }
         return isLong && mayBeNumber && !isCutOff
                 ? number(number, kind)
-                : hexadecimal(from, length);
+                : hexadecimal(bytes, from, length);
     }
 
     private static String number(long number, Kind kind) {
@@ -495,7 +424,8 @@ final class HeaderReader {
         return isCutOff ? cursor.left() : (int) length;
     }
 
-    private String hexadecimal(int from, int length) {
+    /** Bytes in capital hexadecimal digits. */
+    static String hexadecimal(byte[] bytes, int from, int length) {
         StringBuilder text = new StringBuilder(2 * length);
         for (int at = from; at < from + length; ++at) {
             text.append(DIGITS[bytes[at] >> 4 & 0xF]).append(DIGITS[bytes[at] & 0xF]);
@@ -503,7 +433,7 @@ final class HeaderReader {
         return text.toString();
     }
 
-    static String hexadecimal(int octet) {
+    private static String hexadecimal(int octet) {
         return "" + DIGITS[octet >> 4 & 0xF] + DIGITS[octet & 0xF];
     }
 }

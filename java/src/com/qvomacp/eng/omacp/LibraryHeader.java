@@ -4,12 +4,11 @@ import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
 import java.util.Collections;
 import java.util.List;
-import java.util.Locale;
 
 /**
- * What the native library makes of a push header: PDU type, length, content type, SEC and MAC, which
- * it knows in a few forms only. The length of the headers bounds none of these, it only finds the
- * body.
+ * What the native library makes of a push header: PDU type, length, content type, SEC and MAC,
+ * which it knows in a few forms only. The length of the headers bounds none of these, it only finds
+ * the body.
  */
 final class LibraryHeader {
     private static final int PDU_TYPE = 1;
@@ -24,7 +23,9 @@ final class LibraryHeader {
     private static final int NAME_LENGTH = 3;
     private static final int LONGEST_MAC = 43;
 
+    /** The content types that it knows, by number, with or without its high bit, and by name. */
     private static final int[] CODES = {0x36, 0x35, 0x44, 0x4E, 0x42};
+
     private static final String[] MEDIA_TYPES = {
         "application/vnd.wap.connectivity-wbxml",
         "application/vnd.wap.connectivity-xml",
@@ -36,71 +37,55 @@ final class LibraryHeader {
     /** Where the body begins, when the header is taken. */
     final int bodyAt;
 
-    /** Where that stands which is refused; -1 when the header is taken. */
-    final int offset;
+    /** Null when the header is taken. */
+    final Refusal refusal;
 
-    final String found;
-    final List<String> expected;
-    final String reason;
-
-    private LibraryHeader(
-            int bodyAt, int offset, String found, List<String> expected, String reason) {
+    private LibraryHeader(int bodyAt, Refusal refusal) {
         this.bodyAt = bodyAt;
-        this.offset = offset;
-        this.found = found;
-        this.expected = expected;
-        this.reason = reason;
-    }
-
-    private static LibraryHeader taken(int bodyAt) {
-        return new LibraryHeader(bodyAt, -1, null, Collections.<String>emptyList(), null);
+        this.refusal = refusal;
     }
 
     private static LibraryHeader refused(
             int offset, String found, List<String> expected, String reason) {
-        return new LibraryHeader(0, offset, found, expected, reason);
-    }
-
-    private static LibraryHeader ended(byte[] push, List<String> expected, String reason) {
-        return refused(push.length, Refusal.END_OF_DATA, expected, reason);
+        return new LibraryHeader(0, new Refusal(offset, null, found, expected, reason));
     }
 
     boolean isTaken() {
-        return offset < 0;
+        return refusal == null;
     }
 
     /** Reads the header of a push. */
     static LibraryHeader of(byte[] push) {
         if (push.length > PDU_TYPE && push[PDU_TYPE] != PUSH) {
-            String type = hex(push[PDU_TYPE]);
-            return refused(
-                    PDU_TYPE,
-                    type,
-                    Collections.singletonList("Push (0x06)"),
-                    "PDU type " + type + " is no push");
+            String type = Refusal.hex(push[PDU_TYPE]);
+            List<String> expected = Collections.singletonList("Push (0x06)");
+            return refused(PDU_TYPE, type, expected, "PDU type " + type + " is no push");
         }
         if (push.length <= HEADERS) {
-            return ended(
-                    push,
+            String within = "the message ends within its push header, after ";
+            return refused(
+                    push.length,
+                    Refusal.END_OF_DATA,
                     Collections.<String>emptyList(),
                     push.length == 0
                             ? "the message is empty"
-                            : "the message ends within its push header, after "
-                                    + bytes(push.length));
+                            : within + Refusal.bytes(push.length));
         }
-        int bodyAt = HEADERS + (push[LENGTH] & 0xFF);
-        if (bodyAt > push.length) {
+        int length = push[LENGTH] & 0xFF;
+        int left = push.length - HEADERS;
+        if (length > left) {
             return refused(
                     LENGTH,
-                    hex(push[LENGTH]),
-                    Collections.singletonList("at most " + (push.length - HEADERS)),
+                    Refusal.hex(length),
+                    Collections.singletonList("at most " + left),
                     "headers of "
-                            + bytes(push[LENGTH] & 0xFF)
+                            + Refusal.bytes(length)
                             + " are longer than the rest of the message");
         }
         int at = push[HEADERS] == LENGTH_QUOTE ? QUOTED_CONTENT_TYPE : HEADERS;
         int behind = behindContentType(push, at);
-        return behind < 0 ? unknownContentType(push, at) : security(push, behind, bodyAt);
+        Refusal refusal = behind < 0 ? unknownContentType(push, at) : refusedMac(push, behind);
+        return new LibraryHeader(refusal == null ? HEADERS + length : 0, refusal);
     }
 
     /** Where the content type ends: a name with its zero, or else a short code; -1 for neither. */
@@ -111,12 +96,17 @@ final class LibraryHeader {
                 return end + 1;
             }
         }
+        return at < push.length && isCode(push[at] & 0x7F) ? at + 1 : -1;
+    }
+
+    /** Whether a number is that of a content type that it knows. */
+    static boolean isCode(int number) {
         for (int code : CODES) {
-            if (at < push.length && (push[at] & 0x7F) == code) {
-                return at + 1;
+            if (number == code) {
+                return true;
             }
         }
-        return -1;
+        return false;
     }
 
     private static boolean isText(byte[] push, int at, String text) {
@@ -128,49 +118,45 @@ final class LibraryHeader {
         return true;
     }
 
-    private static LibraryHeader unknownContentType(byte[] push, int at) {
+    private static Refusal unknownContentType(byte[] push, int at) {
         List<String> expected = new ArrayList<>();
         for (int i = 0; i < CODES.length; ++i) {
             expected.add(LibraryKind.withToken(MEDIA_TYPES[i], CODES[i] | 0x80));
         }
-        expected = Collections.unmodifiableList(expected);
+        String found = at < push.length ? Refusal.hex(push[at]) : Refusal.END_OF_DATA;
+        String reason = "the content type " + found + " is not known";
         if (at >= push.length) {
-            return ended(push, expected, "the message ends in front of its content type");
-        }
-        int first = push[at] & 0xFF;
-        String type = hex(push[at]);
-        if (first >= 0x20 && first <= 0x7F) {
+            reason = "the message ends in front of its content type";
+        } else if (push[at] >= ' ') {
             int end = endOfText(push, at);
-            if (end == push.length) {
-                return refused(at, "a text", expected, "the message ends within its content type");
-            }
-            type = Refusal.quoted(push, at, end - at);
+            boolean isWhole = end < push.length;
+            found = isWhole ? Refusal.quoted(push, at, end) : "a text";
+            reason =
+                    isWhole
+                            ? "the content type " + found + " is not known"
+                            : "the message ends within its content type";
         }
-        return refused(at, type, expected, "the content type " + type + " is not known");
+        return new Refusal(Math.min(at, push.length), null, found, expected, reason);
     }
 
     /** SEC and MAC are looked for once each, in this order; anything else hides what follows. */
-    private static LibraryHeader security(byte[] push, int behind, int bodyAt) {
+    private static Refusal refusedMac(byte[] push, int behind) {
         int at = valueOf(push, behind, SEC, "SEC");
-        int nameAt = at < 0 ? behind : at + 1;
-        at = valueOf(push, nameAt, MAC, "MAC");
+        at = valueOf(push, at < 0 ? behind : at + 1, MAC, "MAC");
         if (at < 0) {
-            return taken(bodyAt);
+            return null;
         }
         int end = endOfText(push, at);
-        List<String> expected =
-                Collections.singletonList("at most " + LONGEST_MAC + " characters and a zero byte");
+        String reason;
         if (end == push.length) {
-            return refused(at, "a text", expected, "the message ends within its MAC");
+            reason = "the message ends within its MAC";
+        } else if (end - at > LONGEST_MAC) {
+            reason = "a MAC of " + (end - at) + " characters is too long";
+        } else {
+            return null;
         }
-        if (end - at > LONGEST_MAC) {
-            return refused(
-                    at,
-                    "a text",
-                    expected,
-                    "a MAC of " + (end - at) + " characters is too long");
-        }
-        return taken(bodyAt);
+        String expected = "at most " + LONGEST_MAC + " characters and a zero byte";
+        return new Refusal(at, null, "a text", Collections.singletonList(expected), reason);
     }
 
     /** Where the value of the parameter begins, if that is what comes next; else -1. */
@@ -180,12 +166,11 @@ final class LibraryHeader {
             return at + 1;
         }
         int behind = NAME_LENGTH + 1;
-        if (left > behind
-                && new String(push, at, NAME_LENGTH, StandardCharsets.US_ASCII)
-                        .equalsIgnoreCase(name)) {
-            return at + behind;
-        }
-        return -1;
+        boolean isNamed =
+                left > behind
+                        && new String(push, at, NAME_LENGTH, StandardCharsets.US_ASCII)
+                                .equalsIgnoreCase(name);
+        return isNamed ? at + behind : -1;
     }
 
     private static int endOfText(byte[] push, int at) {
@@ -194,13 +179,5 @@ final class LibraryHeader {
             ++end;
         }
         return end;
-    }
-
-    private static String hex(int value) {
-        return String.format(Locale.ROOT, "0x%02X", value & 0xFF);
-    }
-
-    private static String bytes(int count) {
-        return count == 1 ? "1 byte" : count + " bytes";
     }
 }

@@ -1,6 +1,5 @@
 package com.qvomacp.eng.omacp;
 
-import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
 import java.util.Arrays;
 import java.util.Collections;
@@ -9,117 +8,65 @@ import java.util.Locale;
 
 /** The kinds of characteristic that the native library knows, and what it takes in each of them. */
 enum LibraryKind {
-    PXLOGICAL(
-            0x51,
-            Pages.BOTH,
-            Nests.YES,
+    PXLOGICAL(0x51, Pages.BOTH, Nests.YES,
             "07 NAME 15 PROXY-ID 16 PROXY-PROVIDER-ID 17 DOMAIN* 1C STARTPAGE 2A TRUST 2B MASTER"
                     + " 3E PROXY-PW 3F PPGAUTH-TYPE"),
-    PXPHYSICAL(
-            0x52,
-            Pages.BOTH,
-            Nests.YES,
+    PXPHYSICAL(0x52, Pages.BOTH, Nests.YES,
             "17 DOMAIN? 1F PUSHENABLED 20 PXADDR 21 PXADDRTYPE 22 TO-NAPID* 2E WSP-VERSION"
                     + " 2F PHYSICAL-PROXY-ID 3D PXADDR-FQDN 47 PULLENABLED"),
     PORT(0x53, Pages.BOTH, Nests.NO, "23 PORTNBR 24 SERVICE*"),
     VALIDITY(0x54, Pages.BOTH, Nests.NO, "0B VALIDUNTIL 12 COUNTRY 13 NETWORK 2C SID 2D SOC"),
-    NAPDEF(
-            0x55,
-            Pages.FIRST,
-            Nests.YES,
+    NAPDEF(0x55, Pages.FIRST, Nests.YES,
             "05 = 07 NAME 08 NAP-ADDRESS 09 NAP-ADDRTYPE 0A CALLTYPE 0F LINGER 10 BEARER*"
                     + " 11 NAPID 14 INTERNET 25 LINKSPEED 26 DNLINKSPEED 27 LOCAL-ADDR"
-                    + " 28 LOCAL-ADDRTYPE 31 DELIVERY-ERR-SDU 32 DELIVERY-ORDER"
-                    + " 33 TRAFFIC-CLASS 34 MAX-SDU-SIZE 35 MAX-BITRATE-UPLINK"
-                    + " 36 MAX-BITRATE-DNLINK 48 DNS-ADDR* 49 MAX-NUM-RETRY"
-                    + " 4A FIRST-RETRY-TIMEOUT 4B REREG-THRESHOLD 4C T-BIT"),
-    APPLICATION(
-            0x55,
-            Pages.SECOND,
-            Nests.YES,
+                    + " 28 LOCAL-ADDRTYPE 31 DELIVERY-ERR-SDU 32 DELIVERY-ORDER 33 TRAFFIC-CLASS"
+                    + " 34 MAX-SDU-SIZE 35 MAX-BITRATE-UPLINK 36 MAX-BITRATE-DNLINK 48 DNS-ADDR*"
+                    + " 49 MAX-NUM-RETRY 4A FIRST-RETRY-TIMEOUT 4B REREG-THRESHOLD 4C T-BIT"),
+    APPLICATION(0x55, Pages.SECOND, Nests.YES,
             "05 = 07 NAME 14 INTERNET 22 TO-NAPID* 2E AACCEPT 34 ADDR* 36 APPID 37 APROTOCOL"
                     + " 38 PROVIDER-ID 39 TO-PROXY*"),
-    BOOTSTRAP(
-            0x56,
-            Pages.FIRST,
-            Nests.NO,
+    BOOTSTRAP(0x56, Pages.FIRST, Nests.NO,
             "07 NAME 12 COUNTRY 13 NETWORK* 15 PROXY-ID* 18 PROVURL 29 CONTEXT-ALLOW"),
     APPADDR(0x56, Pages.SECOND, Nests.YES, "34 ADDR 35 ADDRTYPE"),
     VENDORCONFIG(0x57, Pages.FIRST, Nests.NO, "05 = 07 NAME"),
-    APPAUTH(
-            0x57,
-            Pages.SECOND,
-            Nests.NO,
+    APPAUTH(0x57, Pages.SECOND, Nests.NO,
             "2F AAUTHDATA 30 AAUTHLEVEL 31 AAUTHNAME 32 AAUTHSECRET 33 AAUTHTYPE+ 90 ,"),
     CLIENTIDENTITY(0x58, Pages.BOTH, Nests.NO, "30 CLIENT-ID"),
     PXAUTHINFO(0x59, Pages.FIRST, Nests.NO, "19 PXAUTH-TYPE 1A PXAUTH-ID 1B PXAUTH-PW"),
-    RESOURCE(
-            0x59,
-            Pages.SECOND,
-            Nests.NO,
+    RESOURCE(0x59, Pages.SECOND, Nests.NO,
             "07 NAME 1C STARTPAGE 2E AACCEPT 2F AAUTHDATA 31 AAUTHNAME 32 AAUTHSECRET"
                     + " 33 AAUTHTYPE 3A URI"),
-    NAPAUTHINFO(
-            0x5A, Pages.BOTH, Nests.NO, "0C AUTHTYPE 0D AUTHNAME 0E AUTHSECRET 4E AUTH-ENTITY*"),
-    ACCESS(
-            0x5B,
-            Pages.BOTH,
-            Nests.NO,
+    NAPAUTHINFO(0x5A, Pages.BOTH, Nests.NO,
+            "0C AUTHTYPE 0D AUTHNAME 0E AUTHSECRET 4E AUTH-ENTITY*"),
+    ACCESS(0x5B, Pages.BOTH, Nests.NO,
             "17 DOMAIN* 22 TO-NAPID* 23 PORTNBR* 36 APPID* 39 TO-PROXY* 3B RULE*"),
     ROAMING("ROAMING", "SYNC-ALLOWED", "SYNC-DEFAULT"),
-    WIFI(
-            "WI-FI",
-            "NETSSID",
-            "SECMODE",
-            "EAPMETHOD",
-            "EAPTYPE",
-            "USERNAME",
-            "ANONUSERNAME",
-            "PASSWORD",
-            "CACERT",
-            "USERCERT",
-            "PHASE1",
-            "AUTHALGORITHM",
-            "PRIORITY"),
+    WIFI("WI-FI",
+            "NETSSID", "SECMODE", "EAPMETHOD", "EAPTYPE", "USERNAME", "ANONUSERNAME", "PASSWORD",
+            "CACERT", "USERCERT", "PHASE1", "AUTHALGORITHM", "PRIORITY"),
     VOWIFI("Vodafone VoWiFi", "ePDG FQDN");
 
     /** The code pages on which a TYPE token stands for a kind. */
-    private enum Pages {
-        FIRST,
-        SECOND,
-        BOTH
-    }
+    private enum Pages { FIRST, SECOND, BOTH }
 
-    private enum Nests {
-        YES,
-        NO
-    }
+    private enum Nests { YES, NO }
 
     /** The TYPE whose name follows as text. */
     static final int TYPE_AS_TEXT = 0x50;
 
-    /** How a parameter is read, by {@link #shapes}. */
-    static final byte UNKNOWN = 0;
+    // How a parameter is read, by `shapes`.
 
+    static final byte UNKNOWN = 0;
     static final byte TEXT = 1;
     static final byte LIST = 2;
-
-    /** A list that is left out when it cannot be read. */
-    static final byte OPTIONAL_LIST = 3;
-
-    /** A text that commas go on with. */
-    static final byte CONTINUED_TEXT = 4;
-
-    /** The name is given as text. */
-    static final byte NAMED = 5;
-
-    /** One more value of the text that goes on. */
-    static final byte COMMA = 6;
+    static final byte OPTIONAL_LIST = 3; // left out when it cannot be read
+    static final byte CONTINUED_TEXT = 4; // commas go on with it
+    static final byte NAMED = 5; // the name is given as text
+    static final byte COMMA = 6; // one more value of the text that goes on
 
     private static final String MARKS = "*?+";
-
-    private static final int FIRST_TYPE = TYPE_AS_TEXT;
     private static final int LAST_TYPE = 0x5B;
+    private static final LibraryKind[] ALL = values();
     private static final LibraryKind[][] BY_TOKEN = byToken();
 
     /** As the message names it. */
@@ -133,13 +80,10 @@ enum LibraryKind {
 
     private final int token;
     private final Pages pages;
-    private final byte[] typeBytes;
     private final String[] parms = new String[256];
 
     /** The names that are known; null where any name is taken. */
-    private final byte[][] names;
-
-    private final List<String> namesListed;
+    private final List<String> names;
 
     /**
      * Parameters as pairs of token and name: * stands behind a list, ? behind one that may fail, +
@@ -150,9 +94,7 @@ enum LibraryKind {
         this.token = token;
         this.pages = pages;
         this.nests = nests == Nests.YES;
-        this.typeBytes = null;
         this.names = null;
-        this.namesListed = null;
         String[] words = pairs.split(" ");
         for (int i = 0; i < words.length; i += 2) {
             put(Integer.parseInt(words[i], 16), words[i + 1]);
@@ -165,17 +107,8 @@ enum LibraryKind {
         this.token = TYPE_AS_TEXT;
         this.pages = Pages.BOTH;
         this.nests = false;
-        this.typeBytes = bytes(type);
-        this.names = new byte[names.length][];
-        for (int i = 0; i < names.length; ++i) {
-            this.names[i] = bytes(names[i]);
-        }
-        this.namesListed = Collections.unmodifiableList(Arrays.asList(names));
+        this.names = Collections.unmodifiableList(Arrays.asList(names));
         put(0x05, "=");
-    }
-
-    private static byte[] bytes(String text) {
-        return text.getBytes(StandardCharsets.US_ASCII);
     }
 
     private void put(int announced, String marked) {
@@ -195,11 +128,11 @@ enum LibraryKind {
     }
 
     private static LibraryKind[][] byToken() {
-        LibraryKind[][] kinds = new LibraryKind[2][LAST_TYPE - FIRST_TYPE + 1];
-        for (LibraryKind kind : values()) {
-            for (int page = 0; page < 2 && kind.typeBytes == null; ++page) {
+        LibraryKind[][] kinds = new LibraryKind[2][LAST_TYPE - TYPE_AS_TEXT + 1];
+        for (LibraryKind kind : ALL) {
+            for (int page = 0; page < 2 && kind.token != TYPE_AS_TEXT; ++page) {
                 if (kind.pages == Pages.BOTH || kind.pages.ordinal() == page) {
-                    kinds[page][kind.token - FIRST_TYPE] = kind;
+                    kinds[page][kind.token - TYPE_AS_TEXT] = kind;
                 }
             }
         }
@@ -208,42 +141,36 @@ enum LibraryKind {
 
     /** The kind of a TYPE token on a code page; null for none. */
     static LibraryKind of(int token, int page) {
-        return token < FIRST_TYPE || token > LAST_TYPE ? null : BY_TOKEN[page][token - FIRST_TYPE];
+        return token < TYPE_AS_TEXT || token > LAST_TYPE
+                ? null
+                : BY_TOKEN[page][token - TYPE_AS_TEXT];
     }
 
     /** The kind whose TYPE is given as the text of so many bytes; null for none. */
     static LibraryKind named(byte[] text, int length) {
-        for (LibraryKind kind : values()) {
-            if (kind.typeBytes != null && is(kind.typeBytes, text, length)) {
+        for (LibraryKind kind : ALL) {
+            if (kind.token == TYPE_AS_TEXT && is(kind.type, text, length)) {
                 return kind;
             }
         }
         return null;
     }
 
-    private static boolean is(byte[] known, byte[] text, int length) {
-        if (known.length != length) {
-            return false;
+    private static boolean is(String known, byte[] text, int length) {
+        boolean isSame = known.length() == length;
+        for (int i = 0; isSame && i < length; ++i) {
+            isSame = known.charAt(i) == text[i];
         }
-        for (int i = 0; i < length; ++i) {
-            if (known[i] != text[i]) {
-                return false;
-            }
-        }
-        return true;
+        return isSame;
     }
 
     /** Whether the value of a parameter of this name is read. */
     boolean takesName(byte[] text, int length) {
-        if (names == null) {
-            return true;
+        boolean isTaken = names == null;
+        for (int i = 0; !isTaken && i < names.size(); ++i) {
+            isTaken = is(names.get(i), text, length);
         }
-        for (byte[] name : names) {
-            if (is(name, text, length)) {
-                return true;
-            }
-        }
-        return false;
+        return isTaken;
     }
 
     /** Whether a parameter may have the empty name. */
@@ -263,7 +190,7 @@ enum LibraryKind {
 
     /** The names that are known; null where any name is taken. */
     List<String> names() {
-        return namesListed;
+        return names;
     }
 
     /** For people: the parameters, with their tokens. */
@@ -280,9 +207,9 @@ enum LibraryKind {
     /** For people: the types that a code page has, with their tokens. */
     static List<String> expectedTypes(int page) {
         List<String> expected = new ArrayList<>();
-        for (LibraryKind kind : values()) {
-            if (kind.typeBytes != null) {
-                expected.add("TYPE=\"" + kind.type + "\" (0x50)");
+        for (LibraryKind kind : ALL) {
+            if (kind.token == TYPE_AS_TEXT) {
+                expected.add(withToken("TYPE=\"" + kind.type + '"', TYPE_AS_TEXT));
             }
         }
         for (LibraryKind kind : BY_TOKEN[page]) {

@@ -4,7 +4,7 @@ package com.qvomacp.eng.omacp;
  * Where a walk has ended: the elements around, innermost eight at most. To number them the body is
  * walked once more, since counting while nobody asks would cost every walk.
  */
-final class LibraryPath implements LibraryTrace {
+final class LibraryPath extends LibraryTrace {
     private static final int LONGEST = 8;
     private static final String SEPARATOR = " / ";
     private static final String UNTYPED = "characteristic";
@@ -34,11 +34,11 @@ final class LibraryPath implements LibraryTrace {
 
     /** Counts a characteristic that stands in front of one of those around, of the same type. */
     @Override
-    public void characteristic(int depth, int start, LibraryKind kind, String type) {
+    void characteristic(LibraryWalk walk, int depth, int start, LibraryKind kind) {
         if (depth < numbers.length
                 && start < ended.starts[depth]
                 && (depth == 0 || start > ended.starts[depth - 1])
-                && typeText(type).equals(type(depth))) {
+                && typeText(kind == null ? walk.nameText() : kind.type).equals(type(depth))) {
             ++numbers[depth];
         }
     }
@@ -56,16 +56,6 @@ final class LibraryPath implements LibraryTrace {
         return typeText(ended.isTyped ? ended.nameText() : null);
     }
 
-    private String parm() {
-        String name = null;
-        if (ended.parmToken == LibraryWalk.NAME_AS_TEXT) {
-            name = ended.nameText();
-        } else if (ended.parmToken >= 0) {
-            name = ended.kinds[ended.depth - 1].parm(ended.parmToken);
-        }
-        return name == null || name.isEmpty() ? Element.PARM.text : Printable.of(name);
-    }
-
     private String text() {
         StringBuilder path = new StringBuilder();
         int steps = 1 + ended.depth + (ended.inParm ? 1 : 0);
@@ -80,34 +70,11 @@ final class LibraryPath implements LibraryTrace {
             } else if (step <= ended.depth) {
                 path.append(type(step - 1)).append(' ').append(numbers[step - 1] + 1);
             } else {
-                path.append(parm());
+                String name = ended.parmName();
+                boolean isNamed = name != null && !name.isEmpty();
+                path.append(isNamed ? Printable.of(name) : Element.PARM.text);
             }
         }
         return path.toString();
-    }
-
-    @Override
-    public void characteristicEnd(int start, int end) {
-        // Counted where it begins.
-    }
-
-    @Override
-    public void parm(int start) {
-        // Not numbered.
-    }
-
-    @Override
-    public void name(String name) {
-        // Not numbered.
-    }
-
-    @Override
-    public void value(int start, int end) {
-        // Not numbered.
-    }
-
-    @Override
-    public void parmEnd(int start, int end) {
-        // Not numbered.
     }
 }

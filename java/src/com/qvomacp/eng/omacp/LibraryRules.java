@@ -26,7 +26,7 @@ final class LibraryRules {
     static Verdict verdictOnPush(byte[] push, int bodyAt, ProvisioningDocument document) {
         LibraryHeader header = LibraryHeader.of(push);
         if (!header.isTaken()) {
-            return Verdict.onHeader(Refusal.ofHeader(header));
+            return new Verdict(null, 0, 0, header.refusal, null, 0);
         }
         if (header.bodyAt == bodyAt && document != null) {
             return document.verdict();
@@ -36,13 +36,9 @@ final class LibraryRules {
         return verdictOn(body, document, bodyAt - header.bodyAt);
     }
 
-    /**
-     * Finds out whether the library takes a body.
-     *
-     * @param shift where the document begins in what the library takes for the body
-     */
+    /** The same of a body, in which the document begins so many bytes from its start. */
     private static Verdict verdictOn(byte[] body, ProvisioningDocument document, int shift) {
-        LibraryWalk walk = new LibraryWalk(body, null);
+        LibraryWalk walk = new LibraryWalk(body, LibraryTrace.NONE);
         Refusal refusal = null;
         int code = 0;
         try {
@@ -57,6 +53,6 @@ final class LibraryRules {
         if (refusal != null && shift != 0) {
             refusal = refusal.ofShiftedBody(shift);
         }
-        return Verdict.onBody(body, code, walk.at, refusal, document, shift);
+        return new Verdict(body, code, walk.at, refusal, document, shift);
     }
 }

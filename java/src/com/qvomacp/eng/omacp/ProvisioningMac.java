@@ -3,6 +3,7 @@ package com.qvomacp.eng.omacp;
 import java.nio.charset.StandardCharsets;
 import java.security.GeneralSecurityException;
 import java.security.MessageDigest;
+import java.util.Arrays;
 import java.util.Locale;
 import javax.crypto.Mac;
 import javax.crypto.spec.SecretKeySpec;
@@ -37,8 +38,6 @@ public final class ProvisioningMac {
     /** How many digits a MAC has at most that the user is told: one for each of its bytes. */
     private static final int LONGEST_HALF = 20;
 
-    private static final String DIGITS = "0123456789ABCDEF";
-
     private ProvisioningMac() {}
 
     /**
@@ -58,14 +57,10 @@ public final class ProvisioningMac {
             SecurityMethod method, String mac, byte[] body, String pin, String imsi) {
         boolean isTold = method == SecurityMethod.USERPINMAC;
         MacResult missing = isTold ? null : missing(method, mac);
-        if (missing == null) {
-            missing = unusable(method, pin, imsi);
-        }
-        if (missing != null) {
-            return missing;
-        }
-        String stated = isTold ? secondHalf(pin) : mac;
-        return compare(compute(method, body, pin, imsi), stated);
+        missing = missing != null ? missing : unusable(method, pin, imsi);
+        return missing != null
+                ? missing
+                : compare(compute(method, body, pin, imsi), isTold ? secondHalf(pin) : mac);
     }
 
     /**
@@ -81,13 +76,10 @@ public final class ProvisioningMac {
      */
     public static MacResult verify(SecurityMethod method, String mac, byte[] body, byte[] key) {
         MacResult missing = missing(method, mac);
-        if (missing != null) {
-            return missing;
+        if (missing == null && (key == null || key.length == 0)) {
+            missing = MacResult.UNUSABLE_KEY;
         }
-        if (key == null || key.length == 0) {
-            return MacResult.UNUSABLE_KEY;
-        }
-        return compare(compute(key, body), mac);
+        return missing != null ? missing : compare(compute(key, body), mac);
     }
 
     /**
@@ -111,7 +103,11 @@ public final class ProvisioningMac {
             case USERPIN:
                 return compute(utf8(pin), body);
             case USERNETWPIN:
-                return compute(joined(imsiKey(imsi), utf8(pin)), body);
+                byte[] network = imsiKey(imsi);
+                byte[] user = utf8(pin);
+                byte[] key = Arrays.copyOf(network, network.length + user.length);
+                System.arraycopy(user, 0, key, network.length, user.length);
+                return compute(key, body);
             default:
                 return told(firstHalf(pin), body);
         }
@@ -127,11 +123,7 @@ public final class ProvisioningMac {
      */
     public static String compute(byte[] key, byte[] body) {
         byte[] hmac = hmac(key, body);
-        StringBuilder text = new StringBuilder(2 * hmac.length);
-        for (byte b : hmac) {
-            text.append(DIGITS.charAt(b >> 4 & 0xF)).append(DIGITS.charAt(b & 0xF));
-        }
-        return text.toString();
+        return HeaderReader.hexadecimal(hmac, 0, hmac.length);
     }
 
     /**
@@ -143,7 +135,7 @@ public final class ProvisioningMac {
      *     as said
      */
     public static String digitsToTell(String key, byte[] body) {
-        return isHalf(key) ? key + told(key, body) : null;
+        return isDigits(key, SHORTEST_HALF, LONGEST_HALF) ? key + told(key, body) : null;
     }
 
     private static boolean isKnown(SecurityMethod method) {
@@ -159,41 +151,28 @@ public final class ProvisioningMac {
 
     /** What the method needs and has not, or null. */
     private static MacResult unusable(SecurityMethod method, String pin, String imsi) {
-        switch (method) {
-            case NETWPIN:
-                return isImsi(imsi) ? null : MacResult.UNUSABLE_IMSI;
-            case USERNETWPIN:
-                if (!isImsi(imsi)) {
-                    return MacResult.UNUSABLE_IMSI;
-                }
-                return isPin(pin) ? null : MacResult.UNUSABLE_PIN;
-            case USERPINMAC:
-                return isTold(pin) ? null : MacResult.UNUSABLE_PIN;
-            default:
-                return isPin(pin) ? null : MacResult.UNUSABLE_PIN;
+        boolean isOfNetwork =
+                method == SecurityMethod.NETWPIN || method == SecurityMethod.USERNETWPIN;
+        if (isOfNetwork && !isDigits(imsi, 1, LONGEST_IMSI)) {
+            return MacResult.UNUSABLE_IMSI;
         }
+        return method == SecurityMethod.NETWPIN || isPin(method, pin)
+                ? null
+                : MacResult.UNUSABLE_PIN;
     }
 
-    private static boolean isTold(String pin) {
-        return isPin(pin)
-                && pin.length() % 2 == 0
-                && isHalf(firstHalf(pin))
-                && isHalf(secondHalf(pin));
+    private static boolean isPin(SecurityMethod method, String pin) {
+        return method == SecurityMethod.USERPINMAC
+                ? isDigits(pin, 2 * SHORTEST_HALF, 2 * LONGEST_HALF) && pin.length() % 2 == 0
+                : pin != null && !pin.isEmpty();
     }
 
-    private static boolean isPin(String pin) {
-        return pin != null && !pin.isEmpty();
-    }
-
-    private static boolean isImsi(String imsi) {
-        return imsi != null && imsi.length() <= LONGEST_IMSI && isDigits(imsi);
-    }
-
-    private static boolean isHalf(String key) {
-        return key != null
-                && key.length() >= SHORTEST_HALF
-                && key.length() <= LONGEST_HALF
-                && isDigits(key);
+    private static boolean isDigits(String text, int least, int most) {
+        boolean isGood = text != null && text.length() >= least && text.length() <= most;
+        for (int i = 0; isGood && i < text.length(); ++i) {
+            isGood = text.charAt(i) >= '0' && text.charAt(i) <= '9';
+        }
+        return isGood;
     }
 
     private static String firstHalf(String pin) {
@@ -205,9 +184,10 @@ public final class ProvisioningMac {
     }
 
     private static MacResult compare(String computed, String stated) {
-        boolean isRight =
-                MessageDigest.isEqual(utf8(computed), utf8(stated.toUpperCase(Locale.ROOT)));
-        return isRight ? MacResult.RIGHT : MacResult.WRONG;
+        byte[] capitals = utf8(stated.toUpperCase(Locale.ROOT));
+        return MessageDigest.isEqual(utf8(computed), capitals)
+                ? MacResult.RIGHT
+                : MacResult.WRONG;
     }
 
     /** The MAC as digits, as many as the key has. */
@@ -244,22 +224,6 @@ public final class ProvisioningMac {
             key[i] = (byte) (high << 4 | low);
         }
         return key;
-    }
-
-    private static byte[] joined(byte[] first, byte[] second) {
-        byte[] key = new byte[first.length + second.length];
-        System.arraycopy(first, 0, key, 0, first.length);
-        System.arraycopy(second, 0, key, first.length, second.length);
-        return key;
-    }
-
-    private static boolean isDigits(String text) {
-        for (int i = 0; i < text.length(); ++i) {
-            if (text.charAt(i) < '0' || text.charAt(i) > '9') {
-                return false;
-            }
-        }
-        return !text.isEmpty();
     }
 
     private static byte[] utf8(String text) {

@@ -1,6 +1,7 @@
 package com.qvomacp.eng.omacp;
 
 import java.util.Arrays;
+import java.util.Collections;
 import java.util.List;
 
 /**
@@ -33,26 +34,39 @@ public final class PushHeader {
     private final ContentType contentType;
     private final List<HeaderField> fields;
     private final SecurityMethod securityMethod;
-    private final String mac;
-    private final int macOffset;
+
+    /** Null when the message carries none. */
+    private final HeaderField mac;
 
     PushHeader(
             int transactionIdentifier,
             int from,
             byte[] bytes,
             ContentType contentType,
-            List<HeaderField> fields,
-            SecurityMethod securityMethod,
-            String mac,
-            int macOffset) {
+            List<HeaderField> fields) {
         this.transactionIdentifier = transactionIdentifier;
         this.from = from;
         this.bytes = bytes;
         this.contentType = contentType;
-        this.fields = fields;
-        this.securityMethod = securityMethod;
-        this.mac = mac;
-        this.macOffset = macOffset;
+        this.fields = Collections.unmodifiableList(fields);
+        HeaderField sec = first("SEC", false);
+        securityMethod = sec == null ? SecurityMethod.NONE : SecurityMethod.stated(sec.value());
+        mac = first("MAC", true);
+    }
+
+    /** The first parameter or header of a name; null without one. */
+    private HeaderField first(String name, boolean hasValue) {
+        HeaderField found = first(contentType.parameters(), name, hasValue);
+        return found != null ? found : first(fields, name, hasValue);
+    }
+
+    private static HeaderField first(List<HeaderField> list, String name, boolean hasValue) {
+        for (HeaderField field : list) {
+            if (field.name().equalsIgnoreCase(name) && (!hasValue || field.value() != null)) {
+                return field;
+            }
+        }
+        return null;
     }
 
     /**
@@ -106,25 +120,19 @@ public final class PushHeader {
     }
 
     /**
-     * {@return the MAC as the message states it, which does not say that it is right: the MAC, 40
-     * hexadecimal digits when it can be one; {@code null} when the message carries none}
+     * {@return the MAC that the message states, right or not, which has 40 hexadecimal digits;
+     * {@code null} when it carries none}
      */
     public String mac() {
-        return mac;
+        return mac == null ? null : mac.value();
     }
 
-    /**
-     * {@return where the MAC stands: bytes from the start of what was read to the parameter,
-     * counted from 0; -1 when the message carries none}
-     */
+    /** {@return where the MAC begins: bytes from the start of what was read; -1 without one} */
     public int macOffset() {
-        return macOffset;
+        return mac == null ? -1 : mac.offset();
     }
 
-    /**
-     * {@return the headers behind the content type: every header, in the order of the message; not
-     * modifiable}
-     */
+    /** {@return the headers behind the content type, in their order; not modifiable} */
     public List<HeaderField> fields() {
         return fields;
     }
@@ -173,12 +181,7 @@ public final class PushHeader {
         return bytes[offset] & 0xFF;
     }
 
-    /**
-     * Compares all that the headers say.
-     *
-     * @param other what to compare with
-     * @return true for a header that says the same, however it is written
-     */
+    /** {@return whether it is a header that says the same, however it is written} */
     @Override
     public boolean equals(Object other) {
         if (!(other instanceof PushHeader)) {
@@ -195,17 +198,10 @@ public final class PushHeader {
         return Arrays.hashCode(new Object[] {transactionIdentifier, contentType, fields});
     }
 
-    /**
-     * {@return the media type, the security method and whether there is a MAC, which may go to a
-     * log: one line of text}
-     */
+    /** {@return media type, security method and whether there is a MAC, in a line for a log} */
     @Override
     public String toString() {
-        return "PushHeader{"
-                + Printable.of(contentType.mediaType())
-                + ", "
-                + securityMethod
-                + (mac == null ? ", no MAC" : ", a MAC")
-                + "}";
+        String text = "PushHeader{" + Printable.of(contentType.mediaType()) + ", ";
+        return text + securityMethod + (mac == null ? ", no MAC}" : ", a MAC}");
     }
 }

@@ -6,8 +6,9 @@ import java.util.List;
 import java.util.Objects;
 
 /** Compares the elements that the native library's walk reads with the items of the tree. */
-final class ReadOtherwise implements LibraryTrace {
+final class ReadOtherwise extends LibraryTrace {
     private static final int OPEN = -1;
+    private static final int NO_PARM = -1;
 
     /** The elements in the order in which they begin. */
     private int count;
@@ -18,9 +19,7 @@ final class ReadOtherwise implements LibraryTrace {
     /** What a characteristic or parameter is called; null for what the library does not know. */
     private String[] names = new String[64];
 
-    private boolean[] areParms = new boolean[64];
-
-    /** How many pairs of name and value a parm has. */
+    /** How many pairs of name and value a parm has; -1 for a characteristic. */
     private int[] pairs = new int[64];
 
     /** The end of a parm's value; 0 without one. */
@@ -80,11 +79,11 @@ final class ReadOtherwise implements LibraryTrace {
         }
         if (item instanceof Characteristic) {
             // One that is open and of no known type is where the library refuses the message.
-            return !areParms[element]
+            return pairs[element] == NO_PARM
                     && (isOpen && names[element] == null
                             || Objects.equals(names[element], ((Characteristic) item).type()));
         }
-        if (!(item instanceof Parameter) || !areParms[element]) {
+        if (!(item instanceof Parameter) || pairs[element] == NO_PARM) {
             return false;
         }
         Parameter parameter = (Parameter) item;
@@ -99,7 +98,6 @@ final class ReadOtherwise implements LibraryTrace {
             starts = Arrays.copyOf(starts, 2 * count);
             ends = Arrays.copyOf(ends, 2 * count);
             names = Arrays.copyOf(names, 2 * count);
-            areParms = Arrays.copyOf(areParms, 2 * count);
             pairs = Arrays.copyOf(pairs, 2 * count);
             valueEnds = Arrays.copyOf(valueEnds, 2 * count);
         }
@@ -110,43 +108,35 @@ final class ReadOtherwise implements LibraryTrace {
         starts[count] = start;
         ends[count] = OPEN;
         names[count] = name;
-        areParms[count++] = isParm;
-    }
-
-    private void end(int end) {
-        ends[open[--depth]] = end;
+        pairs[count] = isParm ? 0 : NO_PARM;
+        valueEnds[count++] = 0;
     }
 
     @Override
-    public void characteristic(int depth, int start, LibraryKind kind, String type) {
-        begin(start, kind == null ? null : type, false);
+    void characteristic(LibraryWalk walk, int depth, int start, LibraryKind kind) {
+        begin(start, kind == null ? null : kind.type, false);
     }
 
     @Override
-    public void characteristicEnd(int start, int end) {
-        end(end);
-    }
-
-    @Override
-    public void parm(int start) {
+    void parm(int start) {
         begin(start, null, true);
     }
 
     @Override
-    public void name(String name) {
+    void name(LibraryWalk walk) {
         int parm = count - 1;
         if (pairs[parm]++ == 0) {
-            names[parm] = name;
+            names[parm] = walk.parmName();
         }
     }
 
     @Override
-    public void value(int start, int end) {
+    void value(int end) {
         valueEnds[count - 1] = end;
     }
 
     @Override
-    public void parmEnd(int start, int end) {
-        end(end);
+    void end(int end) {
+        ends[open[--depth]] = end;
     }
 }

@@ -37,11 +37,11 @@ public enum SecurityMethod {
                 : Long.toString(number);
     }
 
-    /** The method that SEC states, by its name or number. */
+    /** The method that SEC states, by its name or number; null is a SEC without value. */
     static SecurityMethod stated(String sec) {
         for (int number = 0; number < BY_NUMBER.length; ++number) {
             SecurityMethod method = BY_NUMBER[number];
-            if (method.name().equalsIgnoreCase(sec) || sec.equals(Integer.toString(number))) {
+            if (method.name().equalsIgnoreCase(sec) || Integer.toString(number).equals(sec)) {
                 return method;
             }
         }

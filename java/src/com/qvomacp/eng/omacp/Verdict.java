@@ -17,16 +17,14 @@ import java.util.Objects;
  * }</pre>
  */
 public final class Verdict {
-    private static final byte[] NO_BODY = {};
+    /** Null when the library refuses the header. */
+    private final byte[] body;
 
-    private final boolean headerRefused;
     private final int code;
     private final int bytesRead;
 
     /** Null when the message is accepted. */
     private final Refusal refusal;
-
-    private final byte[] body;
 
     /** Null when the body could not be read. */
     private final ProvisioningDocument document;
@@ -34,19 +32,17 @@ public final class Verdict {
     /** Where the document begins in what the library takes for the body. */
     private final int shift;
 
-    private Verdict(
-            boolean headerRefused,
+    Verdict(
+            byte[] body,
             int code,
             int bytesRead,
             Refusal refusal,
-            byte[] body,
             ProvisioningDocument document,
             int shift) {
-        this.headerRefused = headerRefused;
+        this.body = body;
         this.code = code;
         this.bytesRead = bytesRead;
         this.refusal = refusal;
-        this.body = body;
         this.document = document;
         this.shift = shift;
     }
@@ -73,20 +69,6 @@ public final class Verdict {
         return LibraryRules.verdictOnBody(body.clone(), null);
     }
 
-    static Verdict onHeader(Refusal refusal) {
-        return new Verdict(true, 0, 0, refusal, NO_BODY, null, 0);
-    }
-
-    static Verdict onBody(
-            byte[] body,
-            int code,
-            int bytesRead,
-            Refusal refusal,
-            ProvisioningDocument document,
-            int shift) {
-        return new Verdict(false, code, bytesRead, refusal, body, document, shift);
-    }
-
     /** {@return whether the library takes the message} */
     public boolean isAccepted() {
         return refusal == null;
@@ -94,37 +76,33 @@ public final class Verdict {
 
     /** {@return whether it is the push header that the library refuses} */
     public boolean isHeaderRefused() {
-        return headerRefused;
+        return body == null;
     }
 
     /**
-     * {@return the result code of the library's decoder: the code, such as 4101; 0 for a body that
-     * is taken, and for one that can be decoded and holds no document; 0 too when the header is
-     * refused, for which there is no code}
+     * {@return the result code of the library's decoder, such as 4101; 0 for a body that it can
+     * decode, with a document or without, and when the header is refused}
      */
     public int code() {
         return code;
     }
 
-    /**
-     * {@return the name of the result code: such as {@code QVS_ERROR_WBXML_UNKNOWN_ELEMENT}; never
-     * {@code null}}
-     */
+    /** {@return the name of the result code, such as {@code QVS_ERROR_WBXML_UNKNOWN_ELEMENT}} */
     public String codeName() {
         switch (code) {
             case 0:
                 return "QVS_OK";
-            case LibraryWalk.FAILED:
+            case LibraryStop.FAILED:
                 return "QVS_ERROR_FAILED";
-            case LibraryWalk.BAD_ARGUMENT:
+            case LibraryStop.BAD_ARGUMENT:
                 return "QVS_ERROR_BAD_ARGUMENT";
-            case LibraryWalk.UNKNOWN_ELEMENT:
+            case LibraryStop.UNKNOWN_ELEMENT:
                 return "QVS_ERROR_WBXML_UNKNOWN_ELEMENT";
-            case LibraryWalk.NO_DATA:
+            case LibraryStop.NO_DATA:
                 return "QVS_ERROR_WBXML_NO_DATA";
-            case LibraryWalk.WRONG_DOCUMENT_TYPE:
+            case LibraryStop.WRONG_DOCUMENT_TYPE:
                 return "QVS_ERROR_WBXML_DOCUMENT_TYPE";
-            case LibraryWalk.NO_MEMORY:
+            case LibraryStop.NO_MEMORY:
                 return "QVS_ERROR_NO_MEMORY";
             default:
                 throw new AssertionError(code);
@@ -137,54 +115,44 @@ public final class Verdict {
     }
 
     /**
-     * {@return where what is refused stands: in the body, or in the message when the header is
-     * refused: bytes from its start, counted from 0; -1 when the message is accepted}
+     * {@return where what is refused stands: bytes from the start of the body, or of the message
+     * when the header is refused, counted from 0; -1 when the message is accepted}
      */
     public int offset() {
         return refusal == null ? -1 : refusal.offset;
     }
 
     /**
-     * {@return in which element what is refused stands, as {@link Deviation#path} does: the path;
-     * {@code null} when the message is accepted or the header is refused}
+     * {@return in which element what is refused stands, as {@link Deviation#path} tells it; {@code
+     * null} when the message is accepted or the header is refused}
      */
     public String path() {
         return refusal == null ? null : refusal.path;
     }
 
-    /**
-     * {@return what stands there: such as {@code SWITCH_PAGE (0x00)}; {@code null} when the message
-     * is accepted}
-     */
+    /** {@return what stands there, such as {@code SWITCH_PAGE (0x00)}; {@code null} if accepted} */
     public String found() {
         return refusal == null ? null : refusal.found;
     }
 
-    /**
-     * {@return what would have been taken there: what would have been taken, in the order of the
-     * tokens; not modifiable, empty when the message is accepted and when nothing would have been}
-     */
+    /** {@return what would have been taken there, in the order of the tokens; not modifiable} */
     public List<String> expected() {
         return refusal == null ? Collections.<String>emptyList() : refusal.expected;
     }
 
-    /**
-     * {@return why the message is refused: a sentence without a full stop; {@code null} when the
-     * message is accepted}
-     */
+    /** {@return why it is refused, a sentence without a full stop; {@code null} if accepted} */
     public String reason() {
         return refusal == null ? null : refusal.reason;
     }
 
     /**
-     * {@return the items that the library skips or reads as something else, up to where it ends:
-     * the items of the document, in its order; not modifiable}
+     * {@return the items of the document that the library skips or reads as something else, up to
+     * where it ends, in the order of the document; not modifiable}
      */
     public List<Item> readOtherwise() {
-        if (headerRefused || document == null) {
-            return Collections.emptyList();
-        }
-        return Collections.unmodifiableList(ReadOtherwise.of(body, document, shift));
+        return body == null || document == null
+                ? Collections.<Item>emptyList()
+                : Collections.unmodifiableList(ReadOtherwise.of(body, document, shift));
     }
 
     @Override
@@ -193,8 +161,7 @@ public final class Verdict {
             return false;
         }
         Verdict that = (Verdict) other;
-        return headerRefused == that.headerRefused
-                && code == that.code
+        return code == that.code
                 && bytesRead == that.bytesRead
                 && offset() == that.offset()
                 && Objects.equals(path(), that.path())
@@ -210,20 +177,14 @@ public final class Verdict {
         return 31 * (31 * (31 * code + bytesRead) + offset()) + Objects.hashCode(reason());
     }
 
-    /**
-     * {@return the verdict in one line, which may go to a log: the code and where and why the
-     * message is refused}
-     */
+    /** {@return code, place and reason of a refusal, in a line for a log} */
     @Override
     public String toString() {
         if (isAccepted()) {
             return "accepted";
         }
-        return "refused: "
-                + reason()
-                + (headerRefused ? "" : ", " + code + " " + codeName())
-                + ", offset "
-                + offset()
-                + (path() == null ? "" : ", " + path());
+        String result = body == null ? "" : ", " + code + " " + codeName();
+        String where = path() == null ? "" : ", " + path();
+        return "refused: " + reason() + result + ", offset " + offset() + where;
     }
 }
