@@ -2,9 +2,7 @@ package com.qvomacp.eng.omacp;
 
 import java.nio.charset.Charset;
 import java.nio.charset.CharsetEncoder;
-import java.nio.charset.IllegalCharsetNameException;
 import java.nio.charset.StandardCharsets;
-import java.nio.charset.UnsupportedCharsetException;
 
 /** A character set of texts, by the number that IANA assigns (MIBenum). */
 final class CharacterSet {
@@ -108,7 +106,7 @@ final class CharacterSet {
     private static Charset charset(String name) {
         try {
             return Charset.forName(name);
-        } catch (IllegalCharsetNameException | UnsupportedCharsetException e) {
+        } catch (IllegalArgumentException e) {
             return StandardCharsets.ISO_8859_1;
         }
     }

@@ -28,9 +28,10 @@ public abstract class TypedCharacteristic {
 
     /**
      * The view of a characteristic of a type. A switch: for the first method reference a new virtual
-     * machine takes longer than for everything else of a message.
+     * machine takes longer than for everything else of a message; and not of the classes' own type,
+     * for which it would load them all.
      */
-    private static TypedCharacteristic of(String type, Characteristic characteristic) {
+    private static Object of(String type, Characteristic characteristic) {
         switch (type) {
             case AccessPoint.TYPE:
                 return new AccessPoint(characteristic);
