@@ -20,16 +20,12 @@ public final class Other extends Item {
     public enum Kind {
         /** An element of another name; its children stand in it. */
         ELEMENT,
-
         /** An attribute that its element does not have, or has twice. */
         ATTRIBUTE,
-
         /** Text, or a value, in place of an element. */
         TEXT,
-
         /** A processing instruction. */
         INSTRUCTION,
-
         /** Bytes behind the end of the document. */
         TRAILING;
 

@@ -22,19 +22,14 @@ public final class ProvisioningException extends Exception {
     public enum Reason {
         /** The message is longer than the options allow. */
         INPUT_TOO_LONG,
-
         /** The texts of the document are more than the options allow. */
         TEXT_TOO_LONG,
-
         /** The message does not begin with the header of a push, or ends within it. */
         NO_PUSH_HEADER,
-
         /** The body is no WBXML, or none at all. */
         NO_WBXML,
-
         /** The body is a document of another type. */
         OTHER_DOCUMENT_TYPE,
-
         /** The native library refuses the message, and the options ask for that to count. */
         REFUSED
     }

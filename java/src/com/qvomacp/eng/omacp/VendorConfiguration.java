@@ -15,9 +15,6 @@ import java.util.List;
  * }</pre>
  */
 public final class VendorConfiguration extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "VENDORCONFIG";
-
     VendorConfiguration(Characteristic characteristic) {
         super(characteristic);
     }
@@ -27,10 +24,7 @@ public final class VendorConfiguration extends TypedCharacteristic {
         return value("NAME");
     }
 
-    /**
-     * {@return the parameters by their names, NAME included: every parameter, in the order of the
-     * message; not modifiable}
-     */
+    /** {@return the parameters by their names, NAME included: every parameter} */
     public List<Parameter> parameters() {
         return characteristic().parameters();
     }
