@@ -63,8 +63,8 @@ public final class ProvisioningMessage {
      *
      * @param body a WBXML body; it is copied
      * @return what it says
-     * @throws ProvisioningException when it is over a limit, is no WBXML, or is a document of another
-     *     type
+     * @throws ProvisioningException when it is over a limit, is no WBXML, or is a document of
+     *     another type
      */
     public static ProvisioningMessage parseBody(byte[] body) throws ProvisioningException {
         return parseBody(body, ReadOptions.DEFAULT);
@@ -139,8 +139,8 @@ public final class ProvisioningMessage {
      * out at each call.
      *
      * <p>The library takes whole pushes only. Of headers and body that were read apart it is asked
-     * about the push that has them: three bytes in front of the headers, or four in front of more than
-     * 127, for the offset of a header that is refused.
+     * about the push that has them: three bytes in front of the headers, or four in front of more
+     * than 127, for the offset of a header that is refused.
      *
      * @return the verdict, never {@code null}; that on the body when a body alone was read
      */
@@ -162,7 +162,7 @@ public final class ProvisioningMessage {
         return LibraryRules.verdictOnPush(push, bodyAt, document);
     }
 
-    /** How many bytes stand in front of the headers: identifier, type, and length in bytes of 7 bits. */
+    /** How many bytes stand in front of headers: identifier, type, and length, 7 bits a byte. */
     private static int front(byte[] headers) {
         int front = 3;
         for (int rest = headers.length >>> 7; rest != 0; rest >>>= 7) {
@@ -171,7 +171,7 @@ public final class ProvisioningMessage {
         return front;
     }
 
-    /** Writes a length that ends in front of an offset, the high bit set in all bytes but the last. */
+    /** Writes a length up to an offset, the high bit set in all bytes but the last. */
     private static void putLength(byte[] push, int end, int length) {
         int rest = length;
         for (int at = end - 1; at > 1; --at) {
@@ -181,11 +181,11 @@ public final class ProvisioningMessage {
     }
 
     /**
-     * Checks the MAC by whichever security method the message states: {@link ProvisioningMac#verify}.
+     * Checks the MAC by the method that the message states: {@link ProvisioningMac#verify}.
      *
      * @param pin what the user has been told; may be {@code null} for NETWPIN
-     * @param imsi the subscriber's number, 1 to 15 digits; may be {@code null} unless the method has
-     *     NETWPIN in its name
+     * @param imsi the subscriber's number, 1 to 15 digits; may be {@code null} unless the method
+     *     has NETWPIN in its name
      * @return what comes of it, never {@code null}; {@link MacResult#NO_METHOD} for a body alone
      */
     public MacResult verifyMac(String pin, String imsi) {
@@ -265,10 +265,9 @@ public final class ProvisioningMessage {
     }
 
     /**
-     * Compares what two messages say.
-     *
+     * {@return whether another message says the same: it has an equal header, or none either, and
+     * an equal document}
      * @param other what to compare with
-     * @return true for a message with an equal header, or none either, and an equal document
      */
     @Override
     public boolean equals(Object other) {

@@ -5,8 +5,8 @@ import java.util.Collections;
 import java.util.List;
 
 /**
- * A characteristic of a kind that is known, with an accessor for each parameter of its kind. It is a
- * view of the tree and holds nothing of its own: what it has no accessor for is within reach by
+ * A characteristic of a kind that is known, with an accessor for each parameter of its kind. It is
+ * a view of the tree and holds nothing of its own: what it has no accessor for is within reach by
  * {@link #characteristic}.
  *
  * <p>An accessor for one value answers that of the first parameter of its name, {@code null} when
@@ -62,7 +62,7 @@ public abstract class TypedCharacteristic {
         }
     }
 
-    /** A view of each characteristic of a type directly in an item, in a list that stays as it is. */
+    /** A view of each characteristic of a type directly in an item, in a list that stays so. */
     static <V> List<V> views(Item item, Class<V> kind, String type) {
         // Most messages lack most kinds: the list is made for the first.
         List<V> views = Collections.emptyList();
@@ -99,10 +99,8 @@ public abstract class TypedCharacteristic {
     }
 
     /**
-     * Compares what is set.
-     *
+     * {@return whether the other object is of the same class and its characteristic equal}
      * @param other what to compare with
-     * @return true for an object of the same class whose characteristic is equal
      */
     @Override
     public final boolean equals(Object other) {

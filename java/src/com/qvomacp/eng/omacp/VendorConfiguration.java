@@ -24,16 +24,14 @@ public final class VendorConfiguration extends TypedCharacteristic {
         return value("NAME");
     }
 
-    /** {@return the parameters by their names, NAME included: every parameter} */
+    /** {@return every parameter, NAME included, in the order of the message; not modifiable} */
     public List<Parameter> parameters() {
         return characteristic().parameters();
     }
 
     /**
-     * Finds a parameter.
-     *
+     * {@return the first parameter of a name; {@code null} when there is none}
      * @param name what NAME is, in exactly this case
-     * @return the first parameter of that name; {@code null} when there is none
      */
     public Parameter parameter(String name) {
         return characteristic().parameter(name);
