@@ -13,17 +13,11 @@ import java.util.List;
  * }</pre>
  */
 public final class AccessPoint extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "NAPDEF";
-
     AccessPoint(Characteristic characteristic) {
         super(characteristic);
     }
 
-    /**
-     * {@return NAPID: the name of the access point; proxies and applications refer to it by this
-     *     name}
-     */
+    /** {@return NAPID: the name, by which proxies and applications refer to the access point} */
     public String napId() {
         return value("NAPID");
     }
@@ -33,10 +27,7 @@ public final class AccessPoint extends TypedCharacteristic {
         return value("NAME");
     }
 
-    /**
-     * {@return whether INTERNET stands here, with or without a value: by the standard, whether the
-     *     access point leads to the Internet}
-     */
+    /** {@return whether INTERNET stands here: by the standard, this leads to the Internet} */
     public boolean hasInternet() {
         return has("INTERNET");
     }
@@ -46,10 +37,7 @@ public final class AccessPoint extends TypedCharacteristic {
         return value("INTERNET");
     }
 
-    /**
-     * {@return NAP-ADDRESS: the address, such as the access point name of GPRS or a telephone
-     *     number}
-     */
+    /** {@return NAP-ADDRESS: the address, such as an access point name or a telephone number} */
     public String address() {
         return value("NAP-ADDRESS");
     }
@@ -99,10 +87,7 @@ public final class AccessPoint extends TypedCharacteristic {
         return value("LINKSPEED");
     }
 
-    /**
-     * {@return DNLINKSPEED: the speed of the connection towards the device in bit/s, or {@code
-     *     AUTOBAUDING}}
-     */
+    /** {@return DNLINKSPEED: the speed towards the device in bit/s, or {@code AUTOBAUDING}} */
     public String downlinkSpeed() {
         return value("DNLINKSPEED");
     }
@@ -147,9 +132,7 @@ public final class AccessPoint extends TypedCharacteristic {
         return value("RESIDUAL-BER");
     }
 
-    /**
-     * {@return SDU-ERROR-RATIO: the rate of packets that are lost or erroneous, as 3GPP codes it}
-     */
+    /** {@return SDU-ERROR-RATIO: the rate of packets lost or erroneous, as 3GPP codes it} */
     public String sduErrorRatio() {
         return value("SDU-ERROR-RATIO");
     }
@@ -164,16 +147,12 @@ public final class AccessPoint extends TypedCharacteristic {
         return value("TRANSFER-DELAY");
     }
 
-    /**
-     * {@return GUARANTEED-BITRATE-UPLINK: the guaranteed rate from the device, as 3GPP codes it}
-     */
+    /** {@return GUARANTEED-BITRATE-UPLINK: the rate guaranteed from it, as 3GPP codes it} */
     public String guaranteedBitrateUplink() {
         return value("GUARANTEED-BITRATE-UPLINK");
     }
 
-    /**
-     * {@return GUARANTEED-BITRATE-DNLINK: the guaranteed rate towards the device, as 3GPP codes it}
-     */
+    /** {@return GUARANTEED-BITRATE-DNLINK: the rate guaranteed towards it, as 3GPP codes it} */
     public String guaranteedBitrateDownlink() {
         return value("GUARANTEED-BITRATE-DNLINK");
     }
@@ -193,7 +172,7 @@ public final class AccessPoint extends TypedCharacteristic {
         return value("REREG-THRESHOLD");
     }
 
-    /** {@return whether T-BIT stands here, with or without a value} */
+    /** {@return whether T-BIT stands here} */
     public boolean hasTBit() {
         return has("T-BIT");
     }
@@ -203,7 +182,7 @@ public final class AccessPoint extends TypedCharacteristic {
         return value("T-BIT");
     }
 
-    /** {@return whether INIT stands here, with or without a value} */
+    /** {@return whether INIT stands here} */
     public boolean hasInit() {
         return has("INIT");
     }
@@ -213,27 +192,18 @@ public final class AccessPoint extends TypedCharacteristic {
         return value("INIT");
     }
 
-    /**
-     * {@return every NAPAUTHINFO directly in this characteristic: how to authenticate towards the
-     *     access point}
-     */
+    /** {@return every NAPAUTHINFO: how to authenticate towards the access point} */
     public List<AccessPointAuthentication> authentications() {
-        return views(AccessPointAuthentication.class, AccessPointAuthentication.TYPE);
+        return views(AccessPointAuthentication.class, "NAPAUTHINFO");
     }
 
-    /**
-     * {@return every VALIDITY directly in this characteristic: where and until when the access
-     *     point may be used}
-     */
+    /** {@return every VALIDITY: where and until when the access point may be used} */
     public List<Validity> validities() {
-        return views(Validity.class, Validity.TYPE);
+        return views(Validity.class, "VALIDITY");
     }
 
-    /**
-     * {@return every WLAN directly in this characteristic: the wireless networks behind the access
-     *     point}
-     */
+    /** {@return every WLAN: the wireless networks behind the access point} */
     public List<Wlan> wlans() {
-        return views(Wlan.class, Wlan.TYPE);
+        return views(Wlan.class, "WLAN");
     }
 }

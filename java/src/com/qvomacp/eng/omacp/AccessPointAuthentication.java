@@ -12,9 +12,6 @@ import java.util.List;
  * }</pre>
  */
 public final class AccessPointAuthentication extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "NAPAUTHINFO";
-
     AccessPointAuthentication(Characteristic characteristic) {
         super(characteristic);
     }
@@ -34,10 +31,7 @@ public final class AccessPointAuthentication extends TypedCharacteristic {
         return value("AUTHSECRET");
     }
 
-    /**
-     * {@return every AUTH-ENTITY: the entities that ask for the authentication, such as {@code
-     *     AAA}}
-     */
+    /** {@return every AUTH-ENTITY: who asks for the authentication, such as {@code AAA}} */
     public List<String> entities() {
         return values("AUTH-ENTITY");
     }

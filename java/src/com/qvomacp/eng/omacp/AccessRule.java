@@ -12,9 +12,6 @@ import java.util.List;
  * }</pre>
  */
 public final class AccessRule extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "ACCESS";
-
     AccessRule(Characteristic characteristic) {
         super(characteristic);
     }

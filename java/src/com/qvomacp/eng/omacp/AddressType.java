@@ -14,28 +14,20 @@ package com.qvomacp.eng.omacp;
 public enum AddressType {
     /** An address of IP version 4. */
     IPV4("IPV4"),
-
     /** An address of IP version 6. */
     IPV6("IPV6"),
-
     /** A telephone number as E.164 writes it. */
     E164("E164"),
-
     /** A text. */
     ALPHA("ALPHA"),
-
     /** The name of an access point of GPRS. */
     APN("APN"),
-
     /** A service code. */
     SCODE("SCODE"),
-
     /** A subscriber identity of TETRA. */
     TETRA_ITSI("TETRA-ITSI"),
-
     /** An access number of MOBITEX. */
     MAN("MAN"),
-
     /** A text that stands for none of the other kinds. */
     UNKNOWN(null);
 

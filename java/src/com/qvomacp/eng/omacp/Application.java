@@ -15,9 +15,6 @@ import java.util.List;
  * }</pre>
  */
 public final class Application extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "APPLICATION";
-
     Application(Characteristic characteristic) {
         super(characteristic);
     }
@@ -37,9 +34,7 @@ public final class Application extends TypedCharacteristic {
         return value("NAME");
     }
 
-    /**
-     * {@return AACCEPT: the content types that the application accepts, with commas between them}
-     */
+    /** {@return AACCEPT: the content types that the application accepts, commas between them} */
     public String accept() {
         return value("AACCEPT");
     }
@@ -54,17 +49,12 @@ public final class Application extends TypedCharacteristic {
         return values("TO-PROXY");
     }
 
-    /**
-     * {@return every TO-NAPID: the access points through which the application goes, by their
-     *     names}
-     */
+    /** {@return every TO-NAPID: the names of the access points that the application uses} */
     public List<String> toNapIds() {
         return values("TO-NAPID");
     }
 
-    /**
-     * {@return every ADDR: the addresses of the service that are given without further properties}
-     */
+    /** {@return every ADDR: the addresses of the service without further properties} */
     public List<String> simpleAddresses() {
         return values("ADDR");
     }
@@ -74,15 +64,12 @@ public final class Application extends TypedCharacteristic {
         return value("APPREF");
     }
 
-    /**
-     * {@return every TO-APPREF: the settings of other applications that belong to these, by their
-     *     names}
-     */
+    /** {@return every TO-APPREF: the names of other applications' settings that belong to these} */
     public List<String> toReferences() {
         return values("TO-APPREF");
     }
 
-    /** {@return whether INTERNET stands here, with or without a value} */
+    /** {@return whether INTERNET stands here} */
     public boolean hasInternet() {
         return has("INTERNET");
     }
@@ -122,35 +109,23 @@ public final class Application extends TypedCharacteristic {
         return value("XCAP_TID_HEADER");
     }
 
-    /**
-     * {@return every APPADDR directly in this characteristic: the addresses of the service that
-     *     have ports or a type}
-     */
+    /** {@return every APPADDR: the addresses of the service that have ports or a type} */
     public List<ApplicationAddress> addresses() {
-        return views(ApplicationAddress.class, ApplicationAddress.TYPE);
+        return views(ApplicationAddress.class, "APPADDR");
     }
 
-    /**
-     * {@return every APPAUTH directly in this characteristic: how application and service
-     *     authenticate themselves}
-     */
+    /** {@return every APPAUTH: how application and service authenticate themselves} */
     public List<ApplicationAuthentication> authentications() {
-        return views(ApplicationAuthentication.class, ApplicationAuthentication.TYPE);
+        return views(ApplicationAuthentication.class, "APPAUTH");
     }
 
-    /**
-     * {@return every RESOURCE directly in this characteristic: the resources of the service, such
-     *     as bookmarks and databases}
-     */
+    /** {@return every RESOURCE: the resources of the service, such as bookmarks and databases} */
     public List<Resource> resources() {
-        return views(Resource.class, Resource.TYPE);
+        return views(Resource.class, "RESOURCE");
     }
 
-    /**
-     * {@return every ROAMING directly in this characteristic: what the application may do while
-     *     roaming}
-     */
+    /** {@return every ROAMING: what the application may do while roaming} */
     public List<Roaming> roamings() {
-        return views(Roaming.class, Roaming.TYPE);
+        return views(Roaming.class, "ROAMING");
     }
 }

@@ -12,9 +12,6 @@ import java.util.List;
  * }</pre>
  */
 public final class ApplicationAddress extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "APPADDR";
-
     ApplicationAddress(Characteristic characteristic) {
         super(characteristic);
     }
@@ -34,11 +31,8 @@ public final class ApplicationAddress extends TypedCharacteristic {
         return value("ADDRTYPE");
     }
 
-    /**
-     * {@return every PORT directly in this characteristic: the ports of the service at this
-     *     address}
-     */
+    /** {@return every PORT: the ports of the service at this address} */
     public List<Port> ports() {
-        return views(Port.class, Port.TYPE);
+        return views(Port.class, "PORT");
     }
 }

@@ -10,17 +10,11 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class ApplicationAuthentication extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "APPAUTH";
-
     ApplicationAuthentication(Characteristic characteristic) {
         super(characteristic);
     }
 
-    /**
-     * {@return AAUTHLEVEL: who authenticates itself, such as {@code APPSRV}, {@code CLIENT} or
-     *     {@code OBEX}}
-     */
+    /** {@return AAUTHLEVEL: who authenticates itself, such as {@code APPSRV} or {@code CLIENT}} */
     public String level() {
         return value("AAUTHLEVEL");
     }

@@ -12,9 +12,6 @@ import java.util.List;
  * }</pre>
  */
 public final class Bootstrap extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "BOOTSTRAP";
-
     Bootstrap(Characteristic characteristic) {
         super(characteristic);
     }

@@ -30,10 +30,7 @@ public final class Characteristic extends Item {
         this.typeWriting = Writing.code(typeWriting);
     }
 
-    /**
-     * {@return the type: TYPE as the OMA documents write it, such as {@code NAPDEF}; {@code null}
-     * when the characteristic has none}
-     */
+    /** {@return TYPE as the OMA documents write it, as {@code NAPDEF}; {@code null} for none} */
     public String type() {
         return type;
     }
@@ -43,10 +40,7 @@ public final class Characteristic extends Item {
         return Writing.of(typeWriting);
     }
 
-    /**
-     * {@return the parameters that stand directly in the characteristic: every parameter, in the
-     * order of the message; not modifiable}
-     */
+    /** {@return the parameters directly in it, in the order of the message; not modifiable} */
     public List<Parameter> parameters() {
         List<Parameter> parameters = new ArrayList<>();
         for (Item child : inside()) {
@@ -57,29 +51,23 @@ public final class Characteristic extends Item {
         return Collections.unmodifiableList(parameters);
     }
 
-    /**
-     * {@return the characteristics that stand directly in this one: every characteristic, in the
-     * order of the message; not modifiable}
-     */
+    /** {@return the characteristics directly in it, in the order of the message; not modifiable} */
     public List<Characteristic> characteristics() {
         return in(this);
     }
 
     /**
-     * Lists the characteristics of a type that stand directly in this one.
-     *
+     * {@return the characteristics of a type directly in it, in the order of the message; not
+     * modifiable}
      * @param type what TYPE is, in exactly this case
-     * @return all of them, in the order of the message; not modifiable
      */
     public List<Characteristic> characteristics(String type) {
         return in(this, type);
     }
 
     /**
-     * Finds a parameter.
-     *
+     * {@return the first parameter of a name; {@code null} when there is none}
      * @param name what NAME is, in exactly this case
-     * @return the first parameter of that name; {@code null} when there is none
      */
     public Parameter parameter(String name) {
         for (Item child : inside()) {
@@ -91,11 +79,9 @@ public final class Characteristic extends Item {
     }
 
     /**
-     * Tells the value of a parameter.
-     *
+     * {@return the value of the first parameter of a name; {@code null} when there is none, and
+     * when it has no value}
      * @param name what NAME is, in exactly this case
-     * @return the value of the first parameter of that name; {@code null} when there is none, and
-     *     when it has no value
      */
     public String value(String name) {
         Parameter parameter = parameter(name);
@@ -103,11 +89,9 @@ public final class Characteristic extends Item {
     }
 
     /**
-     * Lists the values of all parameters of a name.
-     *
+     * {@return the values of all parameters of a name that have one, in the order of the message;
+     * not modifiable}
      * @param name what NAME is, in exactly this case
-     * @return the values, in the order of the message, without those parameters that have none; not
-     *     modifiable
      */
     public List<String> values(String name) {
         List<String> values = new ArrayList<>();
@@ -170,7 +154,8 @@ public final class Characteristic extends Item {
 
     @Override
     boolean says(Item other) {
-        return other instanceof Characteristic && Objects.equals(type, ((Characteristic) other).type);
+        return other instanceof Characteristic
+                && Objects.equals(type, ((Characteristic) other).type);
     }
 
     @Override

@@ -10,9 +10,6 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class ClientIdentity extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "CLIENTIDENTITY";
-
     ClientIdentity(Characteristic characteristic) {
         super(characteristic);
     }

@@ -21,26 +21,18 @@ final class Describer implements Reading {
         visit(0, header.identifierAt, "WBXML " + header.versionText());
         String type = header.isStated() ? quoted(header.documentType) : "not stated";
         visit(header.identifierAt, header.charsetAt, "document type: " + type);
-        visit(header.charsetAt, header.tableLengthAt, "character set: " + charset(header.charset));
+        CharacterSet charset = header.charset;
+        String name = charset.name() == null ? "number " + charset.number() : charset.name();
+        visit(header.charsetAt, header.tableLengthAt, "character set: " + name);
         int length = header.elementsAt - header.tableAt;
         visit(header.tableLengthAt, header.tableAt, "string table: " + length + " bytes");
-        CharacterSet charset = header.charset;
         for (int from = header.tableAt; from < header.elementsAt; ) {
             int zero = charset.zero(body, from, header.elementsAt);
             int to = Math.min(zero + charset.unit(), header.elementsAt);
-            visit(
-                    from,
-                    to,
-                    "text "
-                            + (from - header.tableAt)
-                            + " of the table: "
-                            + quoted(charset.decode(body, from, zero)));
+            String text = quoted(charset.decode(body, from, zero));
+            visit(from, to, "text " + (from - header.tableAt) + " of the table: " + text);
             from = to;
         }
-    }
-
-    private static String charset(CharacterSet charset) {
-        return charset.name() == null ? "number " + charset.number() : charset.name();
     }
 
     @Override
@@ -61,10 +53,7 @@ final class Describer implements Reading {
 
     @Override
     public void text(int from, int to, Writing writing, String text) {
-        visit(
-                from,
-                to,
-                quoted(text) + ", " + writing.name().toLowerCase(Locale.ROOT));
+        visit(from, to, quoted(text) + ", " + writing.name().toLowerCase(Locale.ROOT));
     }
 
     @Override
@@ -82,20 +71,13 @@ final class Describer implements Reading {
 
     @Override
     public void page(int from, int to, boolean attributes, int page) {
-        visit(
-                from,
-                to,
-                "SWITCH_PAGE: " + (attributes ? "attributes" : "elements") + " by code page " + page);
+        String what = attributes ? "attributes" : "elements";
+        visit(from, to, "SWITCH_PAGE: " + what + " by code page " + page);
     }
 
     @Override
     public void trailing(int from, int to) {
         visit(from, to, "behind the end of the document");
-    }
-
-    @Override
-    public void deviation(int at, Deviation.Kind kind) {
-        // The bytes are told as what they are read as.
     }
 
     private static String quoted(String text) {

@@ -74,9 +74,9 @@ public final class Deviation {
     }
 
     /**
-     * {@return in which element it is, such as {@code wap-provisioningdoc / NAPDEF 1 / BEARER}:
-     * characteristics with their number among those of their type in the same element, counted from
-     * 1: the path, never {@code null}} Of more than eight elements the innermost eight are told.
+     * {@return in which element it is, such as {@code wap-provisioningdoc / NAPDEF 1 / BEARER}: the
+     * innermost eight, characteristics with their number among those of their type in the same
+     * element, counted from 1; never {@code null}}
      */
     public String path() {
         return ItemPath.of(item);

@@ -1,5 +1,6 @@
 package com.qvomacp.eng.omacp;
 
+import com.qvomacp.eng.omacp.Deviation.Kind;
 import java.util.AbstractList;
 import java.util.Arrays;
 import java.util.List;
@@ -61,7 +62,7 @@ final class DeviationFinder implements Reading {
 
         @Override
         public Deviation get(int index) {
-            return new Deviation(at[index], Deviation.Kind.of(kinds[index]), in[index]);
+            return new Deviation(at[index], Kind.of(kinds[index]), in[index]);
         }
 
         @Override
@@ -94,19 +95,16 @@ final class DeviationFinder implements Reading {
         Element outer = open[depth];
         if (depth == 0) {
             if (!rootSeen && element != Element.DOCUMENT) {
-                deviation(from, Deviation.Kind.OTHER_ROOT);
+                deviation(from, Kind.OTHER_ROOT);
             }
             rootSeen = true;
         } else if (outer == Element.PARM) {
-            deviation(from, Deviation.Kind.IN_PARM);
+            deviation(from, Kind.IN_PARM);
         } else if (element == Element.PARM && outer == Element.DOCUMENT) {
-            deviation(from, Deviation.Kind.PARM_OUTSIDE);
+            deviation(from, Kind.PARM_OUTSIDE);
         } else if (element == Element.OTHER) {
-            deviation(
-                    from,
-                    Element.DOCUMENT.text.equals(name)
-                            ? Deviation.Kind.INNER_DOCUMENT
-                            : Deviation.Kind.OTHER_ELEMENT);
+            boolean isDocument = Element.DOCUMENT.text.equals(name);
+            deviation(from, isDocument ? Kind.INNER_DOCUMENT : Kind.OTHER_ELEMENT);
         }
     }
 
@@ -114,26 +112,23 @@ final class DeviationFinder implements Reading {
     public void attribute(int from, int to, Attribute attribute, String name, String value) {
         Element element = open[depth];
         inAttribute = true;
-        if (attribute == element.name) {
-            require(from, !hasName, Deviation.Kind.SECOND_ATTRIBUTE);
-            hasName = true;
-        } else if (attribute == element.value) {
-            require(from, !hasValue, Deviation.Kind.SECOND_ATTRIBUTE);
-            hasValue = true;
-        } else if (element == Element.INSTRUCTION) {
-            require(from, !hasName, Deviation.Kind.SECOND_ATTRIBUTE);
-            hasName = true;
-        } else {
-            deviation(from, Deviation.Kind.OTHER_ATTRIBUTE);
+        boolean isName = attribute == element.name;
+        boolean isValue = attribute == element.value;
+        if (!isName && !isValue && element != Element.INSTRUCTION) {
+            deviation(from, Kind.OTHER_ATTRIBUTE);
+        } else if (isValue ? hasValue : hasName) {
+            deviation(from, Kind.SECOND_ATTRIBUTE);
         }
+        hasValue |= isValue;
+        hasName |= isName || element == Element.INSTRUCTION;
     }
 
     @Override
     public void text(int from, int to, Writing writing, String text) {
-        if (inAttributes) {
-            require(from, inAttribute, Deviation.Kind.VALUE_ALONE);
-        } else {
-            deviation(from, Deviation.Kind.TEXT);
+        if (!inAttributes) {
+            deviation(from, Kind.TEXT);
+        } else if (!inAttribute) {
+            deviation(from, Kind.VALUE_ALONE);
         }
     }
 
@@ -146,8 +141,7 @@ final class DeviationFinder implements Reading {
     @Override
     public void end(int from, int to) {
         if (inAttributes) {
-            requireName(from);
-            inAttributes = false;
+            attributesEnd(from, to);
         }
         --depth;
     }
@@ -155,32 +149,12 @@ final class DeviationFinder implements Reading {
     private void requireName(int from) {
         Element element = open[depth];
         if (!hasName && element.name != null) {
-            deviation(
-                    from,
-                    element == Element.PARM
-                            ? Deviation.Kind.NAME_MISSING
-                            : Deviation.Kind.TYPE_MISSING);
+            deviation(from, element == Element.PARM ? Kind.NAME_MISSING : Kind.TYPE_MISSING);
         }
     }
 
     @Override
-    public void page(int from, int to, boolean attributes, int page) {
-        // A page that the format lacks is told by the tokens that stand on it.
-    }
-
-    @Override
-    public void trailing(int from, int to) {
-        // Told as a deviation.
-    }
-
-    private void require(int at, boolean met, Deviation.Kind kind) {
-        if (!met) {
-            deviation(at, kind);
-        }
-    }
-
-    @Override
-    public void deviation(int at, Deviation.Kind kind) {
+    public void deviation(int at, Kind kind) {
         if (count == kinds.length) {
             this.at = Arrays.copyOf(this.at, 2 * count);
             kinds = Arrays.copyOf(kinds, 2 * count);

@@ -12,9 +12,6 @@ import java.util.List;
  * }</pre>
  */
 public final class Eap extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "EAP";
-
     Eap(Characteristic characteristic) {
         super(characteristic);
     }
@@ -79,8 +76,8 @@ public final class Eap extends TypedCharacteristic {
         return value("PEAP-V2");
     }
 
-    /** {@return every CERT directly in this characteristic: the certificates} */
+    /** {@return every CERT: the certificates} */
     public List<EapCertificate> certificates() {
-        return views(EapCertificate.class, EapCertificate.TYPE);
+        return views(EapCertificate.class, "CERT");
     }
 }

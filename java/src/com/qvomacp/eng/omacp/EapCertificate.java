@@ -11,9 +11,6 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class EapCertificate extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "CERT";
-
     EapCertificate(Characteristic characteristic) {
         super(characteristic);
     }

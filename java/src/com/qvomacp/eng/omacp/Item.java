@@ -45,9 +45,9 @@ public abstract class Item {
     }
 
     /**
-     * {@return what stands in the item: every item, in the order of the message; not modifiable}
-     * The format has parameters and characteristics in a characteristic, and nothing in a
-     * parameter; attributes that it does not have come first.
+     * {@return what stands in the item, in the order of the message; not modifiable} The format has
+     * parameters and characteristics in a characteristic, and nothing in a parameter; attributes
+     * that it does not have come first.
      */
     public final List<Item> children() {
         return Collections.unmodifiableList(Arrays.asList(children));
@@ -73,10 +73,8 @@ public abstract class Item {
     abstract int hash();
 
     /**
-     * Finds out whether another item says the same: it is the same, and so is everything in it.
-     *
+     * {@return whether another item says the same: it is the same, and so is everything in it}
      * @param other what to compare with
-     * @return true when it does
      */
     @Override
     public final boolean equals(Object other) {

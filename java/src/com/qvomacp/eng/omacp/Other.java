@@ -4,8 +4,8 @@ import java.util.Locale;
 import java.util.Objects;
 
 /**
- * What stands in a document and is neither a characteristic nor a parameter. The format has no place
- * for it there, but nothing that was read is left out.
+ * What stands in a document and is neither a characteristic nor a parameter. The format has no
+ * place for it there, but nothing that was read is left out.
  *
  * <pre>{@code
  * for (Item item : document.children()) {
@@ -20,16 +20,12 @@ public final class Other extends Item {
     public enum Kind {
         /** An element of another name; its children stand in it. */
         ELEMENT,
-
         /** An attribute that its element does not have, or has twice. */
         ATTRIBUTE,
-
         /** Text, or a value, in place of an element. */
         TEXT,
-
         /** A processing instruction. */
         INSTRUCTION,
-
         /** Bytes behind the end of the document. */
         TRAILING;
 
@@ -62,17 +58,14 @@ public final class Other extends Item {
     }
 
     /**
-     * {@return the name of an element, an attribute or the target of an instruction: the name; a
-     * printable one for a token that stands for nothing; {@code null} for what has none}
+     * {@return the name of an element, an attribute or the target of an instruction, a printable
+     * one for a token that stands for nothing; {@code null} for what has none}
      */
     public String name() {
         return name;
     }
 
-    /**
-     * {@return the text, or the value of an attribute or instruction: the text; {@code null} for
-     * what has none}
-     */
+    /** {@return the text, or the value of an attribute or instruction; {@code null} for none} */
     public String text() {
         return text;
     }

@@ -3,8 +3,8 @@ package com.qvomacp.eng.omacp;
 import java.util.Objects;
 
 /**
- * A parameter of a provisioning document: a name, such as {@code NAPID}, and a value. The format has
- * nothing in a parm; what stands there all the same is in {@link #children}.
+ * A parameter of a provisioning document: a name, such as {@code NAPID}, and a value. The format
+ * has nothing in a parm; what stands there all the same is in {@link #children}.
  *
  * <pre>{@code
  * for (Parameter parameter : characteristic.parameters()) {
@@ -33,15 +33,12 @@ public final class Parameter extends Item {
         this.valueWriting = Writing.code(valueWriting);
     }
 
-    /**
-     * {@return the name: NAME as the OMA documents write it, such as {@code NAP-ADDRESS}; {@code
-     * null} when the parameter has none}
-     */
+    /** {@return NAME as the OMA documents write it, as {@code NAPID}; {@code null} for none} */
     public String name() {
         return name;
     }
 
-    /** {@return the value: VALUE, which may be empty; {@code null} when the parameter has none} */
+    /** {@return VALUE, which may be empty; {@code null} when the parameter has none} */
     public String value() {
         return value;
     }

@@ -12,9 +12,6 @@ import java.util.List;
  * }</pre>
  */
 public final class PhysicalProxy extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "PXPHYSICAL";
-
     PhysicalProxy(Characteristic characteristic) {
         super(characteristic);
     }
@@ -64,16 +61,13 @@ public final class PhysicalProxy extends TypedCharacteristic {
         return value("PULLENABLED");
     }
 
-    /**
-     * {@return every TO-NAPID: the access points through which the machine is reached, by their
-     *     names}
-     */
+    /** {@return every TO-NAPID: the names of the access points that lead to the machine} */
     public List<String> toNapIds() {
         return values("TO-NAPID");
     }
 
-    /** {@return every PORT directly in this characteristic: the ports of the machine} */
+    /** {@return every PORT: the ports of the machine} */
     public List<Port> ports() {
-        return views(Port.class, Port.TYPE);
+        return views(Port.class, "PORT");
     }
 }

@@ -12,9 +12,6 @@ import java.util.List;
  * }</pre>
  */
 public final class Port extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "PORT";
-
     Port(Characteristic characteristic) {
         super(characteristic);
     }

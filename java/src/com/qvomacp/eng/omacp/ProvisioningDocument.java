@@ -5,8 +5,8 @@ import java.util.List;
 import java.util.Objects;
 
 /**
- * A provisioning document as its body says it: a tree of items in the order of the message. It reads
- * whatever WBXML 1.0 to 1.3 allow, and is immutable.
+ * A provisioning document as its body says it: a tree of items in the order of the message. It
+ * reads whatever WBXML 1.0 to 1.3 allow, and is immutable.
  *
  * <pre>{@code
  * ProvisioningDocument document = ProvisioningDocument.parse(body);
@@ -67,39 +67,30 @@ public final class ProvisioningDocument {
         return document;
     }
 
-    /** {@return the version of WBXML: such as {@code 1.3}} */
+    /** {@return the version of WBXML, such as {@code 1.3}} */
     public String wbxmlVersion() {
         return header.versionText();
     }
 
-    /**
-     * {@return the public identifier of the document type: the number, 11 for a provisioning
-     * document; 0 when it is given as text}
-     */
+    /** {@return the number of the document type: 11 for provisioning, 0 when given as text} */
     public int publicIdentifier() {
         return (int) header.publicIdentifier;
     }
 
     /**
-     * {@return the name of the document type: such as {@code -//WAPFORUM//DTD PROV 1.0//EN}; {@code
+     * {@return the name of the document type, such as {@code -//WAPFORUM//DTD PROV 1.0//EN}; {@code
      * null} when the number stands for none, or the text cannot be had}
      */
     public String documentType() {
         return header.documentType;
     }
 
-    /**
-     * {@return the character set of the texts: the MIBenum that IANA assigns, 106 for UTF-8; 0 when
-     * it is not stated}
-     */
+    /** {@return the MIBenum of the character set, 106 for UTF-8; 0 when it is not stated} */
     public int charset() {
         return (int) header.charset.number();
     }
 
-    /**
-     * {@return the name of the character set: such as {@code UTF-8}; {@code null} when the number
-     * stands for none that is known}
-     */
+    /** {@return the name of the character set, such as {@code UTF-8}; {@code null} if not known} */
     public String charsetName() {
         return header.charset.name();
     }
@@ -109,64 +100,46 @@ public final class ProvisioningDocument {
         return Arrays.copyOfRange(body, header.tableAt, header.elementsAt);
     }
 
-    /**
-     * {@return the version attribute of the document element: such as {@code 1.0}; {@code null}
-     * when there is none}
-     */
+    /** {@return the version of the document element, such as {@code 1.0}; {@code null} for none} */
     public String version() {
         return version;
     }
 
-    /**
-     * {@return what stands in the document element: every item, in the order of the message; not
-     * modifiable}
-     */
+    /** {@return the items in the document element, in the order of the message; not modifiable} */
     public List<Item> children() {
         return root.children();
     }
 
-    /**
-     * {@return the characteristics that stand directly in the document element: every
-     * characteristic, in the order of the message; not modifiable}
-     */
+    /** {@return the characteristics directly in the document element; as {@link #children}} */
     public List<Characteristic> characteristics() {
         return Characteristic.in(root);
     }
 
     /**
-     * Lists the characteristics of a type that stand directly in the document element.
-     *
+     * {@return the characteristics of a type in the document element, as {@link #children}}
      * @param type what TYPE is, in exactly this case
-     * @return all of them, in the order of the message; not modifiable
      */
     public List<Characteristic> characteristics(String type) {
         return Characteristic.in(root, type);
     }
 
     /**
-     * Tells the bytes of an item of this document.
-     *
+     * {@return the bytes of an item: a new array of {@link Item#length} bytes}
      * @param item an item of this document
-     * @return a new array with {@link Item#length} bytes
      */
     public byte[] bytes(Item item) {
         return Arrays.copyOfRange(body, item.offset(), item.offset() + item.length());
     }
 
     /**
-     * Tells the path of an item of this document, as {@link Deviation#path} does.
-     *
+     * {@return the path of an item, as {@link Deviation#path} does; never {@code null}}
      * @param item an item of this document
-     * @return the path, never {@code null}
      */
     public String path(Item item) {
         return ItemPath.of(item);
     }
 
-    /**
-     * {@return where the body departs from the format: every deviation, in the order of the body;
-     * not modifiable, empty when there is none}
-     */
+    /** {@return where the body departs from the format, in its order; not modifiable} */
     public List<Deviation> deviations() {
         DeviationFinder finder = new DeviationFinder(root, body.length);
         read(finder);
@@ -178,11 +151,7 @@ public final class ProvisioningDocument {
         return body.clone();
     }
 
-    /**
-     * Finds out whether the native library takes the body. It is worked out at each call.
-     *
-     * @return the verdict, never {@code null}
-     */
+    /** {@return whether the native library takes the body, worked out at each call} */
     public Verdict verdict() {
         return LibraryRules.verdictOnBody(body, this);
     }
@@ -247,11 +216,9 @@ public final class ProvisioningDocument {
     }
 
     /**
-     * Finds out whether another document says the same: the same version attribute, and the same
-     * items. How it is written does not count.
-     *
+     * {@return whether another document says the same: it has the same version attribute and the
+     * same items, however they are written}
      * @param other what to compare with
-     * @return true when it does
      */
     @Override
     public boolean equals(Object other) {

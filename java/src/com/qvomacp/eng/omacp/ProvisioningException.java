@@ -22,19 +22,14 @@ public final class ProvisioningException extends Exception {
     public enum Reason {
         /** The message is longer than the options allow. */
         INPUT_TOO_LONG,
-
         /** The texts of the document are more than the options allow. */
         TEXT_TOO_LONG,
-
         /** The message does not begin with the header of a push, or ends within it. */
         NO_PUSH_HEADER,
-
         /** The body is no WBXML, or none at all. */
         NO_WBXML,
-
         /** The body is a document of another type. */
         OTHER_DOCUMENT_TYPE,
-
         /** The native library refuses the message, and the options ask for that to count. */
         REFUSED
     }
@@ -89,42 +84,30 @@ public final class ProvisioningException extends Exception {
         }
     }
 
-    /**
-     * {@return why the message is not read: the reason, never {@code null}} {@link #getMessage}
-     * says the same in words.
-     */
+    /** {@return why the message is not read, as {@link #getMessage} says it in words} */
     public Reason reason() {
         return reason;
     }
 
-    /**
-     * {@return the native library's result code for a body that it refuses: {@link Verdict#code}:
-     * the code; 0 for any other reason}
-     */
+    /** {@return {@link Verdict#code} for a body that the library refuses; 0 for another reason} */
     public int code() {
         return code;
     }
 
     /**
-     * {@return where the reading ends: in the message for {@link Reason#NO_PUSH_HEADER} and for a
-     * header that is refused, in the body otherwise: bytes from the start, counted from 0}
+     * {@return where the reading ends: bytes from the start, counted from 0, of the message for
+     * {@link Reason#NO_PUSH_HEADER} and for a header that is refused, of the body otherwise}
      */
     public int offset() {
         return offset;
     }
 
-    /**
-     * {@return in which element the reading ends, as {@link Deviation#path} does: the path; {@code
-     * null} outside a document}
-     */
+    /** {@return the {@link Deviation#path} where reading ends; {@code null} outside a document} */
     public String path() {
         return path;
     }
 
-    /**
-     * {@return what would have been taken where the reading ends: what would have been taken; not
-     * modifiable, empty when that cannot be said}
-     */
+    /** {@return what would have been taken there; not modifiable, empty if it cannot be said} */
     public List<String> expected() {
         return Collections.unmodifiableList(expected);
     }

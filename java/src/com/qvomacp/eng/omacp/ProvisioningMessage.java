@@ -18,7 +18,7 @@ import java.util.List;
  * }</pre>
  *
  * <p>The lists hold the characteristics that stand directly in the document, in the order of the
- * message; {@link #document} has those that stand elsewhere, and whatever else there is.
+ * message, and cannot be modified; {@link #document} has those elsewhere, and all else there is.
  */
 public final class ProvisioningMessage {
     private static final int PUSH = 6;
@@ -63,8 +63,8 @@ public final class ProvisioningMessage {
      *
      * @param body a WBXML body; it is copied
      * @return what it says
-     * @throws ProvisioningException when it is over a limit, is no WBXML, or is a document of another
-     *     type
+     * @throws ProvisioningException when it is over a limit, is no WBXML, or is a document of
+     *     another type
      */
     public static ProvisioningMessage parseBody(byte[] body) throws ProvisioningException {
         return parseBody(body, ReadOptions.DEFAULT);
@@ -124,12 +124,12 @@ public final class ProvisioningMessage {
         return message;
     }
 
-    /** {@return the push header: the header; {@code null} when a body alone was read} */
+    /** {@return the push header; {@code null} when a body alone was read} */
     public PushHeader header() {
         return header;
     }
 
-    /** {@return the document, with all that the message says: the document, never {@code null}} */
+    /** {@return the document, with all that the message says; never {@code null}} */
     public ProvisioningDocument document() {
         return document;
     }
@@ -139,8 +139,8 @@ public final class ProvisioningMessage {
      * out at each call.
      *
      * <p>The library takes whole pushes only. Of headers and body that were read apart it is asked
-     * about the push that has them: three bytes in front of the headers, or four in front of more than
-     * 127, for the offset of a header that is refused.
+     * about the push that has them: three bytes in front of the headers, or four in front of more
+     * than 127, for the offset of a header that is refused.
      *
      * @return the verdict, never {@code null}; that on the body when a body alone was read
      */
@@ -162,7 +162,7 @@ public final class ProvisioningMessage {
         return LibraryRules.verdictOnPush(push, bodyAt, document);
     }
 
-    /** How many bytes stand in front of the headers: identifier, type, and length in bytes of 7 bits. */
+    /** How many bytes stand in front of headers: identifier, type, and length, 7 bits a byte. */
     private static int front(byte[] headers) {
         int front = 3;
         for (int rest = headers.length >>> 7; rest != 0; rest >>>= 7) {
@@ -171,7 +171,7 @@ public final class ProvisioningMessage {
         return front;
     }
 
-    /** Writes a length that ends in front of an offset, the high bit set in all bytes but the last. */
+    /** Writes a length up to an offset, the high bit set in all bytes but the last. */
     private static void putLength(byte[] push, int end, int length) {
         int rest = length;
         for (int at = end - 1; at > 1; --at) {
@@ -181,11 +181,11 @@ public final class ProvisioningMessage {
     }
 
     /**
-     * Checks the MAC by whichever security method the message states: {@link ProvisioningMac#verify}.
+     * Checks the MAC by the method that the message states: {@link ProvisioningMac#verify}.
      *
      * @param pin what the user has been told; may be {@code null} for NETWPIN
-     * @param imsi the subscriber's number, 1 to 15 digits; may be {@code null} unless the method has
-     *     NETWPIN in its name
+     * @param imsi the subscriber's number, 1 to 15 digits; may be {@code null} unless the method
+     *     has NETWPIN in its name
      * @return what comes of it, never {@code null}; {@link MacResult#NO_METHOD} for a body alone
      */
     public MacResult verifyMac(String pin, String imsi) {
@@ -209,79 +209,55 @@ public final class ProvisioningMessage {
                         header.securityMethod(), header.mac(), document.bytes(), key);
     }
 
-    /** {@return the proxies: every PXLOGICAL, in the order of the message; not modifiable} */
+    /** {@return the proxies: every PXLOGICAL} */
     public List<Proxy> proxies() {
-        return views(Proxy.class, Proxy.TYPE);
+        return views(Proxy.class, "PXLOGICAL");
     }
 
-    /**
-     * {@return the network access points: every NAPDEF, in the order of the message; not
-     * modifiable}
-     */
+    /** {@return the network access points: every NAPDEF} */
     public List<AccessPoint> accessPoints() {
-        return views(AccessPoint.class, AccessPoint.TYPE);
+        return views(AccessPoint.class, "NAPDEF");
     }
 
-    /**
-     * {@return where further provisioning comes from: every BOOTSTRAP, in the order of the message;
-     * not modifiable}
-     */
+    /** {@return where further provisioning comes from: every BOOTSTRAP} */
     public List<Bootstrap> bootstraps() {
-        return views(Bootstrap.class, Bootstrap.TYPE);
+        return views(Bootstrap.class, "BOOTSTRAP");
     }
 
-    /**
-     * {@return the identities that the client gets: every CLIENTIDENTITY, in the order of the
-     * message; not modifiable}
-     */
+    /** {@return the identities that the client gets: every CLIENTIDENTITY} */
     public List<ClientIdentity> clientIdentities() {
-        return views(ClientIdentity.class, ClientIdentity.TYPE);
+        return views(ClientIdentity.class, "CLIENTIDENTITY");
     }
 
-    /**
-     * {@return the identity that the client gets: CLIENT-ID of the first CLIENTIDENTITY; {@code
-     * null} when it is not set}
-     */
+    /** {@return CLIENT-ID of the first CLIENTIDENTITY; {@code null} when it is not set} */
     public String clientId() {
         List<ClientIdentity> identities = clientIdentities();
         return identities.isEmpty() ? null : identities.get(0).clientId();
     }
 
-    /**
-     * {@return what vendors' own software is told: every VENDORCONFIG, in the order of the message;
-     * not modifiable}
-     */
+    /** {@return what vendors' own software is told: every VENDORCONFIG} */
     public List<VendorConfiguration> vendorConfigurations() {
-        return views(VendorConfiguration.class, VendorConfiguration.TYPE);
+        return views(VendorConfiguration.class, "VENDORCONFIG");
     }
 
-    /**
-     * {@return the settings of applications: every APPLICATION, in the order of the message; not
-     * modifiable}
-     */
+    /** {@return the settings of applications: every APPLICATION} */
     public List<Application> applications() {
-        return views(Application.class, Application.TYPE);
+        return views(Application.class, "APPLICATION");
     }
 
-    /**
-     * {@return which traffic takes which way: every ACCESS, in the order of the message; not
-     * modifiable}
-     */
+    /** {@return which traffic takes which way: every ACCESS} */
     public List<AccessRule> accessRules() {
-        return views(AccessRule.class, AccessRule.TYPE);
+        return views(AccessRule.class, "ACCESS");
     }
 
-    /** {@return the Wi-Fi networks: every WI-FI, in the order of the message; not modifiable} */
+    /** {@return the Wi-Fi networks: every WI-FI} */
     public List<Wifi> wifis() {
-        return views(Wifi.class, Wifi.TYPE);
+        return views(Wifi.class, "WI-FI");
     }
 
-    /**
-     * {@return the settings for voice over Wi-Fi: every such characteristic, in the order of the
-     * message; not modifiable}
-     */
+    /** {@return the settings for voice over Wi-Fi: every such characteristic} */
     public List<VoWifi> voWifis() {
-        return views(VoWifi.class, VoWifi.TYPE);
+        return views(VoWifi.class, "Vodafone VoWiFi");
     }
 
     private <V> List<V> views(Class<V> kind, String type) {
@@ -289,10 +265,9 @@ public final class ProvisioningMessage {
     }
 
     /**
-     * Compares what two messages say.
-     *
+     * {@return whether another message says the same: it has an equal header, or none either, and
+     * an equal document}
      * @param other what to compare with
-     * @return true for a message with an equal header, or none either, and an equal document
      */
     @Override
     public boolean equals(Object other) {
@@ -310,34 +285,18 @@ public final class ProvisioningMessage {
         return 31 * (header == null ? 0 : header.hashCode()) + document.hashCode();
     }
 
-    /**
-     * Shows how much is set, in one line without any value and without the MAC, which may go to a
-     * log.
-     *
-     * @return one line of text
-     */
+    /** {@return how much is set, in one line without any value or MAC, which may go to a log} */
     @Override
     public String toString() {
-        return "ProvisioningMessage{"
-                + (header == null ? "" : "securityMethod=" + header.securityMethod() + ", ")
-                + "proxies="
-                + proxies().size()
-                + ", accessPoints="
-                + accessPoints().size()
-                + ", bootstraps="
-                + bootstraps().size()
-                + ", clientIdentities="
-                + clientIdentities().size()
-                + ", vendorConfigurations="
-                + vendorConfigurations().size()
-                + ", applications="
-                + applications().size()
-                + ", accessRules="
-                + accessRules().size()
-                + ", wifis="
-                + wifis().size()
-                + ", voWifis="
-                + voWifis().size()
-                + "}";
+        String method = header == null ? "" : "securityMethod=" + header.securityMethod() + ", ";
+        return "ProvisioningMessage{" + method + "proxies=" + proxies().size()
+                + ", accessPoints=" + accessPoints().size()
+                + ", bootstraps=" + bootstraps().size()
+                + ", clientIdentities=" + clientIdentities().size()
+                + ", vendorConfigurations=" + vendorConfigurations().size()
+                + ", applications=" + applications().size()
+                + ", accessRules=" + accessRules().size()
+                + ", wifis=" + wifis().size()
+                + ", voWifis=" + voWifis().size() + "}";
     }
 }

@@ -15,9 +15,6 @@ import java.util.List;
  * }</pre>
  */
 public final class Proxy extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "PXLOGICAL";
-
     Proxy(Characteristic characteristic) {
         super(characteristic);
     }
@@ -52,10 +49,7 @@ public final class Proxy extends TypedCharacteristic {
         return values("DOMAIN");
     }
 
-    /**
-     * {@return whether TRUST stands here, with or without a value: by the standard, whether the
-     *     proxy is trusted to provision}
-     */
+    /** {@return whether TRUST stands here: by the standard, the proxy is trusted to provision} */
     public boolean hasTrust() {
         return has("TRUST");
     }
@@ -65,10 +59,7 @@ public final class Proxy extends TypedCharacteristic {
         return value("TRUST");
     }
 
-    /**
-     * {@return whether MASTER stands here, with or without a value: by the standard, whether the
-     *     proxy is the master of its navigation domain}
-     */
+    /** {@return whether MASTER stands here: by the standard, it leads its navigation domain} */
     public boolean hasMaster() {
         return has("MASTER");
     }
@@ -108,24 +99,18 @@ public final class Proxy extends TypedCharacteristic {
         return value("PULLENABLED");
     }
 
-    /**
-     * {@return every PXAUTHINFO directly in this characteristic: how to authenticate towards the
-     *     proxy}
-     */
+    /** {@return every PXAUTHINFO: how to authenticate towards the proxy} */
     public List<ProxyAuthentication> authentications() {
-        return views(ProxyAuthentication.class, ProxyAuthentication.TYPE);
+        return views(ProxyAuthentication.class, "PXAUTHINFO");
     }
 
-    /**
-     * {@return every PORT directly in this characteristic: the ports that hold for every physical
-     *     proxy without ports of its own}
-     */
+    /** {@return every PORT: the ports of each physical proxy that has none of its own} */
     public List<Port> ports() {
-        return views(Port.class, Port.TYPE);
+        return views(Port.class, "PORT");
     }
 
-    /** {@return every PXPHYSICAL directly in this characteristic: the machines behind the proxy} */
+    /** {@return every PXPHYSICAL: the machines behind the proxy} */
     public List<PhysicalProxy> physicalProxies() {
-        return views(PhysicalProxy.class, PhysicalProxy.TYPE);
+        return views(PhysicalProxy.class, "PXPHYSICAL");
     }
 }

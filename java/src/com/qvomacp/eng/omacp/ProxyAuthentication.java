@@ -10,9 +10,6 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class ProxyAuthentication extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "PXAUTHINFO";
-
     ProxyAuthentication(Characteristic characteristic) {
         super(characteristic);
     }

@@ -22,14 +22,14 @@ public final class ReadOptions {
         this.acceptedOnly = acceptedOnly;
     }
 
-    /** {@return how long a message or body may be: bytes} */
+    /** {@return how many bytes long a message or body may be} */
     public int inputLimit() {
         return inputLimit;
     }
 
     /**
-     * {@return how much text a document may hold, references to the string table counted each time:
-     * bytes of text, as the body writes it}
+     * {@return how many bytes of text, as the body writes it, a document may hold, references to
+     * the string table counted each time}
      */
     public int textLimit() {
         return textLimit;
@@ -41,10 +41,8 @@ public final class ReadOptions {
     }
 
     /**
-     * Changes how long a message or body may be.
-     *
+     * {@return the options with another limit for how long a message or body may be}
      * @param bytes the longest length that is read
-     * @return the changed options
      * @throws IllegalArgumentException for a negative number
      */
     public ReadOptions withInputLimit(int bytes) {
@@ -52,10 +50,8 @@ public final class ReadOptions {
     }
 
     /**
-     * Changes how much text a document may hold.
-     *
+     * {@return the options with another limit for how much text a document may hold}
      * @param bytes the most that is read, of text as the body writes it
-     * @return the changed options
      * @throws IllegalArgumentException for a negative number
      */
     public ReadOptions withTextLimit(int bytes) {
@@ -63,10 +59,8 @@ public final class ReadOptions {
     }
 
     /**
-     * Changes whether a message that the native library refuses is refused.
-     *
+     * {@return the options with or without refusing what the native library refuses}
      * @param only true to have it refused
-     * @return the changed options
      */
     public ReadOptions withAcceptedOnly(boolean only) {
         return new ReadOptions(inputLimit, textLimit, only);

@@ -3,7 +3,7 @@ package com.qvomacp.eng.omacp;
 /**
  * Hears what a {@link BodyReader} reads, in order of the bytes and without a gap: each call is told
  * where its bytes begin and where they end, counted from the start of the body. The tree is one
- * listener, the deviations and the listing of every byte are others.
+ * listener, the deviations and the listing of every byte are others; none needs all that is told.
  */
 interface Reading {
     /** An element or an instruction begins, in the one that has not ended yet. */
@@ -37,11 +37,11 @@ interface Reading {
     void end(int from, int to);
 
     /** Another code page is in force, for elements or for attributes. */
-    void page(int from, int to, boolean attributes, int page);
+    default void page(int from, int to, boolean attributes, int page) {}
 
     /** The document has ended, and these bytes follow. */
-    void trailing(int from, int to);
+    default void trailing(int from, int to) {}
 
     /** Something departs from the format. It is told before the bytes that it is in. */
-    void deviation(int at, Deviation.Kind kind);
+    default void deviation(int at, Deviation.Kind kind) {}
 }

@@ -10,9 +10,6 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class Resource extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "RESOURCE";
-
     Resource(Characteristic characteristic) {
         super(characteristic);
     }
@@ -52,10 +49,7 @@ public final class Resource extends TypedCharacteristic {
         return value("AAUTHDATA");
     }
 
-    /**
-     * {@return whether STARTPAGE stands here, with or without a value: by the standard, whether
-     *     this is the resource to begin with}
-     */
+    /** {@return whether STARTPAGE stands here: by the standard, this is where to begin} */
     public boolean hasStartPage() {
         return has("STARTPAGE");
     }

@@ -10,9 +10,6 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class Roaming extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "ROAMING";
-
     Roaming(Characteristic characteristic) {
         super(characteristic);
     }

@@ -10,9 +10,6 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class SecondarySsid extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "SEC-SSID";
-
     SecondarySsid(Characteristic characteristic) {
         super(characteristic);
     }
@@ -22,7 +19,7 @@ public final class SecondarySsid extends TypedCharacteristic {
         return value("S-SSID");
     }
 
-    /** {@return whether S-U-SSID stands here, with or without a value} */
+    /** {@return whether S-U-SSID stands here} */
     public boolean hasUse() {
         return has("S-U-SSID");
     }

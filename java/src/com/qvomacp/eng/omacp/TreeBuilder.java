@@ -13,12 +13,15 @@ final class TreeBuilder implements Reading {
     private static final int FRAMES = 8;
     private static final int ITEMS = 16;
 
-    /** What is known of an element whose content is read. Frames are used again. */
+    /** What is known of an element that has not ended. Frames are used again. */
     private static final class Frame {
         Element element;
         String elementName;
         int from;
+
+        /** How many items waited when the element began. */
         int waited;
+
         String name;
         Writing nameWriting;
         String value;
@@ -28,24 +31,15 @@ final class TreeBuilder implements Reading {
     /** Deeper ones are let go of when their element ends: its item takes their place in memory. */
     private static final int KEPT_FRAMES = 64;
 
+    /** The elements whose content is read, and behind them the one whose attributes are. */
     private Frame[] frames = new Frame[FRAMES];
+
     private int depth;
 
-    /** What is known of the element whose attributes are read, or that ends. */
-    private Element element;
+    /** The element whose attributes are read, or that ends. */
+    private Frame frame;
 
-    private String elementName;
-    private int from;
-
-    /** How many items waited when the element began. */
-    private int waited;
-
-    private String name;
-    private Writing nameWriting;
-    private String value;
-    private Writing valueWriting;
-
-    /** Whether attributes are read. An element that has nothing else needs no frame. */
+    /** Whether attributes are read. An element that has nothing else is never one of those open. */
     private boolean inAttributes;
 
     private Item[] waiting = new Item[ITEMS];
@@ -78,14 +72,8 @@ final class TreeBuilder implements Reading {
     /** The document element, with everything that was read. */
     Other root() {
         finishText();
-        return new Other(
-                rootFrom,
-                rootTo,
-                Arrays.copyOf(waiting, waits),
-                Other.Kind.ELEMENT,
-                rootName,
-                null,
-                null);
+        Item[] inside = Arrays.copyOf(waiting, waits);
+        return new Other(rootFrom, rootTo, inside, Other.Kind.ELEMENT, rootName, null, null);
     }
 
     /** The version attribute of the document element, or {@code null}. */
@@ -96,51 +84,23 @@ final class TreeBuilder implements Reading {
     @Override
     public void element(int from, int to, Element element, String name, boolean attributes) {
         finishText();
-        this.from = from;
-        this.element = element;
-        elementName = name;
-        waited = waits;
-        this.name = null;
-        value = null;
-        inAttributes = true;
-        if (!attributes) {
-            push();
-        }
-    }
-
-    private void push() {
-        inAttributes = false;
         if (depth == frames.length) {
             frames = Arrays.copyOf(frames, 2 * depth);
         }
-        Frame frame = frames[depth];
+        frame = frames[depth];
         if (frame == null) {
             frame = new Frame();
             frames[depth] = frame;
         }
-        ++depth;
         frame.element = element;
-        frame.elementName = elementName;
+        frame.elementName = name;
         frame.from = from;
-        frame.waited = waited;
-        frame.name = name;
-        frame.nameWriting = nameWriting;
-        frame.value = value;
-        frame.valueWriting = valueWriting;
-    }
-
-    private void pop() {
-        Frame frame = frames[--depth];
-        element = frame.element;
-        elementName = frame.elementName;
-        from = frame.from;
-        waited = frame.waited;
-        name = frame.name;
-        nameWriting = frame.nameWriting;
-        value = frame.value;
-        valueWriting = frame.valueWriting;
-        if (depth >= KEPT_FRAMES) {
-            frames[depth] = null;
+        frame.waited = waits;
+        frame.name = null;
+        frame.value = null;
+        inAttributes = attributes;
+        if (!attributes) {
+            ++depth;
         }
     }
 
@@ -205,16 +165,15 @@ final class TreeBuilder implements Reading {
     }
 
     private void finishAttribute(String whole) {
-        if (attribute == element.name && name == null) {
-            name = whole;
-            nameWriting = writing;
-        } else if (attribute == element.value && value == null) {
-            value = whole;
-            valueWriting = writing;
-        } else if (element == Element.INSTRUCTION && name == null) {
-            name = attribute.name(attributeName);
-            value = whole;
-            valueWriting = writing;
+        Element element = frame.element;
+        boolean isTarget = element == Element.INSTRUCTION && frame.name == null;
+        if (attribute == element.name && frame.name == null) {
+            frame.name = whole;
+            frame.nameWriting = writing;
+        } else if (isTarget || attribute == element.value && frame.value == null) {
+            frame.name = isTarget ? attribute.name(attributeName) : frame.name;
+            frame.value = whole;
+            frame.valueWriting = writing;
         } else {
             Other.Kind kind = Other.Kind.ATTRIBUTE;
             String called = attribute.name(attributeName);
@@ -231,61 +190,57 @@ final class TreeBuilder implements Reading {
     @Override
     public void attributesEnd(int from, int to) {
         finishText();
-        push();
+        inAttributes = false;
+        ++depth;
     }
 
     @Override
     public void end(int from, int to) {
         finishText();
         if (!inAttributes) {
-            pop();
+            frame = frames[--depth];
+            if (depth >= KEPT_FRAMES) {
+                frames[depth] = null;
+            }
         }
         inAttributes = false;
-        if (element == Element.DOCUMENT) {
+        if (frame.element == Element.DOCUMENT) {
             // What stands in it waits on, for the document as a whole.
-            rootFrom = this.from;
+            rootFrom = frame.from;
             rootTo = to;
-            rootName = elementName;
-            version = value;
+            rootName = frame.elementName;
+            version = frame.value;
             return;
         }
         Item[] inside = Item.NONE;
-        if (waits > waited) {
-            inside = Arrays.copyOfRange(waiting, waited, waits);
-            waits = waited;
+        if (waits > frame.waited) {
+            inside = Arrays.copyOfRange(waiting, frame.waited, waits);
+            waits = frame.waited;
         }
-        add(item(to, inside));
+        add(item(frame, to, inside));
     }
 
-    private Item item(int to, Item[] inside) {
-        Writing ofName = name == null ? null : nameWriting;
-        Writing ofValue = value == null ? null : valueWriting;
-        if (element == Element.PARM) {
-            return new Parameter(from, to, inside, name, ofName, value, ofValue);
+    private static Item item(Frame of, int to, Item[] inside) {
+        Writing ofName = of.name == null ? null : of.nameWriting;
+        Writing ofValue = of.value == null ? null : of.valueWriting;
+        if (of.element == Element.PARM) {
+            return new Parameter(of.from, to, inside, of.name, ofName, of.value, ofValue);
         }
-        if (element == Element.CHARACTERISTIC) {
-            return new Characteristic(from, to, inside, name, ofName);
+        if (of.element == Element.CHARACTERISTIC) {
+            return new Characteristic(of.from, to, inside, of.name, ofName);
         }
-        if (element == Element.INSTRUCTION) {
-            return new Other(from, to, inside, Other.Kind.INSTRUCTION, name, value, ofValue);
+        if (of.element == Element.INSTRUCTION) {
+            Other.Kind kind = Other.Kind.INSTRUCTION;
+            return new Other(of.from, to, inside, kind, of.name, of.value, ofValue);
         }
-        return new Other(from, to, inside, Other.Kind.ELEMENT, elementName, null, null);
-    }
-
-    @Override
-    public void page(int from, int to, boolean attributes, int page) {
-        // Names are told as texts.
+        Other.Kind kind = Other.Kind.ELEMENT;
+        return new Other(of.from, to, inside, kind, of.elementName, null, null);
     }
 
     @Override
     public void trailing(int from, int to) {
         finishText();
         add(new Other(from, to, Item.NONE, Other.Kind.TRAILING, null, null, null));
-    }
-
-    @Override
-    public void deviation(int at, Deviation.Kind kind) {
-        // Deviations are looked for when somebody asks for them.
     }
 
     private void add(Item item) {

@@ -5,13 +5,15 @@ import java.util.Collections;
 import java.util.List;
 
 /**
- * A characteristic of a kind that is known, with an accessor for each parameter of its kind. It is a
- * view of the tree and holds nothing of its own: what it has no accessor for is within reach by
+ * A characteristic of a kind that is known, with an accessor for each parameter of its kind. It is
+ * a view of the tree and holds nothing of its own: what it has no accessor for is within reach by
  * {@link #characteristic}.
  *
- * <p>An accessor for one value answers that of the first parameter of its name, {@code null} when there
- * is none and when it has no value. One for several answers all, in the order of the message, in a list
- * that cannot be modified and is empty when there is none.
+ * <p>An accessor for one value answers that of the first parameter of its name, {@code null} when
+ * there is none and when it has no value; whether there is one, with or without a value, is told by
+ * those that begin with {@code has}. One for several answers all, in the order of the message, in a
+ * list that cannot be modified and is empty when there is none. What stands in inner
+ * characteristics is theirs.
  *
  * <pre>{@code
  * for (AccessPoint accessPoint : message.accessPoints()) {
@@ -27,64 +29,40 @@ public abstract class TypedCharacteristic {
     }
 
     /**
-     * The view of a characteristic of a type. A switch: for the first method reference a new virtual
-     * machine takes longer than for everything else of a message; and not of the classes' own type,
-     * for which it would load them all.
+     * The view of a characteristic of a type. A switch: for the first method reference a new
+     * virtual machine takes longer than for everything else of a message; and not of the classes'
+     * own type, for which it would load them all.
      */
-    private static Object of(String type, Characteristic characteristic) {
+    private static Object of(String type, Characteristic in) {
         switch (type) {
-            case AccessPoint.TYPE:
-                return new AccessPoint(characteristic);
-            case AccessPointAuthentication.TYPE:
-                return new AccessPointAuthentication(characteristic);
-            case AccessRule.TYPE:
-                return new AccessRule(characteristic);
-            case Application.TYPE:
-                return new Application(characteristic);
-            case ApplicationAddress.TYPE:
-                return new ApplicationAddress(characteristic);
-            case ApplicationAuthentication.TYPE:
-                return new ApplicationAuthentication(characteristic);
-            case Bootstrap.TYPE:
-                return new Bootstrap(characteristic);
-            case ClientIdentity.TYPE:
-                return new ClientIdentity(characteristic);
-            case Eap.TYPE:
-                return new Eap(characteristic);
-            case EapCertificate.TYPE:
-                return new EapCertificate(characteristic);
-            case PhysicalProxy.TYPE:
-                return new PhysicalProxy(characteristic);
-            case Port.TYPE:
-                return new Port(characteristic);
-            case Proxy.TYPE:
-                return new Proxy(characteristic);
-            case ProxyAuthentication.TYPE:
-                return new ProxyAuthentication(characteristic);
-            case Resource.TYPE:
-                return new Resource(characteristic);
-            case Roaming.TYPE:
-                return new Roaming(characteristic);
-            case SecondarySsid.TYPE:
-                return new SecondarySsid(characteristic);
-            case Validity.TYPE:
-                return new Validity(characteristic);
-            case VendorConfiguration.TYPE:
-                return new VendorConfiguration(characteristic);
-            case VoWifi.TYPE:
-                return new VoWifi(characteristic);
-            case WepKey.TYPE:
-                return new WepKey(characteristic);
-            case Wifi.TYPE:
-                return new Wifi(characteristic);
-            case Wlan.TYPE:
-                return new Wlan(characteristic);
-            default:
-                throw new AssertionError(type);
+            case "NAPDEF": return new AccessPoint(in);
+            case "NAPAUTHINFO": return new AccessPointAuthentication(in);
+            case "ACCESS": return new AccessRule(in);
+            case "APPLICATION": return new Application(in);
+            case "APPADDR": return new ApplicationAddress(in);
+            case "APPAUTH": return new ApplicationAuthentication(in);
+            case "BOOTSTRAP": return new Bootstrap(in);
+            case "CLIENTIDENTITY": return new ClientIdentity(in);
+            case "EAP": return new Eap(in);
+            case "CERT": return new EapCertificate(in);
+            case "PXPHYSICAL": return new PhysicalProxy(in);
+            case "PORT": return new Port(in);
+            case "PXLOGICAL": return new Proxy(in);
+            case "PXAUTHINFO": return new ProxyAuthentication(in);
+            case "RESOURCE": return new Resource(in);
+            case "ROAMING": return new Roaming(in);
+            case "SEC-SSID": return new SecondarySsid(in);
+            case "VALIDITY": return new Validity(in);
+            case "VENDORCONFIG": return new VendorConfiguration(in);
+            case "Vodafone VoWiFi": return new VoWifi(in);
+            case "WEPKEY": return new WepKey(in);
+            case "WI-FI": return new Wifi(in);
+            case "WLAN": return new Wlan(in);
+            default: throw new AssertionError(type);
         }
     }
 
-    /** A view of each characteristic of a type directly in an item, in a list that stays as it is. */
+    /** A view of each characteristic of a type directly in an item, in a list that stays so. */
     static <V> List<V> views(Item item, Class<V> kind, String type) {
         // Most messages lack most kinds: the list is made for the first.
         List<V> views = Collections.emptyList();
@@ -99,10 +77,7 @@ public abstract class TypedCharacteristic {
         return views.isEmpty() ? views : Collections.unmodifiableList(views);
     }
 
-    /**
-     * {@return the characteristic, with everything that stands in it: the characteristic of the
-     * tree, never {@code null}}
-     */
+    /** {@return the characteristic of the tree, with everything in it; never {@code null}} */
     public final Characteristic characteristic() {
         return characteristic;
     }
@@ -124,10 +99,8 @@ public abstract class TypedCharacteristic {
     }
 
     /**
-     * Compares what is set.
-     *
+     * {@return whether the other object is of the same class and its characteristic equal}
      * @param other what to compare with
-     * @return true for an object of the same class whose characteristic is equal
      */
     @Override
     public final boolean equals(Object other) {
@@ -142,18 +115,12 @@ public abstract class TypedCharacteristic {
         return characteristic.hashCode();
     }
 
-    /**
-     * Shows how much is set, in one line without any value, which may go to a log.
-     *
-     * @return one line of text
-     */
+    /** {@return how much is set, in one line without any value, which may go to a log} */
     @Override
     public final String toString() {
-        return getClass().getSimpleName()
-                + "{parameters="
-                + characteristic.parameters().size()
-                + ", characteristics="
-                + characteristic.characteristics().size()
-                + "}";
+        int parameters = characteristic.parameters().size();
+        int inner = characteristic.characteristics().size();
+        String kind = getClass().getSimpleName();
+        return kind + "{parameters=" + parameters + ", characteristics=" + inner + "}";
     }
 }

@@ -10,9 +10,6 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class Validity extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "VALIDITY";
-
     Validity(Characteristic characteristic) {
         super(characteristic);
     }

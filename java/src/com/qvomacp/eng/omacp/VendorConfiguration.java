@@ -15,9 +15,6 @@ import java.util.List;
  * }</pre>
  */
 public final class VendorConfiguration extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "VENDORCONFIG";
-
     VendorConfiguration(Characteristic characteristic) {
         super(characteristic);
     }
@@ -27,19 +24,14 @@ public final class VendorConfiguration extends TypedCharacteristic {
         return value("NAME");
     }
 
-    /**
-     * {@return the parameters by their names, NAME included: every parameter, in the order of the
-     * message; not modifiable}
-     */
+    /** {@return every parameter, NAME included, in the order of the message; not modifiable} */
     public List<Parameter> parameters() {
         return characteristic().parameters();
     }
 
     /**
-     * Finds a parameter.
-     *
+     * {@return the first parameter of a name; {@code null} when there is none}
      * @param name what NAME is, in exactly this case
-     * @return the first parameter of that name; {@code null} when there is none
      */
     public Parameter parameter(String name) {
         return characteristic().parameter(name);

@@ -10,9 +10,6 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class VoWifi extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "Vodafone VoWiFi";
-
     VoWifi(Characteristic characteristic) {
         super(characteristic);
     }

@@ -10,9 +10,6 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class WepKey extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "WEPKEY";
-
     WepKey(Characteristic characteristic) {
         super(characteristic);
     }

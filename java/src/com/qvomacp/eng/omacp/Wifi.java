@@ -10,9 +10,6 @@ package com.qvomacp.eng.omacp;
  * }</pre>
  */
 public final class Wifi extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "WI-FI";
-
     Wifi(Characteristic characteristic) {
         super(characteristic);
     }

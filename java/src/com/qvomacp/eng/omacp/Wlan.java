@@ -12,9 +12,6 @@ import java.util.List;
  * }</pre>
  */
 public final class Wlan extends TypedCharacteristic {
-    /** The type of such a characteristic. */
-    static final String TYPE = "WLAN";
-
     Wlan(Characteristic characteristic) {
         super(characteristic);
     }
@@ -24,7 +21,7 @@ public final class Wlan extends TypedCharacteristic {
         return value("PRI-SSID");
     }
 
-    /** {@return whether PRI-U-SSID stands here, with or without a value} */
+    /** {@return whether PRI-U-SSID stands here} */
     public boolean hasPrimarySsidUse() {
         return has("PRI-U-SSID");
     }
@@ -34,7 +31,7 @@ public final class Wlan extends TypedCharacteristic {
         return value("PRI-U-SSID");
     }
 
-    /** {@return whether PRI-H-SSID stands here, with or without a value} */
+    /** {@return whether PRI-H-SSID stands here} */
     public boolean hasPrimarySsidHidden() {
         return has("PRI-H-SSID");
     }
@@ -44,9 +41,9 @@ public final class Wlan extends TypedCharacteristic {
         return value("PRI-H-SSID");
     }
 
-    /** {@return every SEC-SSID directly in this characteristic: further names of networks} */
+    /** {@return every SEC-SSID: further names of networks} */
     public List<SecondarySsid> secondarySsids() {
-        return views(SecondarySsid.class, SecondarySsid.TYPE);
+        return views(SecondarySsid.class, "SEC-SSID");
     }
 
     /** {@return NETMODE: whether the network has an access point} */
@@ -99,13 +96,13 @@ public final class Wlan extends TypedCharacteristic {
         return value("FORW-SET");
     }
 
-    /** {@return every EAP directly in this characteristic: how to authenticate by EAP} */
+    /** {@return every EAP: how to authenticate by EAP} */
     public List<Eap> eaps() {
-        return views(Eap.class, Eap.TYPE);
+        return views(Eap.class, "EAP");
     }
 
-    /** {@return every WEPKEY directly in this characteristic: the WEP keys} */
+    /** {@return every WEPKEY: the WEP keys} */
     public List<WepKey> wepKeys() {
-        return views(WepKey.class, WepKey.TYPE);
+        return views(WepKey.class, "WEPKEY");
     }
 }

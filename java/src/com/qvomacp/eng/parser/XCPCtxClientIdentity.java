@@ -13,9 +13,8 @@ public class XCPCtxClientIdentity {
     public XCPCtxClientIdentity() {}
 
     /**
-     * The CLIENT-ID of the CLIENTIDENTITY.
-     *
-     * @return its text; {@code null} when there is no CLIENTIDENTITY or it sets no CLIENT-ID
+     * {@return the CLIENT-ID of the CLIENTIDENTITY: its text; {@code null} when there is no
+     * CLIENTIDENTITY or it sets no CLIENT-ID}
      */
     public native String qvomacp_GetPxClientIdentityData();
 }

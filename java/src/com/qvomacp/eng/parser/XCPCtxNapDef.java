@@ -19,25 +19,21 @@ public class XCPCtxNapDef {
     public XCPCtxNapDef() {}
 
     /**
-     * {@return the number of the NAPDEF of the message, from the one on that {@link
-     * #qvomacp_SetPxNapDefIndex} has made the first: their number}
+     * {@return the number of the NAPDEF of the message, from the one on that
+     * {@link #qvomacp_SetPxNapDefIndex} has made the first}
      */
     public native int qvomacp_GetPxNapDefCount();
 
     /**
-     * Counts the DNS-ADDR values of an access point.
-     *
+     * {@return the number of DNS-ADDR values of an access point}
      * @param napDef NAPDEF, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxDnsAddrCount(int napDef);
 
     /**
-     * One DNS-ADDR of an access point.
-     *
+     * {@return one DNS-ADDR of an access point: its text, or {@code null}}
      * @param napDef NAPDEF, from 1
      * @param address DNS-ADDR of that access point, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxDnsAddrData(int napDef, int address);
 
@@ -77,10 +73,8 @@ public class XCPCtxNapDef {
     public native String qvomacp_GetPxBearerData(int napDef, int bearer);
 
     /**
-     * Counts the NAPAUTHINFO of an access point.
-     *
+     * {@return the number of NAPAUTHINFO of an access point}
      * @param napDef NAPDEF, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxNapAuthInfoCount(int napDef);
 
@@ -99,39 +93,31 @@ public class XCPCtxNapDef {
     public native String[] qvomacp_GetPxNapAuthInfoData(int napDef, int authInfo);
 
     /**
-     * Counts the AUTH-ENTITY values of a NAPAUTHINFO.
-     *
+     * {@return the number of AUTH-ENTITY values of a NAPAUTHINFO}
      * @param napDef NAPDEF, from 1
      * @param authInfo NAPAUTHINFO of that access point, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxNapAuthEntityCount(int napDef, int authInfo);
 
     /**
-     * One AUTH-ENTITY of a NAPAUTHINFO.
-     *
+     * {@return one AUTH-ENTITY of a NAPAUTHINFO: its text, or {@code null}}
      * @param napDef NAPDEF, from 1
      * @param authInfo NAPAUTHINFO of that access point, from 1
      * @param entity AUTH-ENTITY of that NAPAUTHINFO, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxAuthInfopAuthEntityData(int napDef, int authInfo, int entity);
 
     /**
-     * Counts the VALIDITY of an access point.
-     *
+     * {@return the number of VALIDITY of an access point}
      * @param napDef NAPDEF, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxNapValidityCount(int napDef);
 
     /**
-     * One VALIDITY of an access point.
-     *
+     * {@return one VALIDITY of an access point in 6 elements: 0 COUNTRY, 1 NETWORK, 2 SID, 3 SOC, 4
+     * VALIDUNTIL, 5 always {@code null}; or {@code null}}
      * @param napDef NAPDEF, from 1
      * @param validity VALIDITY of that access point, from 1
-     * @return 6 elements: 0 COUNTRY, 1 NETWORK, 2 SID, 3 SOC, 4 VALIDUNTIL, 5 always {@code null};
-     *     or {@code null}
      */
     public native String[] qvomacp_GetPxValidityData(int napDef, int validity);
 

@@ -40,58 +40,46 @@ public class XCPCtxParser {
     public native void qvomacp_parser_del();
 
     /**
-     * The content type of the push, as its well-known number.
-     *
-     * @return 54 {@code application/vnd.wap.connectivity-wbxml}, 53
-     *     {@code application/vnd.wap.connectivity-xml}, 68
-     *     {@code application/vnd.syncml.notification}, 78
-     *     {@code application/vnd.syncml.ds.notification}, 66
-     *     {@code application/vnd.syncml.dm+wbxml}; -1 without a parsed header
+     * {@return the content type of the push, as its well-known number: 54
+     * {@code application/vnd.wap.connectivity-wbxml}, 53
+     * {@code application/vnd.wap.connectivity-xml}, 68 {@code application/vnd.syncml.notification},
+     * 78 {@code application/vnd.syncml.ds.notification}, 66
+     * {@code application/vnd.syncml.dm+wbxml}; -1 without a parsed header}
      */
     public native int qvomacp_GetParserContentType();
 
     /**
-     * The length of the push's headers.
-     *
-     * @return bytes, 0 to 255, as the message states them; -1 without a parsed header
+     * {@return the length of the push's headers: bytes, 0 to 255, as the message states them; -1
+     * without a parsed header}
      */
     public native int qvomacp_GetParserHeaderLen();
 
-    /**
-     * The length of the body.
-     *
-     * @return bytes behind the headers; -1 without a parsed header
-     */
+    /** {@return the length of the body: bytes behind the headers; -1 without a parsed header} */
     public native int qvomacp_GetParserBodyLen();
 
     /**
-     * The length of the MAC.
-     *
-     * @return characters of the MAC text, 0 when the message has none; -1 without a parsed header
+     * {@return the length of the MAC: characters of the MAC text, 0 when the message has none; -1
+     * without a parsed header}
      */
     public native int qvomacp_GetParserMACLen();
 
     /**
-     * The security method SEC.
-     *
-     * @return the byte as sent, high bit included: 0x80 NETWPIN, 0x81 USERPIN, 0x82 USERNETWPIN,
-     *     0x83 USERPINMAC; 0 when the message has none; -1 without a parsed header
+     * {@return the security method SEC: the byte as sent, high bit included: 0x80 NETWPIN, 0x81
+     * USERPIN, 0x82 USERNETWPIN, 0x83 USERPINMAC; 0 when the message has none; -1 without a parsed
+     * header}
      */
     public native int qvomacp_GetParserSEC();
 
     /**
-     * The text of the MAC, which is carried and not verified.
-     *
-     * @return a new array of the MAC's characters without a terminator, empty when the message has
-     *     none; {@code null} without a parsed header
+     * {@return the text of the MAC, which is carried and not verified: a new array of the MAC's
+     * characters without a terminator, empty when the message has none; {@code null} without a
+     * parsed header}
      */
     public native byte[] qvomacp_GetParserMAC();
 
     /**
-     * The body of the message: the bytes behind the headers.
-     *
-     * @return a new array, empty when the message ends with its headers; {@code null} without a
-     *     parsed header
+     * {@return the bytes behind the headers, which are the body: a new array, empty when the
+     * message ends with its headers; {@code null} without a parsed header}
      */
     public native byte[] qvomacp_GetParserBody();
 }

@@ -14,7 +14,7 @@ public class XCPCtxVendorConfig {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxVendorConfig() {}
 
-    /** {@return the number of the VENDORCONFIG of the message: their number} */
+    /** {@return the number of the VENDORCONFIG of the message} */
     public native int qvomacp_GetPxVenderConfigCount();
 
     /**

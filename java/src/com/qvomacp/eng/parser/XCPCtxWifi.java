@@ -14,16 +14,14 @@ public class XCPCtxWifi {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxWifi() {}
 
-    /** {@return the number of the WI-FI of the message: their number} */
+    /** {@return the number of the WI-FI of the message} */
     public native int qvomacp_GetPxWifiCount();
 
     /**
-     * The parameters of a WI-FI.
-     *
+     * {@return the parameters of a WI-FI in 13 elements: 0 NETSSID, 1 SECMODE, 2 EAPMETHOD, 3
+     * EAPTYPE, 4 USERNAME, 5 ANONUSERNAME, 6 PASSWORD, 7 CACERT, 8 USERCERT, 9 PHASE1, 10
+     * AUTHALGORITHM, 11 PRIORITY, 12 always {@code null}; or {@code null}}
      * @param wifi WI-FI, from 1
-     * @return 13 elements: 0 NETSSID, 1 SECMODE, 2 EAPMETHOD, 3 EAPTYPE, 4 USERNAME, 5
-     *     ANONUSERNAME, 6 PASSWORD, 7 CACERT, 8 USERCERT, 9 PHASE1, 10 AUTHALGORITHM, 11 PRIORITY,
-     *     12 always {@code null}; or {@code null}
      */
     public native String[] qvomacp_GetPxWifiData(int wifi);
 }
