@@ -472,18 +472,18 @@ class ShowTest {
 
     @Test
     void usesColoursOnATerminalAlone() {
-        Terminal terminal = new Terminal(true, true);
+        Terminal terminal = new Terminal(true, true, true);
         run(REFUSED, "--bytes", "--color=always");
         assertTrue(output.contains("\u001b[32m\"abc\", inline\u001b[0m"), output);
         run(terminal, REFUSED, "--bytes");
         assertTrue(output.contains("\u001b[32m"), output);
         run(terminal, REFUSED, "--bytes", "--color=never");
         assertFalse(output.contains("\u001b"), output);
-        run(new Terminal(true, false), REFUSED);
+        run(new Terminal(true, false, true), REFUSED);
         assertFalse(errors.contains("\u001b"), errors);
-        run(new Terminal(false, true), REFUSED);
+        run(new Terminal(false, true, false), REFUSED);
         assertTrue(errors.startsWith("omacp: standard input: \u001b[1;31mrefused: "), errors);
-        run(new Terminal(false, true), REFUSED, "--bytes");
+        run(new Terminal(false, true, false), REFUSED, "--bytes");
         assertFalse(output.contains("\u001b"), output);
     }
 
