@@ -63,7 +63,7 @@ CONDITION = re.compile(r"\b(?:if|while) (\()")
 TEXT = re.compile(r'"((?:[^"\\\n]|\\.)*)"')
 # Rows of tables: what stands between two commas, or a comma and a brace, and is made of braces or of
 # a call whose name says that it makes a row.
-ROW = re.compile(r"(?<=[{,\n])[ \n]*(\{|QVS_FIELD\(|NATIVE\(|kindOf\(|[a-z]\w*(?:<[^;{}()]*>)?[({]|\.\w+ = |\w+,\s*$)",
+ROW = re.compile(r"(?<=[{,\n])[ \n]*(\{|&\w+::|NATIVE\(|kindOf\(|[a-z]\w*(?:<[^;{}()]*>)?[({]|\.\w+ = |\w+,\s*$)",
                  re.MULTILINE)
 STATEMENT = re.compile(r"(?<=[;{}:\n])\n? *((?:\(void\))?[\w:>.*\[\]-]+(?:<[^;{}()]*>)?\(|"
                        r"\*?[\w:>.\[\]()*-]+ [-+&|]?= |(?:\+\+|--)[\w>.*()-]+;|[\w>.-]+(?:\+\+|--);)")

@@ -51,7 +51,7 @@ WORDS = (
     b"~",
     b"\xff\xfe",
 )
-NAMES = tuple(APPLICATION_NAMES) + tuple(ROAMING_NAMES) + tuple(WIFI_NAMES) + tuple(VO_WIFI_NAMES)
+NAMES = tuple(name for kind in KINDS for name in kind.names)
 ODD_NAMES = (b"INIT", b"init", b"from", b"netssid", b"X-VENDOR", b"")
 
 KINDS = (

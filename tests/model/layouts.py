@@ -4,6 +4,8 @@
     text     "LENGTH:BYTES;  array    [answers];      bytes    #LENGTH:BYTES;
 """
 
+from vocabulary import tokens
+
 NULL = b"~;"
 ZERO = b"0;"
 
@@ -26,59 +28,20 @@ def array(values):
 
 # --- Names that stand for stored values ----------------------------------------------------------
 
-SERVICES = (
-    b"CL-WSP",
-    b"CO-WSP",
-    b"CL-SEC-WSP",
-    b"CO-SEC-WSP",
-    b"CL-SEC-WTA",
-    b"CO-SEC-WTA",
-    b"OTA-HTTP-TO",
-    b"OTA-HTTP-TLS-TO",
-    b"OTA-HTTP-PO",
-    b"OTA-HTTP-TLS-PO",
-    b"Unkown Service",
-)
 
-FIRST_BEARER = 0xA2
-BEARERS = (
-    b"GSM-USSD",
-    b"GSM-SMS",
-    b"ANSI-136-GUTS",
-    b"IS-95-CDMA-SMS",
-    b"IS-95-CDMA-CSD",
-    b"IS-95-CDMA-PACKET",
-    b"ANSI-136-CSD",
-    b"ANSI-136-GPRS",
-    b"GSM-CSD",
-    b"GSM-GPRS",
-    b"AMPS-CDPD",
-    b"PDC-CSD",
-    b"PDC-PACKET",
-    b"IDEN-SMS",
-    b"IDEN-CSD",
-    b"IDEN-PACKET",
-    b"FLEX/REFLEX",
-    b"PHS-SMS",
-    b"PHS-CSD",
-    b"TETRA-SDS",
-    b"TETRA-PACKET",
-    b"ANSI-136-GHOST",
-    b"MOBITEX-MPAK",
-    b"CDMA2000-1X-SIMPLE-IP",
-    b"CDMA2000-1X-MOBILE-IP",
-    b"3G-GSM",
-    b"WLAN",
-)
+def texts(names):
+    """Names in the order of their tokens."""
+    return tuple(name.encode() for name in sorted(names, key=names.get))
+
+
+SERVICES = (*texts(tokens.SERVICES), b"Unkown Service")
+
+FIRST_BEARER = tokens.BEARERS["GSM-USSD"]
+BEARERS = texts(tokens.BEARERS)
 UNKNOWN_BEARER = b"Unkown Bearer"
 
-AUTH_TYPES = (
-    (b"PAP", b"\x9a"),
-    (b"CHAP", b"\x9b"),
-    (b"HTTP-BASIC", b"\x9c"),
-    (b"HTTP-DIGEST", b"\x9d"),
-    (b"WTLS-SS", b"\x9e"),
-    (b"MD5", b"\x9f"),
+AUTH_TYPES = tuple(
+    (name.encode(), bytes((token,))) for name, token in tokens.AUTHENTICATION_TYPES.items()
 )
 
 

@@ -603,9 +603,12 @@ TEST_P(ContextList, CopiesTextsInOrder)
 TEST_P(ContextList, AnswersNullForNoText)
 {
     qvsList *texts = emptyList();
+    qvsListNode elsewhere = {};
+    texts->ptCursor = &elsewhere;
     Traces traces;
     EXPECT_EQ(GetParam().build(texts), nullptr);
     EXPECT_EQ(traces.texts, Strings{});
+    EXPECT_EQ(texts->ptCursor, nullptr);
 }
 
 TEST_P(ContextList, EndsWithoutMemoryForANode)
@@ -615,9 +618,12 @@ TEST_P(ContextList, EndsWithoutMemoryForANode)
     const qvsCtxStrNode *copy = GetParam().build(texts);
     blocks::reset();
     EXPECT_EQ(textsOf(copy), Texts{"one"});
+    // Behind the text that was read for it.
+    EXPECT_EQ(texts->ptCursor, texts->ptFirst->ptNext->ptNext);
     blocks::failAt = 0;
     EXPECT_EQ(GetParam().build(texts), nullptr);
     blocks::reset();
+    EXPECT_EQ(texts->ptCursor, texts->ptFirst->ptNext);
 }
 
 TEST_P(ContextList, GoesOnWithoutMemoryForAText)
@@ -638,6 +644,8 @@ TEST(ContextLists, EndAtAnItemWithoutAText)
     qvsCtxStrNode *copy = qvsClientProvCtxVerifyContextServiceList(texts);
     ASSERT_EQ(textsOf(copy).size(), 1U);
     EXPECT_EQ(textsOf(copy)[0], "a");
+    // Behind that item, as a reader of the list would be.
+    EXPECT_EQ(texts->ptCursor, texts->ptFirst->ptNext->ptNext);
     qvsClientProvCtxDelectContextServiceList(copy);
     EXPECT_EQ(qvsListDeleteNodeAllAndList(texts, nullptr), QVS_OK);
 }

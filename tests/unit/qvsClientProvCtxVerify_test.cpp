@@ -210,15 +210,39 @@ TEST_P(Children, NeedAList)
     EXPECT_EQ(traces.texts, Strings{kMissingList});
 }
 
-TEST_P(Children, NeedAParent)
+TEST_P(Children, NeedAParentOnlyToBeAttached)
 {
-    qvsList *children = nullptr;
-    add(&children, holder(parent.accepted[0].slot, "value"));
+    qvsList *empty = emptyList();
+    qvsList *misfits = nullptr;
+    add(&misfits, blank<qvsWapCharacter>());
+    add(&misfits, holder(parent.accepted[0].slot, "value"));
     const size_t before = blocks::live();
-    Traces traces;
-    EXPECT_EQ(parent.walk(children, nullptr), QVS_ERROR_BAD_ARGUMENT);
-    EXPECT_EQ(traces.texts, Strings{"[Syncml] ERROR : 2\n"});
+    {
+        Traces traces;
+        EXPECT_EQ(parent.walk(nullptr, nullptr), QVS_ERROR_LIST_ARGUMENT);
+        EXPECT_EQ(traces.texts, Strings{kMissingList});
+    }
+    {
+        Traces traces;
+        EXPECT_EQ(parent.walk(empty, nullptr), QVS_OK);
+        EXPECT_EQ(traces.texts, Strings{});
+    }
+    {
+        Traces traces;
+        EXPECT_EQ(parent.walk(misfits, nullptr), QVS_ERROR_FAILED);
+        EXPECT_EQ(traces.texts,
+                  (Strings{"[WARNING] Not Support Context\n", "[Syncml] ERROR : 1\n"}));
+    }
     EXPECT_EQ(blocks::live(), before);
+    for (const Child &kind : parent.accepted) {
+        qvsList *children = nullptr;
+        add(&children, holder(kind.slot, "value"));
+        const size_t held = blocks::live();
+        Traces traces;
+        EXPECT_EQ(parent.walk(children, nullptr), QVS_ERROR_BAD_ARGUMENT);
+        EXPECT_EQ(traces.texts, Strings{"[Syncml] ERROR : 2\n"});
+        EXPECT_EQ(blocks::live(), held);
+    }
 }
 
 TEST(Kept, context_misfit_ends_walk)

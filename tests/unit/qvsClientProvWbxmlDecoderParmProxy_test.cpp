@@ -254,7 +254,7 @@ TEST_F(PxPhysicalParm, EndsAtADomainThatPassesTheLimitOfAllTexts)
     Reading<PxPhysical> run(parm(0x17, "one more"));
     qvs::DecodeState state = {.textLeft = 0};
     Traces traces;
-    EXPECT_EQ(qvs::readParms(run.decoder, &state, run.record, qvs::kPxPhysicalParms), 4111U);
+    EXPECT_EQ(qvs::readParms(run.decoder, &state, run.record, qvs::kPxPhysicalParms.table), 4111U);
     EXPECT_EQ(run.record->ptDomainList, nullptr);
     EXPECT_EQ(traces.texts.back(), "[ERROR] qvsClientProvWbxmlDecoderParamListString Fail\n");
 }
@@ -274,8 +274,9 @@ TEST_F(PxPhysicalParm, EndsAtATextOrAValueTokenThatPassesTheLimitOfAllTexts)
                 qvs::DecodeState state = qvs::wholeDecode(run.decoder);
                 EXPECT_EQ(state.textLeft, limit);
                 state.textLeft = left;
-                EXPECT_EQ(qvs::readParms(run.decoder, &state, run.record, qvs::kPxPhysicalParms),
-                          left < 4 ? 4111U : 0U);
+                EXPECT_EQ(
+                    qvs::readParms(run.decoder, &state, run.record, qvs::kPxPhysicalParms.table),
+                    left < 4 ? 4111U : 0U);
                 EXPECT_EQ(state.textLimit, left < 4);
             }
         }

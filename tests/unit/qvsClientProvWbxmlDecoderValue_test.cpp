@@ -708,7 +708,7 @@ TEST_F(TextLimit, CountsTheTextThatALaterPairContinues)
     Decoder decoder(bytes);
     qvs::DecodeState state = qvs::wholeDecode(decoder);
     qvsWapPxPhysical record = {};
-    EXPECT_EQ(qvs::readList(decoder, &state, &record, QVS_FIELD(qvsWapPxPhysical, ptDomainList)),
-              4111U);
+    static constexpr qvs::Parm<qvsWapPxPhysical> kDomain = {0x17, &qvsWapPxPhysical::ptDomainList};
+    EXPECT_EQ(qvs::readList(decoder, &state, &record, kDomain), 4111U);
     EXPECT_EQ(record.ptDomainList, nullptr);
 }

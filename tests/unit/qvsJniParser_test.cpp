@@ -234,18 +234,19 @@ TEST(Parser, RefusesALengthBeyondTheArray)
     }
 }
 
-TEST(Parser, ChangesNothingWhenTheBytesCannotBeHad)
+TEST(Parser, ForgetsTheHeaderAndKeepsTheContextWhenTheBytesCannotBeHad)
 {
     Session vm;
     ASSERT_EQ(vm.parse(signedPush(proxyDocument())), kTrue);
     const qvsClientProvCtx *context = ptCtx;
-    const smlpushHdlrInfo *header = qvs::ptPushHdlrInfo;
+    smlpushHdlrInfo *header = qvs::ptPushHdlrInfo;
     vm.failCall(0);
     EXPECT_EQ(vm.parse(signedPush(napDocument())), Answer{.exception = true});
     EXPECT_TRUE(vm.hasFailed());
     EXPECT_EQ(vm.calls(), (std::vector<std::string>{"GetArrayLength", "GetByteArrayElements"}));
     EXPECT_EQ(ptCtx, context);
-    EXPECT_EQ(qvs::ptPushHdlrInfo, header);
+    expectNoHeader(&vm);
+    qvs::releasePushHeader(header);
 }
 
 TEST(Parser, ReleasesTheHeaderOfABodyThatCannotBeDecoded)

@@ -12,11 +12,17 @@ namespace {
 constexpr char kModule[] = "jni/src/ClientProv/qvsClientProvCtx";
 
 // One context record of `fields` pointers, all null; null without memory.
-void *newCtxRecord(uint32_t fields)
+void *newFields(uint32_t fields)
 {
     constexpr uint32_t kFieldSize = sizeof(void *);
     constexpr uint32_t kSpare = 1; // kept[context-spare-byte]: one byte more than the record.
     return qvsMemAllocSetZero_debug(fields * kFieldSize + kSpare, kModule, __LINE__);
+}
+
+template <class Record>
+Record *newCtxRecord()
+{
+    return static_cast<Record *>(newFields(kFieldsOf<Record>));
 }
 
 char *copyOf(const char *text)
@@ -87,16 +93,12 @@ struct Chains {
 // The kinds of record nest a few levels deep, whatever a message holds.
 // NOLINTBEGIN(misc-no-recursion)
 
-// Copies the record of a tree node that `row` is about, if the node carries one.
-bool copySlot(const qvsWapCharacter &node, const ChildRow &row, size_t number, Chains *chains,
+// Copies the record of a tree node that `row` is about.
+void copySlot(const qvsWapCharacter &node, const ChildRow &row, size_t number, Chains *chains,
               Texts texts)
 {
     void *record = pointerAt(&node, row.slot);
-    if (!record) {
-        return false;
-    }
-    chains->append(row, number, copyRecord(record, *row.kind, texts));
-    return true;
+    chains->append(row, number, copyRecord(record, *row.kind, row.stays ? Texts::kCopied : texts));
 }
 
 // Copies every record of a node at the top of the document.
@@ -104,34 +106,45 @@ void copyNode(const qvsWapCharacter &node, Chains *chains, Texts texts)
 {
     size_t number = 0;
     for (const ChildRow &row : kRootRows) {
-        if (pointerAt(&node, row.slot) && chains->isTaken(row)) {
-            trace("[WARNING] Already Have ClientIdent Context");
-            return;
+        if (pointerAt(&node, row.slot)) {
+            if (chains->isTaken(row)) {
+                trace("[WARNING] Already Have ClientIdent Context");
+                return;
+            }
+            copySlot(node, row, number, chains, texts);
         }
-        copySlot(node, row, number++, chains, texts);
+        ++number;
     }
 }
 
-// Copies the first record of a child that the parent accepts; false when it accepts none.
-bool copyChild(const qvsWapCharacter &node, const Rows<ChildRow> &rows, Chains *chains, Texts texts)
+// Copies the first record of a child that the parent accepts.
+qvsResult copyChild(const qvsWapCharacter &node, const Rows<ChildRow> &rows, Chains *chains,
+                    Texts texts)
 {
     size_t number = 0;
     for (const ChildRow &row : rows) {
-        if (copySlot(node, row, number++, chains, texts)) {
-            return true;
+        if (pointerAt(&node, row.slot)) {
+            // hardened: nothing can be attached to a parent that is not there.
+            if (!chains->parent) {
+                return QVS_ERROR_BAD_ARGUMENT;
+            }
+            copySlot(node, row, number, chains, texts);
+            return QVS_OK;
         }
+        ++number;
     }
-    return false;
+    // kept[context-misfit-ends-walk]: the children behind one that does not fit are lost.
+    trace("[WARNING] Not Support Context");
+    return QVS_ERROR_FAILED;
 }
 
 qvsResult walkChildren(qvsList *children, void *parent, const Rows<ChildRow> &rows, Texts texts)
 {
     Chains chains = {parent};
     for (void *item = firstItem(children); item; item = nextItem(children)) {
-        if (!copyChild(*static_cast<const qvsWapCharacter *>(item), rows, &chains, texts)) {
-            // kept[context-misfit-ends-walk]: the children behind one that does not fit are lost.
-            trace("[WARNING] Not Support Context");
-            return QVS_ERROR_FAILED;
+        const auto &node = *static_cast<const qvsWapCharacter *>(item);
+        if (qvsResult result = copyChild(node, rows, &chains, texts)) {
+            return result;
         }
     }
     return QVS_OK;
@@ -147,7 +160,7 @@ qvsResult makeRoot(qvsList *list, qvsClientProvCtx **root, Texts texts)
         return result;
     }
     void *item = firstItem(list);
-    void *made = newCtxRecord(kFieldsOf<qvsClientProvCtx>);
+    auto *made = newCtxRecord<qvsClientProvCtx>();
     if (!made) {
         traceError(QVS_ERROR_FAILED);
         return QVS_ERROR_FAILED;
@@ -156,7 +169,7 @@ qvsResult makeRoot(qvsList *list, qvsClientProvCtx **root, Texts texts)
     for (; item; item = nextItem(list)) {
         copyNode(*static_cast<const qvsWapCharacter *>(item), &chains, texts);
     }
-    *root = static_cast<qvsClientProvCtx *>(made);
+    *root = made;
     return QVS_OK;
 }
 
@@ -182,36 +195,29 @@ qvsCtxStrNode *qvs::copyTexts(qvsList *list, Texts texts)
     qvsCtxStrNode *head = nullptr;
     qvsCtxStrNode **end = &head;
     list->ptCursor = list->ptFirst;
-    while (list->ptCursor && list->ptCursor->pItem) {
-        auto *node = static_cast<qvsCtxStrNode *>(newCtxRecord(kFieldsOf<qvsCtxStrNode>));
+    while (qvsListNode *from = list->ptCursor) {
+        list->ptCursor = from->ptNext;
+        auto *text = static_cast<char *>(from->pItem);
+        auto *node = text ? newCtxRecord<qvsCtxStrNode>() : nullptr;
         if (!node) {
             break;
         }
         *end = node;
         end = &node->ptNext;
-        auto *text = static_cast<char *>(list->ptCursor->pItem);
         if (texts == Texts::kTaken) {
-            list->ptCursor->pItem = nullptr;
+            from->pItem = nullptr;
             node->pszValue = text;
         } else {
             node->pszValue = copyOf(text);
         }
-        list->ptCursor = list->ptCursor->ptNext;
     }
     return head;
 }
 
 qvsResult qvs::copyChildren(qvsList *children, void *parent, const CopyKind &kind, Texts texts)
 {
-    qvsResult result = QVS_OK;
-    if (!parent) {
-        // hardened: nothing can be attached to a parent that is not there.
-        result = QVS_ERROR_BAD_ARGUMENT;
-    } else if (!children) {
-        result = QVS_ERROR_LIST_ARGUMENT;
-    } else {
-        result = walkChildren(children, parent, kind.children, texts);
-    }
+    const qvsResult result = children ? walkChildren(children, parent, kind.children, texts)
+                                      : qvsResult{QVS_ERROR_LIST_ARGUMENT};
     traceError(result);
     return result;
 }
@@ -222,18 +228,18 @@ void *qvs::copyRecord(void *record, const CopyKind &kind, Texts texts)
         traceError(QVS_ERROR_BAD_ARGUMENT);
         return nullptr;
     }
-    void *copy = newCtxRecord(kind.fields);
+    void *copy = newFields(kind.fields);
     if (!copy) {
         return nullptr;
     }
     for (const CopyRow &row : kind.rows) {
-        void *field = pointerAt(record, row.from);
+        void *field = pointerAt(record, row.field);
         if (row.type == CopyRow::kList) {
             setPointer(copy, row.to, copyTexts(static_cast<qvsList *>(field), texts));
         } else if (field) {
             auto *text = static_cast<char *>(field);
             if (texts == Texts::kTaken && row.type == CopyRow::kText) {
-                setPointer(record, row.from, nullptr);
+                setPointer(record, row.field, nullptr);
                 setPointer(copy, row.to, text);
             } else {
                 setPointer(copy, row.to, copyOf(text));
@@ -243,9 +249,8 @@ void *qvs::copyRecord(void *record, const CopyKind &kind, Texts texts)
     if (kind.onCopied) {
         kind.onCopied(copy);
     }
-    if (kind.childList.number != kNoField) {
-        const qvsResult result =
-            copyChildren(*listAt(record, kind.childList.number), copy, kind, texts);
+    if (kind.childList != kNoField) {
+        const qvsResult result = copyChildren(*listAt(record, kind.childList), copy, kind, texts);
         if (kind.refusalTraced) {
             traceError(result);
         }

@@ -39,47 +39,45 @@ struct Wording {
 };
 
 template <class Record>
-consteval Kind kindOf(uint8_t token, Pages pages, Record *Node::*, RecordField slot,
-                      const ParmTable &parms, Wording wording = {})
+consteval Kind kindOf(uint8_t token, Pages pages, Record *Node::*slot, const ParmsOf<Record> &parms,
+                      Wording wording = {})
 {
-    return {token,  pages,        slot.number,     kFieldsOf<Record>, kChildListOf<Record>,
-            &parms, wording.name, wording.refusal, wording.created};
+    return {token,        pages,        numberOf(slot),  kFieldsOf<Record>, kChildListOf<Record>,
+            &parms.table, wording.name, wording.refusal, wording.created};
 }
-
-#define QVS_SLOT(name) &Node::name, QVS_FIELD(Node, name)
 
 // kept[refusal-wording]: the refusals name other types than their parents.
 constexpr Kind kKinds[] = {
-    kindOf(attr::kType, kBothPages, QVS_SLOT(ptRoaming), kRoamingParms,
+    kindOf(attr::kType, kBothPages, &Node::ptRoaming, kRoamingParms,
            {.name = "ROAMING", .created = "------------------NEW-------------------!!"}),
-    kindOf(attr::kType, kBothPages, QVS_SLOT(ptWifi), kWifiParms,
+    kindOf(attr::kType, kBothPages, &Node::ptWifi, kWifiParms,
            {.name = "WI-FI", .created = "------------WIFI------------------!!"}),
-    kindOf(attr::kType, kBothPages, QVS_SLOT(ptVoWifi), kVoWifiParms,
+    kindOf(attr::kType, kBothPages, &Node::ptVoWifi, kVoWifiParms,
            {.name = "Vodafone VoWiFi", .created = "------------WIFI------------------!!"}),
-    kindOf(attr::kTypePxLogical, kBothPages, QVS_SLOT(ptPxLogical), kPxLogicalParms),
-    kindOf(attr::kTypePxPhysical, kBothPages, QVS_SLOT(ptPxPhysical), kPxPhysicalParms),
-    kindOf(attr::kTypePort, kBothPages, QVS_SLOT(ptPort), kPortParms,
+    kindOf(attr::kTypePxLogical, kBothPages, &Node::ptPxLogical, kPxLogicalParms),
+    kindOf(attr::kTypePxPhysical, kBothPages, &Node::ptPxPhysical, kPxPhysicalParms),
+    kindOf(attr::kTypePort, kBothPages, &Node::ptPort, kPortParms,
            {.refusal = "BOOTSTRAP is Not Support Chiled PORT."}),
-    kindOf(attr::kTypeValidity, kBothPages, QVS_SLOT(ptValidity), kValidityParms,
+    kindOf(attr::kTypeValidity, kBothPages, &Node::ptValidity, kValidityParms,
            {.refusal = "BOOTSTRAP is Not Support Chiled PORT."}),
-    kindOf(attr::kTypeNapDef, kPage0, QVS_SLOT(ptNapDef), kNapDefParms),
-    kindOf(attr::kTypeApplication, kPage1, QVS_SLOT(ptApplication), kApplicationParms),
-    kindOf(attr::kTypeBootstrap, kPage0, QVS_SLOT(ptBootstrap), kBootstrapParms,
+    kindOf(attr::kTypeNapDef, kPage0, &Node::ptNapDef, kNapDefParms),
+    kindOf(attr::kTypeApplication, kPage1, &Node::ptApplication, kApplicationParms),
+    kindOf(attr::kTypeBootstrap, kPage0, &Node::ptBootstrap, kBootstrapParms,
            {.refusal = "BOOTSTRAP is Not Support Chiled CHARACTER."}),
-    kindOf(attr::kTypeAppAddr, kPage1, QVS_SLOT(ptAppAddr), kAppAddrParms),
-    kindOf(attr::kTypeVendorConfig, kPage0, QVS_SLOT(ptVendorConfig), kVendorConfigParms,
+    kindOf(attr::kTypeAppAddr, kPage1, &Node::ptAppAddr, kAppAddrParms),
+    kindOf(attr::kTypeVendorConfig, kPage0, &Node::ptVendorConfig, kVendorConfigParms,
            {.refusal = "VENDORCONFIG is Not Support Chiled CHARACTER."}),
-    kindOf(attr::kTypeAppAuth, kPage1, QVS_SLOT(ptAppAuth), kAppAuthParms,
+    kindOf(attr::kTypeAppAuth, kPage1, &Node::ptAppAuth, kAppAuthParms,
            {.refusal = "APPAUTH is Not Support Chiled CHARACTER."}),
-    kindOf(attr::kTypeClientIdentity, kBothPages, QVS_SLOT(ptClientIdentity), kClientIdentityParms,
+    kindOf(attr::kTypeClientIdentity, kBothPages, &Node::ptClientIdentity, kClientIdentityParms,
            {.refusal = "BOOTSTRAP is Not Support Chiled CLIENTIDENTITY."}),
-    kindOf(attr::kTypePxAuthInfo, kPage0, QVS_SLOT(ptPxAuthInfo), kPxAuthInfoParms,
+    kindOf(attr::kTypePxAuthInfo, kPage0, &Node::ptPxAuthInfo, kPxAuthInfoParms,
            {.refusal = "RESOURCE is Not Support Chiled CHARACTER."}),
-    kindOf(attr::kTypeResource, kPage1, QVS_SLOT(ptResource), kResourceParms,
+    kindOf(attr::kTypeResource, kPage1, &Node::ptResource, kResourceParms,
            {.refusal = "RESOURCE is Not Support Chiled CHARACTER."}),
-    kindOf(attr::kTypeNapAuthInfo, kBothPages, QVS_SLOT(ptNapAuthInfo), kNapAuthInfoParms,
+    kindOf(attr::kTypeNapAuthInfo, kBothPages, &Node::ptNapAuthInfo, kNapAuthInfoParms,
            {.refusal = "BOOTSTRAP is Not Support Chiled PORT."}),
-    kindOf(attr::kTypeAccess, kBothPages, QVS_SLOT(ptAccess), kAccessParms,
+    kindOf(attr::kTypeAccess, kBothPages, &Node::ptAccess, kAccessParms,
            {.refusal = "BOOTSTRAP is Not Support Chiled ACCESS."}),
 };
 

@@ -113,7 +113,7 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
         if (!peekByte(decoder->ptBuffer, token)) {
             return false;
         }
-        if (!table.freshTokenAfterSwitch) {
+        if (!table.style.freshTokenAfterSwitch) {
             // kept[parm-switch-masked]: behind a switch the token is seen without its top bits.
             *token &= wbxml::kTagMask;
         }
@@ -121,9 +121,9 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
     return true;
 }
 
-const Parm *findParm(const ParmTable &table, uint8_t token)
+const ParmRow *findParm(const ParmTable &table, uint8_t token)
 {
-    for (const Parm &parm : table.rows) {
+    for (const ParmRow &parm : table.rows) {
         if (parm.token == token) {
             return &parm;
         }
@@ -133,11 +133,11 @@ const Parm *findParm(const ParmTable &table, uint8_t token)
 
 [[gnu::noinline, gnu::cold]] qvsResult refuse(const ParmTable &table, uint8_t token)
 {
-    if (table.onRefused) {
-        table.onRefused(token);
+    if (table.style.onRefused) {
+        table.style.onRefused(token);
     } else {
         trace("Tag Code = QVS_ERROR_WBXML_UNKNOWN_ELEMENT");
-        trace("qvsClientProvWbxmlDecoderParam%s[%x]", table.name, token);
+        trace("qvsClientProvWbxmlDecoderParam%s[%x]", table.style.name, token);
     }
     return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
 }
@@ -146,11 +146,11 @@ const Parm *findParm(const ParmTable &table, uint8_t token)
 [[gnu::noinline, gnu::cold]] void traceStep(const ParmTable &table, uint8_t token, bool end,
                                             qvsResult result)
 {
-    if (table.onToken) {
-        table.onToken(token);
+    if (table.style.onToken) {
+        table.style.onToken(token);
     }
-    if (table.onEnd && (end || result != QVS_OK)) {
-        table.onEnd(token, result);
+    if (table.style.onEnd && (end || result != QVS_OK)) {
+        table.style.onEnd(token, result);
     }
 }
 
@@ -158,18 +158,18 @@ const Parm *findParm(const ParmTable &table, uint8_t token)
 qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
                    const ParmTable &table, uint8_t token)
 {
-    const Parm *parm = findParm(table, token);
+    const ParmRow *parm = findParm(table, token);
     if (!parm) {
         return refuse(table, token);
     }
-    if (traceSink && table.onParm) {
-        table.onParm(token);
+    if (traceSink && table.style.onParm) {
+        table.style.onParm(token);
     }
     switch (parm->type) {
     case ParmType::kText:
         return readText(decoder, state, textAt(record, parm->field), token);
     case ParmType::kList:
-        return readList(decoder, state, record, ListField{parm->field, parm->place});
+        return readList(decoder, state, record, parm->field, parm->place);
     default:
         return table.reader(decoder, state, record);
     }
@@ -197,11 +197,12 @@ qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvs
     return readOnto(decoder, &alone, list, &unknown);
 }
 
-qvsResult qvs::readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, ListField list)
+qvsResult qvs::readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t field,
+                        uint8_t place)
 {
     qvsListNode *unknown = nullptr;
-    qvsListNode **end = state->open ? state->open->last + list.place : &unknown;
-    return readOnto(decoder, state, listAt(record, list.number), end);
+    qvsListNode **end = state->open ? state->open->last + place : &unknown;
+    return readOnto(decoder, state, listAt(record, field), end);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
@@ -213,8 +214,8 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
                          const ParmTable &table)
 {
-    if (traceSink && table.entered) {
-        trace("qvsClientProvWbxmlDecoderParam%s", table.entered);
+    if (traceSink && table.style.entered) {
+        trace("qvsClientProvWbxmlDecoderParam%s", table.style.entered);
     }
     if (!record) {
         return QVS_ERROR_BAD_ARGUMENT;

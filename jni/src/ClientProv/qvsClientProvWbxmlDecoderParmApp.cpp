@@ -47,9 +47,9 @@ void traceParm(uint8_t token)
 }
 
 // The comma token where a name is expected: one more value of AAUTHTYPE.
-qvsResult readComma(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
+qvsResult readComma(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapAppAuth *record)
 {
-    char **types = &static_cast<qvsWapAppAuth *>(record)->pszAAuthType;
+    char **types = &record->pszAAuthType;
     const qvsResult result =
         commaAdd(decoder, state, types, state->open ? &state->open->joined : nullptr);
     trace("--------------------------[%s]", *types ? *types : "");
@@ -57,9 +57,9 @@ qvsResult readComma(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 }
 
 // kept[resource-startpage]: a STARTPAGE that leaves the field without a value stores "startpage".
-qvsResult readStartPage(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
+qvsResult readStartPage(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapResource *record)
 {
-    char **page = &static_cast<qvsWapResource *>(record)->pszStartPage;
+    char **page = &record->pszStartPage;
     if (qvsResult result = readText(decoder, state, page, page1::kStartPage)) {
         return result;
     }
@@ -71,31 +71,31 @@ qvsResult readStartPage(qvsWbxmlDecoder *decoder, DecodeState *state, void *reco
 
 namespace application {
 using R = qvsWapApplication;
-constexpr Parm kParms[] = {
+constexpr auto kParms = tableOf<Parm<R>>({
     {attr::kName, kByReader},
-    {page1::kName, QVS_FIELD(R, pszName)},
-    {page1::kInternet, QVS_FIELD(R, pszInternet)},
-    {page1::kToNapId, QVS_FIELD(R, ptToNapIdList)},
-    {page1::kAAccept, QVS_FIELD(R, pszAAccept)},
-    {page1::kAddr, QVS_FIELD(R, ptAddrList)},
-    {page1::kAppId, QVS_FIELD(R, pszAppId)},
-    {page1::kAProtocol, QVS_FIELD(R, pszAProtocol)},
-    {page1::kProviderId, QVS_FIELD(R, pszProviderId)},
-    {page1::kToProxy, QVS_FIELD(R, ptToProxyList)},
-};
+    {page1::kName, &R::pszName},
+    {page1::kInternet, &R::pszInternet},
+    {page1::kToNapId, &R::ptToNapIdList},
+    {page1::kAAccept, &R::pszAAccept},
+    {page1::kAddr, &R::ptAddrList},
+    {page1::kAppId, &R::pszAppId},
+    {page1::kAProtocol, &R::pszAProtocol},
+    {page1::kProviderId, &R::pszProviderId},
+    {page1::kToProxy, &R::ptToProxyList},
+});
 
 // Parameters whose name is given as text.
-constexpr NamedParm kNamed[] = {
-    {"XCAP_AUID_DCS", QVS_FIELD(R, pszXcapAuidDcs)},
-    {"XCAP_AUID_PMS", QVS_FIELD(R, pszXcapAuidPms)},
-    {"XCAP_AUID_CDMS", QVS_FIELD(R, pszXcapAuidCdms)},
-    {"XCAP_IMEI_HEADER", QVS_FIELD(R, pszXcapImeiHeader)},
-    {"XCAP_TID_HEADER", QVS_FIELD(R, pszXcapTidHeader)},
-    {"FROM", QVS_FIELD(R, pszFrom)},
-};
+constexpr auto kNamed = tableOf<NamedParm<R>>({
+    {"XCAP_AUID_DCS", &R::pszXcapAuidDcs},
+    {"XCAP_AUID_PMS", &R::pszXcapAuidPms},
+    {"XCAP_AUID_CDMS", &R::pszXcapAuidCdms},
+    {"XCAP_IMEI_HEADER", &R::pszXcapImeiHeader},
+    {"XCAP_TID_HEADER", &R::pszXcapTidHeader},
+    {"FROM", &R::pszFrom},
+});
 
 // The value of a name that is not listed is read and dropped.
-qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag)
+qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, R *record, uint8_t tag)
 {
     static constexpr char kLabel[] = "qvsClientProvWbxmlDecoderParamNameString";
     ParmName name;
@@ -116,7 +116,7 @@ qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, 
     return result;
 }
 
-qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
+qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
 {
     return readNamed(decoder, state, record, attr::kName);
 }
@@ -124,67 +124,56 @@ qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 
 namespace appAddr {
 using R = qvsWapAppAddr;
-constexpr Parm kParms[] = {
-    {page1::kAddr, QVS_FIELD(R, pszAddr)},
-    {page1::kAddrType, QVS_FIELD(R, pszAddrType)},
-};
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page1::kAddr, &R::pszAddr},
+    {page1::kAddrType, &R::pszAddrType},
+});
 } // namespace appAddr
 
 namespace appAuth {
 using R = qvsWapAppAuth;
-constexpr Parm kParms[] = {
-    {page1::kAAuthData, QVS_FIELD(R, pszAAuthData)},
-    {page1::kAAuthLevel, QVS_FIELD(R, pszAAuthLevel)},
-    {page1::kAAuthName, QVS_FIELD(R, pszAAuthName)},
-    {page1::kAAuthSecret, QVS_FIELD(R, pszAAuthSecret)},
-    {page1::kAAuthType, QVS_FIELD(R, pszAAuthType)},
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page1::kAAuthData, &R::pszAAuthData},
+    {page1::kAAuthLevel, &R::pszAAuthLevel},
+    {page1::kAAuthName, &R::pszAAuthName},
+    {page1::kAAuthSecret, &R::pszAAuthSecret},
+    {page1::kAAuthType, &R::pszAAuthType},
     {kCommaToken, kByReader},
-};
+});
 } // namespace appAuth
 
 namespace resource {
 using R = qvsWapResource;
-constexpr Parm kParms[] = {
-    {page1::kName, QVS_FIELD(R, pszName)},
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page1::kName, &R::pszName},
     {page1::kStartPage, kByReader},
-    {page1::kAAccept, QVS_FIELD(R, pszAAccept)},
-    {page1::kAAuthData, QVS_FIELD(R, pszAAuthData)},
-    {page1::kAAuthName, QVS_FIELD(R, pszAAuthName)},
-    {page1::kAAuthSecret, QVS_FIELD(R, pszAAuthSecret)},
-    {page1::kAAuthType, QVS_FIELD(R, pszAAuthType)},
-    {page1::kUri, QVS_FIELD(R, pszUri)},
-};
+    {page1::kAAccept, &R::pszAAccept},
+    {page1::kAAuthData, &R::pszAAuthData},
+    {page1::kAAuthName, &R::pszAAuthName},
+    {page1::kAAuthSecret, &R::pszAAuthSecret},
+    {page1::kAAuthType, &R::pszAAuthType},
+    {page1::kUri, &R::pszUri},
+});
 } // namespace resource
 
 } // namespace
 
-constexpr ParmTable qvs::kApplicationParms = {
-    .name = "Application",
-    .rows = application::kParms,
-    .reader = application::readName,
-    .onParm = traceParm,
-    .onToken = traceToken,
-};
+constexpr ParmsOf<qvsWapApplication> qvs::kApplicationParms = {
+    {.name = "Application", .onParm = traceParm, .onToken = traceToken},
+    application::kParms,
+    kReadBy<qvsWapApplication, application::readName>};
 
-constexpr ParmTable qvs::kAppAddrParms = {
-    .name = "AppAddr",
-    .rows = appAddr::kParms,
-};
+constexpr ParmsOf<qvsWapAppAddr> qvs::kAppAddrParms = {{.name = "AppAddr"}, appAddr::kParms};
 
-constexpr ParmTable qvs::kAppAuthParms = {
-    .name = "AppAuth",
-    .rows = appAuth::kParms,
-    .reader = readComma,
-    .freshTokenAfterSwitch = true,
-};
+constexpr ParmsOf<qvsWapAppAuth> qvs::kAppAuthParms = {
+    {.name = "AppAuth", .freshTokenAfterSwitch = true},
+    appAuth::kParms,
+    kReadBy<qvsWapAppAuth, readComma>};
 
-constexpr ParmTable qvs::kResourceParms = {
-    .name = "Resource",
-    .rows = resource::kParms,
-    .reader = readStartPage,
-    .freshTokenAfterSwitch = true,
-    .onParm = traceParm,
-};
+constexpr ParmsOf<qvsWapResource> qvs::kResourceParms = {
+    {.name = "Resource", .freshTokenAfterSwitch = true, .onParm = traceParm},
+    resource::kParms,
+    kReadBy<qvsWapResource, readStartPage>};
 
 qvsResult qvsClientProvWbxmlDecoderParamApplication(qvsWbxmlDecoder *decoder,
                                                     qvsWapApplication *record)

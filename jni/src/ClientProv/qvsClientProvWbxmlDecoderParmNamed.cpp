@@ -11,14 +11,13 @@ namespace {
 constexpr char kRefusedBy[] = "Access";
 
 // The NAME is all that the loop knows of these characteristics.
-constexpr Parm kNameAlone[] = {
-    {attr::kName, kByReader},
-};
+template <class Record>
+constexpr auto kNameAlone = tableOf<Parm<Record>>({{attr::kName, kByReader}});
 
 // Reads one named parameter of `record`. A name that is not listed leaves its value to the loop,
 // which refuses it.
-qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag,
-                    const Rows<NamedParm> &names, const char *label)
+qvsResult readAnyNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag,
+                       const Rows<NamedRow> &names, const char *label)
 {
     ParmName name;
     if (qvsResult result = readParmName(decoder, state, tag, label, false, &name)) {
@@ -36,14 +35,21 @@ qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, 
     return QVS_OK;
 }
 
+template <class Record, size_t N>
+qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, Record *record, uint8_t tag,
+                    const Table<Record, NamedRow, N> &names, const char *label)
+{
+    return readAnyNamed(decoder, state, record, tag, rowsFor<Record>(names), label);
+}
+
 namespace roaming {
 using R = qvsWapRoaming;
-constexpr NamedParm kNamed[] = {
-    {"SYNC-ALLOWED", QVS_FIELD(R, pszSyncAllowed)},
-    {"SYNC-DEFAULT", QVS_FIELD(R, pszSyncDefault)},
-};
+constexpr auto kNamed = tableOf<NamedParm<R>>({
+    {"SYNC-ALLOWED", &R::pszSyncAllowed},
+    {"SYNC-DEFAULT", &R::pszSyncDefault},
+});
 
-qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
+qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
 {
     return readNamed(decoder, state, record, attr::kName, kNamed,
                      "qvsClientProvWbxmlDecoderParamRoamingNameString");
@@ -52,22 +58,22 @@ qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 
 namespace wifi {
 using R = qvsWapWifi;
-constexpr NamedParm kNamed[] = {
-    {"NETSSID", QVS_FIELD(R, pszNetSsid)},
-    {"SECMODE", QVS_FIELD(R, pszSecMode)},
-    {"EAPMETHOD", QVS_FIELD(R, pszEapMethod)},
-    {"EAPTYPE", QVS_FIELD(R, pszEapType)},
-    {"USERNAME", QVS_FIELD(R, pszUserName)},
-    {"ANONUSERNAME", QVS_FIELD(R, pszAnonUserName)},
-    {"PASSWORD", QVS_FIELD(R, pszPassword)},
-    {"CACERT", QVS_FIELD(R, pszCaCert)},
-    {"USERCERT", QVS_FIELD(R, pszUserCert)},
-    {"PHASE1", QVS_FIELD(R, pszPhase1)},
-    {"AUTHALGORITHM", QVS_FIELD(R, pszAuthAlgorithm)},
-    {"PRIORITY", QVS_FIELD(R, pszPriority)},
-};
+constexpr auto kNamed = tableOf<NamedParm<R>>({
+    {"NETSSID", &R::pszNetSsid},
+    {"SECMODE", &R::pszSecMode},
+    {"EAPMETHOD", &R::pszEapMethod},
+    {"EAPTYPE", &R::pszEapType},
+    {"USERNAME", &R::pszUserName},
+    {"ANONUSERNAME", &R::pszAnonUserName},
+    {"PASSWORD", &R::pszPassword},
+    {"CACERT", &R::pszCaCert},
+    {"USERCERT", &R::pszUserCert},
+    {"PHASE1", &R::pszPhase1},
+    {"AUTHALGORITHM", &R::pszAuthAlgorithm},
+    {"PRIORITY", &R::pszPriority},
+});
 
-qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
+qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
 {
     return readNamed(decoder, state, record, attr::kName, kNamed,
                      "qvsClientProvWbxmlDecoderParamNameString");
@@ -76,11 +82,11 @@ qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
 
 namespace voWifi {
 using R = qvsWapVoWifi;
-constexpr NamedParm kNamed[] = {
-    {"ePDG FQDN", QVS_FIELD(R, pszEpdgFqdn)},
-};
+constexpr auto kNamed = tableOf<NamedParm<R>>({
+    {"ePDG FQDN", &R::pszEpdgFqdn},
+});
 
-qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
+qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
 {
     return readNamed(decoder, state, record, attr::kName, kNamed,
                      "qvsClientProvWbxmlDecoderParamNameString");
@@ -116,39 +122,30 @@ qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_
     return QVS_OK;
 }
 
-char **qvs::findNamed(void *record, const Rows<NamedParm> &names, const Text &name)
+char **qvs::findNamed(void *record, const Rows<NamedRow> &names, const Text &name)
 {
     const char *const text = name.str();
     const uint32_t length = name.length;
-    for (const NamedParm &known : names) {
+    for (const NamedRow &known : names) {
         if (known.name[0] == text[0] && length < sizeof known.name && known.name[length] == '\0' &&
             memcmp(text, known.name, length) == 0) {
-            return textAt(record, known.field.number);
+            return textAt(record, known.field);
         }
     }
     return nullptr;
 }
 
-constexpr ParmTable qvs::kRoamingParms = {
-    .name = kRefusedBy,
-    .rows = kNameAlone,
-    .reader = roaming::read,
-    .entered = "Roming",
-};
+constexpr ParmsOf<qvsWapRoaming> qvs::kRoamingParms = {{.name = kRefusedBy, .entered = "Roming"},
+                                                       kNameAlone<qvsWapRoaming>,
+                                                       kReadBy<qvsWapRoaming, roaming::read>};
 
-constexpr ParmTable qvs::kWifiParms = {
-    .name = kRefusedBy,
-    .rows = kNameAlone,
-    .reader = wifi::read,
-    .entered = "Wifi",
-};
+constexpr ParmsOf<qvsWapWifi> qvs::kWifiParms = {{.name = kRefusedBy, .entered = "Wifi"},
+                                                 kNameAlone<qvsWapWifi>,
+                                                 kReadBy<qvsWapWifi, wifi::read>};
 
-constexpr ParmTable qvs::kVoWifiParms = {
-    .name = kRefusedBy,
-    .rows = kNameAlone,
-    .reader = voWifi::read,
-    .entered = "VoWifi",
-};
+constexpr ParmsOf<qvsWapVoWifi> qvs::kVoWifiParms = {{.name = kRefusedBy, .entered = "VoWifi"},
+                                                     kNameAlone<qvsWapVoWifi>,
+                                                     kReadBy<qvsWapVoWifi, voWifi::read>};
 
 qvsResult qvsClientProvWbxmlDecoderParamRoaming(qvsWbxmlDecoder *decoder, qvsWapRoaming *record)
 {

@@ -28,39 +28,39 @@ qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapNapDef *
     return QVS_OK;
 }
 
-qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
+qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapNapDef *record)
 {
-    return readNamed(decoder, state, static_cast<qvsWapNapDef *>(record), attr::kName);
+    return readNamed(decoder, state, record, attr::kName);
 }
 
 namespace napDef {
 using R = qvsWapNapDef;
-constexpr Parm kParms[] = {
+constexpr auto kParms = tableOf<Parm<R>>({
     {attr::kName, kByReader},
-    {page0::kName, QVS_FIELD(R, pszName)},
-    {page0::kNapAddress, QVS_FIELD(R, pszNapAddress)},
-    {page0::kNapAddrType, QVS_FIELD(R, pszNapAddrType)},
-    {page0::kCallType, QVS_FIELD(R, pszCallType)},
-    {page0::kLinger, QVS_FIELD(R, pszLinger)},
-    {page0::kBearer, QVS_FIELD(R, ptBearerList)},
-    {page0::kNapId, QVS_FIELD(R, pszNapId)},
-    {page0::kInternet, QVS_FIELD(R, pszInternet)},
-    {page0::kLinkSpeed, QVS_FIELD(R, pszLinkSpeed)},
-    {page0::kDnLinkSpeed, QVS_FIELD(R, pszDnLinkSpeed)},
-    {page0::kLocalAddr, QVS_FIELD(R, pszLocalAddr)},
-    {page0::kLocalAddrType, QVS_FIELD(R, pszLocalAddrType)},
-    {page0::kDeliveryErrSdu, QVS_FIELD(R, pszDeliveryErrSdu)},
-    {page0::kDeliveryOrder, QVS_FIELD(R, pszDeliveryOrder)},
-    {page0::kTrafficClass, QVS_FIELD(R, pszTrafficClass)},
-    {page0::kMaxSduSize, QVS_FIELD(R, pszMaxSduSize)},
-    {page0::kMaxBitrateUplink, QVS_FIELD(R, pszMaxBitrateUplink)},
-    {page0::kMaxBitrateDnlink, QVS_FIELD(R, pszMaxBitrateDnlink)},
-    {page0::kDnsAddr, QVS_FIELD(R, ptDnsAddrList)},
-    {page0::kMaxNumRetry, QVS_FIELD(R, pszMaxNumRetry)},
-    {page0::kFirstRetryTimeout, QVS_FIELD(R, pszFirstRetryTimeout)},
-    {page0::kReregThreshold, QVS_FIELD(R, pszReregThreshold)},
-    {page0::kTBit, QVS_FIELD(R, pszTBit)},
-};
+    {page0::kName, &R::pszName},
+    {page0::kNapAddress, &R::pszNapAddress},
+    {page0::kNapAddrType, &R::pszNapAddrType},
+    {page0::kCallType, &R::pszCallType},
+    {page0::kLinger, &R::pszLinger},
+    {page0::kBearer, &R::ptBearerList},
+    {page0::kNapId, &R::pszNapId},
+    {page0::kInternet, &R::pszInternet},
+    {page0::kLinkSpeed, &R::pszLinkSpeed},
+    {page0::kDnLinkSpeed, &R::pszDnLinkSpeed},
+    {page0::kLocalAddr, &R::pszLocalAddr},
+    {page0::kLocalAddrType, &R::pszLocalAddrType},
+    {page0::kDeliveryErrSdu, &R::pszDeliveryErrSdu},
+    {page0::kDeliveryOrder, &R::pszDeliveryOrder},
+    {page0::kTrafficClass, &R::pszTrafficClass},
+    {page0::kMaxSduSize, &R::pszMaxSduSize},
+    {page0::kMaxBitrateUplink, &R::pszMaxBitrateUplink},
+    {page0::kMaxBitrateDnlink, &R::pszMaxBitrateDnlink},
+    {page0::kDnsAddr, &R::ptDnsAddrList},
+    {page0::kMaxNumRetry, &R::pszMaxNumRetry},
+    {page0::kFirstRetryTimeout, &R::pszFirstRetryTimeout},
+    {page0::kReregThreshold, &R::pszReregThreshold},
+    {page0::kTBit, &R::pszTBit},
+});
 
 void traceRefused(uint8_t token)
 {
@@ -72,43 +72,36 @@ void traceRefused(uint8_t token)
 
 namespace napAuthInfo {
 using R = qvsWapNapAuthInfo;
-constexpr Parm kParms[] = {
-    {page0::kAuthType, QVS_FIELD(R, pszAuthType)},
-    {page0::kAuthName, QVS_FIELD(R, pszAuthName)},
-    {page0::kAuthSecret, QVS_FIELD(R, pszAuthSecret)},
-    {page0::kAuthEntity, QVS_FIELD(R, ptAuthEntityList)},
-};
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page0::kAuthType, &R::pszAuthType},
+    {page0::kAuthName, &R::pszAuthName},
+    {page0::kAuthSecret, &R::pszAuthSecret},
+    {page0::kAuthEntity, &R::ptAuthEntityList},
+});
 } // namespace napAuthInfo
 
 namespace validity {
 using R = qvsWapValidity;
-constexpr Parm kParms[] = {
-    {page0::kValidUntil, QVS_FIELD(R, pszValidUntil)},
-    {page0::kCountry, QVS_FIELD(R, pszCountry)},
-    {page0::kNetwork, QVS_FIELD(R, pszNetwork)},
-    {page0::kSid, QVS_FIELD(R, pszSid)},
-    {page0::kSoc, QVS_FIELD(R, pszSoc)},
-};
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page0::kValidUntil, &R::pszValidUntil},
+    {page0::kCountry, &R::pszCountry},
+    {page0::kNetwork, &R::pszNetwork},
+    {page0::kSid, &R::pszSid},
+    {page0::kSoc, &R::pszSoc},
+});
 } // namespace validity
 
 } // namespace
 
-constexpr ParmTable qvs::kNapDefParms = {
-    .name = "NapDef",
-    .rows = napDef::kParms,
-    .reader = readName,
-    .onRefused = napDef::traceRefused,
-};
+constexpr ParmsOf<qvsWapNapDef> qvs::kNapDefParms = {
+    {.name = "NapDef", .onRefused = napDef::traceRefused},
+    napDef::kParms,
+    kReadBy<qvsWapNapDef, readName>};
 
-constexpr ParmTable qvs::kNapAuthInfoParms = {
-    .name = "NapAuthInfo",
-    .rows = napAuthInfo::kParms,
-};
+constexpr ParmsOf<qvsWapNapAuthInfo> qvs::kNapAuthInfoParms = {{.name = "NapAuthInfo"},
+                                                               napAuthInfo::kParms};
 
-constexpr ParmTable qvs::kValidityParms = {
-    .name = "Validity",
-    .rows = validity::kParms,
-};
+constexpr ParmsOf<qvsWapValidity> qvs::kValidityParms = {{.name = "Validity"}, validity::kParms};
 
 qvsResult qvsClientProvWbxmlDecoderParamNapDef(qvsWbxmlDecoder *decoder, qvsWapNapDef *record)
 {

@@ -29,70 +29,62 @@ qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, char **name, c
     return QVS_OK;
 }
 
-qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
+qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapVendorConfig *record)
 {
-    auto *vendor = static_cast<qvsWapVendorConfig *>(record);
-    return readNamed(decoder, state, &vendor->pszParamName, &vendor->pszParamValue, attr::kName);
+    return readNamed(decoder, state, &record->pszParamName, &record->pszParamValue, attr::kName);
 }
 
 namespace bootstrap {
 using R = qvsWapBootstrap;
-constexpr Parm kParms[] = {
-    {page0::kName, QVS_FIELD(R, pszName)},
-    {page0::kCountry, QVS_FIELD(R, pszCountry)},
-    {page0::kNetwork, QVS_FIELD(R, ptNetworkList)},
-    {page0::kProxyId, QVS_FIELD(R, ptProxyIdList)},
-    {page0::kProvUrl, QVS_FIELD(R, pszProvUrl)},
-    {page0::kContextAllow, QVS_FIELD(R, pszContextAllow)},
-};
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page0::kName, &R::pszName},
+    {page0::kCountry, &R::pszCountry},
+    {page0::kNetwork, &R::ptNetworkList},
+    {page0::kProxyId, &R::ptProxyIdList},
+    {page0::kProvUrl, &R::pszProvUrl},
+    {page0::kContextAllow, &R::pszContextAllow},
+});
 } // namespace bootstrap
 
 namespace clientIdentity {
 using R = qvsWapClientIdentity;
-constexpr Parm kParms[] = {
-    {page0::kClientId, QVS_FIELD(R, pszClientId)},
-};
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page0::kClientId, &R::pszClientId},
+});
 } // namespace clientIdentity
 
 namespace vendorConfig {
 using R = qvsWapVendorConfig;
-constexpr Parm kParms[] = {
+constexpr auto kParms = tableOf<Parm<R>>({
     {attr::kName, kByReader},
-    {page0::kName, QVS_FIELD(R, pszName)},
-};
+    {page0::kName, &R::pszName},
+});
 } // namespace vendorConfig
 
 namespace access {
 using R = qvsWapAccess;
-constexpr Parm kParms[] = {
-    {page0::kDomain, QVS_FIELD(R, ptDomainList)},   {page0::kToNapId, QVS_FIELD(R, ptToNapIdList)},
-    {page0::kPortNbr, QVS_FIELD(R, ptPortNbrList)}, {page1::kAppId, QVS_FIELD(R, ptAppIdList)},
-    {page1::kToProxy, QVS_FIELD(R, ptToProxyList)}, {page1::kRule, QVS_FIELD(R, ptRuleList)},
-};
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page0::kDomain, &R::ptDomainList},
+    {page0::kToNapId, &R::ptToNapIdList},
+    {page0::kPortNbr, &R::ptPortNbrList},
+    {page1::kAppId, &R::ptAppIdList},
+    {page1::kToProxy, &R::ptToProxyList},
+    {page1::kRule, &R::ptRuleList},
+});
 } // namespace access
 
 } // namespace
 
-constexpr ParmTable qvs::kBootstrapParms = {
-    .name = "Bootstrap",
-    .rows = bootstrap::kParms,
-};
+constexpr ParmsOf<qvsWapBootstrap> qvs::kBootstrapParms = {{.name = "Bootstrap"},
+                                                           bootstrap::kParms};
 
-constexpr ParmTable qvs::kClientIdentityParms = {
-    .name = "ClientIdentity",
-    .rows = clientIdentity::kParms,
-};
+constexpr ParmsOf<qvsWapClientIdentity> qvs::kClientIdentityParms = {{.name = "ClientIdentity"},
+                                                                     clientIdentity::kParms};
 
-constexpr ParmTable qvs::kVendorConfigParms = {
-    .name = "VendorConfig",
-    .rows = vendorConfig::kParms,
-    .reader = readName,
-};
+constexpr ParmsOf<qvsWapVendorConfig> qvs::kVendorConfigParms = {
+    {.name = "VendorConfig"}, vendorConfig::kParms, kReadBy<qvsWapVendorConfig, readName>};
 
-constexpr ParmTable qvs::kAccessParms = {
-    .name = "Access",
-    .rows = access::kParms,
-};
+constexpr ParmsOf<qvsWapAccess> qvs::kAccessParms = {{.name = "Access"}, access::kParms};
 
 qvsResult qvsClientProvWbxmlDecoderParamBootstrap(qvsWbxmlDecoder *decoder, qvsWapBootstrap *record)
 {

@@ -5,28 +5,19 @@ using namespace qvs;
 
 namespace {
 
-// kept[pxphysical-domain]: a DOMAIN that cannot be read is traced and the parm goes on.
-qvsResult readPhysicalDomain(qvsWbxmlDecoder *decoder, DecodeState *state, void *record)
-{
-    if (readList(decoder, state, record, QVS_FIELD(qvsWapPxPhysical, ptDomainList)) != QVS_OK) {
-        trace("[ERROR] qvsClientProvWbxmlDecoderParamListString Fail");
-    }
-    return state->textLimit ? QVS_ERROR_NO_MEMORY : QVS_OK;
-}
-
 namespace pxLogical {
 using R = qvsWapPxLogical;
-constexpr Parm kParms[] = {
-    {page0::kName, QVS_FIELD(R, pszName)},
-    {page0::kProxyId, QVS_FIELD(R, pszProxyId)},
-    {page0::kProxyProviderId, QVS_FIELD(R, pszProxyProviderId)},
-    {page0::kDomain, QVS_FIELD(R, ptDomainList)},
-    {page0::kStartPage, QVS_FIELD(R, pszStartPage)},
-    {page0::kTrust, QVS_FIELD(R, pszTrust)},
-    {page0::kMaster, QVS_FIELD(R, pszMaster)},
-    {page0::kProxyPw, QVS_FIELD(R, pszProxyPw)},
-    {page0::kPpgAuthType, QVS_FIELD(R, pszPpgAuthType)},
-};
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page0::kName, &R::pszName},
+    {page0::kProxyId, &R::pszProxyId},
+    {page0::kProxyProviderId, &R::pszProxyProviderId},
+    {page0::kDomain, &R::ptDomainList},
+    {page0::kStartPage, &R::pszStartPage},
+    {page0::kTrust, &R::pszTrust},
+    {page0::kMaster, &R::pszMaster},
+    {page0::kProxyPw, &R::pszProxyPw},
+    {page0::kPpgAuthType, &R::pszPpgAuthType},
+});
 
 void traceResult(uint8_t /*token*/, qvsResult result)
 {
@@ -36,11 +27,11 @@ void traceResult(uint8_t /*token*/, qvsResult result)
 
 namespace pxAuthInfo {
 using R = qvsWapPxAuthInfo;
-constexpr Parm kParms[] = {
-    {page0::kPxAuthType, QVS_FIELD(R, pszPxAuthType)},
-    {page0::kPxAuthId, QVS_FIELD(R, pszPxAuthId)},
-    {page0::kPxAuthPw, QVS_FIELD(R, pszPxAuthPw)},
-};
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page0::kPxAuthType, &R::pszPxAuthType},
+    {page0::kPxAuthId, &R::pszPxAuthId},
+    {page0::kPxAuthPw, &R::pszPxAuthPw},
+});
 
 void traceToken(uint8_t token)
 {
@@ -57,52 +48,50 @@ void traceEnd(uint8_t token, qvsResult result)
 
 namespace port {
 using R = qvsWapPort;
-constexpr Parm kParms[] = {
-    {page0::kPortNbr, QVS_FIELD(R, pszPortNbr)},
-    {page0::kService, QVS_FIELD(R, ptServiceList)},
-};
+constexpr auto kParms = tableOf<Parm<R>>({
+    {page0::kPortNbr, &R::pszPortNbr},
+    {page0::kService, &R::ptServiceList},
+});
 } // namespace port
 
 namespace pxPhysical {
 using R = qvsWapPxPhysical;
-constexpr Parm kParms[] = {
+constexpr auto kParms = tableOf<Parm<R>>({
     {page0::kDomain, kByReader},
-    {page0::kPushEnabled, QVS_FIELD(R, pszPushEnabled)},
-    {page0::kPxAddr, QVS_FIELD(R, pszPxAddr)},
-    {page0::kPxAddrType, QVS_FIELD(R, pszPxAddrType)},
-    {page0::kToNapId, QVS_FIELD(R, ptToNapIdList)},
-    {page0::kWspVersion, QVS_FIELD(R, pszWspVersion)},
-    {page0::kPhysicalProxyId, QVS_FIELD(R, pszPhysicalProxyId)},
-    {page0::kPxAddrFqdn, QVS_FIELD(R, pszPxAddrFqdn)},
-    {page0::kPullEnabled, QVS_FIELD(R, pszPullEnabled)},
-};
+    {page0::kPushEnabled, &R::pszPushEnabled},
+    {page0::kPxAddr, &R::pszPxAddr},
+    {page0::kPxAddrType, &R::pszPxAddrType},
+    {page0::kToNapId, &R::ptToNapIdList},
+    {page0::kWspVersion, &R::pszWspVersion},
+    {page0::kPhysicalProxyId, &R::pszPhysicalProxyId},
+    {page0::kPxAddrFqdn, &R::pszPxAddrFqdn},
+    {page0::kPullEnabled, &R::pszPullEnabled},
+});
+
+// kept[pxphysical-domain]: a DOMAIN that cannot be read is traced and the parm goes on.
+qvsResult readDomain(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
+{
+    static constexpr Parm<R> kDomain = {page0::kDomain, &R::ptDomainList};
+    if (readList(decoder, state, record, kDomain) != QVS_OK) {
+        trace("[ERROR] qvsClientProvWbxmlDecoderParamListString Fail");
+    }
+    return state->textLimit ? QVS_ERROR_NO_MEMORY : QVS_OK;
+}
 } // namespace pxPhysical
 
 } // namespace
 
-constexpr ParmTable qvs::kPxLogicalParms = {
-    .name = "Pxlogical",
-    .rows = pxLogical::kParms,
-    .onEnd = pxLogical::traceResult,
-};
+constexpr ParmsOf<qvsWapPxLogical> qvs::kPxLogicalParms = {
+    {.name = "Pxlogical", .onEnd = pxLogical::traceResult}, pxLogical::kParms};
 
-constexpr ParmTable qvs::kPxAuthInfoParms = {
-    .name = "PxAuthInfo",
-    .rows = pxAuthInfo::kParms,
-    .onToken = pxAuthInfo::traceToken,
-    .onEnd = pxAuthInfo::traceEnd,
-};
+constexpr ParmsOf<qvsWapPxAuthInfo> qvs::kPxAuthInfoParms = {
+    {.name = "PxAuthInfo", .onToken = pxAuthInfo::traceToken, .onEnd = pxAuthInfo::traceEnd},
+    pxAuthInfo::kParms};
 
-constexpr ParmTable qvs::kPortParms = {
-    .name = "Port",
-    .rows = port::kParms,
-};
+constexpr ParmsOf<qvsWapPort> qvs::kPortParms = {{.name = "Port"}, port::kParms};
 
-constexpr ParmTable qvs::kPxPhysicalParms = {
-    .name = "PxPhysical",
-    .rows = pxPhysical::kParms,
-    .reader = readPhysicalDomain,
-};
+constexpr ParmsOf<qvsWapPxPhysical> qvs::kPxPhysicalParms = {
+    {.name = "PxPhysical"}, pxPhysical::kParms, kReadBy<qvsWapPxPhysical, pxPhysical::readDomain>};
 
 qvsResult qvsClientProvWbxmlDecoderParamPxlogical(qvsWbxmlDecoder *decoder, qvsWapPxLogical *record)
 {

@@ -1,5 +1,7 @@
-// The fields of plain records by number. Every field of a record of the tree and of the context is
-// one pointer wide, so that one loop serves all kinds of record and the rest is tables of fields.
+// The fields of plain records. Every field of a record of the tree and of the context is one
+// pointer wide, so that one loop serves all kinds of record: its rows are numbers of fields. They
+// are made here, of the record itself or of its members, so that a row of another record does not
+// compile.
 #ifndef QVSFIELDS_H
 #define QVSFIELDS_H
 
@@ -10,29 +12,14 @@
 #include <stdint.h>
 #include <string.h>
 
+struct qvsCtxStrNode;
+
 namespace [[gnu::visibility("hidden")]] qvs {
-
-// The number of a field, counted from 0, by the type of what it holds.
-struct TextField {
-    uint8_t number;
-};
-struct ListField {
-    uint8_t number;
-    uint8_t place; // 0 for the last field of the record
-};
-struct RecordField {
-    uint8_t number;
-};
-
-constexpr uint8_t kNoField = 0xFF;
-
-// The lists of a record are its last fields. Their places are counted from the end; a list further
-// from it does not compile.
-constexpr uint8_t kMostLists = 6;
-constexpr uint8_t kListPlaces[kMostLists] = {0, 1, 2, 3, 4, 5};
 
 template <class Record>
 constexpr uint8_t kFieldsOf = sizeof(Record) / sizeof(void *);
+
+constexpr uint8_t kNoField = 0xFF;
 
 // The number of ptNext, the last field of the records that form chains; kNoField for others.
 template <class Record>
@@ -49,27 +36,277 @@ template <class Record>
 requires(sizeof(Record::ptCharacterList) >
          0) inline constexpr uint8_t kChildListOf<Record> = kFieldsOf<Record> - 1;
 
-// `offset` is where the member lies; the member itself is here for its type.
+// The fields that a table has rows for: all but the two above.
 template <class Record>
-consteval TextField fieldAt(char *Record::*, size_t offset)
+constexpr uint8_t kRowsOf = kFieldsOf<Record> -
+                            (kLinkOf<Record> == kNoField && kChildListOf<Record> == kNoField ? 0
+                                                                                             : 1);
+
+// The lists of a record are its last fields. Their places are counted from the end; a list further
+// from it does not compile.
+constexpr uint8_t kMostLists = 6;
+constexpr uint8_t kListPlaces[kMostLists] = {0, 1, 2, 3, 4, 5};
+
+// ---- What a record says itself: the numbers of its fields, counted from 0, and their types
+
+// Initialises the n-th field of a record with a pointer that tells n, and its row by n and its
+// type.
+template <class Row>
+struct Mark {
+    template <class Pointee>
+    constexpr operator Pointee *() const;
+
+    uint8_t number;
+    Row *row; // null for none
+};
+
+template <class Pointee>
+inline constexpr Pointee kMarks[64] = {};
+
+template <class Row>
+template <class Pointee>
+constexpr Mark<Row>::operator Pointee *() const
 {
-    return {static_cast<uint8_t>(offset / sizeof(void *))};
+    if (row) {
+        *row = Row(number, static_cast<Pointee *>(nullptr));
+    }
+    return const_cast<Pointee *>(kMarks<Pointee> + number);
 }
 
-template <class Record>
-consteval ListField fieldAt(qvsList *Record::*, size_t offset)
+// A record with a mark in each field. `rows` is one for each field, or null.
+template <class Record, class Row, class... Marks>
+consteval Record marked(Row *rows, Marks... marks)
 {
-    const auto number = static_cast<uint8_t>(offset / sizeof(void *));
-    return {number, kListPlaces[kFieldsOf<Record> - 1 - number]};
+    constexpr uint8_t kNumber = sizeof...(marks);
+    if constexpr (kNumber < kFieldsOf<Record>) {
+        Row *row = rows ? rows + kNumber : nullptr;
+        return marked<Record>(rows, marks..., Mark<Row>{kNumber, row});
+    } else {
+// The union in qvsCtxStrNode is one field, without braces of its own.
+#pragma GCC diagnostic push
+#pragma GCC diagnostic ignored "-Wmissing-braces"
+        return Record{marks...};
+#pragma GCC diagnostic pop
+    }
 }
+
+struct NoRow {
+    constexpr NoRow(uint8_t /*number*/, const void * /*type*/) {}
+};
+
+template <class Record>
+inline constexpr Record kMarked = marked<Record, NoRow>(nullptr);
 
 template <class Record, class Pointee>
-consteval RecordField fieldAt(Pointee *Record::*, size_t offset)
+constexpr uint8_t numberOf(Pointee *Record::*field)
 {
-    return {static_cast<uint8_t>(offset / sizeof(void *))};
+    return static_cast<uint8_t>(kMarked<Record>.*field - kMarks<Pointee>);
 }
 
-#define QVS_FIELD(Record, name) qvs::fieldAt(&Record::name, offsetof(Record, name))
+// ---- Tables
+
+// Rows about fields of one Record. What is made of a table has the rows in another order, one less,
+// or one twice.
+template <class Record, class Row, size_t N>
+struct Table {
+    // The row of a field; a field without one does not compile.
+    template <class Pointee>
+    constexpr size_t rowOf(Pointee *Record::*field) const
+    {
+        size_t row = 0;
+        while (rows[row].field != numberOf(field)) {
+            ++row;
+        }
+        return row;
+    }
+
+    template <class Pointee>
+    constexpr Table<Record, Row, N - 1> without(Pointee *Record::*field) const
+    {
+        Table<Record, Row, N - 1> made;
+        const size_t left = rowOf(field);
+        for (size_t row = 0; row < N - 1; ++row) {
+            made.rows[row] = rows[row < left ? row : row + 1];
+        }
+        return made;
+    }
+
+    template <class Pointee>
+    constexpr Table<Record, Row, N + 1> with(const Row &added, Pointee *Record::*behind) const
+    {
+        Table<Record, Row, N + 1> made;
+        const size_t place = rowOf(behind) + 1;
+        for (size_t row = 0; row < N; ++row) {
+            made.rows[row < place ? row : row + 1] = rows[row];
+        }
+        made.rows[place] = added;
+        return made;
+    }
+
+    template <class Moved, class Pointee>
+    constexpr Table moved(Moved *Record::*field, Pointee *Record::*behind) const
+    {
+        return without(field).with(rows[rowOf(field)], behind);
+    }
+
+    // Both rows stay where they are, each about the other field.
+    template <class Pointee>
+    constexpr Table crossed(Pointee *Record::*one, Pointee *Record::*other) const
+    {
+        Table made = *this;
+        made.rows[rowOf(one)].field = numberOf(other);
+        made.rows[rowOf(other)].field = numberOf(one);
+        return made;
+    }
+
+    template <class Again, class Pointee>
+    constexpr Table<Record, Row, N + 1> again(Again *Record::*field, Pointee *Record::*behind) const
+    {
+        return with(rows[rowOf(field)], behind);
+    }
+
+    Row rows[N];
+};
+
+template <class Row, size_t N>
+consteval size_t countOf(const Row (&)[N])
+{
+    return N;
+}
+
+// The same when it runs: a table of rows that differ in number.
+template <class Row>
+struct Rows {
+    constexpr Rows() = default;
+    template <size_t N>
+    constexpr Rows(const Row (&rows)[N]) : first(rows), count(N)
+    {
+    }
+
+    const Row *begin() const { return first; }
+    const Row *end() const { return first + count; }
+
+    const Row *first = nullptr;
+    uint8_t count = 0;
+};
+
+// The rows of a table about this record; one about another does not compile.
+template <class Record, class Row, size_t N>
+constexpr Rows<Row> rowsFor(const Table<Record, Row, N> &table)
+{
+    return table.rows;
+}
+
+// Fields of a record.
+template <class Record>
+struct FieldSet {
+    bool has[kFieldsOf<Record>] = {};
+    uint8_t count = 0;
+};
+
+template <class Record, class... Pointees>
+consteval FieldSet<Record> setOf(Pointees *Record::*...fields)
+{
+    FieldSet<Record> set;
+    ((set.has[numberOf(fields)] = true), ...);
+    set.count = sizeof...(fields);
+    return set;
+}
+
+// The fields that stay allocated on purpose when a record is released: none, where nothing is said.
+template <class Record>
+inline constexpr FieldSet<Record> kLeft = {};
+
+// The rows of a table: the fields in their order but for those that are left.
+template <class Row, class Record>
+consteval auto inOrder()
+{
+    constexpr FieldSet<Record> kStay = kLeft<Record>;
+    Row all[kFieldsOf<Record>];
+    (void)marked<Record>(all);
+    Table<Record, Row, kRowsOf<Record> - kStay.count> table;
+    size_t row = 0;
+    for (uint8_t field = 0; field < kRowsOf<Record>; ++field) {
+        if (!kStay.has[field]) {
+            table.rows[row++] = all[field];
+        }
+    }
+    return table;
+}
+
+// The same where the order is another one.
+template <class Row, class Record, class... Pointees>
+consteval Table<Record, Row, sizeof...(Pointees)> rowsOf(Pointees *Record::*...fields)
+{
+    return {{Row(numberOf(fields), static_cast<Pointees *>(nullptr))...}};
+}
+
+// Whether a table has each field once, but for those that are left.
+template <class Record, class Row, size_t N>
+consteval bool isComplete(const Table<Record, Row, N> &table)
+{
+    FieldSet<Record> seen = kLeft<Record>;
+    for (const Row &row : table.rows) {
+        if (row.field >= kRowsOf<Record> || seen.has[row.field]) {
+            return false;
+        }
+        seen.has[row.field] = true;
+        ++seen.count;
+    }
+    return seen.count == kRowsOf<Record>;
+}
+
+// A table of rows that are typed by their record.
+template <class Typed, size_t N>
+consteval Table<typename Typed::Of, typename Typed::Row, N> tableOf(const Typed (&typed)[N])
+{
+    Table<typename Typed::Of, typename Typed::Row, N> table;
+    for (size_t row = 0; row < N; ++row) {
+        table.rows[row] = typed[row].row;
+    }
+    return table;
+}
+
+// ---- What fields hold
+
+enum class Holds : uint8_t { kText, kTexts, kRecord };
+
+// A field and what it points at.
+struct FieldRow {
+    constexpr FieldRow() = default;
+    constexpr FieldRow(uint8_t number, char *) : field(number), holds(Holds::kText) {}
+    constexpr FieldRow(uint8_t number, qvsList *) : field(number), holds(Holds::kTexts) {}
+    constexpr FieldRow(uint8_t number, qvsCtxStrNode *) : field(number), holds(Holds::kTexts) {}
+    constexpr FieldRow(uint8_t number, void *) : field(number), holds(Holds::kRecord) {}
+
+    uint8_t field = 0;
+    Holds holds = Holds::kText;
+};
+
+template <class Record>
+consteval Table<Record, FieldRow, kFieldsOf<Record>> fieldsOf()
+{
+    Table<Record, FieldRow, kFieldsOf<Record>> table;
+    (void)marked<Record>(table.rows);
+    return table;
+}
+
+// All fields of a record.
+template <class Record>
+inline constexpr auto kFields = fieldsOf<Record>();
+
+// How many of them are texts: they are its first ones.
+template <class Record>
+consteval uint8_t textsOf()
+{
+    uint8_t texts = 0;
+    while (texts < kFieldsOf<Record> && kFields<Record>.rows[texts].holds == Holds::kText) {
+        ++texts;
+    }
+    return texts;
+}
+
+// ---- Fields by number
 
 inline char **textAt(void *record, uint8_t number)
 {
@@ -92,42 +329,6 @@ inline void *pointerAt(const void *record, uint8_t number)
 inline void setPointer(void *record, uint8_t number, const void *pointer)
 {
     memcpy(static_cast<char *>(record) + number * sizeof pointer, &pointer, sizeof pointer);
-}
-
-// A table of rows that differ in number.
-template <class Row>
-struct Rows {
-    consteval Rows() = default;
-    template <size_t N>
-    consteval Rows(const Row (&rows)[N]) : first(rows), count(N)
-    {
-    }
-
-    const Row *begin() const { return first; }
-    const Row *end() const { return first + count; }
-
-    const Row *first = nullptr;
-    uint8_t count = 0;
-};
-
-// Fields that a release leaves alone on purpose. Counted, so that no field is merely forgotten.
-template <size_t N>
-struct Left {
-};
-
-template <class Record, class... Fields>
-consteval Left<sizeof...(Fields)> leave(Fields Record::*...)
-{
-    return {};
-}
-
-// Releases the text in a field, if there is one, and clears the field.
-inline void releaseText(char **field)
-{
-    if (*field) {
-        qvsMemFree_debug(*field);
-        *field = nullptr;
-    }
 }
 
 } // namespace qvs

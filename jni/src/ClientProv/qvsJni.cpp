@@ -52,23 +52,22 @@ jobjectArray stringArray(JNIEnv *env, const char *const *texts, jsize shown, jsi
     return result;
 }
 
-Shown::Shown(const void *record, Cells cells, Naming naming)
-    : length(static_cast<jsize>(cells.count) + 1)
+Shown::Shown(const void *record, uint8_t shown, Naming naming)
+    : length(static_cast<jsize>(shown) + 1)
 {
-    for (uint8_t i = 0; i < cells.count; ++i) {
-        const uint8_t field = cells.fields[i].number;
+    for (uint8_t field = 0; field < shown; ++field) {
         const char *value = static_cast<const char *>(pointerAt(record, field));
-        texts[i] = value && field == naming.field.number ? naming.nameOf(value) : value;
+        texts[field] = value && field == naming.field ? naming.nameOf(value) : value;
     }
-    texts[cells.count] = nullptr;
+    texts[shown] = nullptr;
 }
 
-jobjectArray array(JNIEnv *env, const void *record, Cells cells, Naming naming)
+jobjectArray array(JNIEnv *env, const void *record, uint8_t texts, Naming naming)
 {
     if (!record) {
         return nullptr;
     }
-    const Shown shown(record, cells, naming);
+    const Shown shown(record, texts, naming);
     return stringArray(env, shown.texts, shown.length, shown.length);
 }
 

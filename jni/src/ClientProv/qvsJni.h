@@ -26,12 +26,6 @@ namespace [[gnu::visibility("hidden")]] qvs {
 // after the delete method. Owned by the session.
 extern smlpushHdlrInfo *ptPushHdlrInfo;
 
-template <class Row, size_t N>
-consteval size_t countOf(const Row (&)[N])
-{
-    return N;
-}
-
 // ---- Walks. Indexes count from 1.
 
 // The n-th record of a chain; null when the chain ends before it or n is below 1.
@@ -100,37 +94,55 @@ jstring text(JNIEnv *env, const Record *record, char *Record::*field)
 // behind them stay empty strings.
 jobjectArray stringArray(JNIEnv *env, const char *const *texts, jsize shown, jsize length);
 
-// The fields that a String[] shows of a record, one element each.
-struct Cells {
-    static constexpr size_t kMost = 28;
-
-    template <size_t N>
-    consteval Cells(const TextField (&rows)[N]) : fields(rows), count(N)
-    {
-        static_assert(N <= kMost);
-    }
-
-    const TextField *fields;
-    uint8_t count;
-};
-
-// A field that is shown under a name made from it; null for a text that has none.
+// A text that is shown under a name made from it; null for a text that has none.
 struct Naming {
-    TextField field = {kNoField};
+    uint8_t field = kNoField;
     const char *(*nameOf)(const char *value) = nullptr;
 };
 
-// What an array shows: its texts, and a null behind them.
+template <class Record>
+struct NamingOf : Naming {
+    consteval NamingOf() = default;
+    consteval NamingOf(char *Record::*text, const char *(*name)(const char *value))
+        : Naming{numberOf(text), name}
+    {
+    }
+};
+
+// What an array shows: the first `shown` fields of a record, and a null behind them.
 // kept[last-element-null]: an array ends with an element that is null.
 struct Shown {
-    Shown(const void *record, Cells cells, Naming naming = {});
+    static constexpr size_t kMost = 28;
 
-    const char *texts[Cells::kMost + 1];
+    Shown(const void *record, uint8_t shown, Naming naming);
+
+    const char *texts[kMost + 1];
     jsize length;
 };
 
-// The record as a String[], one element per cell and the last one; null for a missing record.
-jobjectArray array(JNIEnv *env, const void *record, Cells cells, Naming naming = {});
+// The length of the array of a record.
+template <class Record>
+constexpr jsize lengthOf(const Record * /*record*/)
+{
+    return textsOf<Record>() + 1;
+}
+
+// All texts of a record, in their order.
+template <class Record>
+Shown show(const Record *record, NamingOf<Record> naming = {})
+{
+    static_assert(textsOf<Record>() <= Shown::kMost);
+    return {record, textsOf<Record>(), naming};
+}
+
+// The texts of a record as a String[]; null for a missing record.
+jobjectArray array(JNIEnv *env, const void *record, uint8_t texts, Naming naming);
+template <class Record>
+jobjectArray array(JNIEnv *env, const Record *record, NamingOf<Record> naming = {})
+{
+    static_assert(textsOf<Record>() <= Shown::kMost);
+    return array(env, record, textsOf<Record>(), naming);
+}
 
 // ---- Registration
 

@@ -41,40 +41,6 @@ const char *authLevelName(const char *level)
     return qvsStricmp(level, kClient.bytes) == 0 ? kClient.bytes : nullptr;
 }
 
-// ---- Arrays
-
-constexpr TextField kApplicationCells[] = {
-    QVS_FIELD(Application, pszAppId),          QVS_FIELD(Application, pszProviderId),
-    QVS_FIELD(Application, pszFrom),           QVS_FIELD(Application, pszName),
-    QVS_FIELD(Application, pszAAccept),        QVS_FIELD(Application, pszAProtocol),
-    QVS_FIELD(Application, pszInternet),       QVS_FIELD(Application, pszXcapAuidDcs),
-    QVS_FIELD(Application, pszXcapAuidPms),    QVS_FIELD(Application, pszXcapAuidCdms),
-    QVS_FIELD(Application, pszXcapImeiHeader), QVS_FIELD(Application, pszXcapTidHeader),
-};
-
-constexpr TextField kAppAddrCells[] = {
-    QVS_FIELD(qvsCtxAppAddr, pszAddr),
-    QVS_FIELD(qvsCtxAppAddr, pszAddrType),
-};
-
-constexpr TextField kAppAuthCells[] = {
-    QVS_FIELD(qvsCtxAppAuth, pszAAuthLevel), QVS_FIELD(qvsCtxAppAuth, pszAAuthType),
-    QVS_FIELD(qvsCtxAppAuth, pszAAuthName),  QVS_FIELD(qvsCtxAppAuth, pszAAuthSecret),
-    QVS_FIELD(qvsCtxAppAuth, pszAAuthData),
-};
-
-constexpr TextField kResourceCells[] = {
-    QVS_FIELD(qvsCtxResource, pszUri),       QVS_FIELD(qvsCtxResource, pszName),
-    QVS_FIELD(qvsCtxResource, pszAAccept),   QVS_FIELD(qvsCtxResource, pszAAuthType),
-    QVS_FIELD(qvsCtxResource, pszAAuthName), QVS_FIELD(qvsCtxResource, pszAAuthSecret),
-    QVS_FIELD(qvsCtxResource, pszAAuthData), QVS_FIELD(qvsCtxResource, pszStartPage),
-};
-
-constexpr TextField kRoamingCells[] = {
-    QVS_FIELD(qvsCtxRoaming, pszSyncAllowed),
-    QVS_FIELD(qvsCtxRoaming, pszSyncDefault),
-};
-
 // ---- Natives
 
 jint qvomacp_GetPxApplicationCount(JNIEnv *, jobject)
@@ -119,7 +85,7 @@ jint qvomacp_GetPxAppAddrCount(JNIEnv *, jobject, jint a)
 
 jobjectArray qvomacp_GetPxAppAddrData(JNIEnv *env, jobject, jint a, jint r)
 {
-    return array(env, appAddr(a, r), kAppAddrCells);
+    return array(env, appAddr(a, r));
 }
 
 jint qvomacp_GetPxAppPortCount(JNIEnv *, jobject, jint a, jint r)
@@ -149,8 +115,8 @@ jint qvomacp_GetPxAppAuthCount(JNIEnv *, jobject, jint a)
 
 jobjectArray qvomacp_GetPxAppAuthData(JNIEnv *env, jobject, jint a, jint r)
 {
-    return array(env, nth(chainOf(application(a), &Application::ptAppAuth), r), kAppAuthCells,
-                 {QVS_FIELD(qvsCtxAppAuth, pszAAuthLevel), authLevelName});
+    return array(env, nth(chainOf(application(a), &Application::ptAppAuth), r),
+                 {&qvsCtxAppAuth::pszAAuthLevel, authLevelName});
 }
 
 jint qvomacp_GetPxResourceCount(JNIEnv *, jobject, jint a)
@@ -160,18 +126,18 @@ jint qvomacp_GetPxResourceCount(JNIEnv *, jobject, jint a)
 
 jobjectArray qvomacp_GetPxResourceData(JNIEnv *env, jobject, jint a, jint r)
 {
-    return array(env, nth(chainOf(application(a), &Application::ptResource), r), kResourceCells);
+    return array(env, nth(chainOf(application(a), &Application::ptResource), r));
 }
 
 jobjectArray qvomacp_GetApplicationData(JNIEnv *env, jobject, jint a)
 {
-    return array(env, application(a), kApplicationCells);
+    return array(env, application(a));
 }
 
 jobjectArray qvomacp_GetPxRoamingData(JNIEnv *env, jobject)
 {
     // kept[roaming-first]: only the first ROAMING of the first application can be asked for.
-    return array(env, chainOf(application(1), &Application::ptRoaming), kRoamingCells);
+    return array(env, chainOf(application(1), &Application::ptRoaming));
 }
 
 } // namespace

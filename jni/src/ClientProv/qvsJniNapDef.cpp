@@ -96,54 +96,6 @@ const char *authTypeName(const char *type)
     return kNoAuthType.bytes;
 }
 
-// ---- Arrays
-
-constexpr size_t kAddrTypeElement = 4;
-
-constexpr TextField kNapDefCells[] = {
-    QVS_FIELD(NapDef, pszNapId),
-    QVS_FIELD(NapDef, pszName),
-    QVS_FIELD(NapDef, pszInternet),
-    QVS_FIELD(NapDef, pszNapAddress),
-    QVS_FIELD(NapDef, pszNapAddrType), // element kAddrTypeElement
-    QVS_FIELD(NapDef, pszCallType),
-    QVS_FIELD(NapDef, pszLocalAddr),
-    QVS_FIELD(NapDef, pszLocalAddrType),
-    QVS_FIELD(NapDef, pszLinkSpeed),
-    QVS_FIELD(NapDef, pszDnLinkSpeed),
-    QVS_FIELD(NapDef, pszLinger),
-    QVS_FIELD(NapDef, pszDeliveryErrSdu),
-    QVS_FIELD(NapDef, pszDeliveryOrder),
-    QVS_FIELD(NapDef, pszTrafficClass),
-    QVS_FIELD(NapDef, pszMaxSduSize),
-    QVS_FIELD(NapDef, pszMaxBitrateUplink),
-    QVS_FIELD(NapDef, pszMaxBitrateDnlink),
-    QVS_FIELD(NapDef, pszReserved1),
-    QVS_FIELD(NapDef, pszReserved2),
-    QVS_FIELD(NapDef, pszReserved3),
-    QVS_FIELD(NapDef, pszReserved4),
-    QVS_FIELD(NapDef, pszReserved5),
-    QVS_FIELD(NapDef, pszReserved6),
-    QVS_FIELD(NapDef, pszMaxNumRetry),
-    QVS_FIELD(NapDef, pszFirstRetryTimeout),
-    QVS_FIELD(NapDef, pszReregThreshold),
-    QVS_FIELD(NapDef, pszTBit),
-    QVS_FIELD(NapDef, pszInit),
-};
-
-constexpr TextField kNapAuthInfoCells[] = {
-    QVS_FIELD(qvsCtxNapAuthInfo, pszAuthType),
-    QVS_FIELD(qvsCtxNapAuthInfo, pszAuthName),
-    QVS_FIELD(qvsCtxNapAuthInfo, pszAuthSecret),
-    QVS_FIELD(qvsCtxNapAuthInfo, pszReserved),
-};
-
-constexpr TextField kValidityCells[] = {
-    QVS_FIELD(qvsCtxValidity, pszCountry),    QVS_FIELD(qvsCtxValidity, pszNetwork),
-    QVS_FIELD(qvsCtxValidity, pszSid),        QVS_FIELD(qvsCtxValidity, pszSoc),
-    QVS_FIELD(qvsCtxValidity, pszValidUntil),
-};
-
 // ---- Natives
 
 jint qvomacp_GetPxNapDefCount(JNIEnv *, jobject)
@@ -195,8 +147,7 @@ jint qvomacp_GetPxNapAuthInfoCount(JNIEnv *, jobject, jint n)
 
 jobjectArray qvomacp_GetPxNapAuthInfoData(JNIEnv *env, jobject, jint n, jint a)
 {
-    return array(env, napAuthInfo(n, a), kNapAuthInfoCells,
-                 {QVS_FIELD(qvsCtxNapAuthInfo, pszAuthType), authTypeName});
+    return array(env, napAuthInfo(n, a), {&qvsCtxNapAuthInfo::pszAuthType, authTypeName});
 }
 
 jint qvomacp_GetPxNapAuthEntityCount(JNIEnv *, jobject, jint n, jint a)
@@ -216,7 +167,7 @@ jint qvomacp_GetPxNapValidityCount(JNIEnv *, jobject, jint n)
 
 jobjectArray qvomacp_GetPxValidityData(JNIEnv *env, jobject, jint n, jint a)
 {
-    return array(env, nth(chainOf(napDef(n), &NapDef::ptValidity), a), kValidityCells);
+    return array(env, nth(chainOf(napDef(n), &NapDef::ptValidity), a));
 }
 
 jobjectArray qvomacp_GetPxNapDefData(JNIEnv *env, jobject, jint n)
@@ -225,15 +176,16 @@ jobjectArray qvomacp_GetPxNapDefData(JNIEnv *env, jobject, jint n)
     if (!record) {
         return nullptr;
     }
-    Shown shown(record, kNapDefCells, {QVS_FIELD(NapDef, pszNapAddrType), addrTypeCode});
+    Shown shown = show(record, {&NapDef::pszNapAddrType, addrTypeCode});
+    constexpr uint8_t kTypeElement = numberOf(&NapDef::pszNapAddrType);
     const jsize length = shown.length;
-    const char **typeElement = shown.texts + kAddrTypeElement;
+    const char **typeElement = shown.texts + kTypeElement;
     if (record->pszNapAddrType && !*typeElement) {
         // kept[napdef-shift]: an address type that is no token takes no element; those behind it
         // move down by one, and the last one of the array stays an empty string.
         --shown.length;
         memmove(typeElement, typeElement + 1,
-                (static_cast<size_t>(shown.length) - kAddrTypeElement) * sizeof *typeElement);
+                (static_cast<size_t>(shown.length) - kTypeElement) * sizeof *typeElement);
     }
     return stringArray(env, shown.texts, shown.length, length);
 }

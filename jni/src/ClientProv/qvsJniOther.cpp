@@ -20,34 +20,6 @@ Access *access(jint n)
     return nth(chainOf(ptCtx, &Context::ptAccess), n);
 }
 
-// ---- Arrays
-
-constexpr TextField kBootstrapCells[] = {
-    QVS_FIELD(qvsCtxBootstrap, pszName),
-    QVS_FIELD(qvsCtxBootstrap, pszCountry),
-    QVS_FIELD(qvsCtxBootstrap, pszProvUrl),
-    QVS_FIELD(qvsCtxBootstrap, pszContextAllow),
-};
-
-constexpr TextField kVendorConfigCells[] = {
-    QVS_FIELD(qvsCtxVendorConfig, pszName),
-    QVS_FIELD(qvsCtxVendorConfig, pszParamName),
-    QVS_FIELD(qvsCtxVendorConfig, pszParamValue),
-};
-
-constexpr TextField kWifiCells[] = {
-    QVS_FIELD(qvsCtxWifi, pszNetSsid),       QVS_FIELD(qvsCtxWifi, pszSecMode),
-    QVS_FIELD(qvsCtxWifi, pszEapMethod),     QVS_FIELD(qvsCtxWifi, pszEapType),
-    QVS_FIELD(qvsCtxWifi, pszUserName),      QVS_FIELD(qvsCtxWifi, pszAnonUserName),
-    QVS_FIELD(qvsCtxWifi, pszPassword),      QVS_FIELD(qvsCtxWifi, pszCaCert),
-    QVS_FIELD(qvsCtxWifi, pszUserCert),      QVS_FIELD(qvsCtxWifi, pszPhase1),
-    QVS_FIELD(qvsCtxWifi, pszAuthAlgorithm), QVS_FIELD(qvsCtxWifi, pszPriority),
-};
-
-constexpr TextField kVoWifiCells[] = {
-    QVS_FIELD(qvsCtxVoWifi, pszEpdgFqdn),
-};
-
 // ---- Natives: bootstrap, client identity, vendor configuration
 
 jint qvomacp_GetPxBootstrapCount(JNIEnv *, jobject)
@@ -77,7 +49,7 @@ jstring qvomacp_GetPxNetworkData(JNIEnv *env, jobject, jint n, jint d)
 
 jobjectArray qvomacp_GetBootstrapData(JNIEnv *env, jobject, jint n)
 {
-    return array(env, bootstrap(n), kBootstrapCells);
+    return array(env, bootstrap(n));
 }
 
 jstring qvomacp_GetPxClientIdentityData(JNIEnv *env, jobject)
@@ -92,7 +64,7 @@ jint qvomacp_GetPxVenderConfigCount(JNIEnv *, jobject)
 
 jobjectArray qvomacp_GetPxVenderConfigData(JNIEnv *env, jobject, jint n)
 {
-    return array(env, nth(chainOf(ptCtx, &Context::ptVendorConfig), n), kVendorConfigCells);
+    return array(env, nth(chainOf(ptCtx, &Context::ptVendorConfig), n));
 }
 
 // ---- Natives: access rules
@@ -172,7 +144,7 @@ jint qvomacp_GetPxWifiCount(JNIEnv *, jobject)
 
 jobjectArray qvomacp_GetPxWifiData(JNIEnv *env, jobject, jint n)
 {
-    return array(env, nth(chainOf(ptCtx, &Context::ptWifi), n), kWifiCells);
+    return array(env, nth(chainOf(ptCtx, &Context::ptWifi), n));
 }
 
 jint qvomacp_GetPxVoWifiCount(JNIEnv *, jobject)
@@ -182,7 +154,7 @@ jint qvomacp_GetPxVoWifiCount(JNIEnv *, jobject)
 
 jobjectArray qvomacp_GetPxVoWifiData(JNIEnv *env, jobject, jint n)
 {
-    return array(env, nth(chainOf(ptCtx, &Context::ptVoWifi), n), kVoWifiCells);
+    return array(env, nth(chainOf(ptCtx, &Context::ptVoWifi), n));
 }
 
 } // namespace

@@ -25,11 +25,12 @@ void deleteHeader()
 // kept[parse-overwrites]: what an earlier parse left is neither released nor handed out again.
 bool parseHeader(JNIEnv *env, jbyteArray message, uint32_t length)
 {
+    ptPushHdlrInfo = nullptr;
     // hardened: no array, or fewer bytes in it than the length says, is a message refused.
     if (!message || length > static_cast<uint32_t>(env->GetArrayLength(message))) {
-        ptPushHdlrInfo = nullptr;
         return false;
     }
+    // hardened: and so is one whose bytes cannot be had.
     jbyte *bytes = env->GetByteArrayElements(message, nullptr);
     if (!bytes) {
         return false;

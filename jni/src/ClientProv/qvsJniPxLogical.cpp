@@ -62,31 +62,6 @@ const char *addrTypeName(const char *type)
     return ipv6 ? kIpv6.bytes : kIpv4.bytes;
 }
 
-// ---- Arrays
-
-constexpr TextField kLogicalCells[] = {
-    QVS_FIELD(Logical, pszProxyId),     QVS_FIELD(Logical, pszProxyPw),
-    QVS_FIELD(Logical, pszPpgAuthType), QVS_FIELD(Logical, pszProxyProviderId),
-    QVS_FIELD(Logical, pszName),        QVS_FIELD(Logical, pszTrust),
-    QVS_FIELD(Logical, pszMaster),      QVS_FIELD(Logical, pszStartPage),
-    QVS_FIELD(Logical, pszReserved1),   QVS_FIELD(Logical, pszReserved2),
-    QVS_FIELD(Logical, pszReserved3),   QVS_FIELD(Logical, pszReserved4),
-    QVS_FIELD(Logical, pszReserved5),
-};
-
-constexpr TextField kAuthInfoCells[] = {
-    QVS_FIELD(qvsCtxPxAuthInfo, pszPxAuthType),
-    QVS_FIELD(qvsCtxPxAuthInfo, pszPxAuthId),
-    QVS_FIELD(qvsCtxPxAuthInfo, pszPxAuthPw),
-};
-
-constexpr TextField kPhysicalCells[] = {
-    QVS_FIELD(Physical, pszPhysicalProxyId), QVS_FIELD(Physical, pszPxAddr),
-    QVS_FIELD(Physical, pszPxAddrType),      QVS_FIELD(Physical, pszPxAddrFqdn),
-    QVS_FIELD(Physical, pszWspVersion),      QVS_FIELD(Physical, pszPushEnabled),
-    QVS_FIELD(Physical, pszPullEnabled),
-};
-
 // ---- Natives: logical proxies
 
 jint qvomacp_GetPxLogicalCount(JNIEnv *, jobject)
@@ -112,7 +87,7 @@ jint qvomacp_GetPxAuthInfoCount(JNIEnv *, jobject, jint p)
 
 jobjectArray qvomacp_GetPxAuthInfoData(JNIEnv *env, jobject, jint p, jint d)
 {
-    return array(env, nth(chainOf(logical(p), &Logical::ptPxAuthInfo), d), kAuthInfoCells);
+    return array(env, nth(chainOf(logical(p), &Logical::ptPxAuthInfo), d));
 }
 
 jint qvomacp_GetPxPortCount(JNIEnv *, jobject, jint p)
@@ -142,8 +117,7 @@ jobjectArray qvomacp_GetProxyData(JNIEnv *env, jobject, jint p)
     }
     const Logical *record = logical(p);
     // kept[proxy-blank]: unlike its siblings, a missing proxy answers an array of empty strings.
-    return record ? array(env, record, kLogicalCells)
-                  : stringArray(env, nullptr, 0, countOf(kLogicalCells) + 1);
+    return record ? array(env, record) : stringArray(env, nullptr, 0, lengthOf(record));
 }
 
 // ---- Natives: physical proxies
@@ -155,8 +129,7 @@ jint qvomacp_GetPxPhysicalCount(JNIEnv *, jobject, jint p)
 
 jobjectArray qvomacp_GetPxPhysicalData(JNIEnv *env, jobject, jint p, jint h)
 {
-    return array(env, physical(p, h), kPhysicalCells,
-                 {QVS_FIELD(Physical, pszPxAddrType), addrTypeName});
+    return array(env, physical(p, h), {&Physical::pszPxAddrType, addrTypeName});
 }
 
 jint qvomacp_GetPxPhysicalDomainCount(JNIEnv *, jobject, jint p, jint h)

@@ -16,31 +16,37 @@ namespace [[gnu::visibility("hidden")]] qvs {
 // What a parameter holds: a text, a list of texts, or what the reader of its table makes of it.
 enum class ParmType : uint8_t { kText, kList, kOther };
 
-struct OtherField {};
-constexpr OtherField kByReader;
-
 // One parameter of a characteristic: the NAME token that announces it and the field it fills.
-struct Parm {
-    consteval Parm(uint8_t t, TextField f) : token(t), type(ParmType::kText), field(f.number) {}
-    consteval Parm(uint8_t t, ListField f)
-        : token(t), type(ParmType::kList), field(f.number), place(f.place)
-    {
-    }
-    consteval Parm(uint8_t t, OtherField) : token(t), type(ParmType::kOther), field(kNoField) {}
-
+struct ParmRow {
     uint8_t token;
     ParmType type;
     uint8_t field;
-    uint8_t place = 0; // of a list
+    uint8_t place; // of a list
 };
 
-// The parameters of one kind of characteristic. But for the rows, the reader and the way past a
-// page switch all of it is wording.
-struct ParmTable {
-    const char *name; // of its decoder, in the trace of a refused token
-    Rows<Parm> rows;
-    // Of kByReader.
-    qvsResult (*reader)(qvsWbxmlDecoder *decoder, DecodeState *state, void *record) = nullptr;
+struct OtherField {};
+constexpr OtherField kByReader;
+
+template <class Record>
+struct Parm {
+    using Of = Record;
+    using Row = ParmRow;
+
+    consteval Parm(uint8_t t, char *Record::*text) : row{t, ParmType::kText, numberOf(text), 0} {}
+    consteval Parm(uint8_t t, qvsList *Record::*list)
+        : row{t, ParmType::kList, numberOf(list),
+              kListPlaces[kFieldsOf<Record> - 1 - numberOf(list)]}
+    {
+    }
+    consteval Parm(uint8_t t, OtherField) : row{t, ParmType::kOther, kNoField, 0} {}
+
+    ParmRow row;
+};
+
+// What sets the decoder of one kind of characteristic apart. But for the way past a page switch all
+// of it is wording.
+struct ParmStyle {
+    const char *name;                        // of its decoder, in the trace of a refused token
     bool freshTokenAfterSwitch = false;      // read it again instead of peeking at it masked
     const char *entered = nullptr;           // name of its decoder, traced before anything is read
     void (*onParm)(uint8_t token) = nullptr; // before a parameter of the table is read
@@ -49,44 +55,103 @@ struct ParmTable {
     void (*onEnd)(uint8_t token, qvsResult result) = nullptr;
 };
 
-extern const ParmTable kPxLogicalParms;
-extern const ParmTable kPxAuthInfoParms;
-extern const ParmTable kPortParms;
-extern const ParmTable kPxPhysicalParms;
-extern const ParmTable kNapDefParms;
-extern const ParmTable kNapAuthInfoParms;
-extern const ParmTable kValidityParms;
-extern const ParmTable kApplicationParms;
-extern const ParmTable kAppAddrParms;
-extern const ParmTable kAppAuthParms;
-extern const ParmTable kResourceParms;
-extern const ParmTable kBootstrapParms;
-extern const ParmTable kClientIdentityParms;
-extern const ParmTable kVendorConfigParms;
-extern const ParmTable kAccessParms;
-extern const ParmTable kRoamingParms;
-extern const ParmTable kWifiParms;
-extern const ParmTable kVoWifiParms;
+// The parameters of one kind of characteristic.
+struct ParmTable {
+    ParmStyle style;
+    Rows<ParmRow> rows;
+    // Of kByReader.
+    qvsResult (*reader)(qvsWbxmlDecoder *decoder, DecodeState *state, void *record);
+};
+
+template <class Record>
+struct ParmReader {
+    qvsResult (*read)(qvsWbxmlDecoder *decoder, DecodeState *state, void *record) = nullptr;
+};
+
+template <class Record, qvsResult (*read)(qvsWbxmlDecoder *, DecodeState *, Record *)>
+constexpr ParmReader<Record> kReadBy = {
+    [](qvsWbxmlDecoder *decoder, DecodeState *state, void *record) {
+        return read(decoder, state, static_cast<Record *>(record));
+    }};
+
+template <class Record>
+struct ParmsOf {
+    template <size_t N>
+    consteval ParmsOf(const ParmStyle &style, const Table<Record, ParmRow, N> &rows,
+                      ParmReader<Record> reader = {})
+        : table{style, rowsFor<Record>(rows), reader.read}
+    {
+    }
+
+    ParmTable table;
+};
+
+extern const ParmsOf<qvsWapPxLogical> kPxLogicalParms;
+extern const ParmsOf<qvsWapPxAuthInfo> kPxAuthInfoParms;
+extern const ParmsOf<qvsWapPort> kPortParms;
+extern const ParmsOf<qvsWapPxPhysical> kPxPhysicalParms;
+extern const ParmsOf<qvsWapNapDef> kNapDefParms;
+extern const ParmsOf<qvsWapNapAuthInfo> kNapAuthInfoParms;
+extern const ParmsOf<qvsWapValidity> kValidityParms;
+extern const ParmsOf<qvsWapApplication> kApplicationParms;
+extern const ParmsOf<qvsWapAppAddr> kAppAddrParms;
+extern const ParmsOf<qvsWapAppAuth> kAppAuthParms;
+extern const ParmsOf<qvsWapResource> kResourceParms;
+extern const ParmsOf<qvsWapBootstrap> kBootstrapParms;
+extern const ParmsOf<qvsWapClientIdentity> kClientIdentityParms;
+extern const ParmsOf<qvsWapVendorConfig> kVendorConfigParms;
+extern const ParmsOf<qvsWapAccess> kAccessParms;
+extern const ParmsOf<qvsWapRoaming> kRoamingParms;
+extern const ParmsOf<qvsWapWifi> kWifiParms;
+extern const ParmsOf<qvsWapVoWifi> kVoWifiParms;
 
 // Reads one parm element into `record`. Stops at the END of its attributes, which it consumes,
 // or at the first token that is refused or cannot be read. Without a state it is a step alone.
 qvsResult readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
                     const ParmTable &table);
 qvsResult readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table);
+template <class Record>
+qvsResult readParms(qvsWbxmlDecoder *decoder, Record *record, const ParmsOf<Record> &parms)
+{
+    return readParms(decoder, record, parms.table);
+}
 
 // Reads the parameter that the NAME attribute `token` announces into `*text`.
 qvsResult readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token);
 
 // Reads one parameter onto a list of `record`. On failure the list is as it was, but for the items
 // that it has got.
-qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, ListField list);
+qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t field,
+                   uint8_t place);
+template <class Record>
+qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, Record *record,
+                   const Parm<Record> &list)
+{
+    return readList(decoder, state, record, list.row.field, list.row.place);
+}
 
 // ---- Parameters whose name is given as text
 
 // A name, and the text that its value goes to.
-struct NamedParm {
+struct NamedRow {
     char name[18];
-    TextField field;
+    uint8_t field;
+};
+
+template <class Record>
+struct NamedParm {
+    using Of = Record;
+    using Row = NamedRow;
+
+    template <size_t N>
+    consteval NamedParm(const char (&text)[N], char *Record::*to) : row{{}, numberOf(to)}
+    {
+        for (size_t i = 0; i < N; ++i) {
+            row.name[i] = text[i];
+        }
+    }
+
+    NamedRow row;
 };
 
 // The name of one parameter, compared where it lies, and the token behind it.
@@ -102,7 +167,12 @@ qvsResult readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag
                        bool isKept, ParmName *name);
 
 // The field of `record` that the name selects; null for a name that is not listed.
-char **findNamed(void *record, const Rows<NamedParm> &names, const Text &name);
+char **findNamed(void *record, const Rows<NamedRow> &names, const Text &name);
+template <class Record, size_t N>
+char **findNamed(Record *record, const Table<Record, NamedRow, N> &names, const Text &name)
+{
+    return findNamed(record, rowsFor<Record>(names), name);
+}
 
 } // namespace qvs
 
