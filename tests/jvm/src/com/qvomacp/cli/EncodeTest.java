@@ -116,15 +116,10 @@ class EncodeTest {
         Program shown = Program.run(NOTHING, "--xml", push.toString());
         assertEquals(0, shown.status(), shown.errors());
         assertEquals("", shown.errors());
-        encode(
-                shown.output().getBytes(StandardCharsets.UTF_8),
-                "--pin=1234",
-                "--imsi=001010123456789",
-                "--body");
+        String imsi = push.endsWith("xcap.push") ? "00101012345678" : "001010123456789";
+        encode(shown.output().getBytes(StandardCharsets.UTF_8), "--pin=1234", "--imsi=" + imsi);
         assertEquals(0, status, errors);
-        assertEquals(
-                TreeText.of(ProvisioningDocument.parse(body(Files.readAllBytes(push)))),
-                TreeText.of(ProvisioningDocument.parse(output)));
+        assertArrayEquals(Files.readAllBytes(push), output);
     }
 
     @ParameterizedTest

@@ -326,6 +326,9 @@ class MainTest {
                         array("--color=blue"),
                         array("verify"),
                         array("verify", "--json"),
+                        array("encode", "--\u001b[2Jx"),
+                        array("encode", "--sms=\u001b"),
+                        array("encode", "--to=\u001b", "--sms=submit"),
                         array("completion", "bash"))) {
             assertEquals(2, run(SMALL, arguments));
             assertEquals("", output);
