@@ -15,13 +15,15 @@ final class Console {
 
     final InputStream in;
     final PrintWriter out;
+    private final Output bytes;
     final PrintWriter err;
     final Terminal terminal;
     private int status = DONE;
 
     Console(InputStream in, OutputStream out, OutputStream err, Terminal terminal) {
         this.in = in;
-        this.out = writer(new Output(out));
+        this.bytes = new Output(out);
+        this.out = writer(bytes);
         this.err = writer(err);
         this.terminal = terminal;
     }
@@ -29,6 +31,13 @@ final class Console {
     private static PrintWriter writer(OutputStream to) {
         return new PrintWriter(
                 new BufferedWriter(new OutputStreamWriter(to, StandardCharsets.UTF_8)));
+    }
+
+    /** Writes bytes to standard output, behind what has been written as text. */
+    void write(byte[] content) {
+        out.flush();
+        bytes.write(content, 0, content.length);
+        bytes.flush();
     }
 
     /** Writes to standard error, in its place among what has been written. */

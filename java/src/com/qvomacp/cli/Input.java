@@ -4,14 +4,22 @@ import java.io.ByteArrayOutputStream;
 import java.io.IOException;
 import java.io.InputStream;
 import java.nio.file.AccessDeniedException;
+import java.nio.file.FileAlreadyExistsException;
 import java.nio.file.Files;
 import java.nio.file.InvalidPathException;
 import java.nio.file.NoSuchFileException;
+import java.nio.file.OpenOption;
+import java.nio.file.Path;
 import java.nio.file.Paths;
+import java.nio.file.StandardOpenOption;
 
-/** Reads what a file holds, or standard input. */
+/** Reads what a file holds, or standard input; and writes files. */
 final class Input {
     static final String STANDARD_INPUT = "-";
+
+    private static final OpenOption[] ONLY_NEW = {
+        StandardOpenOption.CREATE_NEW, StandardOpenOption.WRITE
+    };
 
     private Input() {}
 
@@ -35,7 +43,27 @@ final class Input {
         } catch (TooLongException tooLong) {
             throw tooLong;
         } catch (IOException | InvalidPathException unreadable) {
-            throw new IOException(reason(unreadable), unreadable);
+            throw new IOException(reason(unreadable, "cannot be read: "), unreadable);
+        }
+    }
+
+    /**
+     * Writes a file, which may be there already when that is said.
+     *
+     * @throws IOException with a sentence for people
+     */
+    static void write(String file, byte[] content, boolean mayBeThere) throws IOException {
+        try {
+            Path path = Paths.get(file);
+            if (mayBeThere) {
+                Files.write(path, content);
+            } else {
+                Files.write(path, content, ONLY_NEW);
+            }
+        } catch (FileAlreadyExistsException there) {
+            throw new IOException("is there already; --force overwrites it", there);
+        } catch (IOException | InvalidPathException unwritable) {
+            throw new IOException(reason(unwritable, "cannot be written: "), unwritable);
         }
     }
 
@@ -60,16 +88,16 @@ final class Input {
     }
 
     /** Many exceptions carry no more than the file's name. */
-    private static String reason(Exception unreadable) {
-        if (unreadable instanceof NoSuchFileException) {
+    private static String reason(Exception failure, String otherwise) {
+        if (failure instanceof NoSuchFileException) {
             return "no such file";
         }
-        if (unreadable instanceof AccessDeniedException) {
+        if (failure instanceof AccessDeniedException) {
             return "permission denied";
         }
-        if ("Is a directory".equals(unreadable.getMessage())) {
+        if ("Is a directory".equals(failure.getMessage())) {
             return "is a directory";
         }
-        return "cannot be read: " + unreadable.getMessage();
+        return otherwise + failure.getMessage();
     }
 }

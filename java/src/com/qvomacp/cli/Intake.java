@@ -266,7 +266,7 @@ final class Intake {
             held.add(Held.message(name, bytes, form == Form.PUSH));
             return;
         }
-        boolean isPush = bytes.length > 1 && bytes[1] == PUSH;
+        boolean isPush = isPush(bytes);
         boolean isBody = bytes.length > 0 && bytes[0] >= 0 && bytes[0] <= LAST_WBXML_VERSION;
         if (header(bytes) == null && !isDocument(bytes, 0) && !isPush && !isBody) {
             held.add(Held.unknown(name, bytes, NO_MESSAGE + likeness(bytes)));
@@ -289,8 +289,13 @@ final class Intake {
         return isOther ? Held.error(whole.name, NO_MESSAGE + "an SMS without a port") : whole;
     }
 
+    /** Whether the second byte is that of a push. */
+    static boolean isPush(byte[] bytes) {
+        return bytes.length > 1 && bytes[1] == PUSH;
+    }
+
     private static PushHeader header(byte[] bytes) {
-        if (bytes.length < 2 || bytes[1] != PUSH) {
+        if (!isPush(bytes)) {
             return null;
         }
         try {

@@ -1,10 +1,13 @@
 package com.qvomacp.cli;
 
+import com.qvomacp.eng.omacp.EncodingException;
 import java.io.IOException;
 import java.util.ArrayList;
 import java.util.List;
+import picocli.CommandLine.Model.CommandSpec;
 import picocli.CommandLine.Option;
 import picocli.CommandLine.Parameters;
+import picocli.CommandLine.Spec;
 
 /** A command that does the same to each of its files. */
 abstract class Job {
@@ -49,6 +52,7 @@ abstract class Job {
                             + " input when it is \"-\" or there is none.")
     private List<String> files = new ArrayList<>();
 
+    @Spec CommandSpec spec;
     Console console;
     private int bytesRead;
     private boolean isOneOfSeveral;
@@ -58,6 +62,11 @@ abstract class Job {
 
     /** Looks at what the command line asks for, in front of the first file. */
     abstract void begin();
+
+    /** Does it to what is no message, where a command knows more than messages. */
+    boolean takes(String name, byte[] content) {
+        return false;
+    }
 
     /** Called in front of saying that something is no message. */
     void unknown(Held held) {}
@@ -89,7 +98,10 @@ abstract class Job {
         try {
             List<Held> messages = new ArrayList<>();
             try {
-                messages.addAll(intake.take(name, Input.read(file, console.in, bytesRead)));
+                byte[] content = Input.read(file, console.in, bytesRead);
+                if (form != null || !takes(name, content)) {
+                    messages.addAll(intake.take(name, content));
+                }
             } catch (IOException unreadable) {
                 fail(Console.FAILED, name, unreadable.getMessage());
             }
@@ -142,6 +154,10 @@ abstract class Job {
         return isOneOfSeveral;
     }
 
+    boolean readsStandardInput() {
+        return files.isEmpty() || files.contains(Input.STANDARD_INPUT);
+    }
+
     Palette outPalette() {
         return console.terminal.out(color);
     }
@@ -158,6 +174,30 @@ abstract class Job {
     /** Writes to standard error; more about the file goes to the output behind it. */
     void complain(String text) {
         console.complain(text);
+    }
+
+    /** Says why a message is refused, where it is. */
+    void explain(Reading reading) {
+        console.raise(reading.status());
+        if (!reading.isAccepted()) {
+            complain(Refusal.of(reading).write(startOf(reading.held.name), errPalette()));
+        }
+    }
+
+    /** Says why a document cannot be encoded, or not be written as XML. */
+    void refuse(String name, EncodingException e) {
+        if (e.line() > 0) {
+            String expected = e.expected().isEmpty() ? "" : ", expected ";
+            fail(
+                    Console.REFUSED,
+                    name + ':' + e.line() + ':' + e.column(),
+                    e.getMessage() + expected + String.join(", ", e.expected()));
+        } else if (e.path() != null) {
+            fail(Console.REFUSED, name, e.getMessage() + ", in " + e.path());
+        } else {
+            // An option is at fault, and not the document.
+            fail(Console.FAILED, name, e.getMessage());
+        }
     }
 
     void fail(int status, String name, String reason) {

@@ -15,11 +15,11 @@ import picocli.CommandLine.Option;
 import picocli.CommandLine.ParameterException;
 import picocli.CommandLine.ParseResult;
 
-/** The command-line program: shows and checks pushed provisioning messages. */
+/** The command-line program: shows, checks and makes pushed provisioning messages. */
 @Command(
         name = "omacp",
         versionProvider = Main.Version.class,
-        description = "Shows what pushed OMA Client Provisioning messages set, and checks them.",
+        description = "Shows what pushed OMA Client Provisioning messages set, checks and makes them.",
         synopsisHeading = "Usage: ",
         customSynopsis = {"omacp [show] [OPTION...] [FILE...]", "       omacp COMMAND ..."},
         commandListHeading = "%nCommands:%n",
@@ -31,8 +31,8 @@ import picocli.CommandLine.ParseResult;
         },
         exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
-            "0:every message was shown, or its MAC is right",
-            "1:a message is refused, or its MAC is not right",
+            "0:every message was shown or written, or its MAC is right",
+            "1:a message or a document is refused, or its MAC is not right",
             "2:wrong usage, a message cannot be read, the output cannot be written,"
                     + " or the library that is asked cannot be loaded"
         })
@@ -128,7 +128,8 @@ public final class Main {
         // A file's name may begin with @, and what stands in the file is nobody's command line.
         return new CommandLine(new Main())
                 .addSubcommand(new Show())
-                .addSubcommand(new Verify())
+                .addSubcommand(Choices.command(new Verify()))
+                .addSubcommand(Choices.command(new Encode()))
                 .addSubcommand(new Completion())
                 .setExpandAtFiles(false)
                 .setCaseInsensitiveEnumValuesAllowed(true);

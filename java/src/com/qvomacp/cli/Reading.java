@@ -14,6 +14,9 @@ final class Reading {
     /** Null for a body alone, and for a message that does not begin with the header of a push. */
     final PushHeader header;
 
+    /** Null when the message cannot be read. */
+    final ProvisioningMessage message;
+
     /** Null when the body cannot be read. */
     final ProvisioningDocument document;
 
@@ -25,12 +28,13 @@ final class Reading {
     private Reading(
             Held held,
             PushHeader header,
-            ProvisioningDocument document,
+            ProvisioningMessage message,
             Verdict verdict,
             ProvisioningException failure) {
         this.held = held;
         this.header = header;
-        this.document = document;
+        this.message = message;
+        this.document = message == null ? null : message.document();
         this.verdict = verdict;
         this.failure = failure;
     }
@@ -42,8 +46,7 @@ final class Reading {
                     held.isPush
                             ? ProvisioningMessage.parsePush(held.bytes, options)
                             : ProvisioningMessage.parseBody(held.bytes, options);
-            return new Reading(
-                    held, message.header(), message.document(), message.verdict(), null);
+            return new Reading(held, message.header(), message, message.verdict(), null);
         } catch (ProvisioningException failure) {
             Verdict verdict =
                     held.isPush ? Verdict.ofPush(held.bytes) : Verdict.ofBody(held.bytes);

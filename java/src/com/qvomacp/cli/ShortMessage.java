@@ -20,22 +20,22 @@ final class ShortMessage {
     private static final int LONGEST_CENTRE = 12;
     private static final int LONGEST_ADDRESS = 20;
     private static final int TYPE = 0x03;
-    private static final int SUBMIT = 0x01;
-    private static final int HAS_HEADER = 0x40;
+    static final int SUBMIT = 0x01;
+    static final int HAS_HEADER = 0x40;
     private static final int VALIDITY = 0x18;
     private static final int RELATIVE_VALIDITY = 0x10;
     private static final int TIME_STAMP = 7;
     private static final int ALPHANUMERIC = 0xD0;
-    private static final int INTERNATIONAL = 0x90;
+    static final int INTERNATIONAL = 0x90;
     private static final int KIND = 0xF0;
     private static final String DIGITS = "0123456789*#abc";
 
     private static final int[] PUSH_PORTS = {2948, 2949};
     private static final int NO_PORT = -1;
 
-    private static final int CONCATENATED_8 = 0x00;
+    static final int CONCATENATED_8 = 0x00;
     private static final int PORTS_8 = 0x04;
-    private static final int PORTS_16 = 0x05;
+    static final int PORTS_16 = 0x05;
     private static final int CONCATENATED_16 = 0x08;
 
     /** The number or name of the sender; empty for user data alone. */

@@ -1,5 +1,8 @@
 package com.qvomacp.cli;
 
+import com.qvomacp.eng.omacp.EncodeOptions;
+import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.ProvisioningEncoder;
 import com.qvomacp.eng.omacp.ProvisioningException;
 import com.qvomacp.eng.omacp.PushHeader;
 import picocli.CommandLine.Command;
@@ -24,13 +27,7 @@ import picocli.CommandLine.Option;
             "2:wrong usage, a message cannot be read, the output cannot be written,"
                     + " or the library that is asked cannot be loaded"
         })
-final class Show extends Job {
-    @Option(names = "--json", description = "Print JSON: an object, or an array for several files.")
-    private boolean json;
-
-    @Option(names = "--json-lines", description = "Print JSON: an object on a line for each file.")
-    private boolean jsonLines;
-
+final class Show extends JsonJob {
     @Option(names = "--header", description = "Show the push header alone, whatever the body is.")
     private boolean header;
 
@@ -44,35 +41,23 @@ final class Show extends Job {
                             + " message says.")
     private boolean answers;
 
-    private JsonWriter writer;
+    @Option(names = "--xml", description = "Print the document as XML, from which encode makes it.")
+    private boolean xml;
+
     private int shown;
-    private boolean inObject;
 
     @Override
     void begin() {
         if (bytes && (isJson() || header || answers)) {
             throw new UsageException("--bytes goes with none of --json, --header and --answers");
         }
-        if (json && jsonLines || answers && header) {
-            throw new UsageException("--json-lines goes not with --json, nor --answers with --header");
+        if (xml && (bytes || isJson() || header || answers)) {
+            throw new UsageException("--xml goes with no other form, nor with --answers");
         }
-        writer = new JsonWriter(console.out, jsonLines);
-    }
-
-    @Override
-    void end() {
-        if (isInArray() && writer.depth() == 0) {
-            writer.beginArray();
+        if (answers && header) {
+            throw new UsageException("--answers goes not with --header");
         }
-        writer.endTo(0);
-    }
-
-    private boolean isInArray() {
-        return json && isOneOfSeveral();
-    }
-
-    private boolean isJson() {
-        return json || jsonLines;
+        super.begin();
     }
 
     @Override
@@ -82,22 +67,35 @@ final class Show extends Job {
             return;
         }
         Reading reading = Reading.of(held, limit());
-        console.raise(reading.status());
-        if (isJson()) {
-            if (!reading.isAccepted()) {
-                complain(Refusal.of(reading).write(startOf(held.name), errPalette()));
-            }
-            json(reading);
-        } else if (bytes) {
+        if (bytes) {
+            console.raise(reading.status());
             list(reading);
             if (!reading.isAccepted()) {
                 console.out.print("\n" + Refusal.of(reading).write("", outPalette()));
             }
+        } else if (isJson()) {
+            explain(reading);
+            json(reading);
         } else {
-            text(reading);
-            if (!reading.isAccepted()) {
-                complain(Refusal.of(reading).write(startOf(held.name), errPalette()));
+            if (xml) {
+                xml(reading);
+            } else {
+                text(reading);
             }
+            explain(reading);
+        }
+    }
+
+    private void xml(Reading reading) {
+        if (reading.message == null) {
+            return;
+        }
+        try {
+            String text = ProvisioningEncoder.of(reading.message, EncodeOptions.NONE).xml();
+            title(reading.held.name);
+            console.out.print(text);
+        } catch (EncodingException none) {
+            refuse(reading.held.name, none);
         }
     }
 
@@ -111,12 +109,6 @@ final class Show extends Job {
         if (bytes && held.bytes != null) {
             list(Reading.of(held, limit()));
         }
-    }
-
-    @Override
-    void complain(String text) {
-        writer.separate();
-        super.complain(text);
     }
 
     private void showHeader(Held held) {
@@ -189,22 +181,6 @@ final class Show extends Job {
         }
     }
 
-    private void beginObject(String name) {
-        if (isInArray() && writer.depth() == 0) {
-            writer.beginArray();
-        }
-        writer.beginObject();
-        inObject = true;
-        if (isOneOfSeveral()) {
-            writer.member("file", name);
-        }
-    }
-
-    private void endObject() {
-        writer.end();
-        inObject = false;
-    }
-
     /** Of several files, each stands under its name. */
     private void title(String name) {
         if (isOneOfSeveral()) {
@@ -212,17 +188,5 @@ final class Show extends Job {
             console.out.println(outPalette().bold("==> " + Visible.of(name) + " <=="));
         }
         ++shown;
-    }
-
-    @Override
-    void failed(String name, String reason) {
-        if (isJson()) {
-            // What was begun of the message stands already.
-            if (!inObject) {
-                beginObject(name);
-            }
-            writer.member("error", reason);
-            endObject();
-        }
     }
 }

@@ -1,5 +1,6 @@
 package com.qvomacp.cli;
 
+import com.qvomacp.eng.omacp.EncodeOption;
 import com.qvomacp.eng.omacp.MacResult;
 import com.qvomacp.eng.omacp.ProvisioningException;
 import com.qvomacp.eng.omacp.ProvisioningMac;
@@ -13,6 +14,7 @@ import picocli.CommandLine.Option;
 @Command(
         name = "verify",
         description = "Check the MAC of messages, by the security method that each of them states.",
+        customSynopsis = "omacp verify [-h] [OPTION...] [FILE...]",
         sortOptions = false,
         parameterListHeading = "%n",
         optionListHeading = "%nOptions:%n",
@@ -23,50 +25,65 @@ import picocli.CommandLine.Option;
             "2:wrong usage, a PIN or IMSI that cannot be one, a message cannot be read,"
                     + " or the output cannot be written"
         })
-final class Verify extends Job {
+final class Verify extends JsonJob {
     private static final int MAC_DIGITS = 40;
 
-    @Option(
-            names = "--pin",
-            paramLabel = "PIN",
-            description = "What the user has been told (USERPIN, USERNETWPIN, USERPINMAC).")
-    private String pin;
+    @Option(names = "--show-mac", description = "Tell the MAC that the message should have.")
+    private boolean showMac;
 
-    @Option(
-            names = "--imsi",
-            paramLabel = "IMSI",
-            description = "The subscriber's number (NETWPIN, USERNETWPIN).")
+    private String pin;
     private String imsi;
+
+    /** In place of PIN and IMSI; null to make it of them. */
+    private byte[] key;
 
     @Override
     void begin() {
-        if (pin == null && imsi == null) {
-            throw new UsageException("--pin or --imsi is needed");
+        Choices choices = new Choices(this);
+        pin = choices.value(EncodeOption.PIN);
+        imsi = choices.value(EncodeOption.IMSI);
+        String digits = choices.value(EncodeOption.KEY);
+        if (digits == null ? pin == null && imsi == null : pin != null || imsi != null) {
+            throw new UsageException("--pin or --imsi is needed, or else --key alone");
         }
+        if (digits != null) {
+            if (!digits.matches("([0-9A-Fa-f]{2})+")) {
+                throw new UsageException("--key is no even number of hexadecimal digits");
+            }
+            key = HexText.bytes(digits);
+        }
+        super.begin();
     }
 
     @Override
     void run(Held held) {
-        if (!held.isPush) {
-            say(held, Console.REFUSED, "it has no push header, and so no MAC");
-            return;
-        }
-        PushHeader header;
+        PushHeader header = null;
         try {
-            header = PushHeader.parse(held.bytes);
+            header = held.isPush ? PushHeader.parse(held.bytes) : null;
         } catch (ProvisioningException none) {
             console.raise(Console.REFUSED);
             complain(Refusal.of(held, none, 0).write(startOf(held.name), errPalette()));
+            failed(held.name, none.getMessage());
+            return;
+        }
+        if (header == null) {
+            String reason = "it has no push header, and so no MAC";
+            say(held, SecurityMethod.NONE, MacResult.NO_MAC, reason, null);
             return;
         }
         SecurityMethod method = header.securityMethod();
         byte[] body = Arrays.copyOfRange(held.bytes, header.length(), held.bytes.length);
-        MacResult result = ProvisioningMac.verify(method, header.mac(), body, pin, imsi);
-        if (result == MacResult.RIGHT) {
-            console.out.println(Visible.of(held.name) + ": verified (" + method + ")");
-        } else {
-            say(held, statusOf(result), reasonFor(result, header, held.bytes));
-        }
+        MacResult result =
+                key == null
+                        ? ProvisioningMac.verify(method, header.mac(), body, pin, imsi)
+                        : ProvisioningMac.verify(method, header.mac(), body, key);
+        String computed =
+                key == null
+                        ? ProvisioningMac.compute(method, body, pin, imsi)
+                        : ProvisioningMac.compute(key, body);
+        String reason =
+                result == MacResult.RIGHT ? null : reasonFor(result, header, held.bytes);
+        say(held, method, result, reason, showMac ? computed : null);
     }
 
     /** What cannot be tried is not the message's fault. */
@@ -121,9 +138,30 @@ final class Verify extends Job {
         return -1;
     }
 
-    private void say(Held held, int status, String reason) {
-        console.raise(status);
-        String name = Visible.of(held.name) + ": ";
-        console.out.println(name + outPalette().error("NOT VERIFIED") + ": " + reason);
+    /** Says what came of a message; the reason is null when the MAC is right. */
+    private void say(
+            Held held, SecurityMethod method, MacResult result, String reason, String computed) {
+        boolean isRight = reason == null;
+        console.raise(isRight ? Console.DONE : statusOf(result));
+        if (isJson()) {
+            beginObject(held.name);
+            writer.member("verified", isRight).member("result", result.name());
+            writer.member("method", method.name());
+            if (!isRight) {
+                writer.member("reason", reason);
+            }
+            if (computed != null) {
+                writer.member("computedMac", computed);
+            }
+            endObject();
+            return;
+        }
+        console.out.println(
+                Visible.of(held.name)
+                        + ": "
+                        + (isRight
+                                ? "verified (" + method + ")"
+                                : outPalette().error("NOT VERIFIED") + ": " + reason)
+                        + (computed == null ? "" : ", computed " + computed));
     }
 }

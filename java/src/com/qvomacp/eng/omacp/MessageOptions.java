@@ -35,22 +35,42 @@ final class MessageOptions {
                 EncodeOption.CONTENT_TYPE,
                 quoted ? text ? "quoted-text" : "quoted" : text ? "text" : "short");
         SecurityMethod method = header.securityMethod();
-        if (method != SecurityMethod.NONE && method != SecurityMethod.UNKNOWN) {
+        boolean isSecured = method != SecurityMethod.NONE && method != SecurityMethod.UNKNOWN;
+        if (isSecured) {
             set(EncodeOption.SEC, method.name().toLowerCase(Locale.ROOT));
         }
         for (HeaderField parameter : type.parameters()) {
-            if (parameter.name().equals("SEC") && header.byteAt(parameter.offset()) < 0x80) {
-                set(EncodeOption.PARAMETERS, "text");
-            }
+            security(parameter, header);
         }
         if (header.transactionIdentifier() >= 0) {
             set(EncodeOption.TID, hexadecimal(header.transactionIdentifier()));
         }
         StringBuilder further = new StringBuilder();
-        for (int at = type.offset() + type.length(); at < header.length(); ++at) {
-            further.append(hexadecimal(header.byteAt(at)));
+        int at = type.offset() + type.length();
+        for (HeaderField field : header.fields()) {
+            // Encoding writes them anew.
+            if (isSecured && security(field, header)) {
+                append(further, header, at, field.offset());
+                at = field.offset() + field.length();
+            }
         }
+        append(further, header, at, header.length());
         set(EncodeOption.HEADERS, further.toString());
+    }
+
+    /** Whether it is SEC or MAC, and if so, how they are named. */
+    private boolean security(HeaderField field, PushHeader header) {
+        boolean is = field.name().equals("SEC") || field.name().equals("MAC");
+        if (is && header.byteAt(field.offset()) < 0x80) {
+            set(EncodeOption.PARAMETERS, "text");
+        }
+        return is;
+    }
+
+    private static void append(StringBuilder to, PushHeader header, int from, int end) {
+        for (int at = from; at < end; ++at) {
+            to.append(hexadecimal(header.byteAt(at)));
+        }
     }
 
     private void document(ProvisioningDocument document) {

@@ -41,7 +41,7 @@ final class Printable {
     }
 
     /** Whether a character shows itself, and neither breaks a line nor changes its direction. */
-    private static boolean isShown(char c) {
+    static boolean isShown(int c) {
         int type = Character.getType(c);
         return type != Character.CONTROL
                 && type != Character.FORMAT

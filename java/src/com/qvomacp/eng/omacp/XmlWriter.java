@@ -99,13 +99,12 @@ final class XmlWriter extends DocumentSource.Steps {
             case '"':
                 out.append("&quot;");
                 break;
-            case '\t':
-            case '\n':
-            case '\r':
-                out.append("&#").append(c).append(';');
-                break;
             default:
-                out.appendCodePoint(c);
+                if (Printable.isShown(c)) {
+                    out.appendCodePoint(c);
+                } else {
+                    out.append("&#").append(c).append(';');
+                }
         }
     }
 

@@ -310,7 +310,7 @@ class MainTest {
     void refusesWrongUsage() {
         for (String[] arguments :
                 List.of(
-                        array("--xml"),
+                        array("--yaml"),
                         array("--limit=0"),
                         array("--limit=1G"),
                         array("--limit=9999999999M"),
@@ -326,6 +326,9 @@ class MainTest {
                         array("--color=blue"),
                         array("verify"),
                         array("verify", "--json"),
+                        array("encode", "--\u001b[2Jx"),
+                        array("encode", "--sms=\u001b"),
+                        array("encode", "--to=\u001b", "--sms=submit"),
                         array("completion", "bash"))) {
             assertEquals(2, run(SMALL, arguments));
             assertEquals("", output);
@@ -345,7 +348,7 @@ class MainTest {
             assertTrue(output.startsWith("Usage: omacp [show] [OPTION...] [FILE...]\n"), output);
             assertTrue(output.contains("Exit status:\n"), output);
         }
-        for (String command : List.of("show", "verify", "completion")) {
+        for (String command : List.of("show", "verify", "encode", "completion")) {
             assertEquals(0, run(new byte[0], command, "--help"));
             assertEquals("", errors);
             assertTrue(output.startsWith("Usage: omacp " + command + " [-h]"), output);
@@ -382,7 +385,7 @@ class MainTest {
         assertEquals(
                 new ChildVm.Result(2, "", "omacp: " + missing + ": no such file\n"),
                 child(SMALL, missing.toString()));
-        assertEquals(2, child(SMALL, "--xml").status());
+        assertEquals(2, child(SMALL, "--yaml").status());
     }
 
     @Test

@@ -472,18 +472,18 @@ class ShowTest {
 
     @Test
     void usesColoursOnATerminalAlone() {
-        Terminal terminal = new Terminal(true, true);
+        Terminal terminal = new Terminal(true, true, true);
         run(REFUSED, "--bytes", "--color=always");
         assertTrue(output.contains("\u001b[32m\"abc\", inline\u001b[0m"), output);
         run(terminal, REFUSED, "--bytes");
         assertTrue(output.contains("\u001b[32m"), output);
         run(terminal, REFUSED, "--bytes", "--color=never");
         assertFalse(output.contains("\u001b"), output);
-        run(new Terminal(true, false), REFUSED);
+        run(new Terminal(true, false, true), REFUSED);
         assertFalse(errors.contains("\u001b"), errors);
-        run(new Terminal(false, true), REFUSED);
+        run(new Terminal(false, true, false), REFUSED);
         assertTrue(errors.startsWith("omacp: standard input: \u001b[1;31mrefused: "), errors);
-        run(new Terminal(false, true), REFUSED, "--bytes");
+        run(new Terminal(false, true, false), REFUSED, "--bytes");
         assertFalse(output.contains("\u001b"), output);
     }
 
@@ -494,5 +494,61 @@ class ShowTest {
         assertFalse(Terminal.wantsColor(Map.of("TERM", "xterm", "NO_COLOR", "1")));
         assertFalse(Terminal.wantsColor(Map.of("TERM", "dumb")));
         assertFalse(Terminal.wantsColor(Map.of()));
+    }
+
+    // ---- XML
+
+    @Test
+    void printsXml() {
+        byte[] push = withShortType(0xB6, BODY).sec(0x81).mac("AB12").bytes();
+        assertEquals(0, run(push, "--xml"), errors);
+        assertEquals("", errors);
+        assertEquals(
+                """
+                <?xml version="1.0" encoding="UTF-8"?>
+                <?omacp-push content-type="short" sec="userpin"?>
+                <!DOCTYPE wap-provisioningdoc PUBLIC "-//WAPFORUM//DTD PROV 1.0//EN" "http://www.wapforum.org/DTD/prov.dtd">
+                <wap-provisioningdoc version="1.0">
+                  <characteristic type="NAPDEF">
+                    <parm name="NAME" value="abc"/>
+                  </characteristic>
+                </wap-provisioningdoc>
+                """,
+                output);
+    }
+
+    @Test
+    void sendsNothingOfXmlToATerminalThatItObeys() {
+        String hostile = "a\u009b31m\u202e\u2028\t\r\n\ufeff\u00e9";
+        byte[] body = Document.document(characteristic("NAPDEF", parm("NAME", hostile)));
+        assertEquals(0, run(body, "--xml"), errors);
+        assertTrue(
+                output.contains("\"a&#155;31m&#8238;&#8232;&#9;&#13;&#10;&#65279;\u00e9\""), output);
+    }
+
+    @Test
+    void tellsWhatXmlCannotHoldWithItsPath() {
+        byte[] body = Document.document(characteristic("NAPDEF", parm("NAME", "\u001b[31m")));
+        assertEquals(1, run(body, "--xml"));
+        assertEquals("", output);
+        assertEquals(
+                "omacp: standard input: XML has no character U+001B, in wap-provisioningdoc / NAPDEF"
+                        + " 1\n",
+                errors);
+    }
+
+    @Test
+    void printsXmlOfARefusedMessageAndSaysWhyItIsRefused() {
+        assertEquals(1, run(REFUSED, "--xml"));
+        assertTrue(output.endsWith("</wap-provisioningdoc>\n"), output);
+        assertTrue(errors.startsWith("omacp: standard input: refused: "), errors);
+    }
+
+    @Test
+    void printsXmlInNoOtherForm() {
+        for (String other : List.of("--json", "--json-lines", "--bytes", "--header", "--answers")) {
+            assertEquals(2, run(BODY, "--xml", other));
+            assertEquals("", output);
+        }
     }
 }

@@ -1,5 +1,8 @@
 package com.qvomacp.support;
 
+import com.qvomacp.eng.omacp.EncodeOptions;
+import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.ProvisioningEncoder;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.Path;
@@ -72,22 +75,14 @@ public final class FieldMessage {
         return isPush ? bytes : Push.push(bytes);
     }
 
-    /** What the samples' encoder makes of a document; null, and said so, when it refuses it. */
-    private static byte[] encoded(String document) throws Exception {
-        Path file = Files.writeString(Files.createTempFile("field", ".xml"), document);
+    /** What becomes of a document; null, and said so, when it is refused. */
+    private static byte[] encoded(String document) {
         try {
-            Process encoder =
-                    new ProcessBuilder("tools/encode-sample", "-o", "-", file.toString())
-                            .redirectErrorStream(true)
-                            .start();
-            byte[] output = encoder.getInputStream().readAllBytes();
-            if (encoder.waitFor() == 0) {
-                return output;
-            }
-            System.out.print(new String(output, StandardCharsets.UTF_8));
+            byte[] xml = document.getBytes(StandardCharsets.UTF_8);
+            return ProvisioningEncoder.ofXml(xml, EncodeOptions.NONE).push();
+        } catch (EncodingException refused) {
+            System.out.println(refused);
             return null;
-        } finally {
-            Files.delete(file);
         }
     }
 }

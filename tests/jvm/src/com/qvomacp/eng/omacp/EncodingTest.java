@@ -86,6 +86,14 @@ class EncodingTest {
         assertArrayEquals(expected, encoded);
     }
 
+    @Test
+    void everySampleHasItsDocument() throws Exception {
+        try (Stream<Path> files = Files.list(Path.of("samples"))) {
+            assertEquals(
+                    samples().size(), files.filter(file -> file.toString().endsWith(".push")).count());
+        }
+    }
+
     @ParameterizedTest
     @MethodSource("samples")
     void aSampleComesBackFromItsXmlInEveryWriting(Path xml) throws Exception {
