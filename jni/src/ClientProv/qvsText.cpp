@@ -270,10 +270,14 @@ bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 
 qvsResult qvs::dropInlineString(qvsWbxmlDecoder *decoder, DecodeState *state)
 {
-    smlBuffer *buffer = decoder->ptBuffer;
+    uint8_t *at = decoder->ptBuffer->pHead;
     Piece piece;
-    inlinePiece(&buffer->pHead, buffer->pHead + bytesLeft(decoder), &piece);
-    return countText(state, piece.length) ? QVS_OK : QVS_ERROR_NO_MEMORY;
+    inlinePiece(&at, at + bytesLeft(decoder), &piece);
+    if (!countText(state, piece.length)) {
+        return QVS_ERROR_NO_MEMORY;
+    }
+    decoder->ptBuffer->pHead = at;
+    return QVS_OK;
 }
 
 qvsResult qvs::content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
