@@ -32,9 +32,7 @@ final class AnswerText implements Comparison.Listener {
     @Override
     public void begin(String type, List<Item> said) {
         title();
-        if (depth == 0) {
-            out.append('\n');
-        }
+        out.append(depth == 0 ? "\n" : "");
         line(' ', type, null);
         ++depth;
         column = type.equals(Comparison.HEADER) ? HEADER_COLUMN : TextWriter.column(said);
@@ -66,9 +64,7 @@ final class AnswerText implements Comparison.Listener {
     @Override
     public void notAnswered(String type) {
         title();
-        if (depth == 0) {
-            out.append('\n');
-        }
+        out.append(depth == 0 ? "\n" : "");
         line('-', type == null ? "(no TYPE)" : type, null);
     }
 
@@ -83,16 +79,8 @@ final class AnswerText implements Comparison.Listener {
         out.append(": " + why + ".\n");
     }
 
-    private void line(char mark, String name, String value) {
+    private void line(char mark, String name, String shown) {
         out.append(mark == ' ' ? " " : palette.error(String.valueOf(mark))).append(' ');
-        text.spaces(depth * TextWriter.INDENT);
-        String shownName = Visible.of(name);
-        out.append(shownName);
-        if (value != null) {
-            int gap = column - Visible.columns(shownName);
-            text.spaces(Math.max(gap, TextWriter.INDENT));
-            out.append(value);
-        }
-        out.append('\n');
+        text.line(depth * TextWriter.INDENT, column, name, shown);
     }
 }

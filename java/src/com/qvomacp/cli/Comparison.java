@@ -160,11 +160,8 @@ final class Comparison implements Answers.Listener {
     }
 
     private void compare(String name, String value, boolean isSaid, String said) {
-        Agreement agreement =
-                !isSaid
-                        ? Agreement.NOT_SAID
-                        : Objects.equals(value, said) ? Agreement.SAME : Agreement.OTHERWISE;
-        listener.answered(name, value, agreement, said);
+        Agreement ofSaid = Objects.equals(value, said) ? Agreement.SAME : Agreement.OTHERWISE;
+        listener.answered(name, value, isSaid ? ofSaid : Agreement.NOT_SAID, said);
     }
 
     @Override

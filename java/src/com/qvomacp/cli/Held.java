@@ -5,6 +5,8 @@ import java.util.List;
 
 /** What came of something that people hold: a push, a body, or why there is no message. */
 final class Held {
+    private static final List<String> NONE = Collections.emptyList();
+
     /** Where it comes from, for people: the input, its line, or all the parts of an SMS. */
     final String name;
 
@@ -33,16 +35,16 @@ final class Held {
     }
 
     static Held message(String name, byte[] bytes, boolean isPush) {
-        return new Held(name, bytes, isPush, null, Collections.<String>emptyList());
+        return new Held(name, bytes, isPush, null, NONE);
     }
 
     static Held error(String name, String sentence) {
-        return new Held(name, null, false, sentence, Collections.<String>emptyList());
+        return new Held(name, null, false, sentence, NONE);
     }
 
     /** Bytes that are no message. */
     static Held unknown(String name, byte[] bytes, String sentence) {
-        return new Held(name, bytes, true, sentence, Collections.<String>emptyList());
+        return new Held(name, bytes, true, sentence, NONE);
     }
 
     /** A remark that belongs to no message. */

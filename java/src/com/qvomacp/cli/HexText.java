@@ -1,6 +1,7 @@
 package com.qvomacp.cli;
 
 import java.io.ByteArrayOutputStream;
+import java.nio.charset.Charset;
 import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
 import java.util.Arrays;
@@ -39,32 +40,28 @@ final class HexText {
         }
     }
 
-    private static final char BYTE_ORDER_MARK = '\uFEFF';
+    private static final String BYTE_ORDER_MARK = "\uFEFF";
 
-    /**
-     * Behind a label there are at least so many digits, lest words and times be taken for bytes.
-     */
+    /** So many digits are behind a label at least, lest words and times be taken for bytes. */
     private static final int FEWEST_BEHIND_LABEL = 16;
 
-    private static final String SEPARATORS = ":,;-";
-    private static final String BRACKETS = "\"'{}[]()<>";
+    /** What may stand between and around digits, with the letters of a prefix. */
+    private static final String AROUND = "xX \t:,;-\"'{}[]()<>";
 
     private HexText() {}
 
     /** The content as text when it can be one, without a byte order mark; null otherwise. */
     static String text(byte[] content) {
-        boolean isWide =
-                content.length > 1 && (content[0] & 0xFF) + (content[1] & 0xFF) == 0xFE + 0xFF;
-        String text =
-                new String(content, isWide ? StandardCharsets.UTF_16 : StandardCharsets.UTF_8);
-        boolean isMarked = !text.isEmpty() && text.charAt(0) == BYTE_ORDER_MARK;
+        boolean isWide = content.length > 1 && (content[0] & 0xFF) + (content[1] & 0xFF) == 0x1FD;
+        Charset charset = isWide ? StandardCharsets.UTF_16 : StandardCharsets.UTF_8;
+        String text = new String(content, charset);
         for (int i = 0; i < text.length(); ++i) {
             char c = text.charAt(i);
             if (c < ' ' && !Character.isWhitespace(c) || c == '\u007F') {
                 return null;
             }
         }
-        return isMarked ? text.substring(1) : text;
+        return text.startsWith(BYTE_ORDER_MARK) ? text.substring(1) : text;
     }
 
     /** The pieces of a text, in their order. */
@@ -117,7 +114,7 @@ final class HexText {
      */
     private static String behindLabel(String line) {
         int from = line.length();
-        while (from > 0 && belongs(line.charAt(from - 1))) {
+        while (from > 0 && isDigitOrAround(line, from - 1)) {
             --from;
         }
         boolean hasLabel = from > 0;
@@ -141,14 +138,8 @@ final class HexText {
         return digits != null && digits.length() >= fewest ? digits : null;
     }
 
-    private static boolean belongs(char c) {
-        return isDigit(c)
-                || c == 'x'
-                || c == 'X'
-                || c == ' '
-                || c == '\t'
-                || SEPARATORS.indexOf(c) >= 0
-                || BRACKETS.indexOf(c) >= 0;
+    private static boolean isDigitOrAround(String line, int at) {
+        return isDigit(line, at) || AROUND.indexOf(line.charAt(at)) >= 0;
     }
 
     /** The digits without what may stand around them; null for an x that is no prefix. */
@@ -156,16 +147,11 @@ final class HexText {
         StringBuilder digits = new StringBuilder(text.length());
         for (int i = 0; i < text.length(); ++i) {
             char c = text.charAt(i);
-            boolean isPrefix =
-                    c == '0' && i + 1 < text.length() && (text.charAt(i + 1) | ' ') == 'x';
-            if (isPrefix) {
+            if (text.startsWith("0x", i) || text.startsWith("0X", i)) {
                 ++i;
-                boolean isSingle =
-                        i + 1 < text.length()
-                                && isDigit(text.charAt(i + 1))
-                                && (i + 2 == text.length() || !isDigit(text.charAt(i + 2)));
+                boolean isSingle = isDigit(text, i + 1) && !isDigit(text, i + 2);
                 digits.append(isSingle ? "0" : "");
-            } else if (isDigit(c)) {
+            } else if (isDigit(text, i)) {
                 digits.append(c);
             } else if (c == 'x' || c == 'X') {
                 return null;
@@ -174,12 +160,18 @@ final class HexText {
         return digits.toString();
     }
 
-    private static boolean isDigit(char c) {
-        return c < 0x80 && Character.digit(c, 16) >= 0;
+    private static boolean isDigit(String text, int at) {
+        return at < text.length() && text.charAt(at) < 0x80 && digit(text, at) >= 0;
     }
 
-    private static boolean isByte(String text, int at) {
-        return at + 1 < text.length() && isDigit(text.charAt(at)) && isDigit(text.charAt(at + 1));
+    private static int digit(String text, int at) {
+        return Character.digit(text.charAt(at), 16);
+    }
+
+    /** What two digits stand for; -1 where there are none. */
+    private static int byteAt(String text, int at) {
+        boolean isByte = isDigit(text, at) && isDigit(text, at + 1);
+        return isByte ? digit(text, at) << 4 | digit(text, at + 1) : -1;
     }
 
     /** A literal of source code, where some bytes are escapes and others stand for themselves. */
@@ -193,8 +185,8 @@ final class HexText {
         for (int i = isQuoted ? quote + 1 : from; i < line.length(); ++i) {
             char c = line.charAt(i);
             boolean isEscape = c == '\\' && i + 1 < line.length();
-            if (isEscape && line.charAt(i + 1) == 'x' && isByte(line, i + 2)) {
-                bytes.write(Integer.parseInt(line.substring(i + 2, i + 4), 16));
+            if (isEscape && line.charAt(i + 1) == 'x' && byteAt(line, i + 2) >= 0) {
+                bytes.write(byteAt(line, i + 2));
                 i += 3;
             } else if (isEscape) {
                 int known = "nrt0".indexOf(line.charAt(i + 1));
@@ -242,17 +234,16 @@ final class HexText {
         }
         String value = line.substring(from, end);
         String digits = value.indexOf('%') < 0 ? digitsOf(value) : null;
-        boolean isHexadecimal =
-                digits != null && digits.length() == value.length() && digits.length() % 2 == 0;
-        return isHexadecimal ? bytes(digits) : percentDecoded(value);
+        boolean isWhole = digits != null && digits.length() == value.length();
+        return isWhole && digits.length() % 2 == 0 ? bytes(digits) : percentDecoded(value);
     }
 
     private static byte[] percentDecoded(String value) {
         ByteArrayOutputStream bytes = new ByteArrayOutputStream();
         for (int i = 0; i < value.length(); ++i) {
             char c = value.charAt(i);
-            if (c == '%' && isByte(value, i + 1)) {
-                bytes.write(Integer.parseInt(value.substring(i + 1, i + 3), 16));
+            if (c == '%' && byteAt(value, i + 1) >= 0) {
+                bytes.write(byteAt(value, i + 1));
                 i += 2;
             } else {
                 bytes.write(c == '+' ? ' ' : c);
@@ -271,7 +262,7 @@ final class HexText {
         for (int i = 0; i < text.length(); ++i) {
             char c = text.charAt(i);
             if (!Character.isWhitespace(c)) {
-                areDigits &= isDigit(c);
+                areDigits &= isDigit(text, i);
                 letters.append(c == '-' ? '+' : c == '_' ? '/' : c);
             }
         }
@@ -290,8 +281,7 @@ final class HexText {
     static byte[] bytes(String digits) {
         byte[] bytes = new byte[digits.length() / 2];
         for (int i = 0; i < bytes.length; ++i) {
-            int high = Character.digit(digits.charAt(2 * i), 16);
-            bytes[i] = (byte) (high << 4 | Character.digit(digits.charAt(2 * i + 1), 16));
+            bytes[i] = (byte) (digit(digits, 2 * i) << 4 | digit(digits, 2 * i + 1));
         }
         return bytes;
     }

@@ -56,23 +56,18 @@ final class Intake {
         return parts.missing();
     }
 
-    private static void add(List<Held> held, Held more) {
-        if (more != null) {
-            held.add(more);
-        }
-    }
-
     /** A text is what its digits stand for, or base64; anything else is called what it is. */
     private void takeText(String name, byte[] content, String text, List<Held> held) {
         byte[] base64 = HexText.base64(text);
         boolean isMessage = base64 != null && isMessage(base64);
-        List<HexText.Piece> pieces =
-                isMessage || isMarkup(text)
-                        ? Collections.<HexText.Piece>emptyList()
-                        : HexText.pieces(text);
         if (isMessage) {
             take(Place.in(name), base64, form, held);
-        } else if (pieces.isEmpty()) {
+            return;
+        }
+        boolean isMarkup = text.trim().startsWith("<");
+        List<HexText.Piece> pieces =
+                isMarkup ? Collections.<HexText.Piece>emptyList() : HexText.pieces(text);
+        if (pieces.isEmpty()) {
             held.add(Held.unknown(name, content, NO_MESSAGE + likeness(content)));
         } else {
             takePieces(Place.in(name), pieces, held);
@@ -91,10 +86,6 @@ final class Intake {
             held.clear();
             held.add(Held.unknown(name, content, NO_MESSAGE + likeness));
         }
-    }
-
-    private static boolean isMarkup(String text) {
-        return text.trim().startsWith("<");
     }
 
     private static String likeness(byte[] bytes) {
@@ -131,13 +122,8 @@ final class Intake {
 
     private void takeDigits(Place place, String digits, boolean isUserData, List<Held> held) {
         if (digits.length() % 2 != 0) {
-            held.add(
-                    Held.error(
-                            place.toString(),
-                            NO_MESSAGE
-                                    + HEXADECIMAL
-                                    + " with an odd number of digits, "
-                                    + digits.length()));
+            String odd = HEXADECIMAL + " with an odd number of digits, " + digits.length();
+            held.add(Held.error(place.toString(), NO_MESSAGE + odd));
             return;
         }
         take(place, HexText.bytes(digits), isUserData && form == null ? Form.UD : form, held);
@@ -197,13 +183,10 @@ final class Intake {
 
     /** Whether a line is a message, for certain and not just the beginning of one. */
     private boolean isMessageAlone(String digits) {
-        if (digits.length() % 2 != 0) {
-            return false;
-        }
         byte[] bytes = HexText.bytes(digits);
-        return isShortMessage(bytes)
-                || isKnownPush(bytes) && hasDocument(bytes)
-                || isDocument(bytes, 0);
+        boolean isPush = isKnownPush(bytes) && hasDocument(bytes);
+        return digits.length() % 2 == 0
+                && (isShortMessage(bytes) || isPush || isDocument(bytes, 0));
     }
 
     private boolean isMessage(byte[] bytes) {
@@ -250,7 +233,7 @@ final class Intake {
         try {
             ShortMessage message = shortMessage(bytes, form);
             if (message != null) {
-                add(held, takeShortMessage(place, message));
+                takeShortMessage(place, message, held);
                 return;
             }
         } catch (ShortMessage.OtherException other) {
@@ -275,18 +258,18 @@ final class Intake {
         }
     }
 
-    private Held takeShortMessage(Place place, ShortMessage message) {
+    private void takeShortMessage(Place place, ShortMessage message, List<Held> held) {
         String fault = message.fault();
-        if (fault != null) {
-            return Held.error(place.toString(), NO_MESSAGE + fault);
+        Held whole =
+                fault == null
+                        ? parts.take(place, message)
+                        : Held.error(place.toString(), NO_MESSAGE + fault);
+        if (whole == null) {
+            return;
         }
-        Held whole = parts.take(place, message);
-        boolean isOther =
-                whole != null
-                        && whole.bytes != null
-                        && !message.hasPort()
-                        && header(whole.bytes) == null;
-        return isOther ? Held.error(whole.name, NO_MESSAGE + "an SMS without a port") : whole;
+        boolean isOther = whole.bytes != null && !message.hasPort() && header(whole.bytes) == null;
+        held.add(
+                isOther ? Held.error(whole.name, NO_MESSAGE + "an SMS without a port") : whole);
     }
 
     /** Whether the second byte is that of a push. */

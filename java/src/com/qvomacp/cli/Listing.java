@@ -179,10 +179,8 @@ final class Listing implements ByteVisitor {
     }
 
     private static String shown(String meaning) {
-        if (meaning.length() <= LONGEST) {
-            return Visible.of(meaning);
-        }
-        return Visible.of(meaning.substring(0, LONGEST)) + "...";
+        boolean isLong = meaning.length() > LONGEST;
+        return isLong ? Visible.of(meaning.substring(0, LONGEST)) + "..." : Visible.of(meaning);
     }
 
     private String painted(String meaning, String text) {
@@ -228,7 +226,7 @@ final class Listing implements ByteVisitor {
     }
 
     /** Appends a text, and blanks until it is so wide. */
-    private static void pad(StringBuilder to, String text, int width) {
+    static void pad(StringBuilder to, String text, int width) {
         to.append(text);
         for (int i = text.length(); i < width; ++i) {
             to.append(' ');

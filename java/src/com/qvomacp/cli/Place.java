@@ -36,11 +36,9 @@ final class Place {
     static String names(Iterable<Place> places) {
         Map<String, List<Integer>> lines = new LinkedHashMap<>();
         for (Place place : places) {
-            if (!lines.containsKey(place.input)) {
-                lines.put(place.input, new ArrayList<Integer>());
-            }
-            if (place.line != NO_LINE && !lines.get(place.input).contains(place.line)) {
-                lines.get(place.input).add(place.line);
+            List<Integer> known = lines.computeIfAbsent(place.input, input -> new ArrayList<>());
+            if (place.line != NO_LINE && !known.contains(place.line)) {
+                known.add(place.line);
             }
         }
         StringBuilder text = new StringBuilder();

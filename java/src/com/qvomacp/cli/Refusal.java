@@ -47,10 +47,8 @@ final class Refusal {
     static Refusal of(Reading reading) {
         ProvisioningException failure = reading.failure;
         Verdict verdict = reading.verdict;
-        boolean isBoth =
-                failure != null
-                        && !verdict.isHeaderRefused()
-                        && verdict.offset() == failure.offset();
+        boolean isBoth = failure != null && verdict.offset() == failure.offset()
+                && !verdict.isHeaderRefused();
         if (failure != null && !isBoth) {
             return of(reading.held, failure, reading.bodyAt());
         }
@@ -85,8 +83,7 @@ final class Refusal {
         List<String> lines = Lines.of(text, Lines.WIDTH - INDENT.length());
         String first = lines.get(0);
         int painted = first.startsWith(start) ? start.length() : 0;
-        out.append(first, 0, painted).append(palette.error(first.substring(painted)));
-        out.append('\n');
+        out.append(first, 0, painted).append(palette.error(first.substring(painted))).append('\n');
         for (String line : lines.subList(1, lines.size())) {
             out.append(INDENT).append(palette.error(line)).append('\n');
         }
@@ -128,11 +125,9 @@ final class Refusal {
         int from = Math.max(offset - AROUND, 0);
         int to = Math.min(offset + AROUND, held.bytes.length);
         String start = INDENT + INDENT + Listing.hexadecimal(from, 4) + "  ";
-        out.append(palette.dim(start)).append(Listing.hexadecimal(held.bytes, from, to));
-        out.append('\n');
-        for (int i = start.length() + (offset - from) * 3; i > 0; --i) {
-            out.append(' ');
-        }
+        String bytes = Listing.hexadecimal(held.bytes, from, to);
+        out.append(palette.dim(start)).append(bytes).append('\n');
+        Listing.pad(out, "", start.length() + (offset - from) * 3);
         out.append(palette.error("^^")).append('\n');
     }
 }

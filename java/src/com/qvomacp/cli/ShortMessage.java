@@ -92,8 +92,8 @@ final class ShortMessage {
             return null;
         }
         requireData(isSubmit, alphabet, at(bytes, coding), (first & HAS_HEADER) != 0);
-        ShortMessage message =
-                userData(bytes, lengthAt + 1, address(bytes, address + 2, digits, kind));
+        String sender = address(bytes, address + 2, digits, kind);
+        ShortMessage message = userData(bytes, lengthAt + 1, sender);
         if (message == null) {
             throw new OtherException(
                     "an SMS whose user data header does not end where its length says");
@@ -115,12 +115,8 @@ final class ShortMessage {
                             + " SMS-DELIVER");
         }
         if (alphabet != Alphabet.DATA) {
-            throw new OtherException(
-                    String.format(
-                            Locale.ROOT,
-                            "an SMS with %s (coding scheme %02X), and not with data",
-                            alphabet.name,
-                            coding));
+            String why = "an SMS with %s (coding scheme %02X), and not with data";
+            throw new OtherException(String.format(Locale.ROOT, why, alphabet.name, coding));
         }
         if (!hasHeader) {
             throw new OtherException("an SMS without a user data header, and so without a port");
@@ -154,25 +150,22 @@ final class ShortMessage {
 
     /** Takes an element of the header; of two of a kind the last one counts. */
     private void take(int element, byte[] bytes, int from, int length) {
-        if (element == PORTS_16 && length == 4) {
-            port = at(bytes, from) << 8 | at(bytes, from + 1);
-            senderPort = at(bytes, from + 2) << 8 | at(bytes, from + 3);
-        } else if (element == PORTS_8 && length == 2) {
-            port = at(bytes, from);
-            senderPort = at(bytes, from + 1);
-        } else if (element == CONCATENATED_8 && length == 3) {
-            concatenated(8, at(bytes, from), at(bytes, from + 1), at(bytes, from + 2));
-        } else if (element == CONCATENATED_16 && length == 4) {
-            int wide = at(bytes, from) << 8 | at(bytes, from + 1);
-            concatenated(16, wide, at(bytes, from + 2), at(bytes, from + 3));
+        if (element == PORTS_16 && length == 4 || element == PORTS_8 && length == 2) {
+            int octets = length / 2;
+            port = number(bytes, from, octets);
+            senderPort = number(bytes, from + octets, octets);
+        } else if (element == CONCATENATED_8 && length == 3
+                || element == CONCATENATED_16 && length == 4) {
+            int octets = length - 2;
+            width = 8 * octets;
+            reference = number(bytes, from, octets);
+            total = at(bytes, from + octets);
+            number = at(bytes, from + octets + 1);
         }
     }
 
-    private void concatenated(int width, int reference, int total, int number) {
-        this.width = width;
-        this.reference = reference;
-        this.total = total;
-        this.number = number;
+    private static int number(byte[] bytes, int from, int octets) {
+        return octets == 1 ? at(bytes, from) : at(bytes, from) << 8 | at(bytes, from + 1);
     }
 
     private static String address(byte[] bytes, int from, int digits, int kind) {
@@ -253,11 +246,8 @@ final class ShortMessage {
             if (coding >> 4 == 0xF) {
                 return (coding & 0x04) == 0 ? SEVEN_BIT : DATA;
             }
-            if (coding >> 4 == 0xE) {
-                return UCS_2;
-            }
             if (coding >= 0x80) {
-                return SEVEN_BIT;
+                return coding >> 4 == 0xE ? UCS_2 : SEVEN_BIT;
             }
             if ((coding & 0x20) != 0) {
                 return COMPRESSED;

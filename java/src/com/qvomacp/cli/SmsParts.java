@@ -3,7 +3,6 @@ package com.qvomacp.cli;
 import java.io.ByteArrayOutputStream;
 import java.util.ArrayList;
 import java.util.Arrays;
-import java.util.Collections;
 import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
@@ -53,11 +52,7 @@ final class SmsParts {
         if (!message.isPart()) {
             return Held.message(place.toString(), message.data, true);
         }
-        Push push = pushes.get(message.key());
-        if (push == null) {
-            push = new Push(message);
-            pushes.put(message.key(), push);
-        }
+        Push push = pushes.computeIfAbsent(message.key(), key -> new Push(message));
         int index = message.number() - 1;
         String part = "part " + message.number() + " of " + message.description();
         if (push.parts[index] != null) {
@@ -78,19 +73,16 @@ final class SmsParts {
 
     private static Held again(Push push, Place place, ShortMessage message, String part) {
         String name = place.toString();
-        Place first = push.places[message.number() - 1];
-        if (Arrays.equals(push.parts[message.number() - 1], message.data)) {
-            String sentence = part + " is there twice: in " + first + " and in " + name;
-            if (push.isFinished) {
-                return Held.note(name, sentence);
-            }
-            push.notes.add(sentence);
-            return null;
+        String where = ": in " + push.places[message.number() - 1] + " and in " + name;
+        if (!Arrays.equals(push.parts[message.number() - 1], message.data)) {
+            push.isFinished = true;
+            return Held.error(name, part + " is there twice with different bytes" + where);
         }
-        push.isFinished = true;
-        return Held.error(
-                name,
-                part + " is there twice with different bytes: in " + first + " and in " + name);
+        if (push.isFinished) {
+            return Held.note(name, part + " is there twice" + where);
+        }
+        push.notes.add(part + " is there twice" + where);
+        return null;
     }
 
     /** Names what is missing of the pushes that are not whole. */
@@ -99,19 +91,13 @@ final class SmsParts {
         for (Push push : pushes.values()) {
             List<Integer> missing = push.missing();
             if (!push.isFinished && !missing.isEmpty()) {
-                errors.add(
-                        Held.error(
-                                push.name(),
-                                (missing.size() == 1 ? "part " : "parts ")
-                                        + Place.listed(missing)
-                                        + " of "
-                                        + push.parts.length
-                                        + " of "
-                                        + push.any.description()
-                                        + (missing.size() == 1 ? " is" : " are")
-                                        + " missing"));
+                boolean isOne = missing.size() == 1;
+                String which = (isOne ? "part " : "parts ") + Place.listed(missing);
+                String of = " of " + push.parts.length + " of " + push.any.description();
+                String sentence = which + of + (isOne ? " is" : " are") + " missing";
+                errors.add(Held.error(push.name(), sentence));
             }
         }
-        return errors.isEmpty() ? Collections.<Held>emptyList() : errors;
+        return errors;
     }
 }

@@ -60,7 +60,7 @@ final class TextWriter {
     }
 
     private void fact(String name, String value) {
-        line(0, HEADER_COLUMN, name, value);
+        line(0, HEADER_COLUMN, name, shown(value));
     }
 
     void document(ProvisioningDocument document) {
@@ -115,7 +115,7 @@ final class TextWriter {
 
     private void parameter(Parameter parameter, int indent, int column) {
         if (parameter.name() != null) {
-            line(indent, column, parameter.name(), parameter.value());
+            line(indent, column, parameter.name(), shown(parameter.value()));
         } else {
             spaces(indent);
             out.append(palette.error("(no NAME)"));
@@ -161,18 +161,23 @@ final class TextWriter {
         }
     }
 
-    private void line(int indent, int column, String name, String value) {
+    /** Writes a name, and in its column the value as it is shown; null for none. */
+    void line(int indent, int column, String name, String shown) {
         String shownName = Visible.of(name);
         spaces(indent);
         out.append(shownName);
-        if (value != null) {
+        if (shown != null) {
             spaces(Math.max(column - Visible.columns(shownName), INDENT));
-            out.append(Visible.value(value));
+            out.append(shown);
         }
         out.append('\n');
     }
 
-    void spaces(int count) {
+    private static String shown(String value) {
+        return value == null ? null : Visible.value(value);
+    }
+
+    private void spaces(int count) {
         out.append(String.join("", Collections.nCopies(count, " ")));
     }
 }
