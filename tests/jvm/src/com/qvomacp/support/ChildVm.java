@@ -36,7 +36,7 @@ public final class ChildVm {
     }
 
     /** Runs {@code main} to its end; the locale is C, which knows ASCII alone. */
-    private static Result run(
+    public static Result run(
             String libraryPath,
             String classPath,
             List<String> options,
