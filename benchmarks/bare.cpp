@@ -8,11 +8,9 @@
 
 namespace {
 
-// The elements of a String[], the text of a String or the bytes of a byte[]. A null text is a null
-// pointer.
+// The elements of a String[], or the text of a String. A null text is a null pointer.
 struct Answer {
     std::vector<std::unique_ptr<std::string>> texts;
-    std::vector<jbyte> bytes;
 };
 
 jint heldNumber;
@@ -40,14 +38,7 @@ bool isA(JNIEnv *env, jobject object, const char *type)
 Answer answerOf(JNIEnv *env, jobject object)
 {
     Answer answer;
-    if (!object) {
-        return answer;
-    }
-    if (isA(env, object, "[B")) {
-        auto array = static_cast<jbyteArray>(object);
-        answer.bytes.resize(static_cast<size_t>(env->GetArrayLength(array)));
-        env->GetByteArrayRegion(array, 0, env->GetArrayLength(array), answer.bytes.data());
-    } else if (isA(env, object, "java/lang/String")) {
+    if (isA(env, object, "java/lang/String")) {
         answer.texts.push_back(copied(env, static_cast<jstring>(object)));
     } else {
         auto array = static_cast<jobjectArray>(object);
@@ -80,23 +71,9 @@ JNIEXPORT jint JNICALL Java_Bare_number(JNIEnv *, jobject)
     return heldNumber;
 }
 
-JNIEXPORT jobject JNICALL Java_Bare_nothing(JNIEnv *, jobject)
-{
-    return nullptr;
-}
-
 JNIEXPORT jstring JNICALL Java_Bare_text(JNIEnv *env, jobject, jint i)
 {
     return env->NewStringUTF(held[static_cast<size_t>(i)].texts[0]->c_str());
-}
-
-JNIEXPORT jbyteArray JNICALL Java_Bare_bytes(JNIEnv *env, jobject, jint i)
-{
-    const std::vector<jbyte> &bytes = held[static_cast<size_t>(i)].bytes;
-    const auto length = static_cast<jsize>(bytes.size());
-    jbyteArray array = env->NewByteArray(length);
-    env->SetByteArrayRegion(array, 0, length, bytes.data());
-    return array;
 }
 
 JNIEXPORT jobjectArray JNICALL Java_Bare_array(JNIEnv *env, jobject, jint i)

@@ -66,10 +66,10 @@ def prepare():
     """Makes the documents and the steps of their floors."""
     BUILD.mkdir(parents=True, exist_ok=True)
     model = sorted((ROOT / "tests" / "model").glob("*.py"))
-    encoder = ROOT / "tools" / "encode-sample"
-    samples = sorted((ROOT / "samples").glob("*.xml"))
+    encoder = [BENCH / "encoding.py", ROOT / "tools" / "tokens.py"]
+    samples = sorted((ROOT / "samples").iterdir())
     eight = [BUILD / f"{name}.push" for name in ROUNDS]
-    made(eight, [BENCH / "documents", encoder, *samples], [BENCH / "documents"])
+    made(eight, [BENCH / "documents", *encoder, *samples], [BENCH / "documents"])
     messages = sorted(BUILD.glob("*.push"))
     blocks = [path.with_suffix(".blocks") for path in messages]
     made(blocks, [BENCH / "blocks", *model, *messages], [BENCH / "blocks"])

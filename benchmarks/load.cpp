@@ -1,7 +1,7 @@
 // load LIBRARY: what it takes to load a library, and to register its natives with a virtual machine
 // that costs nothing; the fastest of many turns, each with a copy of its own, since a library that
 // was loaded stays mapped.
-#include "quietvm.h"
+#include "support/fakevm.h"
 
 #include <dlfcn.h>
 
@@ -18,20 +18,12 @@ constexpr int kTurns = 300;
 
 using Clock = std::chrono::steady_clock;
 
-jint (*loaded)(JavaVM *, void *);
-
 double microseconds(Clock::duration duration)
 {
     return std::chrono::duration<double, std::micro>(duration).count();
 }
 
 } // namespace
-
-// What the machine calls: the entry of the library that is loaded.
-jint JNI_OnLoad(JavaVM *vm, void *reserved)
-{
-    return loaded(vm, reserved);
-}
 
 int main(int argc, char **argv)
 {
@@ -45,17 +37,19 @@ int main(int argc, char **argv)
         std::filesystem::copy_file(argv[1], copy);
         const auto start = Clock::now();
         void *library = dlopen(copy.c_str(), RTLD_NOW);
-        loaded =
-            library ? reinterpret_cast<decltype(loaded)>(dlsym(library, "JNI_OnLoad")) : nullptr;
+        const auto entry =
+            library ? reinterpret_cast<decltype(&JNI_OnLoad)>(dlsym(library, "JNI_OnLoad"))
+                    : nullptr;
         const auto opened = Clock::now();
         std::filesystem::remove(copy);
-        if (!loaded) {
+        if (!entry) {
             fprintf(stderr, "load: %s\n", dlerror());
             return 1;
         }
         const auto registering = Clock::now();
         {
-            quietvm::Vm vm;
+            fakevm::Vm vm({.quiet = true});
+            vm.load(entry);
         }
         const auto registered = Clock::now();
         fastestOpening = std::min(fastestOpening, microseconds(opened - start));

@@ -1,5 +1,5 @@
 """The tokens of OMA Client Provisioning by their names, and what a kind of characteristic takes: for the
-encoder of the samples, the model and the fuzz targets. Written apart from the library's own tables."""
+documents that are measured, the model and the fuzz targets. Written apart from the library's own tables."""
 
 from typing import NamedTuple
 

@@ -5,11 +5,7 @@ final class Bare {
 
     native int number();
 
-    native Object nothing();
-
     native String text(int place);
 
     native String[] array(int place);
-
-    native byte[] bytes(int place);
 }

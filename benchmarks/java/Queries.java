@@ -1,5 +1,4 @@
 import com.qvomacp.eng.parser.*;
-import java.util.List;
 
 /** Asks the natives everything that there is to ask about the message that was parsed. */
 final class Queries {
@@ -15,8 +14,6 @@ final class Queries {
     private final XCPCtxVoWifi voWifis = new XCPCtxVoWifi();
 
     private int answers;
-    private int counts;
-    private List<Object> record;
 
     /** Parses a message, asks all queries, each for every index, and lets go of it. */
     int all(byte[] message) {
@@ -25,55 +22,38 @@ final class Queries {
         }
         answers = 0;
         header();
-        for (int p = count(proxies.qvomacp_GetPxLogicalCount()); p > 0; --p) {
+        for (int p = proxies.qvomacp_GetPxLogicalCount(); p > 0; --p) {
             proxy(p);
         }
-        for (int n = count(napDefs.qvomacp_GetPxNapDefCount()); n > 0; --n) {
+        for (int n = napDefs.qvomacp_GetPxNapDefCount(); n > 0; --n) {
             napDef(n);
         }
-        for (int b = count(bootstraps.qvomacp_GetPxBootstrapCount()); b > 0; --b) {
+        for (int b = bootstraps.qvomacp_GetPxBootstrapCount(); b > 0; --b) {
             bootstrap(b);
         }
         take(identity.qvomacp_GetPxClientIdentityData());
-        for (int v = count(vendorConfigs.qvomacp_GetPxVenderConfigCount()); v > 0; --v) {
+        for (int v = vendorConfigs.qvomacp_GetPxVenderConfigCount(); v > 0; --v) {
             take(vendorConfigs.qvomacp_GetPxVenderConfigData(v));
         }
-        for (int a = count(applications.qvomacp_GetPxApplicationCount()); a > 0; --a) {
+        for (int a = applications.qvomacp_GetPxApplicationCount(); a > 0; --a) {
             application(a);
         }
         take(applications.qvomacp_GetPxRoamingData());
-        for (int a = count(accesses.qvomacp_GetPxCtxAccessCount()); a > 0; --a) {
+        for (int a = accesses.qvomacp_GetPxCtxAccessCount(); a > 0; --a) {
             access(a);
         }
-        for (int w = count(wifis.qvomacp_GetPxWifiCount()); w > 0; --w) {
+        for (int w = wifis.qvomacp_GetPxWifiCount(); w > 0; --w) {
             take(wifis.qvomacp_GetPxWifiData(w));
         }
-        for (int v = count(voWifis.qvomacp_GetPxVoWifiCount()); v > 0; --v) {
+        for (int v = voWifis.qvomacp_GetPxVoWifiCount(); v > 0; --v) {
             take(voWifis.qvomacp_GetPxVoWifiData(v));
         }
         parser.qvomacp_parser_del();
         return answers;
     }
 
-    /** Asks all of it once: how many counts were asked for, and into the list what else was answered. */
-    int recorded(byte[] message, List<Object> answers) {
-        record = answers;
-        counts = 0;
-        all(message);
-        record = null;
-        return counts;
-    }
-
-    private int count(int number) {
-        ++counts;
-        return number;
-    }
-
     private void take(Object answer) {
         answers += answer == null ? 0 : 1;
-        if (record != null) {
-            record.add(answer);
-        }
     }
 
     private void header() {
@@ -89,29 +69,29 @@ final class Queries {
 
     private void proxy(int p) {
         take(proxies.qvomacp_GetProxyData(p));
-        for (int d = count(proxies.qvomacp_GetPxDomainCount(p)); d > 0; --d) {
+        for (int d = proxies.qvomacp_GetPxDomainCount(p); d > 0; --d) {
             take(proxies.qvomacp_GetPxDomainData(p, d));
         }
-        for (int a = count(proxies.qvomacp_GetPxAuthInfoCount(p)); a > 0; --a) {
+        for (int a = proxies.qvomacp_GetPxAuthInfoCount(p); a > 0; --a) {
             take(proxies.qvomacp_GetPxAuthInfoData(p, a));
         }
-        for (int t = count(proxies.qvomacp_GetPxPortCount(p)); t > 0; --t) {
+        for (int t = proxies.qvomacp_GetPxPortCount(p); t > 0; --t) {
             take(proxies.qvomacp_GetPxPortData(p, t));
-            for (int s = count(proxies.qvomacp_GetPxPortServiceCount(p, t)); s > 0; --s) {
+            for (int s = proxies.qvomacp_GetPxPortServiceCount(p, t); s > 0; --s) {
                 take(proxies.qvomacp_GetPxPortServiceData(p, t, s));
             }
         }
-        for (int h = count(proxies.qvomacp_GetPxPhysicalCount(p)); h > 0; --h) {
+        for (int h = proxies.qvomacp_GetPxPhysicalCount(p); h > 0; --h) {
             take(proxies.qvomacp_GetPxPhysicalData(p, h));
-            for (int d = count(proxies.qvomacp_GetPxPhysicalDomainCount(p, h)); d > 0; --d) {
+            for (int d = proxies.qvomacp_GetPxPhysicalDomainCount(p, h); d > 0; --d) {
                 take(proxies.qvomacp_GetPxPhsicalDomainData(p, h, d));
             }
-            for (int n = count(proxies.qvomacp_GetPxPhsicalNapIdCount(p, h)); n > 0; --n) {
+            for (int n = proxies.qvomacp_GetPxPhsicalNapIdCount(p, h); n > 0; --n) {
                 take(proxies.qvomacp_GetPxPhysicalNapIdData(p, h, n));
             }
-            for (int t = count(proxies.qvomacp_GetPxPhysicalPortCount(p, h)); t > 0; --t) {
+            for (int t = proxies.qvomacp_GetPxPhysicalPortCount(p, h); t > 0; --t) {
                 take(proxies.qvomacp_GetPxPhysicalPortData(p, h, t));
-                for (int s = count(proxies.qvomacp_GetPxPhysicalPortServiceCount(p, h, t)); s > 0;
+                for (int s = proxies.qvomacp_GetPxPhysicalPortServiceCount(p, h, t); s > 0;
                         --s) {
                     take(proxies.qvomacp_GetPxPhysicalPortServiceData(p, h, t, s));
                 }
@@ -121,78 +101,78 @@ final class Queries {
 
     private void napDef(int n) {
         take(napDefs.qvomacp_GetPxNapDefData(n));
-        for (int b = count(napDefs.qvomacp_GetPxBearerCount(n)); b > 0; --b) {
+        for (int b = napDefs.qvomacp_GetPxBearerCount(n); b > 0; --b) {
             take(napDefs.qvomacp_GetPxBearerData(n, b));
         }
-        for (int d = count(napDefs.qvomacp_GetPxDnsAddrCount(n)); d > 0; --d) {
+        for (int d = napDefs.qvomacp_GetPxDnsAddrCount(n); d > 0; --d) {
             take(napDefs.qvomacp_GetPxDnsAddrData(n, d));
         }
-        for (int a = count(napDefs.qvomacp_GetPxNapAuthInfoCount(n)); a > 0; --a) {
+        for (int a = napDefs.qvomacp_GetPxNapAuthInfoCount(n); a > 0; --a) {
             take(napDefs.qvomacp_GetPxNapAuthInfoData(n, a));
-            for (int e = count(napDefs.qvomacp_GetPxNapAuthEntityCount(n, a)); e > 0; --e) {
+            for (int e = napDefs.qvomacp_GetPxNapAuthEntityCount(n, a); e > 0; --e) {
                 take(napDefs.qvomacp_GetPxAuthInfopAuthEntityData(n, a, e));
             }
         }
-        for (int v = count(napDefs.qvomacp_GetPxNapValidityCount(n)); v > 0; --v) {
+        for (int v = napDefs.qvomacp_GetPxNapValidityCount(n); v > 0; --v) {
             take(napDefs.qvomacp_GetPxValidityData(n, v));
         }
     }
 
     private void bootstrap(int b) {
         take(bootstraps.qvomacp_GetBootstrapData(b));
-        for (int p = count(bootstraps.qvomacp_GetPxProxyIdCount(b)); p > 0; --p) {
+        for (int p = bootstraps.qvomacp_GetPxProxyIdCount(b); p > 0; --p) {
             take(bootstraps.qvomacp_GetPxProxyIdData(b, p));
         }
-        for (int n = count(bootstraps.qvomacp_GetPxNetworkCount(b)); n > 0; --n) {
+        for (int n = bootstraps.qvomacp_GetPxNetworkCount(b); n > 0; --n) {
             take(bootstraps.qvomacp_GetPxNetworkData(b, n));
         }
     }
 
     private void application(int a) {
         take(applications.qvomacp_GetApplicationData(a));
-        for (int p = count(applications.qvomacp_GetPxToProxyCount(a)); p > 0; --p) {
+        for (int p = applications.qvomacp_GetPxToProxyCount(a); p > 0; --p) {
             take(applications.qvomacp_GetPxToProxyData(a, p));
         }
-        for (int n = count(applications.qvomacp_GetPxNapIdCount(a)); n > 0; --n) {
+        for (int n = applications.qvomacp_GetPxNapIdCount(a); n > 0; --n) {
             take(applications.qvomacp_GetPxNapIdData(a, n));
         }
-        for (int d = count(applications.qvomacp_GetPxToAddrCount(a)); d > 0; --d) {
+        for (int d = applications.qvomacp_GetPxToAddrCount(a); d > 0; --d) {
             take(applications.qvomacp_GetPxToAddrData(a, d));
         }
-        for (int d = count(applications.qvomacp_GetPxAppAddrCount(a)); d > 0; --d) {
+        for (int d = applications.qvomacp_GetPxAppAddrCount(a); d > 0; --d) {
             take(applications.qvomacp_GetPxAppAddrData(a, d));
-            for (int t = count(applications.qvomacp_GetPxAppPortCount(a, d)); t > 0; --t) {
+            for (int t = applications.qvomacp_GetPxAppPortCount(a, d); t > 0; --t) {
                 take(applications.qvomacp_GetPxAppPortData(a, d, t));
-                for (int s = count(applications.qvomacp_GetPxServiceCount(a, d, t)); s > 0; --s) {
+                for (int s = applications.qvomacp_GetPxServiceCount(a, d, t); s > 0; --s) {
                     take(applications.qvomacp_GetPxServiceData(a, d, t, s));
                 }
             }
         }
-        for (int u = count(applications.qvomacp_GetPxAppAuthCount(a)); u > 0; --u) {
+        for (int u = applications.qvomacp_GetPxAppAuthCount(a); u > 0; --u) {
             take(applications.qvomacp_GetPxAppAuthData(a, u));
         }
-        for (int r = count(applications.qvomacp_GetPxResourceCount(a)); r > 0; --r) {
+        for (int r = applications.qvomacp_GetPxResourceCount(a); r > 0; --r) {
             take(applications.qvomacp_GetPxResourceData(a, r));
         }
     }
 
     private void access(int a) {
-        for (int r = count(accesses.qvomacp_GetPxRuleCount(a)); r > 0; --r) {
+        for (int r = accesses.qvomacp_GetPxRuleCount(a); r > 0; --r) {
             take(accesses.qvomacp_GetPxRuleData(a, r));
         }
-        for (int i = count(accesses.qvomacp_GetPxAppIdCount(a)); i > 0; --i) {
+        for (int i = accesses.qvomacp_GetPxAppIdCount(a); i > 0; --i) {
             take(accesses.qvomacp_GetPxAppIdData(a, i));
         }
-        for (int t = count(accesses.qvomacp_GetPxPortNbrCount(a)); t > 0; --t) {
+        for (int t = accesses.qvomacp_GetPxPortNbrCount(a); t > 0; --t) {
             take(accesses.qvomacp_GetPxPortNbrData(a, t));
         }
-        for (int d = count(accesses.qvomacp_GetPxAccessDomainCount(a)); d > 0; --d) {
+        for (int d = accesses.qvomacp_GetPxAccessDomainCount(a); d > 0; --d) {
             take(accesses.qvomacp_GetPxAccessDomainData(a, d));
         }
-        for (int n = count(accesses.qvomacp_GetPxAccessToNapIdCount(a)); n > 0; --n) {
+        for (int n = accesses.qvomacp_GetPxAccessToNapIdCount(a); n > 0; --n) {
             take(accesses.qvomacp_GetPxAccessToNapIdData(a, n));
         }
-        for (int p = count(accesses.qvomacp_GetPxAccessToProxyCount(a)); p > 0; --p) {
+        for (int p = accesses.qvomacp_GetPxAccessToProxyCount(a); p > 0; --p) {
             take(accesses.qvomacp_GetPxAccessToProxyData(a, p));
         }
     }

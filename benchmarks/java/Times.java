@@ -5,9 +5,7 @@ import java.lang.management.ThreadMXBean;
 import java.nio.file.Files;
 import java.nio.file.Path;
 import java.nio.file.Paths;
-import java.util.ArrayList;
 import java.util.Arrays;
-import java.util.List;
 import java.util.Locale;
 
 /**
@@ -35,7 +33,6 @@ public final class Times {
     private final double seconds;
     private final XCPCtxParser parser = new XCPCtxParser();
     private final XCPCtxNapDef napDefs = new XCPCtxNapDef();
-    private final Queries queries = new Queries();
     private final Bare bare = new Bare();
 
     private Times(Path folder, double seconds) {
@@ -48,7 +45,6 @@ public final class Times {
         System.loadLibrary("bare");
         double seconds = arguments.length > 1 ? Double.parseDouble(arguments[1]) : 4;
         Times times = new Times(Paths.get(arguments[0]), seconds);
-        times.messages();
         times.answers();
         times.loops();
         System.out.println(misses + " figures miss their limits");
@@ -105,83 +101,6 @@ public final class Times {
 
     private byte[] read(String name) throws Exception {
         return Files.readAllBytes(folder.resolve(name));
-    }
-
-    private void messages() throws Exception {
-        System.out.println("Parse, every query of the message and delete, against kXML's pull");
-        row("%10s %12s %12s %12s %12s %12s", "document", "all us", "least us", "parse us",
-                "pull us", "> 1 ");
-        for (String name : "160 300 547 2k 8k 29k 200k 1m".split(" ")) {
-            byte[] message = read(name + ".push");
-            byte[] body = read(name + ".wbxml");
-            Replay replay = new Replay(message);
-            double[] times =
-                    compare(() -> queries.all(message), () -> parse(message) + replay.run(),
-                            () -> parse(message), () -> Pull.all(body));
-            double ratio = times[3] / times[0];
-            row("%10s %12.2f %12.2f %12.2f %12.2f %12s", name, times[0] / 1000, times[1] / 1000,
-                    times[2] / 1000, times[3] / 1000, ratio(ratio, ratio > 1));
-        }
-        System.out.println();
-    }
-
-    /** All answers of a message, by natives that only call the virtual machine for them. */
-    private final class Replay implements Work {
-        private static final int NOTHING = 0;
-        private static final int TEXT = 1;
-        private static final int ARRAY = 2;
-        private static final int BYTES = 3;
-
-        private final int counts;
-        private final byte[] kinds;
-
-        Replay(byte[] message) {
-            List<Object> answers = new ArrayList<>();
-            counts = queries.recorded(message, answers);
-            bare.hold(0, answers.toArray());
-            kinds = new byte[answers.size()];
-            for (int i = 0; i < kinds.length; ++i) {
-                kinds[i] = (byte) kind(answers.get(i));
-            }
-        }
-
-        private int kind(Object answer) {
-            if (answer == null) {
-                return NOTHING;
-            }
-            return answer instanceof String ? TEXT : answer instanceof byte[] ? BYTES : ARRAY;
-        }
-
-        @Override
-        public int run() {
-            int answered = 0;
-            for (int i = 0; i < counts; ++i) {
-                answered += bare.number();
-            }
-            for (int i = 0; i < kinds.length; ++i) {
-                answered += answer(i) == null ? 0 : 1;
-            }
-            return answered;
-        }
-
-        private Object answer(int place) {
-            switch (kinds[place]) {
-                case TEXT:
-                    return bare.text(place);
-                case ARRAY:
-                    return bare.array(place);
-                case BYTES:
-                    return bare.bytes(place);
-                default:
-                    return bare.nothing();
-            }
-        }
-    }
-
-    private int parse(byte[] message) {
-        boolean parsed = parser.qvomacp_parser(message, message.length, 0);
-        parser.qvomacp_parser_del();
-        return parsed ? 1 : 0;
     }
 
     /** Single answers, against natives that do nothing but call the virtual machine for them. */

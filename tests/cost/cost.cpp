@@ -8,8 +8,8 @@
 #include "families.h"
 
 #include "qvsClientProvWbxmlDecoder.h"
+#include "support/fakevm.h"
 #include "support/heap.h"
-#include "support/quietvm.h"
 
 #include <sys/resource.h>
 #include <sys/wait.h>
@@ -54,16 +54,16 @@ struct Outcome {
 
 // A parse, every query (of the first of everything, and with either index behind the end), the
 // choice of an access point, and the delete.
-extern "C" __attribute__((noinline)) void session(quietvm::Vm *vm, const quietvm::Message *message,
+extern "C" __attribute__((noinline)) void session(fakevm::Vm *vm, const cost::Bytes *message,
                                                   Outcome *outcome)
 {
-    outcome->parsed = vm->parse(*message);
+    outcome->parsed = vm->parse(*message).number != 0;
     outcome->blocks = blocks::live();
     vm->query(1, 1);
     vm->query(1, INT_MAX);
     vm->query(INT_MAX, 1);
-    vm->choose(1);
-    vm->remove();
+    vm->call("qvomacp_SetPxNapDefIndex", {1});
+    vm->call("qvomacp_parser_del");
 }
 
 namespace {
@@ -88,13 +88,15 @@ bool isAsExpected(const cost::Family &family, size_t size, const cost::Bytes &me
 
 bool measure(const cost::Family &family, size_t size)
 {
-    quietvm::Vm vm;
+    fakevm::Vm vm({.quiet = true});
+    if (vm.load().number != JNI_VERSION_1_4) {
+        return false;
+    }
     const cost::Bytes bytes = cost::messageOf(family, size);
-    const quietvm::Message message{bytes.data(), bytes.size()};
     Outcome outcome{};
     blocks::counting = countHeap;
     const Clock::time_point start = Clock::now();
-    session(&vm, &message, &outcome);
+    session(&vm, &bytes, &outcome);
     const long time = static_cast<long>(
         std::chrono::duration_cast<std::chrono::microseconds>(Clock::now() - start).count());
     printf("%d %s %zu %zu %zu %zu %ld\n", static_cast<int>(getpid()), family.name.c_str(), size,

@@ -75,7 +75,7 @@ size_t moveStart(fakevm::Vm *vm, jint n, std::string *log)
 std::string session(fakevm::Vm *vm, const Message &message, jlong length, jint n)
 {
     const Expected &expected = message.expected;
-    const bool accepted = vm->parse(message.array, length, 0).number != 0;
+    const bool accepted = vm->parse(&message.array, length, 0).number != 0;
     check(accepted == expected.body.context, "the message is accepted as the format says",
           accepted ? "accepted" : "refused");
     std::string log = askHeader(vm, accepted ? expected.header : HeaderReading{}, message.bytes);
@@ -116,7 +116,8 @@ void tooLong(fakevm::Vm *vm, const fakevm::Bytes &message)
     for (const jlong more :
          {jlong{1}, jlong{INT32_MAX}, jlong{-1} - static_cast<jlong>(message.size())}) {
         const jlong length = static_cast<jlong>(message.size()) + more;
-        check(vm->parse(message, length, 0).number == 0, "no more is parsed than there is", length);
+        check(vm->parse(&message, length, 0).number == 0, "no more is parsed than there is",
+              length);
     }
     check(blocks::live() == 0, "nor is a block left", blocks::live());
 }

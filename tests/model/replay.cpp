@@ -11,55 +11,84 @@
 // mode, u8 keep (no delete afterwards), u8 number of selections, an i32 for each, the array.
 //
 // The registered methods are written first, one a line, closed by an empty line. Then each message
-// gives one line: CRC-32 of its answers, their size, the decoder's result code, the blocks that
-// were left and what was wrong with the calls. With --full its answers are written first, one a
-// line with its name.
-#include "counting.h"
-#include "fake_vm.h"
+// gives one line: CRC-32 of its answers, their size, the decoder's result code and the blocks that
+// were left. With --full its answers are written first, one a line with its name. A call of the
+// virtual machine that breaks its rules ends the program.
+#include "fence.h"
+#include "support/fakevm.h"
+#include "support/heap.h"
 #include "walks.h"
 
 #include <dlfcn.h>
-#include <jni.h>
 #include <signal.h>
 #include <stdint.h>
 #include <stdio.h>
 #include <unistd.h>
 
 #include <array>
+#include <span>
 #include <string>
 #include <vector>
 
 namespace {
+
+using fakevm::Answer;
+using fakevm::Native;
+
+// Under the address sanitizer, which brings an allocator of its own, no block is counted.
+#ifdef __SANITIZE_ADDRESS__
+constexpr bool kBlocksAreCounted = false;
+#else
+constexpr bool kBlocksAreCounted = true;
+#endif
+
+[[noreturn]] void die(const std::string &why)
+{
+    fflush(stdout);
+    fprintf(stderr, "replay: %s\n", why.c_str());
+    _exit(2);
+}
+
+Fence fence;
+fakevm::Vm vm({.inNative = &blocks::counting, .lender = &fence});
 
 // --- Answers -------------------------------------------------------------------------------------
 
 std::string answers;
 bool full = false;
 
-void writeText(const Object *object)
+template <class Bytes>
+void writeBytes(char mark, const Bytes &bytes)
 {
-    if (!object) {
-        answers += "~;";
-        return;
-    }
-    answers += (object->kind == Kind::kBytes ? '#' : '"');
-    answers += std::to_string(object->text.size());
+    answers += mark;
+    answers += std::to_string(bytes.size());
     answers += ':';
-    answers += object->text;
+    answers.append(bytes.begin(), bytes.end());
     answers += ';';
 }
 
-void writeObject(const Object *object)
+void writeText(const fakevm::Text &text)
 {
-    if (!object || object->kind != Kind::kTexts) {
-        writeText(object);
-        return;
+    if (text) {
+        writeBytes('"', *text);
+    } else {
+        answers += "~;";
     }
-    answers += '[';
-    for (const Object *element : object->elements) {
-        writeText(element);
+}
+
+void writeObject(const Answer &answer)
+{
+    if (answer.bytes) {
+        writeBytes('#', *answer.bytes);
+    } else if (answer.array) {
+        answers += '[';
+        for (const fakevm::Text &element : *answer.array) {
+            writeText(element);
+        }
+        answers += "];";
+    } else {
+        writeText(answer.text);
     }
-    answers += "];";
 }
 
 void writeNumber(jint value)
@@ -86,68 +115,42 @@ void printAnswer(size_t from, const std::string &label)
 
 // A query and the counts that say how far each of its indexes runs.
 struct Query {
-    const Method *method;
-    char result; // last letter group of its signature: I, L or [
+    const Native *native;
     std::vector<const Query *> counts;
 };
 
 const std::string kPrefix = "qvomacp_";
 
-template <class Result>
-Result call(const Method &method, const jint *i, size_t arguments)
+std::string labelOf(const Native &native, std::span<const jint> indexes, const char *note)
 {
-    const Counting counted;
-    void *f = method.function;
-    JNIEnv *e = &env;
-    const jobject self = nullptr;
-    switch (arguments) {
-    case 0:
-        return reinterpret_cast<Result(JNICALL *)(JNIEnv *, jobject)>(f)(e, self);
-    case 1:
-        return reinterpret_cast<Result(JNICALL *)(JNIEnv *, jobject, jint)>(f)(e, self, i[0]);
-    case 2:
-        return reinterpret_cast<Result(JNICALL *)(JNIEnv *, jobject, jint, jint)>(f)(e, self, i[0],
-                                                                                     i[1]);
-    case 3:
-        return reinterpret_cast<Result(JNICALL *)(JNIEnv *, jobject, jint, jint, jint)>(f)(
-            e, self, i[0], i[1], i[2]);
-    default:
-        return reinterpret_cast<Result(JNICALL *)(JNIEnv *, jobject, jint, jint, jint, jint)>(f)(
-            e, self, i[0], i[1], i[2], i[3]);
+    std::string label(native.name);
+    for (const jint &index : indexes) {
+        label += (&index == indexes.data() ? "(" : ", ") + std::to_string(index);
     }
+    return label + (indexes.empty() ? "()" : ")") + note;
 }
 
-std::string labelOf(const Method &method, const jint *indexes, size_t count, const char *note)
-{
-    std::string label = method.name + "(";
-    for (size_t i = 0; i < count; ++i) {
-        label += (i ? ", " : "") + std::to_string(indexes[i]);
-    }
-    return label + ")" + note;
-}
-
-void ask(const Query &query, const jint *indexes, const char *note)
+void ask(const Query &query, std::span<const jint> indexes, const char *note)
 {
     const size_t from = answers.size();
-    const size_t count = query.counts.size();
-    if (query.result == 'I') {
-        writeNumber(call<jint>(*query.method, indexes, count));
+    const Answer answer = vm.call(*query.native, indexes);
+    if (query.native->signature.back() == 'I') {
+        writeNumber(answer.number);
     } else {
-        writeObject(objectOf(call<jobject>(*query.method, indexes, count)));
+        writeObject(answer);
     }
-    heap.used = 0;
     if (full) {
-        printAnswer(from, labelOf(*query.method, indexes, count, note));
+        printAnswer(from, labelOf(*query.native, indexes, note));
     }
 }
 
 void askEach(const Query &query, jint *indexes, size_t level, const char *note)
 {
     if (level == query.counts.size()) {
-        ask(query, indexes, note);
+        ask(query, {indexes, level}, note);
         return;
     }
-    const jint count = call<jint>(*query.counts[level]->method, indexes, level);
+    const jint count = vm.call(*query.counts[level]->native, {indexes, level}).number;
     for (jint i = -1; i <= count + 1; ++i) {
         indexes[level] = i;
         askEach(query, indexes, level + 1, note);
@@ -155,55 +158,31 @@ void askEach(const Query &query, jint *indexes, size_t level, const char *note)
 }
 
 struct Natives {
-    const Method *parse = nullptr;
-    const Method *remove = nullptr;
-    const Method *select = nullptr;
     std::vector<Query> header;
     std::vector<Query> queries;
-    std::vector<const Query *> accessPoints;
 
     const Query *find(const std::string &name) const
     {
         for (const Query &query : queries) {
-            if (query.method->name == kPrefix + name) {
+            if (query.native->name == kPrefix + name) {
                 return &query;
             }
         }
         die("no native " + name);
     }
 
-    void collect()
+    Natives()
     {
-        for (size_t i = 0; i < methods.size(); ++i) {
-            const Method &method = methods[i];
-            const bool session = methods[i].owner == "com/qvomacp/eng/parser/XCPCtxParser";
-            if (method.name == "qvomacp_parser") {
-                parse = &method;
-            } else if (method.name == "qvomacp_parser_del") {
-                remove = &method;
-            } else if (method.name == "qvomacp_SetPxNapDefIndex") {
-                select = &method;
-            } else {
-                const char result = method.signature[method.signature.find(')') + 1];
-                (session ? header : queries).push_back({&method, result, {}});
+        for (const Native &native : vm.natives()) {
+            if (native.isQuery()) {
+                const bool session = native.javaClass == "com/qvomacp/eng/parser/XCPCtxParser";
+                (session ? header : queries).push_back({&native, {}});
             }
-        }
-        if (!parse || !remove || !select) {
-            die("the session's methods were not registered");
         }
         for (const Walk &walk : kWalks) {
             auto *query = const_cast<Query *>(find(walk.name));
             for (const char *count : walk.counts) {
                 query->counts.push_back(find(count));
-            }
-        }
-        size_t place = 0;
-        for (size_t i = 0; i < methods.size(); ++i) {
-            if (place < queries.size() && queries[place].method == &methods[i]) {
-                if (methods[i].owner == "com/qvomacp/eng/parser/XCPCtxNapDef") {
-                    accessPoints.push_back(&queries[place]);
-                }
-                ++place;
             }
         }
     }
@@ -212,7 +191,7 @@ struct Natives {
     {
         jint indexes[4] = {};
         for (const Query &query : header) {
-            ask(query, indexes, note);
+            ask(query, {}, note);
         }
         for (const Query &query : queries) {
             askEach(query, indexes, 0, note);
@@ -222,8 +201,10 @@ struct Natives {
     void askAccessPoints(const char *note) const
     {
         jint indexes[4] = {};
-        for (const Query *query : accessPoints) {
-            askEach(*query, indexes, 0, note);
+        for (const Query &query : queries) {
+            if (query.native->javaClass == "com/qvomacp/eng/parser/XCPCtxNapDef") {
+                askEach(query, indexes, 0, note);
+            }
         }
     }
 };
@@ -266,12 +247,11 @@ struct Decoder {
     // The result code that the body is decoded with, "-" for a message whose header is rejected.
     std::string code(uint32_t length) const
     {
-        if (length > fence.used) {
+        if (length > fence.size()) {
             return "-";
         }
-        fence.open();
-        PushHeader *header = parseHeader(fence.bytes, length);
-        fence.close();
+        PushHeader *header = parseHeader(fence.lend(), length);
+        fence.takeBack();
         if (!header) {
             return "-";
         }
@@ -296,7 +276,7 @@ struct Message {
     int32_t mode = 0;
     bool keep = false;
     std::vector<int32_t> selections;
-    std::string bytes;
+    fakevm::Bytes bytes;
 };
 
 template <class Value>
@@ -345,47 +325,31 @@ uint32_t crc32Of(const std::string &bytes)
     return ~crc;
 }
 
-void parse(const Natives &natives, const Message &message)
-{
-    using Parse = jboolean(JNICALL *)(JNIEnv *, jobject, jbyteArray, jlong, jint);
-    jboolean parsed = JNI_FALSE;
-    {
-        const Counting counted;
-        parsed = reinterpret_cast<Parse>(natives.parse->function)(
-            &env, nullptr, handleOf<jbyteArray>(&messageArray), message.length, message.mode);
-    }
-    if (fence.handedOut != 0) {
-        fault("the message was not handed back");
-    }
-    writeNumber(parsed);
-    if (full) {
-        printAnswer(0, natives.parse->name);
-    }
-}
-
 void replay(const Natives &natives, const Decoder &decoder, const Message &message)
 {
     answers.clear();
-    faults.clear();
     const size_t liveBefore = blocks::live();
-    fence.place(message.bytes);
-    parse(natives, message);
+    if (!fence.place(message.bytes)) {
+        die("no memory for a message");
+    }
+    writeNumber(vm.parse(&message.bytes, message.length, message.mode).number);
+    if (full) {
+        printAnswer(0, "qvomacp_parser");
+    }
     natives.askEverything("");
-    for (const int32_t index : message.selections) {
-        const jint argument = index;
-        call<void>(*natives.select, &argument, 1);
+    for (const jint index : message.selections) {
+        vm.call("qvomacp_SetPxNapDefIndex", {index});
         const std::string note = " after index " + std::to_string(index) + " was set";
         natives.askAccessPoints(note.c_str());
     }
     if (!message.keep) {
-        call<void>(*natives.remove, nullptr, 0);
+        vm.call("qvomacp_parser_del");
         natives.askEverything(" after delete");
     }
     const std::string blocks =
         kBlocksAreCounted ? std::to_string(static_cast<long>(blocks::live() - liveBefore)) : "-";
     const std::string code = decoder.code(static_cast<uint32_t>(message.length));
-    printf("%08x %zu %s %s %s\n", crc32Of(answers), answers.size(), code.c_str(), blocks.c_str(),
-           faults.c_str());
+    printf("%08x %zu %s %s\n", crc32Of(answers), answers.size(), code.c_str(), blocks.c_str());
 }
 
 // --- A message that does not end -----------------------------------------------------------------
@@ -424,19 +388,16 @@ int main(int argc, char **argv)
     }
     const auto load =
         reinterpret_cast<jint(JNICALL *)(JavaVM *, void *)>(dlsym(library, "JNI_OnLoad"));
-    if (!load || load(&machine, nullptr) != JNI_VERSION_1_4) {
+    if (!load || vm.load(load).number != JNI_VERSION_1_4) {
         die("the library cannot be loaded");
     }
-    for (size_t i = 0; i < methods.size(); ++i) {
-        printf("%s %s %s\n", methods[i].owner.c_str(), methods[i].name.c_str(),
-               methods[i].signature.c_str());
+    for (const Native &native : vm.natives()) {
+        printf("%s %s %s\n", native.javaClass.c_str(), native.name.data(), native.signature.data());
     }
     putchar('\n');
     fflush(stdout);
-    Natives natives;
-    natives.collect();
+    const Natives natives;
     const Decoder decoder(library);
-    messageArray.kind = Kind::kBytes;
     signal(SIGALRM, checkProgress);
     alarm(60);
     Message message;

@@ -8,7 +8,7 @@
 #include <cstdlib>
 #include <cstring>
 #include <map>
-#include <set>
+#include <span>
 #include <utility>
 
 // Lets a function stand for entries of all types, to say which one was called.
@@ -46,6 +46,29 @@ struct Reference {
     abort();
 }
 
+jbyte *elementsOf(const uint8_t *bytes)
+{
+    return reinterpret_cast<jbyte *>(const_cast<uint8_t *>(bytes));
+}
+
+// Sets a flag, if there is one, for as long as it lives.
+class Flag {
+public:
+    Flag(bool *flag, bool value) : flag_(flag), before_(flag && std::exchange(*flag, value)) {}
+    Flag(const Flag &) = delete;
+    Flag &operator=(const Flag &) = delete;
+    ~Flag()
+    {
+        if (flag_) {
+            *flag_ = before_;
+        }
+    }
+
+private:
+    bool *flag_;
+    bool before_;
+};
+
 } // namespace
 
 struct Vm::State {
@@ -55,49 +78,165 @@ struct Vm::State {
     struct JavaVm : JavaVM_ {
         State *state;
     };
-    // The array elements that a native has in its hands.
-    struct Pinned {
-        ObjectPtr array;
-        std::unique_ptr<jbyte[]> copy;
-    };
 
-    explicit State(Vm *vm) : owner(vm)
+    State(Vm *vm, const Options &chosen) : owner(vm), options(chosen)
     {
+        fill(&table, std::make_index_sequence<sizeof table / sizeof(void *)>());
         env.functions = &table;
         env.state = this;
+        invokeTable.GetEnv = GetEnv;
         javaVm.functions = &invokeTable;
         javaVm.state = this;
-        fillTables();
     }
+    State(const State &) = delete;
+    State &operator=(const State &) = delete;
+    virtual ~State() = default;
 
     Vm *owner;
+    const Options options;
     JNINativeInterface_ table;
-    JNIInvokeInterface_ invokeTable;
+    JNIInvokeInterface_ invokeTable{};
     Env env;
     JavaVm javaVm;
 
     std::vector<Native> natives;
-    std::vector<std::string> calls;
+    std::vector<const char *> calls;
     long failIn = -1;
     bool failed = false;
 
+    // ---- What a native is called with, and what becomes of its answer
+
+    virtual jobject begin() = 0;
+    virtual jbyteArray argument(const Bytes &message) = 0;
+    virtual Answer end(jint number, jobject result) = 0;
+
+    // ---- Entries
+
+    template <auto Entry>
+    struct Entered;
+    template <class Rules, class Result, class... Arguments, Result (Rules::*Entry)(Arguments...)>
+    struct Entered<Entry> {
+        static Result JNICALL call(JNIEnv *env, Arguments... arguments)
+        {
+            State &state = *static_cast<Env *>(env)->state;
+            const Flag machine(state.options.inNative, false);
+            return (static_cast<Rules &>(state).*Entry)(arguments...);
+        }
+    };
+
+    // The entries that the library has business with.
+    template <class Rules>
+    void provide()
+    {
+        table.FindClass = Entered<&Rules::FindClass>::call;
+        table.RegisterNatives = Entered<&Rules::RegisterNatives>::call;
+        table.ExceptionCheck = Entered<&Rules::ExceptionCheck>::call;
+        table.DeleteLocalRef = Entered<&Rules::DeleteLocalRef>::call;
+        table.NewStringUTF = Entered<&Rules::NewStringUTF>::call;
+        table.NewObjectArray = Entered<&Rules::NewObjectArray>::call;
+        table.SetObjectArrayElement = Entered<&Rules::SetObjectArrayElement>::call;
+        table.NewByteArray = Entered<&Rules::NewByteArray>::call;
+        table.SetByteArrayRegion = Entered<&Rules::SetByteArrayRegion>::call;
+        table.GetArrayLength = Entered<&Rules::GetArrayLength>::call;
+        table.GetByteArrayElements = Entered<&Rules::GetByteArrayElements>::call;
+        table.ReleaseByteArrayElements = Entered<&Rules::ReleaseByteArrayElements>::call;
+    }
+
+    virtual void enter(const char *entry) = 0;
+
+    static jint JNICALL GetEnv(JavaVM *vm, void **env, jint version)
+    {
+        State &state = *static_cast<JavaVm *>(vm)->state;
+        const Flag machine(state.options.inNative, false);
+        state.enter("GetEnv");
+        if (version != JNI_VERSION_1_4) {
+            die("GetEnv of another version than 1.4");
+        }
+        *env = state.owner->hasEnvironment ? static_cast<JNIEnv *>(&state.env) : nullptr;
+        return state.owner->environmentResult;
+    }
+
+    void keep(const std::string &javaClass, const JNINativeMethod *methods, size_t count)
+    {
+        std::for_each_n(methods, count, [&](const JNINativeMethod &method) {
+            natives.push_back({javaClass, method.name, method.signature, method.fnPtr});
+        });
+    }
+
+    virtual const std::vector<Native> &registered() { return natives; }
+
+    template <size_t Slot>
+    CALLED_UNDER_ANY_TYPE static void unexpected()
+    {
+        constexpr size_t kNamed = sizeof kEntryNames / sizeof *kEntryNames;
+        die(Slot < kNamed ? std::string("the library calls ") + kEntryNames[Slot]
+                          : "the library calls entry " + std::to_string(Slot));
+    }
+
+    template <class Table, size_t... Slots>
+    static void fill(Table *table, std::index_sequence<Slots...>)
+    {
+        void (*const entries[])() = {unexpected<Slots>...};
+        static_assert(sizeof entries == sizeof *table);
+        memcpy(table, entries, sizeof entries);
+    }
+
+    // ---- Natives
+
+    template <class Result, class... Argument>
+    Result invoke(void *function, Argument... arguments)
+    {
+        const Flag native(options.inNative, true);
+        return reinterpret_cast<Result (*)(Argument...)>(function)(arguments...);
+    }
+
+    template <class Result>
+    Result apply(void *function, jobject self, std::span<const jint> i)
+    {
+        JNIEnv *e = &env;
+        switch (i.size()) {
+        case 0:
+            return invoke<Result>(function, e, self);
+        case 1:
+            return invoke<Result>(function, e, self, i[0]);
+        case 2:
+            return invoke<Result>(function, e, self, i[0], i[1]);
+        case 3:
+            return invoke<Result>(function, e, self, i[0], i[1], i[2]);
+        case 4:
+            return invoke<Result>(function, e, self, i[0], i[1], i[2], i[3]);
+        default:
+            die("a native with more than four indexes");
+        }
+    }
+};
+
+// Holds the library to the rules.
+struct Vm::Strict : Vm::State {
+    // The array elements that a native has in its hands.
+    struct Pinned {
+        ObjectPtr array;
+        std::unique_ptr<jbyte[]> copy; // unless they are lent
+    };
+
+    Strict(Vm *vm, const Options &chosen) : State(vm, chosen) { provide<Strict>(); }
+
     // ---- The native that is running
 
+    ObjectPtr message;          // that it was given
     bool pending = false;       // an exception
     std::string uncheckedEntry; // its exception check is due
     std::vector<std::unique_ptr<Reference>> references;
-    std::set<Reference *> live;      // local references made by the native
-    std::set<Reference *> arguments; // and those that it was given
-    std::map<jbyte *, Pinned> pinned;
-
-    static State &of(JNIEnv *env) { return *static_cast<Env *>(env)->state; }
+    std::vector<Reference *> live;      // local references made by the native
+    std::vector<Reference *> arguments; // and those that it was given
+    std::map<const jbyte *, Pinned> pinned;
 
     // ---- References
 
-    jobject refer(ObjectPtr object, std::set<Reference *> *owners)
+    jobject refer(ObjectPtr object, std::vector<Reference *> *owners)
     {
         references.push_back(std::make_unique<Reference>(Reference{std::move(object)}));
-        owners->insert(references.back().get());
+        owners->push_back(references.back().get());
         return reinterpret_cast<jobject>(references.back().get());
     }
 
@@ -113,7 +252,8 @@ struct Vm::State {
     ObjectPtr object(jobject reference)
     {
         Reference *known = reinterpret_cast<Reference *>(reference);
-        if (!live.count(known) && !arguments.count(known)) {
+        if (!std::count(live.begin(), live.end(), known) &&
+            !std::count(arguments.begin(), arguments.end(), known)) {
             die("a reference that is null, deleted or of another call");
         }
         return known->object;
@@ -132,7 +272,7 @@ struct Vm::State {
 
     void enterAnyway(const char *entry) { calls.emplace_back(entry); }
 
-    void enter(const char *entry)
+    void enter(const char *entry) override
     {
         enterAnyway(entry);
         if (pending) {
@@ -156,94 +296,81 @@ struct Vm::State {
 
     // ---- Entries
 
-    static jclass JNICALL FindClass(JNIEnv *env, const char *name)
+    jclass FindClass(const char *name)
     {
-        State &state = of(env);
-        if (!state.enterFallible("FindClass")) {
+        if (!enterFallible("FindClass")) {
             return nullptr;
         }
-        if (name == state.owner->lackedClass) {
-            state.pending = true;
+        if (name == owner->lackedClass) {
+            pending = true;
             return nullptr;
         }
-        return state.local<jclass>({.kind = Object::kClass, .text = name});
+        return local<jclass>({.kind = Object::kClass, .text = name});
     }
 
-    static jint JNICALL RegisterNatives(JNIEnv *env, jclass javaClass,
-                                        const JNINativeMethod *methods, jint count)
+    jint RegisterNatives(jclass javaClass, const JNINativeMethod *methods, jint count)
     {
-        State &state = of(env);
-        if (!state.enterFallible("RegisterNatives")) {
+        if (!enterFallible("RegisterNatives")) {
             return JNI_ERR;
         }
-        const std::string name = state.object(javaClass, Object::kClass)->text;
-        if (name == state.owner->refusedClass) {
-            state.pending = true;
+        const std::string name = object(javaClass, Object::kClass)->text;
+        if (name == owner->refusedClass) {
+            pending = true;
             return JNI_ERR;
         }
-        for (jint i = 0; i < count; ++i) {
-            state.natives.push_back(
-                {name, methods[i].name, methods[i].signature, methods[i].fnPtr});
-        }
+        keep(name, methods, static_cast<size_t>(count));
         return JNI_OK;
     }
 
-    static jboolean JNICALL ExceptionCheck(JNIEnv *env)
+    jboolean ExceptionCheck()
     {
-        State &state = of(env);
-        state.enterAnyway("ExceptionCheck");
-        state.uncheckedEntry.clear();
-        return state.pending ? JNI_TRUE : JNI_FALSE;
+        enterAnyway("ExceptionCheck");
+        uncheckedEntry.clear();
+        return pending ? JNI_TRUE : JNI_FALSE;
     }
 
-    static void JNICALL DeleteLocalRef(JNIEnv *env, jobject reference)
+    void DeleteLocalRef(jobject reference)
     {
-        State &state = of(env);
-        state.enterAnyway("DeleteLocalRef");
+        enterAnyway("DeleteLocalRef");
         Reference *known = reinterpret_cast<Reference *>(reference);
-        if (!state.live.erase(known)) {
+        if (!std::erase(live, known)) {
             die("DeleteLocalRef of what is no local reference of this native");
         }
         known->object.reset();
     }
 
-    static jstring JNICALL NewStringUTF(JNIEnv *env, const char *text)
+    jstring NewStringUTF(const char *text)
     {
-        State &state = of(env);
-        if (!state.enterFallible("NewStringUTF")) {
+        if (!enterFallible("NewStringUTF")) {
             return nullptr;
         }
         const std::string bytes = text;
         if (memcmp(text + bytes.size(), kZeroBytes, sizeof kZeroBytes) != 0) {
             die("text without four zero bytes behind it: " + bytes);
         }
-        return state.local<jstring>({.kind = Object::kString, .text = bytes});
+        return local<jstring>({.kind = Object::kString, .text = bytes});
     }
 
-    static jobjectArray JNICALL NewObjectArray(JNIEnv *env, jsize length, jclass elementClass,
-                                               jobject initial)
+    jobjectArray NewObjectArray(jsize length, jclass elementClass, jobject initial)
     {
-        State &state = of(env);
-        if (!state.enterFallible("NewObjectArray")) {
+        if (!enterFallible("NewObjectArray")) {
             return nullptr;
         }
-        if (length < 0 || state.object(elementClass, Object::kClass)->text != "java/lang/String") {
+        if (length < 0 || object(elementClass, Object::kClass)->text != "java/lang/String") {
             die("NewObjectArray of a negative length or of another class than String");
         }
-        const ObjectPtr element = initial ? state.object(initial, Object::kString) : nullptr;
-        return state.local<jobjectArray>(
+        const ObjectPtr element = initial ? object(initial, Object::kString) : nullptr;
+        return local<jobjectArray>(
             {.kind = Object::kStringArray,
              .elements = std::vector<ObjectPtr>(static_cast<size_t>(length), element)});
     }
 
-    static void JNICALL SetObjectArrayElement(JNIEnv *env, jobjectArray array, jsize index,
-                                              jobject element)
+    void SetObjectArrayElement(jobjectArray array, jsize index, jobject element)
     {
-        State &state = of(env);
-        const bool succeeds = state.enterFallible("SetObjectArrayElement");
-        state.uncheckedEntry = "SetObjectArrayElement";
-        std::vector<ObjectPtr> &elements = state.object(array, Object::kStringArray)->elements;
-        const ObjectPtr value = element ? state.object(element, Object::kString) : nullptr;
+        const bool succeeds = enterFallible("SetObjectArrayElement");
+        uncheckedEntry = "SetObjectArrayElement";
+        std::vector<ObjectPtr> &elements = object(array, Object::kStringArray)->elements;
+        const ObjectPtr value = element ? object(element, Object::kString) : nullptr;
         if (index < 0 || static_cast<size_t>(index) >= elements.size()) {
             die("SetObjectArrayElement outside the array");
         }
@@ -252,26 +379,23 @@ struct Vm::State {
         }
     }
 
-    static jbyteArray JNICALL NewByteArray(JNIEnv *env, jsize length)
+    jbyteArray NewByteArray(jsize length)
     {
-        State &state = of(env);
-        if (!state.enterFallible("NewByteArray")) {
+        if (!enterFallible("NewByteArray")) {
             return nullptr;
         }
         if (length < 0) {
             die("NewByteArray of a negative length");
         }
-        return state.local<jbyteArray>(
+        return local<jbyteArray>(
             {.kind = Object::kByteArray, .bytes = Bytes(static_cast<size_t>(length))});
     }
 
-    static void JNICALL SetByteArrayRegion(JNIEnv *env, jbyteArray array, jsize start, jsize length,
-                                           const jbyte *bytes)
+    void SetByteArrayRegion(jbyteArray array, jsize start, jsize length, const jbyte *bytes)
     {
-        State &state = of(env);
-        const bool succeeds = state.enterFallible("SetByteArrayRegion");
-        state.uncheckedEntry = "SetByteArrayRegion";
-        Bytes &target = state.object(array, Object::kByteArray)->bytes;
+        const bool succeeds = enterFallible("SetByteArrayRegion");
+        uncheckedEntry = "SetByteArrayRegion";
+        Bytes &target = object(array, Object::kByteArray)->bytes;
         if (start < 0 || length < 0 ||
             static_cast<size_t>(start) + static_cast<size_t>(length) > target.size()) {
             die("SetByteArrayRegion outside the array");
@@ -281,38 +405,40 @@ struct Vm::State {
         }
     }
 
-    static jsize JNICALL GetArrayLength(JNIEnv *env, jarray array)
+    jsize GetArrayLength(jarray array)
     {
-        State &state = of(env);
-        state.enter("GetArrayLength");
-        return static_cast<jsize>(state.object(array, Object::kByteArray)->bytes.size());
+        enter("GetArrayLength");
+        return static_cast<jsize>(object(array, Object::kByteArray)->bytes.size());
     }
 
-    // Hands out a copy, so that a sanitizer sees every byte that is read or written outside it.
-    static jbyte *JNICALL GetByteArrayElements(JNIEnv *env, jbyteArray array, jboolean *isCopy)
+    // Hands out a copy, so that a sanitizer sees every byte that is read or written outside it,
+    // unless the message is lent.
+    jbyte *GetByteArrayElements(jbyteArray array, jboolean *isCopy)
     {
-        State &state = of(env);
-        if (!state.enterFallible("GetByteArrayElements")) {
+        if (!enterFallible("GetByteArrayElements")) {
             return nullptr;
         }
-        const ObjectPtr source = state.object(array, Object::kByteArray);
-        auto copy = std::make_unique<jbyte[]>(source->bytes.size());
-        std::copy(source->bytes.begin(), source->bytes.end(), copy.get());
+        const ObjectPtr source = object(array, Object::kByteArray);
         if (isCopy) {
             *isCopy = JNI_TRUE;
         }
+        if (options.lender && source == message) {
+            jbyte *elements = elementsOf(options.lender->lend());
+            pinned[elements] = {source, nullptr};
+            return elements;
+        }
+        auto copy = std::make_unique<jbyte[]>(source->bytes.size());
+        std::copy(source->bytes.begin(), source->bytes.end(), copy.get());
         jbyte *elements = copy.get();
-        state.pinned[elements] = {source, std::move(copy)};
+        pinned[elements] = {source, std::move(copy)};
         return elements;
     }
 
-    static void JNICALL ReleaseByteArrayElements(JNIEnv *env, jbyteArray array, jbyte *elements,
-                                                 jint mode)
+    void ReleaseByteArrayElements(jbyteArray array, jbyte *elements, jint mode)
     {
-        State &state = of(env);
-        state.enterAnyway("ReleaseByteArrayElements");
-        const auto found = state.pinned.find(elements);
-        if (found == state.pinned.end() || state.object(array) != found->second.array) {
+        enterAnyway("ReleaseByteArrayElements");
+        const auto found = pinned.find(elements);
+        if (found == pinned.end() || object(array) != found->second.array) {
             die("ReleaseByteArrayElements of what was not handed out");
         }
         const Bytes &source = found->second.array->bytes;
@@ -322,72 +448,28 @@ struct Vm::State {
         if (!std::equal(source.begin(), source.end(), reinterpret_cast<uint8_t *>(elements))) {
             die("array elements were written to");
         }
-        state.pinned.erase(found);
-    }
-
-    static jint JNICALL GetEnv(JavaVM *vm, void **env, jint version)
-    {
-        State &state = *static_cast<JavaVm *>(vm)->state;
-        state.enter("GetEnv");
-        if (version != JNI_VERSION_1_4) {
-            die("GetEnv of another version than 1.4");
+        if (!found->second.copy) {
+            options.lender->takeBack();
         }
-        *env = state.owner->hasEnvironment ? static_cast<JNIEnv *>(&state.env) : nullptr;
-        return state.owner->environmentResult;
-    }
-
-    // ---- Tables
-
-    template <size_t Slot>
-    CALLED_UNDER_ANY_TYPE static void unexpected()
-    {
-        constexpr size_t kNamed = sizeof kEntryNames / sizeof *kEntryNames;
-        die(Slot < kNamed ? std::string("the library calls ") + kEntryNames[Slot]
-                          : "the library calls entry " + std::to_string(Slot));
-    }
-
-    template <class Table, size_t... Slots>
-    static void fill(Table *table, std::index_sequence<Slots...>)
-    {
-        void (*const entries[])() = {unexpected<Slots>...};
-        static_assert(sizeof entries == sizeof *table);
-        memcpy(table, entries, sizeof entries);
-    }
-
-    void fillTables()
-    {
-        fill(&table, std::make_index_sequence<sizeof table / sizeof(void *)>());
-        table.FindClass = FindClass;
-        table.RegisterNatives = RegisterNatives;
-        table.ExceptionCheck = ExceptionCheck;
-        table.DeleteLocalRef = DeleteLocalRef;
-        table.NewStringUTF = NewStringUTF;
-        table.NewObjectArray = NewObjectArray;
-        table.SetObjectArrayElement = SetObjectArrayElement;
-        table.NewByteArray = NewByteArray;
-        table.SetByteArrayRegion = SetByteArrayRegion;
-        table.GetArrayLength = GetArrayLength;
-        table.GetByteArrayElements = GetByteArrayElements;
-        table.ReleaseByteArrayElements = ReleaseByteArrayElements;
-        invokeTable = {};
-        invokeTable.GetEnv = GetEnv;
+        pinned.erase(found);
     }
 
     // ---- Natives
 
-    jobject begin()
+    jobject begin() override
     {
         calls.clear();
-        return argument({.kind = Object::kThis});
+        return refer(std::make_shared<Object>(Object{.kind = Object::kThis}), &arguments);
     }
 
-    jobject argument(Object object)
+    jbyteArray argument(const Bytes &bytes) override
     {
-        return refer(std::make_shared<Object>(std::move(object)), &arguments);
+        message = std::make_shared<Object>(Object{.kind = Object::kByteArray, .bytes = bytes});
+        return static_cast<jbyteArray>(refer(message, &arguments));
     }
 
     // Takes what a native returned for an answer, and holds it to the rules of a return.
-    Answer end(jint number, jobject result)
+    Answer end(jint number, jobject result) override
     {
         if (pending && (number > 0 || result)) {
             die("an answer with an exception pending");
@@ -399,7 +481,7 @@ struct Vm::State {
             die("array elements that were not handed back");
         }
         Answer answer = shown(result ? object(result) : nullptr);
-        live.erase(reinterpret_cast<Reference *>(result));
+        std::erase(live, reinterpret_cast<Reference *>(result));
         if (!live.empty()) {
             die("a local reference was left behind");
         }
@@ -427,39 +509,58 @@ struct Vm::State {
         }
         return answer;
     }
+};
 
-    template <class Result, class... Index>
-    Result invoke(void *function, Index... index)
+// Costs next to nothing.
+struct Vm::Quiet : Vm::State {
+    Quiet(Vm *vm, const Options &chosen) : State(vm, chosen) { provide<Quiet>(); }
+
+    std::vector<JNINativeMethod> rows; // that were registered; `natives` when they are asked for
+    const Bytes *message = nullptr;
+    size_t textSeen = 0;
+
+    // Something that is not null.
+    template <class Reference = jobject>
+    static Reference refer()
     {
-        return reinterpret_cast<Result (*)(JNIEnv *, jobject, Index...)>(function)(&env, begin(),
-                                                                                   index...);
+        static _jobjectArray something;
+        return static_cast<Reference>(static_cast<void *>(&something));
     }
 
-    // Calls `function` with the indexes, taken from a list of them.
-    template <class Result, size_t... I>
-    Result apply(void *function, const std::vector<jint> &indexes, std::index_sequence<I...>)
+    jclass FindClass(const char *) { return refer<jclass>(); }
+    jint RegisterNatives(jclass, const JNINativeMethod *methods, jint count)
     {
-        return invoke<Result>(function, indexes[I]...);
+        rows.insert(rows.end(), methods, methods + count);
+        return JNI_OK;
     }
+    jboolean ExceptionCheck() { return JNI_FALSE; }
+    void DeleteLocalRef(jobject) {}
+    jstring NewStringUTF(const char *text)
+    {
+        textSeen += strlen(text);
+        return refer<jstring>();
+    }
+    jobjectArray NewObjectArray(jsize, jclass, jobject) { return refer<jobjectArray>(); }
+    void SetObjectArrayElement(jobjectArray, jsize, jobject) {}
+    jbyteArray NewByteArray(jsize) { return refer<jbyteArray>(); }
+    void SetByteArrayRegion(jbyteArray, jsize, jsize, const jbyte *) {}
+    jsize GetArrayLength(jarray) { return static_cast<jsize>(message->size()); }
+    jbyte *GetByteArrayElements(jbyteArray, jboolean *) { return elementsOf(message->data()); }
+    void ReleaseByteArrayElements(jbyteArray, jbyte *, jint) {}
 
-    template <class Result>
-    Result apply(void *function, const std::vector<jint> &indexes)
+    const std::vector<Native> &registered() override
     {
-        switch (indexes.size()) {
-        case 0:
-            return invoke<Result>(function);
-        case 1:
-            return apply<Result>(function, indexes, std::make_index_sequence<1>());
-        case 2:
-            return apply<Result>(function, indexes, std::make_index_sequence<2>());
-        case 3:
-            return apply<Result>(function, indexes, std::make_index_sequence<3>());
-        case 4:
-            return apply<Result>(function, indexes, std::make_index_sequence<4>());
-        default:
-            die("a native with more than four indexes");
-        }
+        keep({}, rows.data() + natives.size(), rows.size() - natives.size());
+        return natives;
     }
+    void enter(const char *) override {}
+    jobject begin() override { return refer(); }
+    jbyteArray argument(const Bytes &bytes) override
+    {
+        message = &bytes;
+        return refer<jbyteArray>();
+    }
+    Answer end(jint number, jobject result) override { return {.number = result ? 1 : number}; }
 };
 
 void PrintTo(const Answer &answer, std::ostream *out)
@@ -479,81 +580,110 @@ void PrintTo(const Answer &answer, std::ostream *out)
     }
 }
 
-Vm::Vm() : state_(std::make_unique<State>(this)) {}
+bool saysNothing(const Answer &answer)
+{
+    return answer.number <= 0 && !answer.text && !answer.array && !answer.bytes;
+}
+
+Vm::Vm(const Options &options)
+{
+    if (options.quiet) {
+        state_ = std::make_unique<Quiet>(this, options);
+    } else {
+        state_ = std::make_unique<Strict>(this, options);
+    }
+}
 
 Vm::~Vm() = default;
 
-Answer Vm::load()
+Answer Vm::load(jint (*entry)(JavaVM *, void *))
 {
     state_->begin();
-    return state_->end(JNI_OnLoad(&state_->javaVm, nullptr), nullptr);
+    JavaVM *vm = &state_->javaVm;
+    return state_->end(
+        state_->invoke<jint>(reinterpret_cast<void *>(entry), vm, static_cast<void *>(nullptr)),
+        nullptr);
 }
 
 const std::vector<Native> &Vm::natives() const
 {
-    return state_->natives;
+    return state_->registered();
+}
+
+const Native &Vm::native(std::string_view name) const
+{
+    const auto found = std::find_if(natives().begin(), natives().end(),
+                                    [name](const Native &native) { return native.name == name; });
+    if (found == natives().end()) {
+        die("no native of the name " + std::string(name));
+    }
+    return *found;
 }
 
 Answer Vm::call(std::string_view name, std::initializer_list<jint> indexes)
 {
-    const auto found = std::find_if(state_->natives.begin(), state_->natives.end(),
-                                    [name](const Native &native) { return native.name == name; });
-    if (found == state_->natives.end()) {
-        die("no native of the name " + std::string(name));
-    }
-    return call(*found, indexes);
+    return call(native(name), {indexes.begin(), indexes.size()});
 }
 
-Answer Vm::call(const Native &native, const std::vector<jint> &indexes)
+Answer Vm::call(const Native &native, std::span<const jint> indexes)
 {
-    const std::string arguments = "(" + std::string(indexes.size(), 'I') + ")";
-    if (native.signature.rfind(arguments, 0) != 0) {
-        die(native.name + " called with other arguments than its signature names");
+    const size_t end = indexes.size() + 1;
+    if (native.indexes() != indexes.size() || native.signature.find_first_not_of('I', 1) != end) {
+        die(std::string(native.name) + " called with other arguments than its signature names");
     }
-    const std::string result = native.signature.substr(arguments.size());
-    if (result == "V") {
-        state_->apply<void>(native.function, indexes);
-        return state_->end(0, nullptr);
-    }
-    if (result == "I") {
-        return state_->end(state_->apply<jint>(native.function, indexes), nullptr);
-    }
-    if (result == "[B") {
-        return state_->end(0, state_->apply<jbyteArray>(native.function, indexes));
-    }
-    if (result == "[Ljava/lang/String;") {
-        return state_->end(0, state_->apply<jobjectArray>(native.function, indexes));
-    }
-    return state_->end(0, state_->apply<jstring>(native.function, indexes));
-}
-
-Answer Vm::parse(const std::optional<Bytes> &message, jlong length, jint mode)
-{
-    using Parse = jboolean (*)(JNIEnv *, jobject, jbyteArray, jlong, jint);
-    const auto found =
-        std::find_if(state_->natives.begin(), state_->natives.end(),
-                     [](const Native &native) { return native.signature == "([BJI)Z"; });
-    if (found == state_->natives.end()) {
-        die("no parse method");
-    }
+    const std::string_view result = native.signature.substr(end + 1);
     jobject self = state_->begin();
-    jobject array = nullptr;
-    if (message) {
-        array = state_->argument({.kind = Object::kByteArray, .bytes = *message});
+    jint number = 0;
+    jobject object = nullptr;
+    if (result == "V") {
+        state_->apply<void>(native.function, self, indexes);
+    } else if (result == "I") {
+        number = state_->apply<jint>(native.function, self, indexes);
+    } else if (result == "[B") {
+        object = state_->apply<jbyteArray>(native.function, self, indexes);
+    } else if (result == "[Ljava/lang/String;") {
+        object = state_->apply<jobjectArray>(native.function, self, indexes);
+    } else {
+        object = state_->apply<jstring>(native.function, self, indexes);
     }
-    const Parse native = reinterpret_cast<Parse>(found->function);
-    return state_->end(native(&state_->env, self, static_cast<jbyteArray>(array), length, mode),
+    return state_->end(number, object);
+}
+
+long Vm::query(jint first, jint last)
+{
+    long answered = 0;
+    for (const Native &native : natives()) {
+        if (native.isQuery()) {
+            jint indexes[] = {first, first, first, first};
+            const size_t count = native.indexes();
+            indexes[count > 0 ? count - 1 : 0] = last;
+            answered += !saysNothing(call(native, {indexes, count}));
+        }
+    }
+    return answered;
+}
+
+Answer Vm::parse(const Bytes *message, jlong length, jint mode)
+{
+    const Native &parser = native("qvomacp_parser");
+    if (parser.signature != "([BJI)Z") {
+        die("a parse method with other arguments");
+    }
+    JNIEnv *env = &state_->env;
+    jobject self = state_->begin();
+    jbyteArray array = message ? state_->argument(*message) : nullptr;
+    return state_->end(state_->invoke<jboolean>(parser.function, env, self, array, length, mode),
                        nullptr);
 }
 
 Answer Vm::parse(const Bytes &message, jint mode)
 {
-    return parse(message, static_cast<jlong>(message.size()), mode);
+    return parse(&message, static_cast<jlong>(message.size()), mode);
 }
 
-const std::vector<std::string> &Vm::calls() const
+std::vector<std::string> Vm::calls() const
 {
-    return state_->calls;
+    return {state_->calls.begin(), state_->calls.end()};
 }
 
 void Vm::failCall(long n)

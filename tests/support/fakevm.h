@@ -7,6 +7,7 @@
 //   - more than 16 local references at a time, one used after it was deleted, one left behind
 //   - array elements not handed back, handed back with a copy, or written to
 //   - text without four zero bytes at its end
+// One that is quiet asks for none of it, to see what the library costs.
 #pragma once
 
 #include <jni.h>
@@ -16,6 +17,7 @@
 #include <memory>
 #include <optional>
 #include <ostream>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -40,20 +42,46 @@ struct Answer {
 
 void PrintTo(const Answer &answer, std::ostream *out);
 
+// No number above 0, and null for all else.
+bool saysNothing(const Answer &answer);
+
 // A native as it was registered.
 struct Native {
     std::string javaClass;
-    std::string name;
-    std::string signature;
+    std::string_view name; // where the library has it, which stays loaded
+    std::string_view signature;
     void *function;
 
     // The number of its arguments, for the natives that take ints alone.
     size_t indexes() const { return signature.find(')') - 1; }
+    // Whether it is asked something: not parse, delete and the choice of an access point.
+    bool isQuery() const { return signature.back() != 'V' && signature.back() != 'Z'; }
+};
+
+// Memory that the bytes of a message are handed out in.
+class Lender {
+public:
+    virtual const uint8_t *lend() = 0;
+    virtual void takeBack() = 0;
+
+protected:
+    ~Lender() = default;
+};
+
+struct Options {
+    // Costs next to nothing: hands out the same reference again and again, reads text as far as a
+    // machine has to, and keeps nothing but the natives, without their classes. An answer that is
+    // not null is the number 1. A message stays where it is.
+    bool quiet = false;
+    // True while a native runs, and as before while the machine does; null for none.
+    bool *inNative = nullptr;
+    // Of the bytes of a message; null for a copy on the heap each time.
+    Lender *lender = nullptr;
 };
 
 class Vm {
 public:
-    Vm();
+    explicit Vm(const Options &options = {});
     ~Vm();
     Vm(const Vm &) = delete;
     Vm &operator=(const Vm &) = delete;
@@ -69,23 +97,28 @@ public:
     std::string refusedClass;
 
     // Calls JNI_OnLoad. An exception that it leaves is cleared, as the answer says.
-    Answer load();
+    Answer load(jint (*entry)(JavaVM *, void *) = JNI_OnLoad);
 
     // All that was registered, in that order.
     const std::vector<Native> &natives() const;
+    const Native &native(std::string_view name) const;
 
     // ---- Calling natives
 
     // Calls a native that takes ints alone, by its name.
     Answer call(std::string_view name, std::initializer_list<jint> indexes = {});
-    Answer call(const Native &native, const std::vector<jint> &indexes);
+    Answer call(const Native &native, std::span<const jint> indexes);
+
+    // Asks each query once: the last of its indexes is `last`, those before it are `first`.
+    // Answers how many of them said something.
+    long query(jint first, jint last);
 
     // Calls the parse method with a message, or with null; `length` is that of the message.
-    Answer parse(const std::optional<Bytes> &message, jlong length, jint mode);
+    Answer parse(const Bytes *message, jlong length, jint mode);
     Answer parse(const Bytes &message, jint mode = 0);
 
     // The entries of the function table that the last native called, in order.
-    const std::vector<std::string> &calls() const;
+    std::vector<std::string> calls() const;
 
     // The n-th call from now on that can fail, counted from 0, fails with an exception pending.
     void failCall(long n);
@@ -94,6 +127,8 @@ public:
 
 private:
     struct State;
+    struct Strict;
+    struct Quiet;
     std::unique_ptr<State> state_;
 };
 

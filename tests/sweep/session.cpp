@@ -63,8 +63,7 @@ std::vector<Call> makeCalls()
     const auto addQueries = [&](bool ofHeader) {
         for (const Native &native : machine().natives()) {
             const bool asksHeader = native.name.rfind("qvomacp_GetParser", 0) == 0;
-            const bool isQuery = native.signature.back() != 'V' && native.signature.back() != 'Z';
-            if (isQuery && (asksHeader || !ofHeader)) {
+            if (native.isQuery() && (asksHeader || !ofHeader)) {
                 for (const Indexes &indexes : representative(native.indexes())) {
                     all.push_back(
                         {asksHeader ? Call::kHeaderQuery : Call::kQuery, &native, indexes});
@@ -121,16 +120,11 @@ const std::vector<Call> &calls()
 
 std::string Call::shown() const
 {
-    std::string text = native ? native->name : "parse";
+    std::string text(native ? native->name : "parse");
     for (const jint argument : arguments) {
         text += ' ' + std::to_string(argument);
     }
     return text;
-}
-
-bool saysNothing(const Answer &answer)
-{
-    return answer.number <= 0 && !answer.text && !answer.array && !answer.bytes;
 }
 
 Answer Session::ask(const Call &call)

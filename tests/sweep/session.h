@@ -25,9 +25,6 @@ struct Call {
 // The calls of a session, in their order.
 const std::vector<Call> &calls();
 
-// Whether an answer holds nothing.
-bool saysNothing(const fakevm::Answer &answer);
-
 // How many blocks a context does not let go of: those of WI-FI and ROAMING records, the texts of
 // XCAP, and the copies of FROM that were replaced.
 size_t keptBy(const qvsClientProvCtx *context);

@@ -4,7 +4,7 @@
 
 #include "cost/families.h"
 
-#include "support/quietvm.h"
+#include "support/fakevm.h"
 
 #include "qvstrace.h"
 
@@ -54,8 +54,8 @@ private:
 };
 
 struct Work {
-    quietvm::Vm *vm;
-    quietvm::Message message;
+    fakevm::Vm *vm;
+    const fakevm::Bytes &message;
     uint8_t *lowest;
     bool parsed = false;
     long answers = 0;
@@ -64,11 +64,11 @@ struct Work {
 
 __attribute__((noinline)) void session(Work *work)
 {
-    work->parsed = work->vm->parse(work->message);
+    work->parsed = work->vm->parse(work->message).number != 0;
     work->answers = work->vm->query(1, 1);
     work->vm->query(1, INT_MAX);
     work->vm->query(INT_MAX, 1);
-    work->vm->remove();
+    work->vm->call("qvomacp_parser_del");
 }
 
 // Paints what lies below its own frame, plays the session, and looks how far the paint is gone.
@@ -99,9 +99,10 @@ Work play(const std::string &family, bool parsed)
     SCOPED_TRACE(family);
     const cost::Bytes bytes = cost::messageOf(cost::family(family), kSize);
     EXPECT_GT(bytes.size(), kSize - 1024);
-    quietvm::Vm vm;
+    fakevm::Vm vm({.quiet = true});
+    EXPECT_EQ(vm.load().number, JNI_VERSION_1_4);
     const Stack stack;
-    Work work{.vm = &vm, .message = {bytes.data(), bytes.size()}, .lowest = stack.lowest()};
+    Work work{.vm = &vm, .message = bytes, .lowest = stack.lowest()};
     sweep::Losses losses;
     pthread_attr_t attributes;
     EXPECT_EQ(pthread_attr_init(&attributes), 0);

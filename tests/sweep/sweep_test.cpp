@@ -193,7 +193,7 @@ TEST(Documents, LetEveryNativeAnswerSomething)
 {
     std::set<std::string> silent;
     for (const Call &call : calls()) {
-        silent.insert(call.native ? call.native->name : "parse");
+        silent.emplace(call.native ? call.native->name : "parse");
     }
     for (const Document &document : files()) {
         Losses losses;
@@ -201,7 +201,7 @@ TEST(Documents, LetEveryNativeAnswerSomething)
         losses.count();
         for (size_t i = 0; i < answers.size(); ++i) {
             if (!saysNothing(answers[i])) {
-                silent.erase(calls()[i].native ? calls()[i].native->name : "parse");
+                silent.erase(std::string(calls()[i].native ? calls()[i].native->name : "parse"));
             }
         }
     }

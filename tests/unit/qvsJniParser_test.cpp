@@ -172,9 +172,9 @@ TEST(Parser, RefusesAMessageThatIsNoPush)
 TEST(Parser, RefusesNoMessageAndAnEmptyOne)
 {
     Session vm;
-    EXPECT_EQ(vm.parse(std::nullopt, 100, 0), kFalse);
+    EXPECT_EQ(vm.parse(nullptr, 100, 0), kFalse);
     expectNoHeader(&vm);
-    EXPECT_EQ(vm.parse(std::nullopt, 0, 0), kFalse);
+    EXPECT_EQ(vm.parse(nullptr, 0, 0), kFalse);
     EXPECT_EQ(vm.parse(Bytes{}, 0), kFalse);
     expectNoHeader(&vm);
 }
@@ -182,8 +182,8 @@ TEST(Parser, RefusesNoMessageAndAnEmptyOne)
 TEST(Parser, ForgetsTheHeaderWithARefusedMessage)
 {
     const Bytes pushed = signedPush(proxyDocument());
-    const std::vector<std::pair<std::optional<Bytes>, jlong>> refused = {
-        {std::nullopt, 3}, {pushed, static_cast<jlong>(pushed.size()) + 1}, {pushed, 0}};
+    const std::vector<std::pair<const Bytes *, jlong>> refused = {
+        {nullptr, 3}, {&pushed, static_cast<jlong>(pushed.size()) + 1}, {&pushed, 0}};
     for (const auto &[bytes, length] : refused) {
         Session vm;
         ASSERT_EQ(vm.parse(pushed, kHeaderOnly), kTrue);
@@ -200,13 +200,13 @@ TEST(Parser, TakesTheLengthForTheMessage)
     const Bytes body = {1, 2, 3, 4};
     const Bytes pushed = message::push(body);
     const jlong length = static_cast<jlong>(pushed.size());
-    ASSERT_EQ(vm.parse(pushed, length - 3, kHeaderOnly), kTrue);
+    ASSERT_EQ(vm.parse(&pushed, length - 3, kHeaderOnly), kTrue);
     EXPECT_EQ(vm.call("qvomacp_GetParserBody").bytes, Bytes{1});
     vm.call("qvomacp_parser_del");
-    ASSERT_EQ(vm.parse(pushed, length - 4, kHeaderOnly), kTrue);
+    ASSERT_EQ(vm.parse(&pushed, length - 4, kHeaderOnly), kTrue);
     EXPECT_EQ(vm.call("qvomacp_GetParserBody").bytes, Bytes{});
     vm.call("qvomacp_parser_del");
-    EXPECT_EQ(vm.parse(pushed, length - 5, kHeaderOnly), kFalse);
+    EXPECT_EQ(vm.parse(&pushed, length - 5, kHeaderOnly), kFalse);
 }
 
 TEST(Parser, TakesTheLow32BitsOfTheLength)
@@ -215,10 +215,10 @@ TEST(Parser, TakesTheLow32BitsOfTheLength)
     const Bytes pushed = message::push({1, 2});
     const jlong length = static_cast<jlong>(pushed.size());
     for (jlong high : {jlong{0}, jlong{1} << 32, jlong{0x7FFFFFFF} << 32, jlong{-1} << 32}) {
-        ASSERT_EQ(vm.parse(pushed, high | length, kHeaderOnly), kTrue) << high;
+        ASSERT_EQ(vm.parse(&pushed, high | length, kHeaderOnly), kTrue) << high;
         EXPECT_EQ(vm.number("qvomacp_GetParserBodyLen"), 2);
         vm.call("qvomacp_parser_del");
-        EXPECT_EQ(vm.parse(pushed, high, kHeaderOnly), kFalse) << high;
+        EXPECT_EQ(vm.parse(&pushed, high, kHeaderOnly), kFalse) << high;
     }
 }
 
@@ -229,7 +229,7 @@ TEST(Parser, RefusesALengthBeyondTheArray)
     const jlong length = static_cast<jlong>(pushed.size());
     for (jlong wrong :
          {length + 1, jlong{INT32_MAX}, jlong{0x80000000}, jlong{0xFFFFFFFF}, jlong{-1}, -length}) {
-        EXPECT_EQ(vm.parse(pushed, wrong, 0), kFalse) << wrong;
+        EXPECT_EQ(vm.parse(&pushed, wrong, 0), kFalse) << wrong;
         expectNoHeader(&vm);
     }
 }

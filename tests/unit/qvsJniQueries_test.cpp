@@ -38,7 +38,7 @@ struct Everything {
     }
 
     Context context;
-    std::map<std::string, std::map<Indexes, Answer>> answers;
+    std::map<std::string_view, std::map<Indexes, Answer>> answers;
 
     // The indexes of `size` records, of which a native answers the count.
     Indexes records(const char *count, const Indexes &path, jint size)
@@ -52,9 +52,9 @@ struct Everything {
     }
 
     // A text of its own for each native and path.
-    static std::string name(const std::string &native, const Indexes &path)
+    static std::string name(std::string_view native, const Indexes &path)
     {
-        std::string text = native;
+        std::string text(native);
         for (jint index : path) {
             text += '-' + std::to_string(index);
         }

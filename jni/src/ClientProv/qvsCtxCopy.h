@@ -36,7 +36,7 @@ template <class From>
 consteval auto copyInOrder()
 {
     constexpr FieldSet<From> kStay = kLeft<From>;
-    Table<From, CopyRow, kRowsOf<From>> table;
+    Table<From, CopyRow, kRowsOf<From>> table = {};
     for (uint8_t field = 0; field < kRowsOf<From>; ++field) {
         const CopyRow::Type text = kStay.has[field] ? CopyRow::kKeptText : CopyRow::kText;
         const bool isText = kFields<From>.rows[field].holds == Holds::kText;
@@ -52,12 +52,11 @@ inline constexpr auto kCopyRows = copyInOrder<From>();
 template <class From, class To>
 consteval bool areAlike()
 {
+    bool alike = true;
     for (const CopyRow &row : kCopyRows<From>.rows) {
-        if (kFields<From>.rows[row.field].holds != kFields<To>.rows[row.to].holds) {
-            return false;
-        }
+        alike = alike && kFields<From>.rows[row.field].holds == kFields<To>.rows[row.to].holds;
     }
-    return true;
+    return alike;
 }
 
 struct CopyKind;
@@ -119,16 +118,17 @@ struct CopyOf {
 
 // A row of the children of Parent.
 template <class Parent>
-struct Child : ChildRow {
+struct Child {
     using Of = Parent;
     using Row = ChildRow;
 
     template <class From, class To>
     consteval Child(From *qvsWapCharacter::*from, To *Parent::*to, const CopyOf<From, To> &copy)
-        : ChildRow{numberOf(from), numberOf(to), kLeft<qvsWapCharacter>.has[numberOf(from)],
-                   &copy.kind}
+        : row{numberOf(from), numberOf(to), kLeft<qvsWapCharacter>.has[numberOf(from)], &copy.kind}
     {
     }
+
+    ChildRow row;
 };
 
 // Every kind at the top of a document, in the order in which a node's records are taken.

@@ -262,7 +262,7 @@ consteval Table<typename Typed::Of, typename Typed::Row, N> tableOf(const Typed 
 {
     Table<typename Typed::Of, typename Typed::Row, N> table;
     for (size_t row = 0; row < N; ++row) {
-        table.rows[row] = typed[row];
+        table.rows[row] = typed[row].row;
     }
     return table;
 }
@@ -299,11 +299,11 @@ inline constexpr auto kFields = fieldsOf<Record>();
 template <class Record>
 consteval uint8_t textsOf()
 {
-    uint8_t count = 0;
-    while (count < kFieldsOf<Record> && kFields<Record>.rows[count].holds == Holds::kText) {
-        ++count;
+    uint8_t texts = 0;
+    while (texts < kFieldsOf<Record> && kFields<Record>.rows[texts].holds == Holds::kText) {
+        ++texts;
     }
-    return count;
+    return texts;
 }
 
 // ---- Fields by number

@@ -52,14 +52,14 @@ jobjectArray stringArray(JNIEnv *env, const char *const *texts, jsize shown, jsi
     return result;
 }
 
-Shown::Shown(const void *record, uint8_t count, Naming naming)
-    : length(static_cast<jsize>(count) + 1)
+Shown::Shown(const void *record, uint8_t shown, Naming naming)
+    : length(static_cast<jsize>(shown) + 1)
 {
-    for (uint8_t field = 0; field < count; ++field) {
+    for (uint8_t field = 0; field < shown; ++field) {
         const char *value = static_cast<const char *>(pointerAt(record, field));
         texts[field] = value && field == naming.field ? naming.nameOf(value) : value;
     }
-    texts[count] = nullptr;
+    texts[shown] = nullptr;
 }
 
 jobjectArray array(JNIEnv *env, const void *record, uint8_t texts, Naming naming)

@@ -102,19 +102,19 @@ struct Naming {
 
 template <class Record>
 struct NamingOf : Naming {
-    consteval NamingOf() = default;
-    consteval NamingOf(char *Record::*text, const char *(*name)(const char *value))
+    constexpr NamingOf() = default;
+    constexpr NamingOf(char *Record::*text, const char *(*name)(const char *value))
         : Naming{numberOf(text), name}
     {
     }
 };
 
-// What an array shows: the first `texts` fields of a record, and a null behind them.
+// What an array shows: the first `shown` fields of a record, and a null behind them.
 // kept[last-element-null]: an array ends with an element that is null.
 struct Shown {
     static constexpr size_t kMost = 28;
 
-    Shown(const void *record, uint8_t texts, Naming naming);
+    Shown(const void *record, uint8_t shown, Naming naming);
 
     const char *texts[kMost + 1];
     jsize length;

@@ -28,19 +28,19 @@ struct OtherField {};
 constexpr OtherField kByReader;
 
 template <class Record>
-struct Parm : ParmRow {
+struct Parm {
     using Of = Record;
     using Row = ParmRow;
 
-    consteval Parm(uint8_t t, char *Record::*text) : ParmRow{t, ParmType::kText, numberOf(text), 0}
-    {
-    }
+    consteval Parm(uint8_t t, char *Record::*text) : row{t, ParmType::kText, numberOf(text), 0} {}
     consteval Parm(uint8_t t, qvsList *Record::*list)
-        : ParmRow{t, ParmType::kList, numberOf(list),
-                  kListPlaces[kFieldsOf<Record> - 1 - numberOf(list)]}
+        : row{t, ParmType::kList, numberOf(list),
+              kListPlaces[kFieldsOf<Record> - 1 - numberOf(list)]}
     {
     }
-    consteval Parm(uint8_t t, OtherField) : ParmRow{t, ParmType::kOther, kNoField, 0} {}
+    consteval Parm(uint8_t t, OtherField) : row{t, ParmType::kOther, kNoField, 0} {}
+
+    ParmRow row;
 };
 
 // What sets the decoder of one kind of characteristic apart. But for the way past a page switch all
@@ -127,7 +127,7 @@ template <class Record>
 qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, Record *record,
                    const Parm<Record> &list)
 {
-    return readList(decoder, state, record, list.field, list.place);
+    return readList(decoder, state, record, list.row.field, list.row.place);
 }
 
 // ---- Parameters whose name is given as text
@@ -140,18 +140,19 @@ struct NamedRow {
 };
 
 template <class Record>
-struct NamedParm : NamedRow {
+struct NamedParm {
     using Of = Record;
     using Row = NamedRow;
 
     template <size_t N>
-    consteval NamedParm(const char (&text)[N], char *Record::*to)
-        : NamedRow{N - 1, {}, numberOf(to)}
+    consteval NamedParm(const char (&text)[N], char *Record::*to) : row{N - 1, {}, numberOf(to)}
     {
         for (size_t i = 0; i < N - 1; ++i) {
-            name[i] = text[i];
+            row.name[i] = text[i];
         }
     }
+
+    NamedRow row;
 };
 
 // The name of one parameter, compared where it lies, and the token behind it.

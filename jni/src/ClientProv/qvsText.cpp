@@ -217,8 +217,9 @@ bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
     return appendAll(state, text, &piece, &piece + 1, added) != &piece;
 }
 
-// All pieces are looked at before a block is made for them; of many, so many at a time, and while
-// blocks are tracked each by itself.
+// All pieces are looked at before a block is made for them; of many, so many at a time. Each by
+// itself while blocks are tracked, and where the texts of the message come near their limit: what
+// is in front of the piece that passes it is read.
 bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
     Piece pieces[kMostPieces];
@@ -250,8 +251,14 @@ bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
             added += found ? piece++->length : 0;
             joins = true;
         }
-        const Piece *const left =
-            piece != pieces ? appendAll(state, text, pieces, piece, added) : piece;
+        const Piece *left = piece;
+        if (added + text->length > state->textLeft) [[unlikely]] {
+            for (left = pieces; left != piece && append(state, text, *left);) {
+                ++left;
+            }
+        } else if (piece != pieces) {
+            left = appendAll(state, text, pieces, piece, added);
+        }
         if (left != piece) [[unlikely]] {
             decoder->ptBuffer->pHead = left->unread;
             return false;
@@ -263,10 +270,14 @@ bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 
 qvsResult qvs::dropInlineString(qvsWbxmlDecoder *decoder, DecodeState *state)
 {
-    smlBuffer *buffer = decoder->ptBuffer;
+    uint8_t *at = decoder->ptBuffer->pHead;
     Piece piece;
-    inlinePiece(&buffer->pHead, buffer->pHead + bytesLeft(decoder), &piece);
-    return countText(state, piece.length) ? QVS_OK : QVS_ERROR_NO_MEMORY;
+    inlinePiece(&at, at + bytesLeft(decoder), &piece);
+    if (!countText(state, piece.length)) {
+        return QVS_ERROR_NO_MEMORY;
+    }
+    decoder->ptBuffer->pHead = at;
+    return QVS_OK;
 }
 
 qvsResult qvs::content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
@@ -280,9 +291,12 @@ qvsResult qvs::lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
     if (!takeOnlyPiece(decoder, &piece)) {
         return content(decoder, state, text);
     }
-    (void)countText(state, piece.length); // the limit shows in the result
-    text->before = piece.bytes;
-    text->length = piece.length;
+    if (countText(state, piece.length)) {
+        text->before = piece.bytes;
+        text->length = piece.length;
+    } else if (piece.unread) {
+        decoder->ptBuffer->pHead = piece.unread;
+    }
     return endOfContent(state, QVS_OK);
 }
 

@@ -1,20 +1,33 @@
 package com.qvomacp.cli;
 
-import com.qvomacp.eng.omacp.NativeLibrary;
+import com.qvomacp.eng.omacp.EncodingException;
 import java.io.IOException;
-import java.io.PrintWriter;
-import java.nio.file.InvalidPathException;
 import java.util.ArrayList;
 import java.util.List;
-import java.util.concurrent.Callable;
 import picocli.CommandLine.Model.CommandSpec;
 import picocli.CommandLine.Option;
 import picocli.CommandLine.Parameters;
 import picocli.CommandLine.Spec;
 
 /** A command that does the same to each of its files. */
-abstract class Job implements Callable<Integer> {
-    @Spec CommandSpec spec;
+abstract class Job {
+    private static final int DEFAULT_LIMIT = 64 << 10;
+
+    @Option(
+            names = "--limit",
+            paramLabel = "BYTES",
+            description =
+                    "Read no more than so many bytes of a file; K and M may stand behind the number"
+                            + " (by itself 64K).")
+    private String limit;
+
+    @Option(
+            names = "--as",
+            paramLabel = "FORM",
+            description =
+                    "What the messages are, where it does not show by itself: push, body, sms (an"
+                            + " SMS-DELIVER) or ud (the user data of an SMS).")
+    private Form form;
 
     @Option(
             names = "--color",
@@ -34,100 +47,162 @@ abstract class Job implements Callable<Integer> {
             arity = "0..*",
             paramLabel = "FILE",
             description =
-                    "A message: a push, or the WBXML body of one alone; its bytes, or hexadecimal"
-                            + " or base64 text. Standard input when it is \"-\" or there is none.")
+                    "What holds messages: pushes, WBXML bodies alone, or parts of SMS; their bytes,"
+                            + " or hexadecimal or base64 text, also in a log or a dump. Standard"
+                            + " input when it is \"-\" or there is none.")
     private List<String> files = new ArrayList<>();
 
-    private final Main main;
-    private int status = Main.DONE;
-
-    Job(Main main) {
-        this.main = main;
-    }
+    @Spec CommandSpec spec;
+    Console console;
+    private int bytesRead;
+    private boolean isOneOfSeveral;
 
     /** Does it to one message. */
-    abstract void run(Source source) throws RefusedException;
+    abstract void run(Held held);
 
-    /** Says that a message is refused. */
-    abstract void refused(Explanation explanation);
+    /** Looks at what the command line asks for, in front of the first file. */
+    abstract void begin();
 
-    /** Says in which other way a file has failed. */
+    /** Does it to what is no message, where a command knows more than messages. */
+    boolean takes(String name, byte[] content) {
+        return false;
+    }
+
+    /** Called in front of saying that something is no message. */
+    void unknown(Held held) {}
+
+    /** Says in which way a file has failed, where more than a complaint is wanted. */
     void failed(String name, String reason) {}
 
-    /** Called in front of the first file and behind the last one. */
-    void begin() {}
-
+    /** Called behind the last file. */
     void end() {}
 
-    @Override
-    public Integer call() {
-        if (files.isEmpty()) {
-            files.add(Source.STANDARD_INPUT);
-        }
+    final void run(Console to) {
+        console = to;
+        bytesRead = limit == null ? DEFAULT_LIMIT : bytes(limit);
         begin();
-        for (String file : files) {
-            call(file);
+        if (files.isEmpty()) {
+            files.add(Input.STANDARD_INPUT);
+        }
+        Intake intake = new Intake(form);
+        isOneOfSeveral = files.size() > 1;
+        for (int i = 0; i < files.size(); ++i) {
+            run(files.get(i), intake, i == files.size() - 1);
         }
         end();
-        return status;
     }
 
-    private void call(String file) {
-        Source source;
+    /** Does it to the messages that are whole with a file, or for which it was the last hope. */
+    private void run(String file, Intake intake, boolean isLast) {
+        String name = Input.nameOf(file);
         try {
-            source = Source.read(file, main.in);
-        } catch (IOException | InvalidPathException unreadable) {
-            fail(Main.FAILED, Source.nameOf(file), Source.reasonOf(unreadable));
-            return;
+            List<Held> messages = new ArrayList<>();
+            try {
+                byte[] content = Input.read(file, console.in, bytesRead);
+                if (form != null || !takes(name, content)) {
+                    messages.addAll(intake.take(name, content));
+                }
+            } catch (IOException unreadable) {
+                fail(Console.FAILED, name, unreadable.getMessage());
+            }
+            if (isLast) {
+                messages.addAll(intake.finish());
+            }
+            isOneOfSeveral |= messages.size() > 1;
+            for (Held held : messages) {
+                name = held.name;
+                look(held);
+            }
+        } catch (OutOfMemoryError tooLarge) {
+            fail(Console.FAILED, name, "needs more memory than there is");
         }
+    }
+
+    private void look(Held held) {
+        for (String note : held.notes) {
+            complain(startOf(held.name) + "note: " + Visible.of(note) + "\n");
+        }
+        if (held.error != null) {
+            unknown(held);
+            fail(Console.REFUSED, held.name, held.error);
+        } else if (held.bytes != null) {
+            run(held);
+        }
+    }
+
+    private static int bytes(String number) {
+        int unit = "KM".indexOf(number.charAt(number.length() - 1));
         try {
-            NativeLibrary.load();
-            run(source);
-        } catch (RefusedException refused) {
-            raise(Main.REFUSED);
-            refused(Explanation.of(source, refused.headerTaken));
-        } catch (UnsatisfiedLinkError missing) {
-            fail(Main.FAILED, source.name, missing.getMessage());
+            String digits = unit < 0 ? number : number.substring(0, number.length() - 1);
+            long bytes = Math.multiplyExact(Long.parseLong(digits), 1L << 10 * (unit + 1));
+            if (bytes > 0 && bytes <= Integer.MAX_VALUE / 2) {
+                return (int) bytes;
+            }
+        } catch (ArithmeticException | NumberFormatException none) {
+            // Said below.
         }
+        throw new UsageException("--limit is a number of bytes, up to 1023M: " + number);
     }
 
-    boolean hasSeveralFiles() {
-        return files.size() > 1;
+    /** How much of a file is read, and so how long a message may be. */
+    int limit() {
+        return bytesRead;
     }
 
-    PrintWriter out() {
-        return spec.commandLine().getOut();
+    /** Whether there are several files, or several messages in the only one. */
+    boolean isOneOfSeveral() {
+        return isOneOfSeveral;
+    }
+
+    boolean readsStandardInput() {
+        return files.isEmpty() || files.contains(Input.STANDARD_INPUT);
     }
 
     Palette outPalette() {
-        return main.terminal.out(color);
+        return console.terminal.out(color);
     }
 
-    /** Writes an explanation where errors go, in its place among what has been written. */
-    void complain(Explanation explanation) {
-        String start = startOf(explanation.source.name);
-        complain(explanation.write(start, main.terminal.err(color)));
+    Palette errPalette() {
+        return console.terminal.err(color);
     }
 
-    private static String startOf(String name) {
+    /** How a line begins that says something about a file where errors go. */
+    static String startOf(String name) {
         return "omacp: " + Visible.of(name) + ": ";
     }
 
-    private void complain(String text) {
-        out().flush();
-        PrintWriter err = spec.commandLine().getErr();
-        err.print(text);
-        err.flush();
+    /** Writes to standard error; more about the file goes to the output behind it. */
+    void complain(String text) {
+        console.complain(text);
     }
 
-    void fail(int raised, String name, String reason) {
-        raise(raised);
-        complain(startOf(name) + reason + System.lineSeparator());
+    /** Says why a message is refused, where it is. */
+    void explain(Reading reading) {
+        console.raise(reading.status());
+        if (!reading.isAccepted()) {
+            complain(Refusal.of(reading).write(startOf(reading.held.name), errPalette()));
+        }
+    }
+
+    /** Says why a document cannot be encoded, or not be written as XML. */
+    void refuse(String name, EncodingException e) {
+        if (e.line() > 0) {
+            String expected = e.expected().isEmpty() ? "" : ", expected ";
+            fail(
+                    Console.REFUSED,
+                    name + ':' + e.line() + ':' + e.column(),
+                    e.getMessage() + expected + String.join(", ", e.expected()));
+        } else if (e.path() != null) {
+            fail(Console.REFUSED, name, e.getMessage() + ", in " + e.path());
+        } else {
+            // An option is at fault, and not the document.
+            fail(Console.FAILED, name, e.getMessage());
+        }
+    }
+
+    void fail(int status, String name, String reason) {
+        console.raise(status);
+        complain(startOf(name) + Visible.of(reason) + "\n");
         failed(name, reason);
-    }
-
-    /** The exit status is the worst of all files. */
-    void raise(int raised) {
-        status = Math.max(status, raised);
     }
 }

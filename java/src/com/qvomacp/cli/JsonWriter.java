@@ -1,182 +1,207 @@
 package com.qvomacp.cli;
 
-import java.util.List;
-import java.util.function.Consumer;
+import java.io.PrintWriter;
 
 /**
- * Writes a message as one JSON object.
- *
- * <p>{@code header} has {@code contentType}, {@code contentTypeCode}, {@code headerLength} and
- * {@code bodyLength}, with {@code sec} (its name) and {@code secCode} (the byte as sent) when the
- * message has a SEC, and {@code mac} when it has a MAC; it is null for a body alone. {@code characteristics} is an array; each
- * has {@code type}, {@code parms} (objects of {@code name} and {@code value}, the value null when
- * the parameter is set but the library answers none) and again {@code characteristics}.
+ * Writes JSON as it is told it: nothing but the open brackets is kept. What a terminal would obey
+ * is escaped in strings.
  */
 final class JsonWriter {
     private static final String INDENT = "  ";
 
-    private final StringBuilder out = new StringBuilder();
+    /** Deeper values are indented no further: the brackets tell how deep they are. */
+    private static final int DEEPEST = 12;
 
-    private JsonWriter() {}
+    private final PrintWriter out;
+    private final boolean onOneLine;
 
-    static String write(Message message) {
-        JsonWriter writer = new JsonWriter();
-        writer.message(message);
-        return writer.out.append('\n').toString();
+    /** The closing brackets of what is open, the innermost one last. */
+    private final StringBuilder open = new StringBuilder();
+
+    /** How much of {@link #open} stands on lines of its own; the rest shares a line. */
+    private int flatFrom = Integer.MAX_VALUE;
+
+    private boolean isFirst = true;
+    private boolean isNamed;
+    private boolean isSeparated;
+
+    JsonWriter(PrintWriter out, boolean onOneLine) {
+        this.out = out;
+        this.onOneLine = onOneLine;
     }
 
-    /** The push header alone: the object that is {@code header} in a whole message. */
-    static String write(Header header) {
-        JsonWriter writer = new JsonWriter();
-        writer.out.append("{\n").append(INDENT);
-        writer.header(header);
-        return writer.out.append("\n}\n").toString();
+    JsonWriter beginObject() {
+        return begin('{', '}');
     }
 
-    /** Why a message is refused: an object with {@code refused}. */
-    static String write(Explanation explanation) {
-        JsonWriter writer = new JsonWriter();
-        writer.out.append("{\n").append(INDENT).append("\"refused\": {\n");
-        writer.member("reason").text(explanation.reason);
-        if (explanation.code != 0) {
-            writer.nextMember("code").out.append(explanation.code);
-            writer.nextMember("name").text(Vocabulary.result(explanation.code));
-        }
-        if (!explanation.isHeader()) {
-            writer.nextMember("bodyOffset").out.append(explanation.bodyOffset);
-        }
-        writer.nextMember("messageOffset").out.append(explanation.messageOffset);
-        writer.nextMember("path").text(explanation.path);
-        if (explanation.accepted != null) {
-            writer.nextMember("accepted").text(explanation.accepted);
-        }
-        writer.out.append('\n').append(INDENT).append("}\n}\n");
-        return writer.out.toString();
-    }
-
-    /** Why nothing can be said of a message: an object with {@code error}. */
-    static String error(String reason) {
-        JsonWriter writer = new JsonWriter();
-        writer.out.append("{\n").append(INDENT).append("\"error\": ");
-        writer.text(reason);
-        return writer.out.append("\n}\n").toString();
-    }
-
-    /** An object as an element of an array, with {@code file} in front; without a line end. */
-    static String element(String file, String object) {
-        JsonWriter writer = new JsonWriter();
-        writer.out.append("{\n").append(INDENT).append("\"file\": ");
-        writer.text(file);
-        writer.out.append(",\n").append(INDENT).append(object.substring("{\n".length()).trim());
-        return INDENT + writer.out.toString().replace("\n", "\n" + INDENT);
-    }
-
-    private void message(Message message) {
-        out.append("{\n").append(INDENT);
-        if (message.header == null) {
-            out.append("\"header\": null");
-        } else {
-            header(message.header);
-        }
-        out.append(",\n").append(INDENT);
-        characteristics(message.characteristics, INDENT);
-        out.append("\n}");
-    }
-
-    private void header(Header header) {
-        out.append("\"header\": {\n");
-        member("contentType").text(header.mediaType());
-        nextMember("contentTypeCode").out.append(header.contentType);
-        nextMember("headerLength").out.append(header.headerLength);
-        nextMember("bodyLength").out.append(header.bodyLength);
-        if (header.hasSec()) {
-            nextMember("sec").text(header.secName());
-            nextMember("secCode").out.append(header.sec);
-        }
-        if (header.hasMac()) {
-            nextMember("mac").text(header.mac);
-        }
-        out.append('\n').append(INDENT).append('}');
-    }
-
-    private JsonWriter nextMember(String name) {
-        out.append(",\n");
-        return member(name);
-    }
-
-    private JsonWriter member(String name) {
-        out.append(INDENT).append(INDENT);
-        text(name);
-        out.append(": ");
+    /** An object all of which stands on one line. */
+    JsonWriter beginFlatObject() {
+        beginObject();
+        flatFrom = Math.min(flatFrom, open.length());
         return this;
     }
 
-    /** Recursion ends at a port of a physical proxy, four levels down. */
-    private void characteristics(List<Characteristic> characteristics, String indent) {
-        String inner = indent + INDENT + INDENT;
-        array(
-                "characteristics",
-                characteristics,
-                indent,
-                characteristic -> {
-                    out.append("{\n").append(inner).append("\"type\": ");
-                    text(characteristic.type);
-                    out.append(",\n").append(inner);
-                    array("parms", characteristic.parms, inner, this::parm);
-                    out.append(",\n").append(inner);
-                    characteristics(characteristic.characteristics, inner);
-                    out.append('\n').append(indent).append(INDENT).append('}');
-                });
+    JsonWriter beginArray() {
+        return begin('[', ']');
     }
 
-    private void parm(Characteristic.Parm parm) {
-        out.append("{\"name\": ");
-        text(parm.name);
-        out.append(", \"value\": ");
-        if (parm.value == null) {
-            out.append("null");
-        } else {
-            text(parm.value);
+    /** Ends the innermost object or array; a line ends behind the outermost one. */
+    JsonWriter end() {
+        int last = open.length() - 1;
+        char bracket = open.charAt(last);
+        boolean wasFlat = isFlat();
+        open.setLength(last);
+        if (open.length() < flatFrom) {
+            flatFrom = Integer.MAX_VALUE;
         }
-        out.append('}');
+        if (!isFirst && !wasFlat) {
+            out.append('\n');
+            indent();
+        }
+        out.append(bracket);
+        isFirst = false;
+        if (open.length() == 0) {
+            out.append('\n');
+            isFirst = true;
+        }
+        return this;
     }
 
-    /** A member that is an array, with an element a line. */
-    private <T> void array(String name, List<T> elements, String indent, Consumer<T> write) {
-        text(name);
-        out.append(": [");
-        String separator = "\n";
-        for (T element : elements) {
-            out.append(separator).append(indent).append(INDENT);
-            write.accept(element);
-            separator = ",\n";
-        }
-        if (!elements.isEmpty()) {
-            out.append('\n').append(indent);
-        }
-        out.append(']');
+    int depth() {
+        return open.length();
     }
 
-    /** A JSON string; a surrogate without a partner is escaped, as UTF-8 has no place for it. */
-    private void text(String text) {
+    /** Ends what has been begun since there were so many objects and arrays open. */
+    void endTo(int depth) {
+        if (isNamed) {
+            nothing();
+        }
+        while (open.length() > depth) {
+            end();
+        }
+    }
+
+    JsonWriter name(String name) {
+        next();
+        string(name);
+        out.append(": ");
+        isNamed = true;
+        return this;
+    }
+
+    JsonWriter member(String name, String value) {
+        return name(name).text(value);
+    }
+
+    JsonWriter member(String name, long value) {
+        return name(name).number(value);
+    }
+
+    JsonWriter member(String name, boolean value) {
+        name(name).next();
+        out.print(value);
+        return this;
+    }
+
+    JsonWriter nullMember(String name) {
+        return name(name).nothing();
+    }
+
+    /** A string, or null. */
+    JsonWriter text(String text) {
+        if (text == null) {
+            return nothing();
+        }
+        next();
+        string(text);
+        return this;
+    }
+
+    private JsonWriter number(long number) {
+        next();
+        out.print(number);
+        return this;
+    }
+
+    private JsonWriter nothing() {
+        next();
+        out.append("null");
+        return this;
+    }
+
+    private JsonWriter begin(char bracket, char closing) {
+        next();
+        out.append(bracket);
+        open.append(closing);
+        isFirst = true;
+        return this;
+    }
+
+    /** Whatever stands between one value and the next. */
+    private void next() {
+        if (isNamed) {
+            isNamed = false;
+            return;
+        }
+        if (open.length() > 0 && isFlat()) {
+            out.append(isFirst ? "" : ", ");
+        } else if (open.length() > 0) {
+            separate();
+            indent();
+            isSeparated = false;
+        }
+        isFirst = false;
+    }
+
+    /** Ends the line in front of a value that is going to follow, for something to stand between. */
+    void separate() {
+        if (open.length() > 0 && !isFlat() && !isSeparated) {
+            out.append(isFirst ? "\n" : ",\n");
+            isSeparated = true;
+        }
+    }
+
+    private boolean isFlat() {
+        return onOneLine || open.length() >= flatFrom;
+    }
+
+    private void indent() {
+        for (int i = Math.min(open.length(), DEEPEST); i > 0; --i) {
+            out.append(INDENT);
+        }
+    }
+
+    private void string(String text) {
+        StringBuilder escaped = new StringBuilder();
         out.append('"');
-        for (int i = 0; i < text.length(); i += Character.charCount(text.codePointAt(i))) {
+        int written = 0;
+        for (int i = 0; i < text.length(); ) {
             int codePoint = text.codePointAt(i);
-            if (codePoint == '"' || codePoint == '\\') {
-                out.append('\\').append((char) codePoint);
-            } else if (codePoint == '\n') {
-                out.append("\\n");
-            } else if (codePoint == '\r') {
-                out.append("\\r");
-            } else if (codePoint == '\t') {
-                out.append("\\t");
-            } else if (Character.isISOControl(codePoint)
-                    || Character.getType(codePoint) == Character.SURROGATE) {
-                out.append(String.format("\\u%04x", codePoint));
-            } else {
-                out.appendCodePoint(codePoint);
+            int next = i + Character.charCount(codePoint);
+            boolean isQuoted = codePoint == '"' || codePoint == '\\';
+            if (isQuoted || !Visible.isVisible(codePoint)) {
+                out.write(text, written, i - written);
+                escaped.setLength(0);
+                if (isQuoted) {
+                    escaped.append('\\').append((char) codePoint);
+                } else {
+                    escape(escaped, codePoint, text, i, next);
+                }
+                out.append(escaped);
+                written = next;
             }
+            i = next;
         }
+        out.write(text, written, text.length() - written);
         out.append('"');
+    }
+
+    private static void escape(StringBuilder to, int codePoint, String text, int from, int end) {
+        int known = "\n\r\t".indexOf(codePoint);
+        if (known >= 0) {
+            to.append('\\').append("nrt".charAt(known));
+        } else {
+            Visible.escape(to, text, from, end);
+        }
     }
 }

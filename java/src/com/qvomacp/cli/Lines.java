@@ -15,8 +15,8 @@ final class Lines {
         List<String> lines = new ArrayList<>();
         StringBuilder line = new StringBuilder();
         for (String word : text.split(" ", -1)) {
-            int wanted = Visible.columns(word) + (line.length() == 0 ? 0 : 1);
-            if (line.length() > 0 && Visible.columns(line.toString()) + wanted > columns) {
+            int wanted = Visible.columns(word, 0, columns) + (line.length() == 0 ? 0 : 1);
+            if (line.length() > 0 && Visible.columns(line, 0, columns) + wanted > columns) {
                 lines.add(line.toString());
                 line.setLength(0);
             }
@@ -24,24 +24,26 @@ final class Lines {
                 line.append(' ');
             }
             line.append(word);
-            while (Visible.columns(line.toString()) > columns) {
-                int end = cut(line, columns);
-                lines.add(line.substring(0, end));
-                line.delete(0, end);
+            int start = 0;
+            while (Visible.columns(line, start, columns) > columns) {
+                int end = cut(line, start, columns);
+                lines.add(line.substring(start, end));
+                start = end;
             }
+            line.delete(0, start);
         }
         lines.add(line.toString());
         return lines;
     }
 
-    /** Where a line is cut that is too wide; behind one character at least. */
-    private static int cut(StringBuilder line, int columns) {
+    /** Where a line is cut that is too wide from a place on; behind one character at least. */
+    private static int cut(CharSequence line, int start, int columns) {
         int used = 0;
-        int end = 0;
+        int end = start;
         while (end < line.length()) {
-            int codePoint = line.codePointAt(end);
+            int codePoint = Character.codePointAt(line, end);
             used += Visible.isWide(codePoint) ? 2 : 1;
-            if (used > columns && end > 0) {
+            if (used > columns && end > start) {
                 break;
             }
             end += Character.charCount(codePoint);

@@ -1,13 +1,20 @@
 package com.qvomacp.cli;
 
+import com.qvomacp.eng.omacp.ByteVisitor;
+import com.qvomacp.eng.omacp.Deviation;
+import com.qvomacp.eng.omacp.Item;
+import com.qvomacp.eng.omacp.Verdict;
+import java.io.PrintWriter;
 import java.util.Collections;
+import java.util.Iterator;
 import java.util.List;
 
 /**
  * Writes every byte of a message with what it means: its offset in the message and in the body, the
- * bytes, the meaning, indented as the elements nest. No line is wider than a terminal.
+ * bytes, the meaning, indented as the elements nest. Where the library reads otherwise, that stands
+ * below the bytes. No line is wider than a terminal.
  */
-final class Listing {
+final class Listing implements ByteVisitor {
     private static final int BYTES_PER_LINE = 8;
     private static final int BYTES_WIDTH = BYTES_PER_LINE * 3 - 1;
     private static final int INDENT = 2;
@@ -15,115 +22,214 @@ final class Listing {
     /** Deeper elements are indented no further. */
     private static final int DEEPEST = 8;
 
-    private final StringBuilder out = new StringBuilder();
+    /** Characters of a meaning that are shown. */
+    private static final int LONGEST = 160;
 
-    private final byte[] message;
+    private static final String UNREAD = "not read";
+    private static final String DIGITS = "0123456789ABCDEF";
+
+    private final PrintWriter out;
     private final Palette palette;
-    private final String offset;
-    private final int width;
+    private final byte[] message;
+    private final int bodyAt;
+    private final int digits;
 
-    /** The offset in the message and that in the body. */
+    /** Whether a push header stands in front of the body. */
     private final boolean hasTwoOffsets;
 
-    private Listing(Annotation annotation, Palette palette) {
-        this.message = annotation.message;
-        this.hasTwoOffsets = annotation.header != null;
+    /** Where what is told begins: the offsets of a header or of a body. */
+    private int start;
+
+    private boolean isBody;
+
+    /** Up to where bytes have been told, counted from {@link #start}. */
+    private int told;
+
+    private int depth;
+
+    /** What is still to be said, besides the meanings: the first of each, null behind the last. */
+    private Iterator<Item> otherwise = Collections.emptyIterator();
+
+    private Iterator<Deviation> deviations = Collections.emptyIterator();
+    private Item nextOtherwise;
+    private Deviation nextDeviation;
+
+    /** Where the library stops, counted from {@link #start}; -1 where it does not. */
+    private int stop = -1;
+
+    private String stopReason;
+
+    private Listing(PrintWriter out, Palette palette, Reading reading) {
+        this.out = out;
         this.palette = palette;
-        int digits = message.length > 0x10000 ? 6 : 4;
-        this.offset = "%0" + digits + "X";
-        this.width = digits;
+        this.message = reading.held.bytes;
+        this.bodyAt = reading.bodyAt();
+        this.hasTwoOffsets = reading.header != null;
+        this.digits = message.length > 0x10000 ? 6 : 4;
     }
 
-    static String write(Annotation annotation, Palette palette) {
-        Listing listing = new Listing(annotation, palette);
-        listing.title();
-        if (annotation.header != null) {
-            listing.section(annotation.header, 0, false);
+    static void write(PrintWriter out, Palette palette, Reading reading) {
+        Listing listing = new Listing(out, palette, reading);
+        listing.title(reading.held.isPush);
+        Verdict verdict = reading.verdict;
+        boolean isRefused = !verdict.isAccepted();
+        if (reading.header != null) {
+            if (isRefused && verdict.isHeaderRefused()) {
+                listing.stopsAt(verdict);
+            }
+            reading.header.describe(listing);
+            listing.end(reading.bodyAt());
         }
-        if (annotation.body != null) {
-            listing.section(annotation.body, annotation.bodyAt(), annotation.header != null);
+        listing.start = reading.bodyAt();
+        listing.isBody = reading.header != null || !reading.held.isPush;
+        listing.told = 0;
+        if (reading.document != null) {
+            if (!verdict.isHeaderRefused()) {
+                if (isRefused) {
+                    listing.stopsAt(verdict);
+                }
+                listing.otherwise = verdict.readOtherwise().iterator();
+            }
+            listing.deviations = reading.document.deviations().iterator();
+            listing.nextOtherwise();
+            listing.nextDeviation();
+            reading.document.describe(listing);
         }
-        return listing.out.toString();
+        listing.end(reading.held.bytes.length - listing.start);
     }
 
-    private void title() {
+    private void stopsAt(Verdict verdict) {
+        stop = verdict.offset();
+        stopReason = "the library refuses: " + verdict.reason();
+    }
+
+    private void nextOtherwise() {
+        nextOtherwise = otherwise.hasNext() ? otherwise.next() : null;
+    }
+
+    private void nextDeviation() {
+        nextDeviation = deviations.hasNext() ? deviations.next() : null;
+    }
+
+    private void title(boolean isPush) {
         StringBuilder title = new StringBuilder();
-        pad(title, hasTwoOffsets ? "msg" : "body", width + 1);
-        pad(title, hasTwoOffsets ? "body" : "", hasTwoOffsets ? width + 2 : 1);
+        pad(title, hasTwoOffsets ? "msg" : isPush ? "at" : "body", digits + 1);
+        pad(title, hasTwoOffsets ? "body" : "", hasTwoOffsets ? digits + 2 : 1);
         pad(title, "bytes", BYTES_WIDTH + 2);
         out.append(palette.bold(title + "meaning")).append('\n');
     }
 
-    private void section(Annotation.Section section, int start, boolean isBody) {
-        for (Note note : section.notes) {
-            note(note, start, isBody);
+    @Override
+    public void visit(int offset, int length, int nesting, String meaning) {
+        depth = nesting;
+        while (nextOtherwise != null && nextOtherwise.offset() <= offset) {
+            row(offset, 0, "the library reads this otherwise");
+            nextOtherwise();
+        }
+        while (nextDeviation != null && nextDeviation.offset() < offset + length) {
+            row(offset, 0, "departs from the format: " + nextDeviation.sentence());
+            nextDeviation();
+        }
+        row(offset, length, meaning);
+        told = offset + length;
+        if (stop >= 0 && stop < told) {
+            refused();
         }
     }
 
-    private void note(Note note, int start, boolean isBody) {
-        int column = width + 1 + (hasTwoOffsets ? width + 2 : 1) + BYTES_WIDTH + 2;
-        int indent = Math.min(note.depth, DEEPEST) * INDENT;
-        List<String> texts = Lines.of(note.text, Lines.WIDTH - column - indent);
-        int rows = Math.max((note.length + BYTES_PER_LINE - 1) / BYTES_PER_LINE, texts.size());
-        for (int row = 0; row < rows; ++row) {
-            int from = note.offset + row * BYTES_PER_LINE;
-            int to = Math.min(from + BYTES_PER_LINE, note.offset + note.length);
-            StringBuilder line = new StringBuilder();
-            StringBuilder offsets = new StringBuilder();
-            boolean hasBytes = from < to;
-            pad(offsets, hasBytes ? String.format(offset, start + from) : "", width + 1);
-            if (hasTwoOffsets) {
-                pad(offsets, hasBytes && isBody ? String.format(offset, from) : "", width + 2);
-            } else {
-                offsets.append(' ');
-            }
-            line.append(palette.dim(offsets.toString()));
-            pad(line, hexadecimal(message, start + from, start + to), BYTES_WIDTH + 2, line.length());
-            String text = row < texts.size() ? texts.get(row) : "";
-            if (text.isEmpty() && note.style == Note.Style.UNREAD) {
-                text = characters(message, start + from, start + to);
-            }
-            if (!text.isEmpty()) {
-                pad(line, "", indent, line.length());
-                line.append(palette.of(note.style, text));
-            }
-            out.append(trimmed(line)).append('\n');
+    /** Tells what is left up to the end. */
+    private void end(int end) {
+        if (told < end) {
+            visit(told, end - told, 0, UNREAD);
+        }
+        if (stop >= 0) {
+            refused();
         }
     }
 
-    private static String trimmed(StringBuilder line) {
-        int end = line.length();
-        while (end > 0 && line.charAt(end - 1) == ' ') {
-            --end;
+    private void refused() {
+        stop = -1;
+        row(told, 0, stopReason);
+    }
+
+    private void row(int offset, int length, String meaning) {
+        int column = digits + 1 + (hasTwoOffsets ? digits + 2 : 1) + BYTES_WIDTH + 2;
+        int indent = Math.min(depth, DEEPEST) * INDENT;
+        List<String> texts = Lines.of(shown(meaning), Lines.WIDTH - column - indent);
+        int lines = Math.max((length + BYTES_PER_LINE - 1) / BYTES_PER_LINE, texts.size());
+        boolean isUnread = meaning.equals(UNREAD);
+        for (int i = 0; i < lines; ++i) {
+            int from = offset + Math.min(i * BYTES_PER_LINE, length);
+            int to = Math.min(from + BYTES_PER_LINE, offset + length);
+            String text = i < texts.size() ? texts.get(i) : "";
+            if (i > 0 && isUnread) {
+                text = characters(from, to);
+            }
+            line(from, to, indent, length == 0 ? palette.error(text) : painted(meaning, text));
         }
-        return line.substring(0, end);
     }
 
     /** Bytes that were not read, as characters where they are ones of ASCII. */
-    private static String characters(byte[] bytes, int from, int to) {
+    private String characters(int from, int to) {
         StringBuilder text = new StringBuilder("|");
-        for (int i = from; i < to; ++i) {
-            text.append(bytes[i] >= ' ' && bytes[i] <= '~' ? (char) bytes[i] : '.');
+        for (int i = start + from; i < start + to; ++i) {
+            text.append(message[i] >= ' ' && message[i] <= '~' ? (char) message[i] : '.');
         }
         return text.append('|').toString();
+    }
+
+    private static String shown(String meaning) {
+        boolean isLong = meaning.length() > LONGEST;
+        return isLong ? Visible.of(meaning.substring(0, LONGEST)) + "..." : Visible.of(meaning);
+    }
+
+    private String painted(String meaning, String text) {
+        return meaning.indexOf('"') >= 0 ? palette.text(text) : text;
+    }
+
+    private void line(int from, int to, int indent, String text) {
+        StringBuilder offsets = new StringBuilder();
+        boolean hasBytes = from < to;
+        pad(offsets, hasBytes ? hexadecimal(start + from, digits) : "", digits + 1);
+        if (hasTwoOffsets) {
+            pad(offsets, hasBytes && isBody ? hexadecimal(from, digits) : "", digits + 2);
+        } else {
+            offsets.append(' ');
+        }
+        StringBuilder line = new StringBuilder();
+        pad(line, hexadecimal(message, start + from, start + to), BYTES_WIDTH + 2);
+        if (text.isEmpty()) {
+            line.setLength(Math.max(3 * (to - from) - 1, 0));
+        } else {
+            pad(line, "", indent);
+            line.append(text);
+        }
+        out.append(palette.dim(offsets.toString())).append(line).append('\n');
+    }
+
+    /** A number with at least so many digits. */
+    static String hexadecimal(int number, int atLeast) {
+        StringBuilder text = new StringBuilder(Integer.toHexString(number).toUpperCase());
+        while (text.length() < atLeast) {
+            text.insert(0, '0');
+        }
+        return text.toString();
     }
 
     static String hexadecimal(byte[] bytes, int from, int to) {
         StringBuilder text = new StringBuilder();
         for (int i = from; i < to; ++i) {
-            text.append(i == from ? "" : " ").append(String.format("%02X", bytes[i]));
+            text.append(i == from ? "" : " ");
+            text.append(DIGITS.charAt(bytes[i] >> 4 & 0xF)).append(DIGITS.charAt(bytes[i] & 0xF));
         }
         return text.toString();
     }
 
-    private static void pad(StringBuilder to, String text, int width) {
-        pad(to, text, width, to.length());
-    }
-
-    /** Appends text and blanks, so that {@code width} columns are used behind {@code start}. */
-    private static void pad(StringBuilder to, String text, int width, int start) {
+    /** Appends a text, and blanks until it is so wide. */
+    static void pad(StringBuilder to, String text, int width) {
         to.append(text);
-        int missing = start + width - to.length();
-        to.append(String.join("", Collections.nCopies(Math.max(missing, 0), " ")));
+        for (int i = text.length(); i < width; ++i) {
+            to.append(' ');
+        }
     }
 }

@@ -3,37 +3,23 @@ package com.qvomacp.cli;
 import java.io.FileDescriptor;
 import java.io.FileInputStream;
 import java.io.FileOutputStream;
-import java.io.FilterOutputStream;
-import java.io.IOException;
 import java.io.InputStream;
 import java.io.OutputStream;
-import java.io.OutputStreamWriter;
 import java.io.PrintWriter;
-import java.nio.charset.StandardCharsets;
 import java.util.Arrays;
 import picocli.AutoComplete;
 import picocli.CommandLine;
 import picocli.CommandLine.Command;
 import picocli.CommandLine.IVersionProvider;
-import picocli.CommandLine.Model.CommandSpec;
 import picocli.CommandLine.Option;
 import picocli.CommandLine.ParameterException;
-import picocli.CommandLine.Spec;
+import picocli.CommandLine.ParseResult;
 
-/**
- * The command-line program: shows and checks pushed provisioning messages.
- *
- * <p>The values are those that the natives of {@code com.qvomacp.eng.parser} answer. Where these do
- * not answer what the message holds, neither does this program: the SERVICE of a proxy's port is
- * named by its place in the list, a BEARER given as text shows the NAP-ADDRESS of its access point,
- * the text of a NAP-ADDRTYPE is not told, an AAUTHLEVEL that is not recognised is missing, and only
- * the first ROAMING of the first application is there. Characteristics stand by kind, those of one
- * kind in the order of the message.
- */
+/** The command-line program: shows, checks and makes pushed provisioning messages. */
 @Command(
         name = "omacp",
         versionProvider = Main.Version.class,
-        description = "Shows what pushed OMA Client Provisioning messages set, and checks them.",
+        description = "Shows what pushed OMA Client Provisioning messages set, checks and makes them.",
         synopsisHeading = "Usage: ",
         customSynopsis = {"omacp [show] [OPTION...] [FILE...]", "       omacp COMMAND ..."},
         commandListHeading = "%nCommands:%n",
@@ -45,21 +31,12 @@ import picocli.CommandLine.Spec;
         },
         exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
-            "0:every message was shown, or its MAC is right",
-            "1:a message is refused, or its MAC is not right",
+            "0:every message was shown or written, or its MAC is right",
+            "1:a message or a document is refused, or its MAC is not right",
             "2:wrong usage, a message cannot be read, the output cannot be written,"
-                    + " or the library cannot be loaded"
+                    + " or the library that is asked cannot be loaded"
         })
-public final class Main implements Runnable {
-    static final int DONE = 0;
-    static final int REFUSED = 1;
-    static final int FAILED = 2;
-
-    final InputStream in;
-    final Terminal terminal;
-
-    @Spec private CommandSpec spec;
-
+public final class Main {
     @Option(
             names = {"-h", "--help"},
             usageHelp = true,
@@ -72,10 +49,7 @@ public final class Main implements Runnable {
             description = "Show the version and exit.")
     private boolean version;
 
-    private Main(InputStream in, Terminal terminal) {
-        this.in = in;
-        this.terminal = terminal;
-    }
+    private Main() {}
 
     /**
      * Runs the program and ends the virtual machine with its exit status.
@@ -110,42 +84,65 @@ public final class Main implements Runnable {
             OutputStream err,
             Terminal terminal,
             String... arguments) {
-        Pipe pipe = new Pipe(out);
-        PrintWriter output = new PrintWriter(new OutputStreamWriter(pipe, StandardCharsets.UTF_8));
-        PrintWriter errors = new PrintWriter(new OutputStreamWriter(err, StandardCharsets.UTF_8));
-        CommandLine program = program(new Main(in, terminal));
-        int status =
-                program.setOut(output).setErr(errors).execute(withCommand(program, arguments));
-        if (output.checkError()) {
-            if (!pipe.isBroken()) {
-                errors.println("omacp: the output cannot be written");
+        Console console = new Console(in, out, err, terminal);
+        try {
+            run(console, arguments);
+            console.out.flush();
+        } catch (Output.ClosedError closed) {
+            console.raise(Console.FAILED);
+            if (!closed.isBrokenPipe()) {
+                console.err.println("omacp: the output cannot be written");
             }
-            status = FAILED;
         }
-        errors.flush();
-        return status;
+        console.err.flush();
+        return console.status();
+    }
+
+    private static void run(Console console, String[] arguments) {
+        CommandLine program = program().setOut(console.out).setErr(console.err);
+        try {
+            ParseResult parsed = program.parseArgs(withCommand(program, arguments));
+            if (CommandLine.printHelpIfRequested(parsed)) {
+                return;
+            }
+            CommandLine command = parsed.subcommand().commandSpec().commandLine();
+            try {
+                run(console, command.getCommandSpec().userObject());
+            } catch (UsageException wrong) {
+                throw new ParameterException(command, wrong.getMessage());
+            }
+        } catch (ParameterException wrong) {
+            explainUsage(console, wrong);
+        }
+    }
+
+    private static void run(Console console, Object command) {
+        if (command instanceof Job) {
+            ((Job) command).run(console);
+        } else {
+            console.out.print(AutoComplete.bash("omacp", program()));
+        }
     }
 
     static CommandLine program() {
-        return program(new Main(null, Terminal.NONE));
-    }
-
-    private static CommandLine program(Main main) {
-        return new CommandLine(main)
-                .addSubcommand(new Show(main))
-                .addSubcommand(new Verify(main))
+        // A file's name may begin with @, and what stands in the file is nobody's command line.
+        return new CommandLine(new Main())
+                .addSubcommand(new Show())
+                .addSubcommand(Choices.command(new Verify()))
+                .addSubcommand(Choices.command(new Encode()))
                 .addSubcommand(new Completion())
-                .setParameterExceptionHandler(Main::explainUsage);
+                .setExpandAtFiles(false)
+                .setCaseInsensitiveEnumValuesAllowed(true);
     }
 
     /** Says in a few lines what is wrong with a command line. */
-    private static int explainUsage(ParameterException wrong, String[] arguments) {
+    private static void explainUsage(Console console, ParameterException wrong) {
         CommandLine command = wrong.getCommandLine();
-        PrintWriter err = command.getErr();
-        err.println("omacp: " + wrong.getMessage());
+        PrintWriter err = console.err;
+        err.println("omacp: " + Visible.of(wrong.getMessage()));
         err.print(command.getHelp().synopsisHeading() + command.getHelp().synopsis(0));
         err.println('"' + command.getCommandSpec().qualifiedName() + " --help\" tells more.");
-        return FAILED;
+        console.raise(Console.FAILED);
     }
 
     /** The arguments with {@code show} in front, where no command or question is. */
@@ -160,34 +157,6 @@ public final class Main implements Runnable {
         withShow[0] = "show";
         System.arraycopy(arguments, 0, withShow, 1, arguments.length);
         return withShow;
-    }
-
-    /** An output that notices when whoever reads it has seen enough, which is no news to him. */
-    private static final class Pipe extends FilterOutputStream {
-        private boolean broken;
-
-        Pipe(OutputStream out) {
-            super(out);
-        }
-
-        boolean isBroken() {
-            return broken;
-        }
-
-        @Override
-        public void write(byte[] bytes, int from, int count) throws IOException {
-            try {
-                out.write(bytes, from, count);
-            } catch (IOException failed) {
-                broken = "Broken pipe".equals(failed.getMessage());
-                throw failed;
-            }
-        }
-    }
-
-    @Override
-    public void run() {
-        spec.commandLine().usage(spec.commandLine().getOut());
     }
 
     /** The version that the jar states. */
@@ -206,19 +175,11 @@ public final class Main implements Runnable {
             optionListHeading = "%nOptions:%n",
             footerHeading = "%n",
             footer = {"Use it by: source <(omacp completion)"})
-    private static final class Completion implements Runnable {
-        @Spec private CommandSpec spec;
-
+    private static final class Completion {
         @Option(
                 names = {"-h", "--help"},
                 usageHelp = true,
                 description = "Show this help and exit.")
         private boolean help;
-
-        @Override
-        public void run() {
-            CommandLine own = spec.commandLine();
-            own.getOut().print(AutoComplete.bash("omacp", own.getParent()));
-        }
     }
 }

@@ -25,19 +25,8 @@ final class Palette {
         return painted("\u001b[1m", text);
     }
 
-    String of(Note.Style style, String text) {
-        switch (style) {
-            case ELEMENT:
-                return painted("\u001b[36m", text);
-            case TEXT:
-                return painted("\u001b[32m", text);
-            case UNREAD:
-                return dim(text);
-            case REFUSED:
-                return error(text);
-            default:
-                return text;
-        }
+    String text(String text) {
+        return painted("\u001b[32m", text);
     }
 
     private String painted(String color, String text) {

@@ -1,8 +1,12 @@
 package com.qvomacp.cli;
 
+import com.qvomacp.eng.omacp.EncodeOptions;
+import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.ProvisioningEncoder;
+import com.qvomacp.eng.omacp.ProvisioningException;
+import com.qvomacp.eng.omacp.PushHeader;
 import picocli.CommandLine.Command;
 import picocli.CommandLine.Option;
-import picocli.CommandLine.ParameterException;
 
 /** Shows what messages say. */
 @Command(
@@ -13,112 +17,176 @@ import picocli.CommandLine.ParameterException;
         optionListHeading = "%nOptions:%n",
         footerHeading = "%n",
         footer = {
-            "Values are shown as the library answers them: the SERVICE of a proxy's port by its"
-                    + " place in the list, a BEARER given as text by the NAP-ADDRESS of its access"
-                    + " point. A message that is refused is explained."
+            "A message that the native library refuses is shown all the same, and the refusal is"
+                    + " explained."
         },
         exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
             "0:every message was shown",
             "1:a message is refused",
             "2:wrong usage, a message cannot be read, the output cannot be written,"
-                    + " or the library cannot be loaded"
+                    + " or the library that is asked cannot be loaded"
         })
-final class Show extends Job {
-    @Option(names = "--json", description = "Print JSON: an object, or an array for several files.")
-    private boolean json;
-
+final class Show extends JsonJob {
     @Option(names = "--header", description = "Show the push header alone, whatever the body is.")
     private boolean header;
 
     @Option(names = "--bytes", description = "List every byte with what it means.")
     private boolean bytes;
 
+    @Option(
+            names = "--answers",
+            description =
+                    "Ask the native library as well, and mark where it answers otherwise than the"
+                            + " message says.")
+    private boolean answers;
+
+    @Option(names = "--xml", description = "Print the document as XML, from which encode makes it.")
+    private boolean xml;
+
     private int shown;
-
-    /** The last element of the JSON array, which waits for what separates it from the next. */
-    private String waiting = "";
-
-    Show(Main main) {
-        super(main);
-    }
 
     @Override
     void begin() {
-        if (bytes && (json || header)) {
-            throw new ParameterException(
-                    spec.commandLine(), "--bytes goes with neither --json nor --header");
+        if (bytes && (isJson() || header || answers)) {
+            throw new UsageException("--bytes goes with none of --json, --header and --answers");
         }
-        if (json && hasSeveralFiles()) {
-            out().print("[\n");
+        if (xml && (bytes || isJson() || header || answers)) {
+            throw new UsageException("--xml goes with no other form, nor with --answers");
         }
+        if (answers && header) {
+            throw new UsageException("--answers goes not with --header");
+        }
+        super.begin();
     }
 
     @Override
-    void end() {
-        if (json && hasSeveralFiles()) {
-            out().print(waiting + "\n]\n");
-        }
-    }
-
-    @Override
-    void run(Source source) throws RefusedException {
-        MessageReader reader = new MessageReader();
+    void run(Held held) {
         if (header) {
-            if (!source.isPush) {
-                fail(Main.REFUSED, source.name, "has no push header");
-                return;
+            showHeader(held);
+            return;
+        }
+        Reading reading = Reading.of(held, limit());
+        if (bytes) {
+            console.raise(reading.status());
+            list(reading);
+            if (!reading.isAccepted()) {
+                console.out.print("\n" + Refusal.of(reading).write("", outPalette()));
             }
-            Header answered = reader.readHeader(source.bytes);
-            print(source.name, json ? JsonWriter.write(answered) : TextWriter.write(answered));
-        } else if (bytes) {
-            list(source, reader);
+        } else if (isJson()) {
+            explain(reading);
+            json(reading);
         } else {
-            Message message = reader.read(source);
-            print(source.name, json ? JsonWriter.write(message) : TextWriter.write(message));
+            if (xml) {
+                xml(reading);
+            } else {
+                text(reading);
+            }
+            explain(reading);
         }
     }
 
-    /** The listing, and below it why the message is refused, if it is. */
-    private void list(Source source, MessageReader reader) {
-        String listing = Listing.write(source.annotation(), outPalette());
+    private void xml(Reading reading) {
+        if (reading.message == null) {
+            return;
+        }
         try {
-            reader.read(source);
-        } catch (RefusedException refused) {
-            raise(Main.REFUSED);
-            Explanation explanation = Explanation.of(source, refused.headerTaken);
-            listing += "\n" + explanation.write("", outPalette());
+            String text = ProvisioningEncoder.of(reading.message, EncodeOptions.NONE).xml();
+            title(reading.held.name);
+            console.out.print(text);
+        } catch (EncodingException none) {
+            refuse(reading.held.name, none);
         }
-        print(source.name, listing);
     }
 
-    /** Prints what is shown of a file; of several, each under its name. */
-    private void print(String name, String text) {
-        if (!hasSeveralFiles()) {
-            out().print(text);
-        } else if (json) {
-            out().print(shown == 0 ? "" : waiting + ",\n");
-            waiting = JsonWriter.element(name, text);
+    private void list(Reading reading) {
+        title(reading.held.name);
+        Listing.write(console.out, outPalette(), reading);
+    }
+
+    @Override
+    void unknown(Held held) {
+        if (bytes && held.bytes != null) {
+            list(Reading.of(held, limit()));
+        }
+    }
+
+    private void showHeader(Held held) {
+        if (!held.isPush) {
+            fail(Console.REFUSED, held.name, "has no push header");
+            return;
+        }
+        PushHeader read;
+        try {
+            read = PushHeader.parse(held.bytes);
+        } catch (ProvisioningException refused) {
+            console.raise(Console.REFUSED);
+            complain(Refusal.of(held, refused, 0).write(startOf(held.name), errPalette()));
+            failed(held.name, refused.getMessage());
+            return;
+        }
+        int bodyLength = held.bytes.length - read.length();
+        if (isJson()) {
+            beginObject(held.name);
+            new MessageJson(writer).header(read, bodyLength);
+            endObject();
         } else {
-            out().print(shown == 0 ? "" : "\n");
-            out().println(outPalette().bold("==> " + Visible.of(name) + " <=="));
-            out().print(text);
+            title(held.name);
+            new TextWriter(console.out, outPalette()).header(read, bodyLength);
+        }
+    }
+
+    private void text(Reading reading) {
+        if (reading.document == null && reading.header == null) {
+            return;
+        }
+        title(reading.held.name);
+        TextWriter text = new TextWriter(console.out, outPalette());
+        int bodyLength = reading.held.bytes.length - reading.bodyAt();
+        if (reading.header == null) {
+            text.bodyAlone(bodyLength);
+        } else {
+            text.header(reading.header, bodyLength);
+        }
+        if (reading.document != null) {
+            text.document(reading.document);
+        }
+        if (answers) {
+            answers(reading, new AnswerText(console.out, outPalette()));
+        }
+    }
+
+    private void json(Reading reading) {
+        beginObject(reading.held.name);
+        int depth = writer.depth();
+        try {
+            new MessageJson(writer).message(reading);
+            if (answers) {
+                answers(reading, new AnswerJson(writer));
+            }
+        } finally {
+            writer.endTo(depth);
+        }
+        endObject();
+    }
+
+    /** Asks the library; where it cannot be loaded, that is said. */
+    private void answers(Reading reading, Comparison.Listener listener) {
+        try {
+            Comparison.of(reading, listener);
+        } catch (UnsatisfiedLinkError missing) {
+            console.raise(Console.FAILED);
+            complain(startOf(reading.held.name) + Visible.of(missing.getMessage()) + "\n");
+            listener.unanswered("the library cannot be loaded");
+        }
+    }
+
+    /** Of several files, each stands under its name. */
+    private void title(String name) {
+        if (isOneOfSeveral()) {
+            console.out.print(shown == 0 ? "" : "\n");
+            console.out.println(outPalette().bold("==> " + Visible.of(name) + " <=="));
         }
         ++shown;
-    }
-
-    @Override
-    void refused(Explanation explanation) {
-        complain(explanation);
-        if (json) {
-            print(explanation.source.name, JsonWriter.write(explanation));
-        }
-    }
-
-    @Override
-    void failed(String name, String reason) {
-        if (json) {
-            print(name, JsonWriter.error(reason));
-        }
     }
 }

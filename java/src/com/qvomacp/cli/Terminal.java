@@ -8,7 +8,7 @@ import java.util.Map;
 
 /** What the outputs of the program are connected to. */
 final class Terminal {
-    static final Terminal NONE = new Terminal(false, false);
+    static final Terminal NONE = new Terminal(false, false, false);
 
     /** When colours are wanted. */
     enum Color {
@@ -20,17 +20,20 @@ final class Terminal {
     private final boolean out;
     private final boolean err;
 
-    Terminal(boolean out, boolean err) {
+    /** Whether the output is for people's eyes, in colours or without. */
+    final boolean isScreen;
+
+    Terminal(boolean out, boolean err, boolean isScreen) {
         this.out = out;
         this.err = err;
+        this.isScreen = isScreen;
     }
 
     /** The terminal of this process, as its environment wants it used. */
     static Terminal ofProcess(Map<String, String> environment) {
-        if (!wantsColor(environment)) {
-            return NONE;
-        }
-        return new Terminal(isTerminal(1), isTerminal(2));
+        boolean isScreen = isTerminal(1);
+        boolean wantsColor = wantsColor(environment);
+        return new Terminal(wantsColor && isScreen, wantsColor && isTerminal(2), isScreen);
     }
 
     static boolean wantsColor(Map<String, String> environment) {

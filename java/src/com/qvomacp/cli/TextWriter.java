@@ -1,86 +1,183 @@
 package com.qvomacp.cli;
 
+import com.qvomacp.eng.omacp.Characteristic;
+import com.qvomacp.eng.omacp.ContentType;
+import com.qvomacp.eng.omacp.Deviation;
+import com.qvomacp.eng.omacp.HeaderField;
+import com.qvomacp.eng.omacp.Item;
+import com.qvomacp.eng.omacp.Other;
+import com.qvomacp.eng.omacp.Parameter;
+import com.qvomacp.eng.omacp.ProvisioningDocument;
+import com.qvomacp.eng.omacp.PushHeader;
+import java.io.PrintWriter;
+import java.util.Collections;
+import java.util.List;
+import java.util.Locale;
+
 /**
- * Writes a message for people: a block per characteristic, indented as they nest, values in a
- * column.
+ * Writes a message for people: its items in their order, indented as they nest, the values of a
+ * characteristic in a column.
  */
 final class TextWriter {
-    private static final int INDENT = 2;
+    static final int INDENT = 2;
     private static final int HEADER_COLUMN = 16;
 
-    private final StringBuilder out = new StringBuilder();
+    /** Deeper items are indented no further. */
+    private static final int DEEPEST = 16;
 
-    private TextWriter() {}
+    /** A wider name has its value two columns behind it. */
+    private static final int WIDEST = 32;
 
-    static String write(Message message) {
-        TextWriter writer = new TextWriter();
-        writer.header(message);
-        for (Characteristic characteristic : message.characteristics) {
-            writer.out.append('\n');
-            writer.characteristic(characteristic, 0);
-        }
-        return writer.out.toString();
+    private static final int DEVIATIONS = 8;
+
+    private final PrintWriter out;
+    private final Palette palette;
+
+    TextWriter(PrintWriter out, Palette palette) {
+        this.out = out;
+        this.palette = palette;
     }
 
-    /** Writes what the push header says, alone. */
-    static String write(Header header) {
-        TextWriter writer = new TextWriter();
-        writer.header(header);
-        return writer.out.toString();
+    /** Writes what the push header says. */
+    void header(PushHeader header, int bodyLength) {
+        ContentType type = header.contentType();
+        String code = type.code() < 0 ? "" : " (" + type.code() + ")";
+        fact("Content type", type.mediaType() + code);
+        fact("Header length", header.length() + " bytes");
+        fact("Body length", bodyLength + " bytes");
+        fields(type.parameters());
+        fields(header.fields());
     }
 
-    private void header(Message message) {
-        if (message.header == null) {
-            fact("Body length", message.bodyLength + " bytes, without a push header");
-        } else {
-            header(message.header);
+    private void fields(List<HeaderField> fields) {
+        for (HeaderField field : fields) {
+            fact(field.name(), field.value());
         }
     }
 
-    private void header(Header header) {
-        fact("Content type", header.mediaType() + " (" + header.contentType + ")");
-        fact("Header length", header.headerLength + " bytes");
-        fact("Body length", header.bodyLength + " bytes");
-        if (header.hasSec()) {
-            fact("SEC", Header.secShown(header.sec));
-        }
-        if (header.hasMac()) {
-            fact("MAC", header.mac);
-        }
+    void bodyAlone(int length) {
+        fact("Body length", length + " bytes, without a push header");
     }
 
     private void fact(String name, String value) {
-        line(0, HEADER_COLUMN, name, value);
+        line(0, HEADER_COLUMN, name, shown(value));
     }
 
-    /** Recursion ends at a port of a physical proxy, four levels down. */
-    private void characteristic(Characteristic characteristic, int indent) {
-        spaces(indent);
-        out.append(characteristic.type).append('\n');
+    void document(ProvisioningDocument document) {
+        // Where the values stand, by depth as far as items are indented.
+        int[] columns = new int[DEEPEST + 1];
+        columns[0] = column(document.children());
+        new Walk() {
+            private boolean wasCharacteristic = true;
+
+            @Override
+            void enter(Item item, int depth) {
+                boolean isCharacteristic = item instanceof Characteristic;
+                if (depth == 0) {
+                    if (isCharacteristic || wasCharacteristic) {
+                        out.append('\n');
+                    }
+                    wasCharacteristic = isCharacteristic;
+                }
+                int indent = Math.min(depth, DEEPEST);
+                if (item instanceof Parameter) {
+                    parameter((Parameter) item, indent * INDENT, columns[indent]);
+                } else {
+                    spaces(indent * INDENT);
+                    if (isCharacteristic) {
+                        String type = ((Characteristic) item).type();
+                        out.append(type == null ? palette.error("(no TYPE)") : Visible.of(type));
+                    } else {
+                        out.append(palette.error(describe((Other) item)));
+                    }
+                    out.append('\n');
+                }
+                if (!item.children().isEmpty()) {
+                    columns[Math.min(depth + 1, DEEPEST)] = column(item.children());
+                }
+            }
+        }.through(document.children());
+        deviations(document.deviations());
+    }
+
+    /** The column in which the values stand. */
+    static int column(List<Item> items) {
         int column = 0;
-        for (Characteristic.Parm parm : characteristic.parms) {
-            column = Math.max(column, Visible.of(parm.name).length() + INDENT);
+        for (Item item : items) {
+            if (item instanceof Parameter) {
+                String name = ((Parameter) item).name();
+                int width = name == null ? 0 : Visible.columns(name, 0, WIDEST);
+                column = Math.max(column, width <= WIDEST ? width + INDENT : 0);
+            }
         }
-        for (Characteristic.Parm parm : characteristic.parms) {
-            String value = parm.value == null ? "(set, value not answered)" : parm.value;
-            line(indent + INDENT, column, parm.name, value);
-        }
-        for (Characteristic child : characteristic.characteristics) {
-            characteristic(child, indent + INDENT);
+        return column;
+    }
+
+    private void parameter(Parameter parameter, int indent, int column) {
+        if (parameter.name() != null) {
+            line(indent, column, parameter.name(), shown(parameter.value()));
+        } else {
+            spaces(indent);
+            out.append(palette.error("(no NAME)"));
+            out.append(parameter.value() == null ? "" : "  " + Visible.value(parameter.value()));
+            out.append('\n');
         }
     }
 
-    private void line(int indent, int column, String name, String value) {
+    private static String describe(Other other) {
+        boolean isTrailing = other.kind() == Other.Kind.TRAILING;
+        StringBuilder text = new StringBuilder("(");
+        text.append(isTrailing ? other.length() + " bytes behind the document" : nameOf(other.kind()));
+        if (other.name() != null) {
+            text.append(' ').append(Visible.of(other.name()));
+        }
+        if (other.text() != null) {
+            text.append(' ').append(Visible.quoted(other.text()));
+        }
+        return text.append(')').toString();
+    }
+
+    private static String nameOf(Other.Kind kind) {
+        return kind.name().toLowerCase(Locale.ROOT);
+    }
+
+    private void deviations(List<Deviation> deviations) {
+        if (deviations.isEmpty()) {
+            return;
+        }
+        out.append('\n').append(palette.bold("Departs from the format:")).append('\n');
+        for (Deviation deviation : deviations.subList(0, Math.min(DEVIATIONS, deviations.size()))) {
+            String path = deviation.path().isEmpty() ? "" : ", " + deviation.path();
+            String text = deviation.sentence() + " (body offset " + deviation.offset() + path + ")";
+            String start = "- ";
+            for (String line : Lines.of(Visible.of(text), Lines.WIDTH - INDENT)) {
+                out.append(start).append(line).append('\n');
+                start = "  ";
+            }
+        }
+        if (deviations.size() > DEVIATIONS) {
+            int more = deviations.size() - DEVIATIONS;
+            out.append("- and " + more + " more, which --json lists\n");
+        }
+    }
+
+    /** Writes a name, and in its column the value as it is shown; null for none. */
+    void line(int indent, int column, String name, String shown) {
         String shownName = Visible.of(name);
         spaces(indent);
         out.append(shownName);
-        spaces(column - shownName.length());
-        out.append(Visible.of(value)).append('\n');
+        if (shown != null) {
+            spaces(Math.max(column - Visible.columns(shownName), INDENT));
+            out.append(shown);
+        }
+        out.append('\n');
+    }
+
+    private static String shown(String value) {
+        return value == null ? null : Visible.value(value);
     }
 
     private void spaces(int count) {
-        for (int i = 0; i < count; ++i) {
-            out.append(' ');
-        }
+        out.append(String.join("", Collections.nCopies(count, " ")));
     }
 }

@@ -4,52 +4,40 @@ import java.util.List;
 
 /**
  * How to authenticate towards an access point: a NAPAUTHINFO.
+ *
+ * <pre>{@code
+ * for (AccessPointAuthentication way : message.accessPoints().get(0).authentications()) {
+ *     System.out.println(way.type() + " as " + way.name());
+ * }
+ * }</pre>
  */
-public final class AccessPointAuthentication extends Characteristic {
-    private static final String[] NAMES = {"AUTHTYPE", "AUTHNAME", "AUTHSECRET"};
-
-    private final List<String> entities;
-
-    AccessPointAuthentication(String[] values, List<String> entities) {
-        super(NAMES, values, entities);
-        this.entities = entities;
+public final class AccessPointAuthentication extends TypedCharacteristic {
+    AccessPointAuthentication(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Tells the scheme.
-     *
-     * @return AUTHTYPE: {@code PAP}, {@code CHAP}, {@code HTTP-BASIC}, {@code HTTP-DIGEST}, {@code
-     *     WTLS-SS} or {@code MD5}; {@code NONE} for any other value; {@code null} when the message
-     *     does not set it
-     */
-    public String getType() {
+    /** {@return AUTHTYPE: the scheme, such as {@code PAP} or {@code CHAP}} */
+    public String type() {
         return value("AUTHTYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return AUTHNAME, or {@code null} when the message does not set it
-     */
-    public String getName() {
+    /** {@return AUTHNAME: the name of the user} */
+    public String name() {
         return value("AUTHNAME");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return AUTHSECRET, or {@code null} when the message does not set it
-     */
-    public String getSecret() {
+    /** {@return AUTHSECRET: the password} */
+    public String secret() {
         return value("AUTHSECRET");
     }
 
-    /**
-     * Lists the entities that ask for the authentication, such as {@code AAA}.
-     *
-     * @return every AUTH-ENTITY; not modifiable, empty when there is none
-     */
-    public List<String> getEntities() {
-        return entities;
+    /** {@return every AUTH-ENTITY: who asks for the authentication, such as {@code AAA}} */
+    public List<String> entities() {
+        return values("AUTH-ENTITY");
+    }
+
+    /** {@return SPI: the security parameter index of Mobile IP} */
+    public String securityParameterIndex() {
+        return value("SPI");
     }
 }

@@ -3,83 +3,46 @@ package com.qvomacp.eng.omacp;
 import java.util.List;
 
 /**
- * Which traffic takes which way: an ACCESS of the message.
+ * Which traffic takes which way: an ACCESS.
+ *
+ * <pre>{@code
+ * for (AccessRule rule : message.accessRules()) {
+ *     System.out.println(rule.appIds() + " by " + rule.toNapIds());
+ * }
+ * }</pre>
  */
-public final class AccessRule extends Characteristic {
-    private final List<String> rules;
-    private final List<String> appIds;
-    private final List<String> portNumbers;
-    private final List<String> domains;
-    private final List<String> toNapIds;
-    private final List<String> toProxies;
-
-    AccessRule(
-            List<String> rules,
-            List<String> appIds,
-            List<String> portNumbers,
-            List<String> domains,
-            List<String> toNapIds,
-            List<String> toProxies) {
-        super(NONE, NONE, rules, appIds, portNumbers, domains, toNapIds, toProxies);
-        this.rules = rules;
-        this.appIds = appIds;
-        this.portNumbers = portNumbers;
-        this.domains = domains;
-        this.toNapIds = toNapIds;
-        this.toProxies = toProxies;
+public final class AccessRule extends TypedCharacteristic {
+    AccessRule(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Lists the rules.
-     *
-     * @return every RULE; not modifiable, empty when there is none
-     */
-    public List<String> getRules() {
-        return rules;
+    /** {@return every RULE: the rules} */
+    public List<String> rules() {
+        return values("RULE");
     }
 
-    /**
-     * Lists the applications that the rule is about.
-     *
-     * @return every APPID; not modifiable, empty when there is none
-     */
-    public List<String> getAppIds() {
-        return appIds;
+    /** {@return every APPID: the applications that the rule is about} */
+    public List<String> appIds() {
+        return values("APPID");
     }
 
-    /**
-     * Lists the ports that the rule is about.
-     *
-     * @return every PORTNBR; not modifiable, empty when there is none
-     */
-    public List<String> getPortNumbers() {
-        return portNumbers;
+    /** {@return every PORTNBR: the ports that the rule is about} */
+    public List<String> portNumbers() {
+        return values("PORTNBR");
     }
 
-    /**
-     * Lists the domains that the rule is about.
-     *
-     * @return every DOMAIN; not modifiable, empty when there is none
-     */
-    public List<String> getDomains() {
-        return domains;
+    /** {@return every DOMAIN: the domains that the rule is about} */
+    public List<String> domains() {
+        return values("DOMAIN");
     }
 
-    /**
-     * Lists the access points to take, by their names.
-     *
-     * @return every TO-NAPID; not modifiable, empty when there is none
-     */
-    public List<String> getToNapIds() {
-        return toNapIds;
+    /** {@return every TO-NAPID: the access points to take, by their names} */
+    public List<String> toNapIds() {
+        return values("TO-NAPID");
     }
 
-    /**
-     * Lists the proxies to take, by their names.
-     *
-     * @return every TO-PROXY; not modifiable, empty when there is none
-     */
-    public List<String> getToProxies() {
-        return toProxies;
+    /** {@return every TO-PROXY: the proxies to take, by their names} */
+    public List<String> toProxies() {
+        return values("TO-PROXY");
     }
 }

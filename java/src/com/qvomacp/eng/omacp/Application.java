@@ -3,229 +3,129 @@ package com.qvomacp.eng.omacp;
 import java.util.List;
 
 /**
- * The settings of an application: an APPLICATION of the message.
+ * The settings of an application: an APPLICATION.
+ *
+ * <pre>{@code
+ * for (Application application : message.applications()) {
+ *     System.out.println(application.appId() + ": " + application.addresses());
+ *     for (Roaming roaming : application.roamings()) {
+ *         System.out.println("abroad: " + roaming.syncAllowed());
+ *     }
+ * }
+ * }</pre>
  */
-public final class Application extends Characteristic {
-    private static final String[] NAMES = {
-        "APPID",
-        "PROVIDER-ID",
-        "FROM",
-        "NAME",
-        "AACCEPT",
-        "APROTOCOL",
-        "INTERNET",
-        "XCAP_AUID_DCS",
-        "XCAP_AUID_PMS",
-        "XCAP_AUID_CDMS",
-        "XCAP_IMEI_HEADER",
-        "XCAP_TID_HEADER",
-    };
-
-    private final List<String> toProxies;
-    private final List<String> toNapIds;
-    private final List<String> simpleAddresses;
-    private final List<ApplicationAddress> addresses;
-    private final List<ApplicationAuthentication> authentications;
-    private final List<Resource> resources;
-    private final Roaming roaming;
-
-    Application(
-            String[] values,
-            List<String> toProxies,
-            List<String> toNapIds,
-            List<String> simpleAddresses,
-            List<ApplicationAddress> addresses,
-            List<ApplicationAuthentication> authentications,
-            List<Resource> resources,
-            Roaming roaming) {
-        super(
-                NAMES,
-                values,
-                toProxies,
-                toNapIds,
-                simpleAddresses,
-                addresses,
-                authentications,
-                resources,
-                roaming);
-        this.toProxies = toProxies;
-        this.toNapIds = toNapIds;
-        this.simpleAddresses = simpleAddresses;
-        this.addresses = addresses;
-        this.authentications = authentications;
-        this.resources = resources;
-        this.roaming = roaming;
+public final class Application extends TypedCharacteristic {
+    Application(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Tells which application it is, such as {@code w4} for multimedia messages.
-     *
-     * @return APPID, or {@code null} when the message does not set it
-     */
-    public String getAppId() {
+    /** {@return APPID: which application it is, such as {@code w4} for multimedia messages} */
+    public String appId() {
         return value("APPID");
     }
 
-    /**
-     * Names the provider of the service.
-     *
-     * @return PROVIDER-ID, or {@code null} when the message does not set it
-     */
-    public String getProviderId() {
+    /** {@return PROVIDER-ID: the name of the provider of the service} */
+    public String providerId() {
         return value("PROVIDER-ID");
     }
 
-    /**
-     * Tells the sender that the application uses.
-     *
-     * @return FROM, or {@code null} when the message does not set it
-     */
-    public String getFrom() {
-        return value("FROM");
-    }
-
-    /**
-     * Tells the name to show to the user.
-     *
-     * @return NAME, or {@code null} when the message does not set it
-     */
-    public String getName() {
+    /** {@return NAME: the name to show to the user} */
+    public String name() {
         return value("NAME");
     }
 
-    /**
-     * Lists the content types that the application accepts.
-     *
-     * @return AACCEPT, or {@code null} when the message does not set it
-     */
-    public String getAccept() {
+    /** {@return AACCEPT: the content types that the application accepts, commas between them} */
+    public String accept() {
         return value("AACCEPT");
     }
 
-    /**
-     * Tells the protocol that the application speaks.
-     *
-     * @return APROTOCOL, or {@code null} when the message does not set it
-     */
-    public String getProtocol() {
+    /** {@return APROTOCOL: the protocol that the application speaks} */
+    public String protocol() {
         return value("APROTOCOL");
     }
 
-    /**
-     * Tells whether the application is reached through the Internet.
-     *
-     * @return INTERNET, or {@code null} when the message does not set it
-     */
-    public String getInternet() {
+    /** {@return every TO-PROXY: the proxies through which the application goes, by their names} */
+    public List<String> toProxies() {
+        return values("TO-PROXY");
+    }
+
+    /** {@return every TO-NAPID: the names of the access points that the application uses} */
+    public List<String> toNapIds() {
+        return values("TO-NAPID");
+    }
+
+    /** {@return every ADDR: the addresses of the service without further properties} */
+    public List<String> simpleAddresses() {
+        return values("ADDR");
+    }
+
+    /** {@return APPREF: the name of the settings; others refer to them by this name} */
+    public String reference() {
+        return value("APPREF");
+    }
+
+    /** {@return every TO-APPREF: the names of other applications' settings that belong to these} */
+    public List<String> toReferences() {
+        return values("TO-APPREF");
+    }
+
+    /** {@return whether INTERNET stands here} */
+    public boolean hasInternet() {
+        return has("INTERNET");
+    }
+
+    /** {@return the value of INTERNET} */
+    public String internet() {
         return value("INTERNET");
     }
 
-    /**
-     * Tells the first of the XCAP application identifiers.
-     *
-     * @return XCAP_AUID_DCS, or {@code null} when the message does not set it
-     */
-    public String getXcapAuidDcs() {
+    /** {@return FROM: the sender that the application uses} */
+    public String from() {
+        return value("FROM");
+    }
+
+    /** {@return XCAP_AUID_DCS: the first of the XCAP application identifiers} */
+    public String xcapAuidDcs() {
         return value("XCAP_AUID_DCS");
     }
 
-    /**
-     * Tells the second of the XCAP application identifiers.
-     *
-     * @return XCAP_AUID_PMS, or {@code null} when the message does not set it
-     */
-    public String getXcapAuidPms() {
+    /** {@return XCAP_AUID_PMS: the second of the XCAP application identifiers} */
+    public String xcapAuidPms() {
         return value("XCAP_AUID_PMS");
     }
 
-    /**
-     * Tells the third of the XCAP application identifiers.
-     *
-     * @return XCAP_AUID_CDMS, or {@code null} when the message does not set it
-     */
-    public String getXcapAuidCdms() {
+    /** {@return XCAP_AUID_CDMS: the third of the XCAP application identifiers} */
+    public String xcapAuidCdms() {
         return value("XCAP_AUID_CDMS");
     }
 
-    /**
-     * Tells the XCAP header for the identity of the device.
-     *
-     * @return XCAP_IMEI_HEADER, or {@code null} when the message does not set it
-     */
-    public String getXcapImeiHeader() {
+    /** {@return XCAP_IMEI_HEADER: the XCAP header for the identity of the device} */
+    public String xcapImeiHeader() {
         return value("XCAP_IMEI_HEADER");
     }
 
-    /**
-     * Tells the XCAP header for the identity of the transaction.
-     *
-     * @return XCAP_TID_HEADER, or {@code null} when the message does not set it
-     */
-    public String getXcapTidHeader() {
+    /** {@return XCAP_TID_HEADER: the XCAP header for the identity of the transaction} */
+    public String xcapTidHeader() {
         return value("XCAP_TID_HEADER");
     }
 
-    /**
-     * Lists the proxies through which the application goes, by their names.
-     *
-     * @return every TO-PROXY; not modifiable, empty when there is none
-     */
-    public List<String> getToProxies() {
-        return toProxies;
+    /** {@return every APPADDR: the addresses of the service that have ports or a type} */
+    public List<ApplicationAddress> addresses() {
+        return views(ApplicationAddress.class, "APPADDR");
     }
 
-    /**
-     * Lists the access points through which the application goes, by their names.
-     *
-     * @return every TO-NAPID; not modifiable, empty when there is none
-     */
-    public List<String> getToNapIds() {
-        return toNapIds;
+    /** {@return every APPAUTH: how application and service authenticate themselves} */
+    public List<ApplicationAuthentication> authentications() {
+        return views(ApplicationAuthentication.class, "APPAUTH");
     }
 
-    /**
-     * Lists the addresses of the service that are given without further properties.
-     *
-     * @return every ADDR directly in the APPLICATION; not modifiable, empty when there is none
-     */
-    public List<String> getSimpleAddresses() {
-        return simpleAddresses;
+    /** {@return every RESOURCE: the resources of the service, such as bookmarks and databases} */
+    public List<Resource> resources() {
+        return views(Resource.class, "RESOURCE");
     }
 
-    /**
-     * Lists the addresses of the service that have ports or a type.
-     *
-     * @return every APPADDR; not modifiable, empty when there is none
-     */
-    public List<ApplicationAddress> getAddresses() {
-        return addresses;
-    }
-
-    /**
-     * Lists how application and service authenticate themselves.
-     *
-     * @return every APPAUTH; not modifiable, empty when there is none
-     */
-    public List<ApplicationAuthentication> getAuthentications() {
-        return authentications;
-    }
-
-    /**
-     * Lists the resources of the service, such as bookmarks and databases.
-     *
-     * @return every RESOURCE; not modifiable, empty when there is none
-     */
-    public List<Resource> getResources() {
-        return resources;
-    }
-
-    /**
-     * Tells what the application may do while roaming. The library answers this of the first
-     * application of a message only, and of that one its first ROAMING.
-     *
-     * @return the first ROAMING of the first application, or {@code null}
-     */
-    public Roaming getRoaming() {
-        return roaming;
+    /** {@return every ROAMING: what the application may do while roaming} */
+    public List<Roaming> roamings() {
+        return views(Roaming.class, "ROAMING");
     }
 }

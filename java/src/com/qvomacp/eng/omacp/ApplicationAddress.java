@@ -4,41 +4,35 @@ import java.util.List;
 
 /**
  * An address of a service: an APPADDR.
+ *
+ * <pre>{@code
+ * for (ApplicationAddress address : message.applications().get(0).addresses()) {
+ *     System.out.println(address.address() + " " + address.ports());
+ * }
+ * }</pre>
  */
-public final class ApplicationAddress extends Characteristic {
-    private static final String[] NAMES = {"ADDR", "ADDRTYPE"};
-
-    private final List<ApplicationPort> ports;
-
-    ApplicationAddress(String[] values, List<ApplicationPort> ports) {
-        super(NAMES, values, ports);
-        this.ports = ports;
+public final class ApplicationAddress extends TypedCharacteristic {
+    ApplicationAddress(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Tells the address.
-     *
-     * @return ADDR, or {@code null} when the message does not set it
-     */
-    public String getAddress() {
+    /** {@return ADDR: the address} */
+    public String address() {
         return value("ADDR");
     }
 
-    /**
-     * Tells what kind of address it is, as the library holds it.
-     *
-     * @return ADDRTYPE, or {@code null} when the message does not set it
-     */
-    public String getAddressType() {
+    /** {@return ADDRTYPE: what kind of address {@link #address} is} */
+    public AddressType addressType() {
+        return AddressType.of(addressTypeText());
+    }
+
+    /** {@return ADDRTYPE as the message says it} */
+    public String addressTypeText() {
         return value("ADDRTYPE");
     }
 
-    /**
-     * Lists the ports of the service at this address.
-     *
-     * @return every PORT; not modifiable, empty when there is none
-     */
-    public List<ApplicationPort> getPorts() {
-        return ports;
+    /** {@return every PORT: the ports of the service at this address} */
+    public List<Port> ports() {
+        return views(Port.class, "PORT");
     }
 }

@@ -1,64 +1,41 @@
 package com.qvomacp.eng.omacp;
 
 /**
- * How an application or its service authenticates itself: an APPAUTH.
+ * How application and service authenticate themselves: an APPAUTH.
+ *
+ * <pre>{@code
+ * for (ApplicationAuthentication way : message.applications().get(0).authentications()) {
+ *     System.out.println(way.level() + ": " + way.type() + " as " + way.name());
+ * }
+ * }</pre>
  */
-public final class ApplicationAuthentication extends Characteristic {
-    private static final String[] NAMES = {
-        "AAUTHLEVEL",
-        "AAUTHTYPE",
-        "AAUTHNAME",
-        "AAUTHSECRET",
-        "AAUTHDATA",
-    };
-
-    ApplicationAuthentication(String[] values) {
-        super(NAMES, values);
+public final class ApplicationAuthentication extends TypedCharacteristic {
+    ApplicationAuthentication(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Tells who authenticates itself.
-     *
-     * @return AAUTHLEVEL: {@code APPSRV} or {@code CLIENT}; {@code null} when the message does not
-     *     set it, gives another value, or gives CLIENT as a token
-     */
-    public String getLevel() {
+    /** {@return AAUTHLEVEL: who authenticates itself, such as {@code APPSRV} or {@code CLIENT}} */
+    public String level() {
         return value("AAUTHLEVEL");
     }
 
-    /**
-     * Tells the scheme, such as {@code HTTP-BASIC}.
-     *
-     * @return AAUTHTYPE, or {@code null} when the message does not set it
-     */
-    public String getType() {
+    /** {@return AAUTHTYPE: the scheme, such as {@code HTTP-BASIC}} */
+    public String type() {
         return value("AAUTHTYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return AAUTHNAME, or {@code null} when the message does not set it
-     */
-    public String getName() {
+    /** {@return AAUTHNAME: the name of the user} */
+    public String name() {
         return value("AAUTHNAME");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return AAUTHSECRET, or {@code null} when the message does not set it
-     */
-    public String getSecret() {
+    /** {@return AAUTHSECRET: the password} */
+    public String secret() {
         return value("AAUTHSECRET");
     }
 
-    /**
-     * Tells what else the scheme needs, such as a nonce.
-     *
-     * @return AAUTHDATA, or {@code null} when the message does not set it
-     */
-    public String getData() {
+    /** {@return AAUTHDATA: what else the scheme needs, such as a nonce} */
+    public String data() {
         return value("AAUTHDATA");
     }
 }

@@ -3,71 +3,46 @@ package com.qvomacp.eng.omacp;
 import java.util.List;
 
 /**
- * Where further provisioning comes from: a BOOTSTRAP of the message.
+ * Where further provisioning comes from: a BOOTSTRAP.
+ *
+ * <pre>{@code
+ * for (Bootstrap bootstrap : message.bootstraps()) {
+ *     System.out.println(bootstrap.provisioningUrl() + " for " + bootstrap.networks());
+ * }
+ * }</pre>
  */
-public final class Bootstrap extends Characteristic {
-    private static final String[] NAMES = {"NAME", "COUNTRY", "PROVURL", "CONTEXT-ALLOW"};
-
-    private final List<String> proxyIds;
-    private final List<String> networks;
-
-    Bootstrap(String[] values, List<String> proxyIds, List<String> networks) {
-        super(NAMES, values, proxyIds, networks);
-        this.proxyIds = proxyIds;
-        this.networks = networks;
+public final class Bootstrap extends TypedCharacteristic {
+    Bootstrap(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Tells the name to show to the user.
-     *
-     * @return NAME, or {@code null} when the message does not set it
-     */
-    public String getName() {
+    /** {@return NAME: the name to show to the user} */
+    public String name() {
         return value("NAME");
     }
 
-    /**
-     * Tells the mobile country code.
-     *
-     * @return COUNTRY, or {@code null} when the message does not set it
-     */
-    public String getCountry() {
+    /** {@return every PROXY-ID: the proxies that may provision, by their names} */
+    public List<String> proxyIds() {
+        return values("PROXY-ID");
+    }
+
+    /** {@return COUNTRY: the mobile country code} */
+    public String country() {
         return value("COUNTRY");
     }
 
-    /**
-     * Names the trusted provisioning server.
-     *
-     * @return PROVURL, or {@code null} when the message does not set it
-     */
-    public String getProvisioningUrl() {
+    /** {@return every NETWORK: the networks for which this holds} */
+    public List<String> networks() {
+        return values("NETWORK");
+    }
+
+    /** {@return PROVURL: the name of the trusted provisioning server} */
+    public String provisioningUrl() {
         return value("PROVURL");
     }
 
-    /**
-     * Tells how many further contexts the server may make.
-     *
-     * @return CONTEXT-ALLOW, or {@code null} when the message does not set it
-     */
-    public String getContextAllow() {
+    /** {@return CONTEXT-ALLOW: how many further contexts the server may make} */
+    public String contextAllow() {
         return value("CONTEXT-ALLOW");
-    }
-
-    /**
-     * Lists the proxies that may provision, by their names.
-     *
-     * @return every PROXY-ID; not modifiable, empty when there is none
-     */
-    public List<String> getProxyIds() {
-        return proxyIds;
-    }
-
-    /**
-     * Lists the networks for which this holds.
-     *
-     * @return every NETWORK; not modifiable, empty when there is none
-     */
-    public List<String> getNetworks() {
-        return networks;
     }
 }

@@ -1,97 +1,175 @@
 package com.qvomacp.eng.omacp;
 
-import java.util.Arrays;
+import java.util.ArrayList;
+import java.util.Collections;
+import java.util.HashMap;
 import java.util.List;
+import java.util.Map;
+import java.util.Objects;
 
-/** What all snapshots share: the parameters by their names, and what stands beside them. */
-abstract class Characteristic {
-    /** The names and values of a characteristic of which every parameter is a list. */
-    static final String[] NONE = {};
+/**
+ * A characteristic of a provisioning document: a type, such as {@code NAPDEF}, and what stands in
+ * it, in the order of the message.
+ *
+ * <pre>{@code
+ * for (Characteristic access : document.characteristics("NAPDEF")) {
+ *     System.out.println(access.value("NAPID") + ": " + access.values("BEARER"));
+ * }
+ * }</pre>
+ */
+public final class Characteristic extends Item {
+    private final String type;
+    private final byte typeWriting;
 
-    private static final List<String> SECRETS =
-            Arrays.asList(
-                    "PROXY-PW", "PXAUTH-PW", "AUTHSECRET", "AAUTHSECRET", "AAUTHDATA", "PASSWORD");
+    /** The number of the characteristic in a path; 0 until somebody asks for one beside it. */
+    private int ordinal;
 
-    private final String[] names;
-    private final String[] values;
-    private final Object[] parts;
-
-    /**
-     * Takes what the library has answered.
-     *
-     * @param names what the elements of {@code values} are called; null for one without a name
-     * @param values at least as many as there are names; belongs to the snapshot from now on
-     * @param parts everything else that makes two snapshots equal
-     */
-    Characteristic(String[] names, String[] values, Object... parts) {
-        this.names = names;
-        this.values = values;
-        this.parts = parts;
+    Characteristic(int offset, int end, Item[] children, String type, Writing typeWriting) {
+        super(offset, end, children);
+        this.type = type;
+        this.typeWriting = Writing.code(typeWriting);
     }
 
-    final String value(String name) {
-        for (int i = 0; i < names.length; ++i) {
-            if (name.equals(names[i])) {
-                return values[i];
+    /** {@return TYPE as the OMA documents write it, as {@code NAPDEF}; {@code null} for none} */
+    public String type() {
+        return type;
+    }
+
+    /** {@return how the type is written: how; {@code null} without a type} */
+    public Writing typeWriting() {
+        return Writing.of(typeWriting);
+    }
+
+    /** {@return the parameters directly in it, in the order of the message; not modifiable} */
+    public List<Parameter> parameters() {
+        List<Parameter> parameters = new ArrayList<>();
+        for (Item child : inside()) {
+            if (child instanceof Parameter) {
+                parameters.add((Parameter) child);
             }
         }
-        throw new IllegalArgumentException(name);
+        return Collections.unmodifiableList(parameters);
+    }
+
+    /** {@return the characteristics directly in it, in the order of the message; not modifiable} */
+    public List<Characteristic> characteristics() {
+        return in(this);
     }
 
     /**
-     * Compares everything that the message sets.
-     *
-     * @param other what to compare with
-     * @return true for an object of the same class that sets the same
+     * {@return the characteristics of a type directly in it, in the order of the message; not
+     * modifiable}
+     * @param type what TYPE is, in exactly this case
      */
-    @Override
-    public final boolean equals(Object other) {
-        if (other == null || other.getClass() != getClass()) {
-            return false;
-        }
-        Characteristic that = (Characteristic) other;
-        return Arrays.equals(values, that.values) && Arrays.equals(parts, that.parts);
+    public List<Characteristic> characteristics(String type) {
+        return in(this, type);
     }
 
     /**
-     * Answers a number that fits {@link #equals}.
-     *
-     * @return the same number for equal objects
+     * {@return the first parameter of a name; {@code null} when there is none}
+     * @param name what NAME is, in exactly this case
      */
-    @Override
-    public final int hashCode() {
-        return 31 * Arrays.hashCode(values) + Arrays.hashCode(parts);
-    }
-
-    /**
-     * Shows what is set, for logs: passwords and their like are shown as {@code ***}.
-     *
-     * @return one line of text
-     */
-    @Override
-    public final String toString() {
-        StringBuilder text = new StringBuilder(getClass().getSimpleName()).append('{');
-        String separator = "";
-        for (int i = 0; i < names.length; ++i) {
-            if (names[i] != null && values[i] != null) {
-                text.append(separator).append(names[i]).append('=');
-                text.append(SECRETS.contains(names[i]) ? "***" : values[i]);
-                separator = ", ";
+    public Parameter parameter(String name) {
+        for (Item child : inside()) {
+            if (child instanceof Parameter && name.equals(((Parameter) child).name())) {
+                return (Parameter) child;
             }
         }
-        for (Object part : parts) {
-            if (isShown(part)) {
-                text.append(separator).append(part);
-                separator = ", ";
-            }
-        }
-        return text.append('}').toString();
+        return null;
     }
 
-    /** Counts and the like say little without their names. */
-    private static boolean isShown(Object part) {
-        return part instanceof List
-                ? !((List<?>) part).isEmpty()
-                : part instanceof Characteristic || part instanceof PushHeader;
+    /**
+     * {@return the value of the first parameter of a name; {@code null} when there is none, and
+     * when it has no value}
+     * @param name what NAME is, in exactly this case
+     */
+    public String value(String name) {
+        Parameter parameter = parameter(name);
+        return parameter == null ? null : parameter.value();
+    }
+
+    /**
+     * {@return the values of all parameters of a name that have one, in the order of the message;
+     * not modifiable}
+     * @param name what NAME is, in exactly this case
+     */
+    public List<String> values(String name) {
+        List<String> values = new ArrayList<>();
+        for (Item child : inside()) {
+            if (child instanceof Parameter) {
+                Parameter parameter = (Parameter) child;
+                if (parameter.value() != null && name.equals(parameter.name())) {
+                    values.add(parameter.value());
+                }
+            }
+        }
+        return Collections.unmodifiableList(values);
+    }
+
+    static List<Characteristic> in(Item item) {
+        List<Characteristic> characteristics = new ArrayList<>();
+        for (Item child : item.inside()) {
+            if (child instanceof Characteristic) {
+                characteristics.add((Characteristic) child);
+            }
+        }
+        return Collections.unmodifiableList(characteristics);
+    }
+
+    static List<Characteristic> in(Item item, String type) {
+        List<Characteristic> characteristics = new ArrayList<>();
+        for (Item child : item.inside()) {
+            if (child instanceof Characteristic && type.equals(((Characteristic) child).type)) {
+                characteristics.add((Characteristic) child);
+            }
+        }
+        return Collections.unmodifiableList(characteristics);
+    }
+
+    @Override
+    void step(StringBuilder path) {
+        if (ordinal == 0) {
+            count(parent());
+        }
+        Printable.append(path, type == null ? Element.CHARACTERISTIC.text : type);
+        path.append(' ').append(ordinal);
+    }
+
+    /**
+     * Numbers the characteristics of an item, all at once, so that many paths take no longer than
+     * few. Two threads that do so at the same time write the same numbers.
+     */
+    private static void count(Item item) {
+        Map<String, Integer> counts = new HashMap<>();
+        for (Item child : item.inside()) {
+            if (child instanceof Characteristic) {
+                Characteristic characteristic = (Characteristic) child;
+                Integer before = counts.get(characteristic.type);
+                int number = before == null ? 1 : before + 1;
+                counts.put(characteristic.type, number);
+                characteristic.ordinal = number;
+            }
+        }
+    }
+
+    @Override
+    boolean says(Item other) {
+        return other instanceof Characteristic
+                && Objects.equals(type, ((Characteristic) other).type);
+    }
+
+    @Override
+    int hash() {
+        return Objects.hashCode(type);
+    }
+
+    /** {@return the characteristic, without what is in it: one line of text} */
+    @Override
+    public String toString() {
+        return "Characteristic{type="
+                + (type == null ? "none" : Printable.of(type))
+                + ", children="
+                + inside().length
+                + "}";
     }
 }

@@ -1,65 +1,119 @@
 package com.qvomacp.eng.omacp;
 
-/** The content types that the library takes, with the codes that WSP assigns to them. */
-public enum ContentType {
-    /** A provisioning document in WBXML, which is what provisioning servers send. */
-    CONNECTIVITY_WBXML(54, "application/vnd.wap.connectivity-wbxml"),
+import java.util.Collections;
+import java.util.List;
 
-    /** A provisioning document in XML; the library reads its body as WBXML all the same. */
-    CONNECTIVITY_XML(53, "application/vnd.wap.connectivity-xml"),
-
-    /** A notification of SyncML device management. */
-    SYNCML_NOTIFICATION(68, "application/vnd.syncml.notification"),
-
-    /** A notification of SyncML data synchronisation. */
-    SYNCML_DS_NOTIFICATION(78, "application/vnd.syncml.ds.notification"),
-
-    /** A message of SyncML device management in WBXML. */
-    SYNCML_DM_WBXML(66, "application/vnd.syncml.dm+wbxml");
-
-    private final int code;
+/**
+ * The content type of a push: a media type and its parameters. Immutable.
+ *
+ * <pre>{@code
+ * ContentType type = header.contentType();
+ * System.out.println(type.mediaType() + ", " + type.parameters().size() + " parameters");
+ * }</pre>
+ */
+public final class ContentType {
     private final String mediaType;
+    private final int code;
+    private final int offset;
+    private final int mediaTypeOffset;
+    private final int mediaTypeEnd;
+    private final int end;
+    private final List<HeaderField> parameters;
 
-    ContentType(int code, String mediaType) {
-        this.code = code;
+    ContentType(
+            String mediaType,
+            int code,
+            int offset,
+            int mediaTypeOffset,
+            int mediaTypeEnd,
+            int end,
+            List<HeaderField> parameters) {
         this.mediaType = mediaType;
+        this.code = code;
+        this.offset = offset;
+        this.mediaTypeOffset = mediaTypeOffset;
+        this.mediaTypeEnd = mediaTypeEnd;
+        this.end = end;
+        this.parameters = Collections.unmodifiableList(parameters);
     }
 
     /**
-     * Tells the code of the content type.
-     *
-     * @return the code without its high bit, such as 54
+     * {@return the media type: in lower case, such as {@code
+     * application/vnd.wap.connectivity-wbxml}; a printable name for a number that stands for none}
      */
-    public int getCode() {
-        return code;
-    }
-
-    /**
-     * Tells the name of the content type.
-     *
-     * @return the media type, such as {@code application/vnd.wap.connectivity-wbxml}
-     */
-    public String getMediaType() {
+    public String mediaType() {
         return mediaType;
     }
 
-    /** The content type with a code; null for a code that is none of these. */
-    static ContentType ofCode(int code) {
-        for (ContentType type : values()) {
-            if (type.code == code) {
-                return type;
-            }
-        }
-        return null;
+    /**
+     * {@return the number that WSP assigns to the media type: the number, such as 54; -1 when the
+     * media type is given as text and has none}
+     */
+    public int code() {
+        return code;
     }
 
-    /** The content type with a name, in exactly this case; null for any other name. */
-    static ContentType named(String mediaType) {
-        for (ContentType type : values()) {
-            if (type.mediaType.equals(mediaType)) {
-                return type;
-            }
+    /** {@return the parameters, in the order of the message; not modifiable} */
+    public List<HeaderField> parameters() {
+        return parameters;
+    }
+
+    /** {@return where it begins, with its length in front: bytes from the start of what was read} */
+    public int offset() {
+        return offset;
+    }
+
+    /** {@return how long the content type is, with its parameters: bytes} */
+    public int length() {
+        return end - offset;
+    }
+
+    /** Where the media type begins: bytes from the start of what was read. */
+    int mediaTypeOffset() {
+        return mediaTypeOffset;
+    }
+
+    void describe(ByteVisitor visitor) {
+        int depth = 0;
+        if (mediaTypeOffset > offset) {
+            visitor.visit(offset, mediaTypeOffset - offset, 0, "length of the content type");
+            depth = 1;
         }
-        return null;
+        int length = mediaTypeEnd - mediaTypeOffset;
+        visitor.visit(mediaTypeOffset, length, depth, "content type: " + mediaType);
+        int at = mediaTypeEnd;
+        for (HeaderField parameter : parameters) {
+            describeGap(visitor, at, parameter.offset());
+            parameter.describe(visitor, 1);
+            at = parameter.offset() + parameter.length();
+        }
+        describeGap(visitor, at, end);
+    }
+
+    private static void describeGap(ByteVisitor visitor, int from, int to) {
+        if (to > from) {
+            visitor.visit(from, to - from, 1, "no parameter");
+        }
+    }
+
+    /** {@return whether it is a content type that says the same, however it is written} */
+    @Override
+    public boolean equals(Object other) {
+        if (!(other instanceof ContentType)) {
+            return false;
+        }
+        ContentType that = (ContentType) other;
+        return mediaType.equals(that.mediaType) && parameters.equals(that.parameters);
+    }
+
+    @Override
+    public int hashCode() {
+        return 31 * mediaType.hashCode() + parameters.hashCode();
+    }
+
+    /** {@return the media type and how many parameters there are, in a line for a log} */
+    @Override
+    public String toString() {
+        return "ContentType{" + Printable.of(mediaType) + ", " + parameters.size() + " parameters}";
     }
 }

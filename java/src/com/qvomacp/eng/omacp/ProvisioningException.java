@@ -1,85 +1,114 @@
 package com.qvomacp.eng.omacp;
 
-/** Says that a message cannot be parsed, and why. */
+import java.util.ArrayList;
+import java.util.Collections;
+import java.util.List;
+
+/**
+ * Says that a message cannot be read, or is refused, and why and where.
+ *
+ * <pre>{@code
+ * try {
+ *     ProvisioningMessage.parseBody(new byte[] {3, 11, 106});
+ * } catch (ProvisioningException e) {
+ *     System.out.println(e.reason() + " at " + e.offset() + ": " + e.getMessage());
+ * }
+ * }</pre>
+ */
 public final class ProvisioningException extends Exception {
-    private static final long serialVersionUID = 1L;
+    private static final long serialVersionUID = 2L;
 
-    /** Why a message cannot be parsed. */
+    /** Why a message is not read. */
     public enum Reason {
-        /** There is no message: null, or not a single byte. */
-        NO_MESSAGE,
-
-        /** The message is not a connectionless WSP push. */
-        NOT_A_PUSH,
-
-        /** The message ends within the push header. */
-        HEADER_CUT_OFF,
-
-        /** The content type is none of {@link ContentType}. */
-        UNKNOWN_CONTENT_TYPE,
-
-        /** The MAC of the push header does not end within the message, or is too long. */
-        BAD_MAC,
-
-        /** The message ends with its push header. */
-        EMPTY_BODY,
-
-        /** The body is not a provisioning document that the library can decode. */
-        BODY_REFUSED
+        /** The message is longer than the options allow. */
+        INPUT_TOO_LONG,
+        /** The texts of the document are more than the options allow. */
+        TEXT_TOO_LONG,
+        /** The message does not begin with the header of a push, or ends within it. */
+        NO_PUSH_HEADER,
+        /** The body is no WBXML, or none at all. */
+        NO_WBXML,
+        /** The body is a document of another type. */
+        OTHER_DOCUMENT_TYPE,
+        /** The native library refuses the message, and the options ask for that to count. */
+        REFUSED
     }
 
-    /** Why the message was refused. */
+    /** Why the message is not read. */
     private final Reason reason;
 
-    /** The decoder's result code; null without its word. */
-    private final Integer resultCode;
+    /** The library's result code, or 0. */
+    private final int code;
 
-    /** How many bytes of the body the decoder had read; null without its word. */
-    private final Integer bodyOffset;
+    /** Where the reading ends. */
+    private final int offset;
 
-    ProvisioningException(Reason reason, String text) {
-        this(reason, text, null);
+    /** In which element it ends, or null. */
+    private final String path;
+
+    /** What would have been taken there. */
+    private final ArrayList<String> expected;
+
+    ProvisioningException(Reason reason, int offset, String text) {
+        this(reason, 0, offset, null, Collections.<String>emptyList(), text);
     }
 
-    ProvisioningException(Reason reason, String text, NativeDecoder decoder) {
+    ProvisioningException(
+            Reason reason, int code, int offset, String path, List<String> expected, String text) {
         super(text);
         this.reason = reason;
-        this.resultCode = decoder == null ? null : decoder.code;
-        this.bodyOffset = decoder == null ? null : decoder.read;
+        this.code = code;
+        this.offset = offset;
+        this.path = path;
+        this.expected = new ArrayList<>(expected);
     }
 
-    /**
-     * Tells why the message cannot be parsed. {@link #getMessage} says the same in words.
-     *
-     * @return the reason, never {@code null}
-     */
-    public Reason getReason() {
+    /** Throws for an input that is longer than the options allow. */
+    static void checkInput(long length, ReadOptions options) throws ProvisioningException {
+        if (length > options.inputLimit()) {
+            String text = length + " bytes are more than the limit of " + options.inputLimit();
+            throw new ProvisioningException(Reason.INPUT_TOO_LONG, options.inputLimit(), text);
+        }
+    }
+
+    /** Throws for what the native library refuses. */
+    static void checkVerdict(Verdict verdict) throws ProvisioningException {
+        if (!verdict.isAccepted()) {
+            throw new ProvisioningException(
+                    Reason.REFUSED,
+                    verdict.code(),
+                    verdict.offset(),
+                    verdict.path(),
+                    verdict.expected(),
+                    verdict.reason());
+        }
+    }
+
+    /** {@return why the message is not read, as {@link #getMessage} says it in words} */
+    public Reason reason() {
         return reason;
     }
 
-    /**
-     * Tells the library's result code for a body that it refuses.
-     *
-     * <p>The codes are those of {@code qvsresult.h}: 4101 for an element, attribute or token that is
-     * unknown or out of place, 4103 when the data ends or a text has no end, 4107 for another kind
-     * of document, 4111 when the texts of the body are too much, 2 for an empty body; 0 when it can
-     * be decoded and holds no document.
-     *
-     * @return the result code; {@code null} when the push header is refused, and when the library
-     *     {@code omacp_explain}, which asks the decoder, is not beside the library
-     */
-    public Integer getResultCode() {
-        return resultCode;
+    /** {@return {@link Verdict#code} for a body that the library refuses; 0 for another reason} */
+    public int code() {
+        return code;
     }
 
     /**
-     * Tells how far the decoder had come in a body that it refuses. The byte that it refuses is
-     * the one at this offset, or the last one in front of it.
-     *
-     * @return bytes from the start of the body, up to its length; {@code null} where {@link
-     *     #getResultCode} is
+     * {@return where the reading ends: bytes from the start, counted from 0, of the message for
+     * {@link Reason#NO_PUSH_HEADER} and for a header that is refused, of the body otherwise}
      */
-    public Integer getBodyOffset() {
-        return bodyOffset;
+    public int offset() {
+        return offset;
+    }
+
+    /** {@return the {@link Deviation#path} where reading ends; {@code null} outside a document} */
+    public String path() {
+        return path;
+    }
+
+    /** {@return what would have been taken there; not modifiable, empty if it cannot be said} */
+    public List<String> expected() {
+        return Collections.unmodifiableList(expected);
     }
 }

@@ -1,220 +1,302 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Arrays;
 import java.util.List;
 
 /**
- * What a pushed provisioning message sets: an immutable snapshot of everything that the library
- * answers about it.
+ * What a provisioning message says: its push header, its document, and views of the document's
+ * characteristics by their kinds. Everything that can be read is read; whether the native library
+ * takes the message is told beside it, by {@link #verdict}. Immutable.
  *
  * <pre>{@code
- * ProvisioningMessage message = ProvisioningMessage.parse(bytes);
- * if (message.verifyMac("1234")) {
- *     for (AccessPoint accessPoint : message.getAccessPoints()) {
- *         System.out.println(accessPoint.getName() + ": " + accessPoint.getAddress());
+ * ProvisioningMessage message = ProvisioningMessage.parsePush(push);
+ * if (message.verifyMac("1234", null) == MacResult.RIGHT) {
+ *     for (AccessPoint accessPoint : message.accessPoints()) {
+ *         System.out.println(accessPoint.name() + ": " + accessPoint.address());
  *     }
  * }
  * }</pre>
+ *
+ * <p>The lists hold the characteristics that stand directly in the document, in the order of the
+ * message, and cannot be modified; {@link #document} has those elsewhere, and all else there is.
  */
-public final class ProvisioningMessage extends Characteristic {
-    private static final String[] NAMES = {"CLIENT-ID"};
+public final class ProvisioningMessage {
+    private static final int PUSH = 6;
 
     private final PushHeader header;
-    private final List<Proxy> proxies;
-    private final List<AccessPoint> accessPoints;
-    private final List<Bootstrap> bootstraps;
-    private final List<VendorConfiguration> vendorConfigurations;
-    private final List<Application> applications;
-    private final List<AccessRule> accessRules;
-    private final List<Wifi> wifis;
-    private final List<VoWifi> voWifis;
+    private final ProvisioningDocument document;
 
-    ProvisioningMessage(
-            PushHeader header,
-            String clientId,
-            List<Proxy> proxies,
-            List<AccessPoint> accessPoints,
-            List<Bootstrap> bootstraps,
-            List<VendorConfiguration> vendorConfigurations,
-            List<Application> applications,
-            List<AccessRule> accessRules,
-            List<Wifi> wifis,
-            List<VoWifi> voWifis) {
-        super(
-                NAMES,
-                new String[] {clientId},
-                header,
-                proxies,
-                accessPoints,
-                bootstraps,
-                vendorConfigurations,
-                applications,
-                accessRules,
-                wifis,
-                voWifis);
+    private ProvisioningMessage(PushHeader header, ProvisioningDocument document) {
         this.header = header;
-        this.proxies = proxies;
-        this.accessPoints = accessPoints;
-        this.bootstraps = bootstraps;
-        this.vendorConfigurations = vendorConfigurations;
-        this.applications = applications;
-        this.accessRules = accessRules;
-        this.wifis = wifis;
-        this.voWifis = voWifis;
+        this.document = document;
     }
 
     /**
-     * Parses a pushed message. The MAC is not checked: see {@link #verifyMac(String)}.
+     * Reads a push with the usual limits.
      *
-     * <p>May be called from many threads: they take turns, since the library parses one message at
-     * a time. The natives find a record by counting up to it, so that the time grows with the square
-     * of the number of characteristics of one kind: a hostile message of 64 KiB takes half a second,
-     * one of 300 KiB half a minute. Refuse what is longer than a push can be.
-     *
-     * @param message the push as it was received, from its transaction identifier on; it is not
-     *     kept, and must not change during the call
-     * @return what the message sets
-     * @throws ProvisioningException when the message cannot be parsed, {@code null} included
-     * @throws UnsatisfiedLinkError when the native library cannot be loaded
+     * @param push the push as it was received, from its transaction identifier on; it is copied
+     * @return what it says
+     * @throws ProvisioningException when it is over a limit, does not begin with a push header, or
+     *     its body is no WBXML or a document of another type
      */
-    public static ProvisioningMessage parse(byte[] message) throws ProvisioningException {
-        return new MessageReader().parse(message);
+    public static ProvisioningMessage parsePush(byte[] push) throws ProvisioningException {
+        return parsePush(push, ReadOptions.DEFAULT);
     }
 
     /**
-     * Parses the push header of a message alone, whatever its body holds: enough to check the MAC
-     * before the body is looked at.
+     * Reads a push.
      *
-     * @param message the push as it was received, from its transaction identifier on; it is not
-     *     kept, and must not change during the call
-     * @return what the push header states
-     * @throws ProvisioningException when the push header cannot be parsed, or there is none
-     * @throws UnsatisfiedLinkError when the native library cannot be loaded
+     * @param push the push as it was received, from its transaction identifier on; it is copied
+     * @param options the limits, and whether what the native library refuses is refused
+     * @return what it says
+     * @throws ProvisioningException as {@link #parsePush(byte[])}, and as the options ask for
      */
-    public static PushHeader parseHeader(byte[] message) throws ProvisioningException {
-        return new MessageReader().parseHeader(message);
+    public static ProvisioningMessage parsePush(byte[] push, ReadOptions options)
+            throws ProvisioningException {
+        ProvisioningException.checkInput(push.length, options);
+        PushHeader header = PushHeader.parse(push);
+        return read(header, Arrays.copyOfRange(push, header.length(), push.length), options);
     }
 
     /**
-     * Tells what the push header states.
+     * Reads a body with the usual limits.
      *
-     * @return the push header, never {@code null}
+     * @param body a WBXML body; it is copied
+     * @return what it says
+     * @throws ProvisioningException when it is over a limit, is no WBXML, or is a document of
+     *     another type
      */
-    public PushHeader getHeader() {
+    public static ProvisioningMessage parseBody(byte[] body) throws ProvisioningException {
+        return parseBody(body, ReadOptions.DEFAULT);
+    }
+
+    /**
+     * Reads a body.
+     *
+     * @param body a WBXML body; it is copied
+     * @param options the limits, and whether what the native library refuses is refused
+     * @return what it says
+     * @throws ProvisioningException as {@link #parseBody(byte[])}, and as the options ask for
+     */
+    public static ProvisioningMessage parseBody(byte[] body, ReadOptions options)
+            throws ProvisioningException {
+        ProvisioningException.checkInput(body.length, options);
+        return read(null, body.clone(), options);
+    }
+
+    /**
+     * Reads a message as a platform's receiver of pushes hands it out, with the usual limits.
+     *
+     * @param header the headers, from the content type on; they are copied
+     * @param data the body; it is copied
+     * @return what it says
+     * @throws ProvisioningException when it is over a limit, {@code header} does not begin with a
+     *     content type, or {@code data} is no WBXML or a document of another type
+     */
+    public static ProvisioningMessage parse(byte[] header, byte[] data)
+            throws ProvisioningException {
+        return parse(header, data, ReadOptions.DEFAULT);
+    }
+
+    /**
+     * Reads a message as a platform's receiver of pushes hands it out.
+     *
+     * @param header the headers, from the content type on; they are copied
+     * @param data the body; it is copied
+     * @param options the limits, and whether what the native library refuses is refused
+     * @return what it says
+     * @throws ProvisioningException as {@link #parse(byte[], byte[])}, and as the options ask for
+     */
+    public static ProvisioningMessage parse(byte[] header, byte[] data, ReadOptions options)
+            throws ProvisioningException {
+        ProvisioningException.checkInput((long) header.length + data.length, options);
+        return read(PushHeader.parseHeaders(header), data.clone(), options);
+    }
+
+    /** Reads a body that nobody else has. */
+    private static ProvisioningMessage read(PushHeader header, byte[] body, ReadOptions options)
+            throws ProvisioningException {
+        ProvisioningMessage message =
+                new ProvisioningMessage(header, ProvisioningDocument.of(body, options));
+        if (options.acceptedOnly()) {
+            ProvisioningException.checkVerdict(message.verdict());
+        }
+        return message;
+    }
+
+    /** {@return the push header; {@code null} when a body alone was read} */
+    public PushHeader header() {
         return header;
     }
 
-    /**
-     * Checks the MAC with the PIN that the user has been told: {@link
-     * PushHeader#verifyMac(String)}.
-     *
-     * @param pin what the user has been told, or {@code null}
-     * @return true when the MAC is right
-     */
-    public boolean verifyMac(String pin) {
-        return header.verifyMac(pin);
+    /** {@return the document, with all that the message says; never {@code null}} */
+    public ProvisioningDocument document() {
+        return document;
     }
 
     /**
-     * Checks the MAC with the subscriber's number: {@link PushHeader#verifyMacWithImsi}.
+     * Finds out whether the native library takes the message, its header and its body. It is worked
+     * out at each call.
      *
-     * @param imsi the subscriber's number, or {@code null}
-     * @return true when the MAC is right
+     * <p>The library takes whole pushes only. Of headers and body that were read apart it is asked
+     * about the push that has them: three bytes in front of the headers, or four in front of more
+     * than 127, for the offset of a header that is refused.
+     *
+     * @return the verdict, never {@code null}; that on the body when a body alone was read
      */
-    public boolean verifyMacWithImsi(String imsi) {
-        return header.verifyMacWithImsi(imsi);
+    public Verdict verdict() {
+        if (header == null) {
+            return document.verdict();
+        }
+        byte[] head = header.bytes();
+        byte[] body = document.bytes();
+        int front = header.transactionIdentifier() == PushHeader.NO_TRANSACTION ? front(head) : 0;
+        int bodyAt = front + head.length;
+        byte[] push = new byte[bodyAt + body.length];
+        if (front > 0) {
+            push[1] = PUSH;
+            putLength(push, front, head.length);
+        }
+        System.arraycopy(head, 0, push, front, head.length);
+        System.arraycopy(body, 0, push, bodyAt, body.length);
+        return LibraryRules.verdictOnPush(push, bodyAt, document);
+    }
+
+    /** How many bytes stand in front of headers: identifier, type, and length, 7 bits a byte. */
+    private static int front(byte[] headers) {
+        int front = 3;
+        for (int rest = headers.length >>> 7; rest != 0; rest >>>= 7) {
+            ++front;
+        }
+        return front;
+    }
+
+    /** Writes a length up to an offset, the high bit set in all bytes but the last. */
+    private static void putLength(byte[] push, int end, int length) {
+        int rest = length;
+        for (int at = end - 1; at > 1; --at) {
+            push[at] = (byte) (rest & 0x7F | (at < end - 1 ? 0x80 : 0));
+            rest >>>= 7;
+        }
     }
 
     /**
-     * Checks the MAC by whichever security method the message states: {@link
-     * PushHeader#verifyMac(String, String)}.
+     * Checks the MAC by the method that the message states: {@link ProvisioningMac#verify}.
      *
-     * @param pin what the user has been told, or {@code null}
-     * @param imsi the subscriber's number, or {@code null}
-     * @return true when the MAC is right
+     * @param pin what the user has been told; may be {@code null} for NETWPIN
+     * @param imsi the subscriber's number, 1 to 15 digits; may be {@code null} unless the method
+     *     has NETWPIN in its name
+     * @return what comes of it, never {@code null}; {@link MacResult#NO_METHOD} for a body alone
      */
-    public boolean verifyMac(String pin, String imsi) {
-        return header.verifyMac(pin, imsi);
+    public MacResult verifyMac(String pin, String imsi) {
+        return header == null
+                ? MacResult.NO_METHOD
+                : ProvisioningMac.verify(
+                        header.securityMethod(), header.mac(), document.bytes(), pin, imsi);
     }
 
     /**
-     * Lists the proxies.
+     * Checks the MAC with a key that the caller has made, for a network whose subscribers have no
+     * IMSI.
      *
-     * @return every PXLOGICAL, in the order of the message; not modifiable
+     * @param key the bytes of the key
+     * @return what comes of it, never {@code null}; {@link MacResult#NO_METHOD} for a body alone
      */
-    public List<Proxy> getProxies() {
-        return proxies;
+    public MacResult verifyMac(byte[] key) {
+        return header == null
+                ? MacResult.NO_METHOD
+                : ProvisioningMac.verify(
+                        header.securityMethod(), header.mac(), document.bytes(), key);
+    }
+
+    /** {@return the proxies: every PXLOGICAL} */
+    public List<Proxy> proxies() {
+        return views(Proxy.class, "PXLOGICAL");
+    }
+
+    /** {@return the network access points: every NAPDEF} */
+    public List<AccessPoint> accessPoints() {
+        return views(AccessPoint.class, "NAPDEF");
+    }
+
+    /** {@return where further provisioning comes from: every BOOTSTRAP} */
+    public List<Bootstrap> bootstraps() {
+        return views(Bootstrap.class, "BOOTSTRAP");
+    }
+
+    /** {@return the identities that the client gets: every CLIENTIDENTITY} */
+    public List<ClientIdentity> clientIdentities() {
+        return views(ClientIdentity.class, "CLIENTIDENTITY");
+    }
+
+    /** {@return CLIENT-ID of the first CLIENTIDENTITY; {@code null} when it is not set} */
+    public String clientId() {
+        List<ClientIdentity> identities = clientIdentities();
+        return identities.isEmpty() ? null : identities.get(0).clientId();
+    }
+
+    /** {@return what vendors' own software is told: every VENDORCONFIG} */
+    public List<VendorConfiguration> vendorConfigurations() {
+        return views(VendorConfiguration.class, "VENDORCONFIG");
+    }
+
+    /** {@return the settings of applications: every APPLICATION} */
+    public List<Application> applications() {
+        return views(Application.class, "APPLICATION");
+    }
+
+    /** {@return which traffic takes which way: every ACCESS} */
+    public List<AccessRule> accessRules() {
+        return views(AccessRule.class, "ACCESS");
+    }
+
+    /** {@return the Wi-Fi networks: every WI-FI} */
+    public List<Wifi> wifis() {
+        return views(Wifi.class, "WI-FI");
+    }
+
+    /** {@return the settings for voice over Wi-Fi: every such characteristic} */
+    public List<VoWifi> voWifis() {
+        return views(VoWifi.class, "Vodafone VoWiFi");
+    }
+
+    private <V> List<V> views(Class<V> kind, String type) {
+        return TypedCharacteristic.views(document.root(), kind, type);
     }
 
     /**
-     * Lists the network access points.
-     *
-     * @return every NAPDEF, in the order of the message; not modifiable
+     * {@return whether another message says the same: it has an equal header, or none either, and
+     * an equal document}
+     * @param other what to compare with
      */
-    public List<AccessPoint> getAccessPoints() {
-        return accessPoints;
+    @Override
+    public boolean equals(Object other) {
+        if (!(other instanceof ProvisioningMessage)) {
+            return false;
+        }
+        ProvisioningMessage that = (ProvisioningMessage) other;
+        return (header == null ? that.header == null : header.equals(that.header))
+                && document.equals(that.document);
     }
 
-    /**
-     * Lists where further provisioning comes from.
-     *
-     * @return every BOOTSTRAP, in the order of the message; not modifiable
-     */
-    public List<Bootstrap> getBootstraps() {
-        return bootstraps;
+    /** {@return a number that fits {@link #equals}: the same number for equal messages} */
+    @Override
+    public int hashCode() {
+        return 31 * (header == null ? 0 : header.hashCode()) + document.hashCode();
     }
 
-    /**
-     * Tells the identity that the client gets.
-     *
-     * @return CLIENT-ID of the first CLIENTIDENTITY, or {@code null} when the message does not set
-     *     it
-     */
-    public String getClientId() {
-        return value("CLIENT-ID");
-    }
-
-    /**
-     * Lists what vendors' own software is told.
-     *
-     * @return every VENDORCONFIG, in the order of the message; not modifiable
-     */
-    public List<VendorConfiguration> getVendorConfigurations() {
-        return vendorConfigurations;
-    }
-
-    /**
-     * Lists the settings of applications.
-     *
-     * @return every APPLICATION, in the order of the message; not modifiable
-     */
-    public List<Application> getApplications() {
-        return applications;
-    }
-
-    /**
-     * Lists which traffic takes which way.
-     *
-     * @return every ACCESS, in the order of the message; not modifiable
-     */
-    public List<AccessRule> getAccessRules() {
-        return accessRules;
-    }
-
-    /**
-     * Lists the Wi-Fi networks.
-     *
-     * @return every WI-FI, in the order of the message; not modifiable
-     */
-    public List<Wifi> getWifis() {
-        return wifis;
-    }
-
-    /**
-     * Lists the settings for voice over Wi-Fi.
-     *
-     * @return every such characteristic, in the order of the message; not modifiable
-     */
-    public List<VoWifi> getVoWifis() {
-        return voWifis;
+    /** {@return how much is set, in one line without any value or MAC, which may go to a log} */
+    @Override
+    public String toString() {
+        String method = header == null ? "" : "securityMethod=" + header.securityMethod() + ", ";
+        return "ProvisioningMessage{" + method + "proxies=" + proxies().size()
+                + ", accessPoints=" + accessPoints().size()
+                + ", bootstraps=" + bootstraps().size()
+                + ", clientIdentities=" + clientIdentities().size()
+                + ", vendorConfigurations=" + vendorConfigurations().size()
+                + ", applications=" + applications().size()
+                + ", accessRules=" + accessRules().size()
+                + ", wifis=" + wifis().size()
+                + ", voWifis=" + voWifis().size() + "}";
     }
 }

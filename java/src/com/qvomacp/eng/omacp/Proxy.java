@@ -3,143 +3,114 @@ package com.qvomacp.eng.omacp;
 import java.util.List;
 
 /**
- * A proxy: a PXLOGICAL of the message.
+ * A proxy: a PXLOGICAL.
+ *
+ * <pre>{@code
+ * for (Proxy proxy : message.proxies()) {
+ *     System.out.println(proxy.proxyId() + " begins with " + proxy.startPage());
+ *     for (PhysicalProxy machine : proxy.physicalProxies()) {
+ *         System.out.println(machine.address() + " by " + machine.toNapIds());
+ *     }
+ * }
+ * }</pre>
  */
-public final class Proxy extends Characteristic {
-    private static final String[] NAMES = {
-        "PROXY-ID",
-        "PROXY-PW",
-        "PPGAUTH-TYPE",
-        "PROXY-PROVIDER-ID",
-        "NAME",
-        "TRUST",
-        "MASTER",
-        "STARTPAGE",
-    };
-
-    private final List<String> domains;
-    private final List<ProxyAuthentication> authentications;
-    private final List<ProxyPort> ports;
-    private final List<PhysicalProxy> physicalProxies;
-
-    Proxy(
-            String[] values,
-            List<String> domains,
-            List<ProxyAuthentication> authentications,
-            List<ProxyPort> ports,
-            List<PhysicalProxy> physicalProxies) {
-        super(NAMES, values, domains, authentications, ports, physicalProxies);
-        this.domains = domains;
-        this.authentications = authentications;
-        this.ports = ports;
-        this.physicalProxies = physicalProxies;
+public final class Proxy extends TypedCharacteristic {
+    Proxy(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Names the proxy; an application refers to it by this name.
-     *
-     * @return PROXY-ID, or {@code null} when the message does not set it
-     */
-    public String getProxyId() {
+    /** {@return PROXY-ID: the name of the proxy; applications refer to it by this name} */
+    public String proxyId() {
         return value("PROXY-ID");
     }
 
-    /**
-     * Tells the password with which the proxy authenticates itself.
-     *
-     * @return PROXY-PW, or {@code null} when the message does not set it
-     */
-    public String getPassword() {
+    /** {@return PROXY-PW: the password with which the proxy authenticates itself} */
+    public String password() {
         return value("PROXY-PW");
     }
 
-    /**
-     * Tells how the push proxy gateway authenticates itself.
-     *
-     * @return PPGAUTH-TYPE, or {@code null} when the message does not set it
-     */
-    public String getPushAuthenticationType() {
+    /** {@return PPGAUTH-TYPE: how the push proxy gateway authenticates itself} */
+    public String pushAuthenticationType() {
         return value("PPGAUTH-TYPE");
     }
 
-    /**
-     * Names the provider of the proxy.
-     *
-     * @return PROXY-PROVIDER-ID, or {@code null} when the message does not set it
-     */
-    public String getProviderId() {
+    /** {@return PROXY-PROVIDER-ID: the name of the provider of the proxy} */
+    public String providerId() {
         return value("PROXY-PROVIDER-ID");
     }
 
-    /**
-     * Tells the name to show to the user.
-     *
-     * @return NAME, or {@code null} when the message does not set it
-     */
-    public String getName() {
+    /** {@return NAME: the name to show to the user} */
+    public String name() {
         return value("NAME");
     }
 
-    /**
-     * Tells whether the proxy is trusted to provision.
-     *
-     * @return TRUST, or {@code null} when the message does not set it
-     */
-    public String getTrust() {
+    /** {@return every DOMAIN: the domains that are reached through the proxy} */
+    public List<String> domains() {
+        return values("DOMAIN");
+    }
+
+    /** {@return whether TRUST stands here: by the standard, the proxy is trusted to provision} */
+    public boolean hasTrust() {
+        return has("TRUST");
+    }
+
+    /** {@return the value of TRUST, which by the standard has none} */
+    public String trust() {
         return value("TRUST");
     }
 
-    /**
-     * Tells whether the proxy is the master of its navigation domain.
-     *
-     * @return MASTER, or {@code null} when the message does not set it
-     */
-    public String getMaster() {
+    /** {@return whether MASTER stands here: by the standard, it leads its navigation domain} */
+    public boolean hasMaster() {
+        return has("MASTER");
+    }
+
+    /** {@return the value of MASTER, which by the standard has none} */
+    public String master() {
         return value("MASTER");
     }
 
-    /**
-     * Tells the address of the page to begin with.
-     *
-     * @return STARTPAGE, or {@code null} when the message does not set it
-     */
-    public String getStartPage() {
+    /** {@return STARTPAGE: the address of the page to begin with} */
+    public String startPage() {
         return value("STARTPAGE");
     }
 
-    /**
-     * Lists the domains that are reached through the proxy.
-     *
-     * @return every DOMAIN; not modifiable, empty when there is none
-     */
-    public List<String> getDomains() {
-        return domains;
+    /** {@return BASAUTH-ID: the name of the user for the page to begin with} */
+    public String basicAuthenticationId() {
+        return value("BASAUTH-ID");
     }
 
-    /**
-     * Lists how to authenticate towards the proxy.
-     *
-     * @return every PXAUTHINFO; not modifiable, empty when there is none
-     */
-    public List<ProxyAuthentication> getAuthentications() {
-        return authentications;
+    /** {@return BASAUTH-PW: the password for the page to begin with} */
+    public String basicAuthenticationPassword() {
+        return value("BASAUTH-PW");
     }
 
-    /**
-     * Lists the ports that hold for every physical proxy without ports of its own.
-     *
-     * @return every PORT directly in the PXLOGICAL; not modifiable, empty when there is none
-     */
-    public List<ProxyPort> getPorts() {
-        return ports;
+    /** {@return WSP-VERSION: the version of WSP that the proxy speaks} */
+    public String wspVersion() {
+        return value("WSP-VERSION");
     }
 
-    /**
-     * Lists the machines behind the proxy.
-     *
-     * @return every PXPHYSICAL; not modifiable, empty when there is none
-     */
-    public List<PhysicalProxy> getPhysicalProxies() {
-        return physicalProxies;
+    /** {@return PUSHENABLED: whether the proxy supports push: {@code 1} when it does} */
+    public String pushEnabled() {
+        return value("PUSHENABLED");
+    }
+
+    /** {@return PULLENABLED: whether the proxy supports pull: {@code 1} when it does} */
+    public String pullEnabled() {
+        return value("PULLENABLED");
+    }
+
+    /** {@return every PXAUTHINFO: how to authenticate towards the proxy} */
+    public List<ProxyAuthentication> authentications() {
+        return views(ProxyAuthentication.class, "PXAUTHINFO");
+    }
+
+    /** {@return every PORT: the ports of each physical proxy that has none of its own} */
+    public List<Port> ports() {
+        return views(Port.class, "PORT");
+    }
+
+    /** {@return every PXPHYSICAL: the machines behind the proxy} */
+    public List<PhysicalProxy> physicalProxies() {
+        return views(PhysicalProxy.class, "PXPHYSICAL");
     }
 }

@@ -2,38 +2,30 @@ package com.qvomacp.eng.omacp;
 
 /**
  * How to authenticate towards a proxy: a PXAUTHINFO.
+ *
+ * <pre>{@code
+ * for (ProxyAuthentication way : message.proxies().get(0).authentications()) {
+ *     System.out.println(way.type() + " as " + way.id());
+ * }
+ * }</pre>
  */
-public final class ProxyAuthentication extends Characteristic {
-    private static final String[] NAMES = {"PXAUTH-TYPE", "PXAUTH-ID", "PXAUTH-PW"};
-
-    ProxyAuthentication(String[] values) {
-        super(NAMES, values);
+public final class ProxyAuthentication extends TypedCharacteristic {
+    ProxyAuthentication(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Tells the scheme, such as {@code HTTP-BASIC}.
-     *
-     * @return PXAUTH-TYPE, or {@code null} when the message does not set it
-     */
-    public String getType() {
+    /** {@return PXAUTH-TYPE: the scheme, such as {@code HTTP-BASIC}} */
+    public String type() {
         return value("PXAUTH-TYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return PXAUTH-ID, or {@code null} when the message does not set it
-     */
-    public String getId() {
+    /** {@return PXAUTH-ID: the name of the user} */
+    public String id() {
         return value("PXAUTH-ID");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return PXAUTH-PW, or {@code null} when the message does not set it
-     */
-    public String getPassword() {
+    /** {@return PXAUTH-PW: the password} */
+    public String password() {
         return value("PXAUTH-PW");
     }
 }

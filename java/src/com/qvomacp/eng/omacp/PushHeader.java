@@ -1,204 +1,207 @@
 package com.qvomacp.eng.omacp;
 
 import java.util.Arrays;
+import java.util.Collections;
+import java.util.List;
 
 /**
- * The push header of a message, and what checks the MAC that it carries. The MAC can be checked
- * before the body is decoded: see {@link ProvisioningMessage#parseHeader}.
+ * The header of a push, by the Wireless Session Protocol (WAP-230): content type, security method,
+ * MAC, and whatever else the sender has put there. Immutable.
+ *
+ * <p>There is no header without the type of a push, a header length that the data has, and a media
+ * type. Of anything else what is there is read: a length inside the header that runs beyond it ends
+ * with it, as does a text without its NUL; a parameter that begins inside the content type is read
+ * to its own end; an octet that can begin nothing is passed over. SEC and MAC are found as
+ * parameters and as headers, by number or by name in any case; the first one counts.
+ *
+ * <pre>{@code
+ * PushHeader header = PushHeader.parse(push);
+ * System.out.println(header.contentType().mediaType() + " " + header.securityMethod());
+ * }</pre>
  */
 public final class PushHeader {
-    private final ContentType contentType;
-    private final int headerLength;
-    private final int sec;
-    private final String mac;
-    private final byte[] body;
+    static final int NO_TRANSACTION = -1;
 
-    PushHeader(ContentType contentType, int headerLength, int sec, String mac, byte[] body) {
+    private static final int FIRST_TEXT = 0x20;
+    private static final int SHIFT = 0x7F;
+
+    private final int transactionIdentifier;
+
+    /** Where the content type begins. */
+    private final int from;
+
+    private final byte[] bytes;
+    private final ContentType contentType;
+    private final List<HeaderField> fields;
+    private final SecurityMethod securityMethod;
+
+    /** Null when the message carries none. */
+    private final HeaderField mac;
+
+    PushHeader(
+            int transactionIdentifier,
+            int from,
+            byte[] bytes,
+            ContentType contentType,
+            List<HeaderField> fields) {
+        this.transactionIdentifier = transactionIdentifier;
+        this.from = from;
+        this.bytes = bytes;
         this.contentType = contentType;
-        this.headerLength = headerLength;
-        this.sec = sec;
-        this.mac = mac;
-        this.body = body;
+        this.fields = Collections.unmodifiableList(fields);
+        HeaderField sec = first("SEC", false);
+        securityMethod = sec == null ? SecurityMethod.NONE : SecurityMethod.stated(sec.value());
+        mac = first("MAC", true);
+    }
+
+    /** The first parameter or header of a name; null without one. */
+    private HeaderField first(String name, boolean hasValue) {
+        HeaderField found = first(contentType.parameters(), name, hasValue);
+        return found != null ? found : first(fields, name, hasValue);
+    }
+
+    private static HeaderField first(List<HeaderField> list, String name, boolean hasValue) {
+        for (HeaderField field : list) {
+            if (field.name().equalsIgnoreCase(name) && (!hasValue || field.value() != null)) {
+                return field;
+            }
+        }
+        return null;
     }
 
     /**
-     * Tells the content type of the message.
+     * Reads the header of a push, whatever follows it.
      *
-     * @return the content type, with its code and its name; never {@code null}
+     * @param push a push, from its transaction identifier on
+     * @return the header
+     * @throws ProvisioningException when the bytes do not begin with the header of a push
      */
-    public ContentType getContentType() {
+    public static PushHeader parse(byte[] push) throws ProvisioningException {
+        return HeaderReader.readPush(push);
+    }
+
+    /**
+     * Reads the headers of a push alone, from the content type on, as a platform hands them out.
+     *
+     * @param headers the content type and the headers behind it
+     * @return the header, without transaction identifier
+     * @throws ProvisioningException when the bytes are no headers of a push
+     */
+    public static PushHeader parseHeaders(byte[] headers) throws ProvisioningException {
+        return HeaderReader.readHeaders(headers);
+    }
+
+    /** What was read, not to be changed. */
+    byte[] bytes() {
+        return bytes;
+    }
+
+    /** {@return the transaction identifier: 0 to 255; -1 when the headers were read alone} */
+    public int transactionIdentifier() {
+        return transactionIdentifier;
+    }
+
+    /** {@return how long the header is: bytes from the start of what was read to the body} */
+    public int length() {
+        return bytes.length;
+    }
+
+    /** {@return the content type with its parameters: the content type, never {@code null}} */
+    public ContentType contentType() {
         return contentType;
     }
 
     /**
-     * Tells how long the headers are. The body stands behind them, and behind the three bytes in
-     * front of them.
-     *
-     * @return bytes, 0 to 255
+     * {@return the security method: the method that SEC states; {@link SecurityMethod#NONE} without
+     * SEC, {@link SecurityMethod#UNKNOWN} for a SEC that states none of them; never {@code null}}
      */
-    public int getHeaderLength() {
-        return headerLength;
+    public SecurityMethod securityMethod() {
+        return securityMethod;
     }
 
     /**
-     * Tells how long the body is.
-     *
-     * @return bytes
+     * {@return the MAC that the message states, right or not, which has 40 hexadecimal digits;
+     * {@code null} when it carries none}
      */
-    public int getBodyLength() {
-        return body.length;
+    public String mac() {
+        return mac == null ? null : mac.value();
+    }
+
+    /** {@return where the MAC begins: bytes from the start of what was read; -1 without one} */
+    public int macOffset() {
+        return mac == null ? -1 : mac.offset();
+    }
+
+    /** {@return the headers behind the content type, in their order; not modifiable} */
+    public List<HeaderField> fields() {
+        return fields;
     }
 
     /**
-     * Tells the body, over which the MAC is computed.
+     * Tells what every byte of the header means. Nothing is kept: the visitor hears each as it is
+     * worked out.
      *
-     * @return a new array
+     * @param visitor hears all bytes in their order; a meaning may hold any character that the
+     *     message holds, the MAC among them
      */
-    public byte[] getBody() {
-        return body.clone();
+    public void describe(ByteVisitor visitor) {
+        if (transactionIdentifier != NO_TRANSACTION) {
+            visitor.visit(0, 1, 0, "transaction identifier " + transactionIdentifier);
+            visitor.visit(1, 1, 0, "push");
+            visitor.visit(2, from - 2, 0, "header length " + (bytes.length - from));
+        }
+        contentType.describe(visitor);
+        int at = contentType.offset() + contentType.length();
+        for (HeaderField field : fields) {
+            describeShifts(visitor, at, field.offset());
+            field.describe(visitor, 0);
+            at = field.offset() + field.length();
+        }
+        describeShifts(visitor, at, bytes.length);
     }
 
-    /**
-     * Tells the security method.
-     *
-     * @return the method that SEC states; {@link SecurityMethod#NONE} without SEC, {@link
-     *     SecurityMethod#UNKNOWN} for a SEC that states none of them; never {@code null}
-     */
-    public SecurityMethod getSecurityMethod() {
-        return SecurityMethod.ofSec(sec);
+    /** Between the headers stand changes of the code page, and what begins no header. */
+    private void describeShifts(ByteVisitor visitor, int from, int to) {
+        int at = from;
+        while (at < to) {
+            int octet = bytes[at] & 0xFF;
+            if (octet == SHIFT && at + 1 < to) {
+                visitor.visit(at, 2, 0, "headers of code page " + (bytes[at + 1] & 0xFF));
+                at += 2;
+            } else {
+                boolean isShift = octet > 0 && octet < FIRST_TEXT;
+                visitor.visit(at, 1, 0, isShift ? "headers of code page " + octet : "no header");
+                at += 1;
+            }
+        }
     }
 
-    /**
-     * Tells SEC as the message states it.
-     *
-     * @return the byte as sent, such as 0x81, or 0 when the message does not state it
-     */
-    public int getSec() {
-        return sec;
+    /** A byte of what was read, 0 to 255. */
+    int byteAt(int offset) {
+        return bytes[offset] & 0xFF;
     }
 
-    /**
-     * Tells the MAC as the message states it, which does not say that it is right.
-     *
-     * @return the MAC, usually 40 hexadecimal digits, or {@code null} when the message carries none
-     */
-    public String getMac() {
-        return mac;
-    }
-
-    /**
-     * Checks the MAC of a message that is secured by what the user has been told: {@link
-     * SecurityMethod#USERPIN} or {@link SecurityMethod#USERPINMAC}. The same as {@link
-     * #verifyMac(String, String) verifyMac(pin, null)}.
-     *
-     * @param pin what the user has been told, or {@code null}
-     * @return true when the message carries the right MAC
-     */
-    public boolean verifyMac(String pin) {
-        return verifyMac(pin, null);
-    }
-
-    /**
-     * Checks the MAC of a message that is secured by the subscriber's number: {@link
-     * SecurityMethod#NETWPIN}. The same as {@link #verifyMac(String, String) verifyMac(null,
-     * imsi)}.
-     *
-     * @param imsi the subscriber's number, or {@code null}
-     * @return true when the message carries the right MAC
-     */
-    public boolean verifyMacWithImsi(String imsi) {
-        return verifyMac(null, imsi);
-    }
-
-    /**
-     * Checks the MAC by whichever security method the message states.
-     *
-     * <p>The MAC is the HMAC-SHA1 of the body. Its key, as OMA Provisioning Bootstrap defines it:
-     *
-     * <ul>
-     *   <li>{@link SecurityMethod#NETWPIN}: the IMSI in semi-octets, as it stands on a SIM card.
-     *   <li>{@link SecurityMethod#USERPIN}: the characters of the PIN.
-     *   <li>{@link SecurityMethod#USERNETWPIN}: that of the IMSI and then that of the PIN.
-     *   <li>{@link SecurityMethod#USERPINMAC}: the first half of the PIN, whose second half is the
-     *       MAC, a decimal digit for each of its first bytes. The PIN has an even number of digits,
-     *       10 to 40. A MAC in the push header is not looked at.
-     * </ul>
-     *
-     * <p>MACs are compared in a time that does not depend on where they differ. Small and capital
-     * hexadecimal digits are the same.
-     *
-     * @param pin what the user has been told; may be {@code null} for NETWPIN
-     * @param imsi the subscriber's number, 1 to 15 digits; may be {@code null} unless the method
-     *     has NETWPIN in its name
-     * @return true when the MAC is right; false when it is not, when the message states no security
-     *     method, one that is unknown, or carries no MAC, and when the PIN or the number that the
-     *     method needs is missing, empty or not made as said above
-     */
-    public boolean verifyMac(String pin, String imsi) {
-        return MacVerifier.verify(getSecurityMethod(), mac, body, pin, imsi);
-    }
-
-    /**
-     * Checks the MAC that the push header carries with a key that the caller has made: for a
-     * network whose subscribers have no IMSI.
-     *
-     * @param key the bytes of the key, or {@code null}
-     * @return true when the message carries a MAC and it is right; false when it is not, when there
-     *     is none, and without a key
-     */
-    public boolean verifyMacWithKey(byte[] key) {
-        return MacVerifier.verify(mac, body, key);
-    }
-
-    /** The first byte of a body that is not empty. */
-    byte firstBodyByte() {
-        return body[0];
-    }
-
-    /**
-     * Compares all that the header states, and the bodies.
-     *
-     * @param other what to compare with
-     * @return true for a header that states the same in front of the same body
-     */
+    /** {@return whether it is a header that says the same, however it is written} */
     @Override
     public boolean equals(Object other) {
         if (!(other instanceof PushHeader)) {
             return false;
         }
         PushHeader that = (PushHeader) other;
-        return contentType == that.contentType
-                && headerLength == that.headerLength
-                && sec == that.sec
-                && (mac == null ? that.mac == null : mac.equals(that.mac))
-                && Arrays.equals(body, that.body);
+        return transactionIdentifier == that.transactionIdentifier
+                && contentType.equals(that.contentType)
+                && fields.equals(that.fields);
     }
 
-    /**
-     * Answers a number that fits {@link #equals}.
-     *
-     * @return the same number for equal headers
-     */
     @Override
     public int hashCode() {
-        return 31 * (31 * contentType.getCode() + sec) + Arrays.hashCode(body);
+        return Arrays.hashCode(new Object[] {transactionIdentifier, contentType, fields});
     }
 
-    /**
-     * Shows what the header states.
-     *
-     * @return one line of text
-     */
+    /** {@return media type, security method and whether there is a MAC, in a line for a log} */
     @Override
     public String toString() {
-        return "PushHeader{"
-                + contentType.getMediaType()
-                + ", SEC="
-                + getSecurityMethod()
-                + ", MAC="
-                + mac
-                + ", "
-                + body.length
-                + " bytes}";
+        String text = "PushHeader{" + Printable.of(contentType.mediaType()) + ", ";
+        return text + securityMethod + (mac == null ? ", no MAC}" : ", a MAC}");
     }
 }

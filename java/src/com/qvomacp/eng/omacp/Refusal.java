@@ -1,144 +1,397 @@
 package com.qvomacp.eng.omacp;
 
-import com.qvomacp.eng.omacp.ProvisioningException.Reason;
-import java.nio.charset.StandardCharsets;
+import com.qvomacp.eng.omacp.LibraryStop.Cause;
+import com.qvomacp.eng.omacp.LibraryStop.Place;
+import java.util.ArrayList;
+import java.util.Arrays;
+import java.util.Collections;
+import java.util.List;
 import java.util.Locale;
 
-/**
- * Finds out from a message why the library has refused it, since the library itself only says that
- * it has. The push header is looked at in the order in which the library reads it.
- */
+/** Where and why the native library refuses a message, in words. */
 final class Refusal {
-    private static final int PDU_TYPE = 1;
-    private static final int HEADERS_LENGTH = 2;
-    private static final int HEADERS = 3;
-    private static final int QUOTED_CONTENT_TYPE = 5;
+    static final String END_OF_DATA = "the end of the data";
 
-    private static final int PUSH = 0x06;
-    private static final int LENGTH_QUOTE = 0x1F;
-    private static final int FIRST_TEXT = 0x20;
-    private static final int LAST_TEXT = 0x7F;
-    private static final int LONGEST_SHOWN = 60;
+    /** Where that stands which is refused. */
+    final int offset;
 
-    private Refusal() {}
+    /** The elements around; null when the header of a push is refused. */
+    final String path;
 
-    /** Says what a message lacks before the library need be asked; null when it lacks nothing. */
-    static ProvisioningException ofOutline(byte[] message) {
-        if (message == null || message.length == 0) {
-            return exception(Reason.NO_MESSAGE, "there is no message");
-        }
-        if (message.length > PDU_TYPE && unsigned(message, PDU_TYPE) != PUSH) {
-            return exception(
-                    Reason.NOT_A_PUSH,
-                    "not a push: PDU type %s in place of 0x06",
-                    hex(unsigned(message, PDU_TYPE)));
-        }
-        if (message.length <= HEADERS) {
-            return exception(
-                    Reason.HEADER_CUT_OFF,
-                    "the message ends within its push header, after %d bytes",
-                    message.length);
-        }
-        int end = HEADERS + unsigned(message, HEADERS_LENGTH);
-        if (message.length < end) {
-            return exception(
-                    Reason.HEADER_CUT_OFF,
-                    "the push header is %d bytes long, but the message ends after %d",
-                    end,
-                    message.length);
-        }
-        return null;
+    final String found;
+    final List<String> expected;
+    final String reason;
+
+    Refusal(int offset, String path, String found, List<String> expected, String reason) {
+        this.offset = offset;
+        this.path = path;
+        this.found = found;
+        this.expected = Collections.unmodifiableList(expected);
+        this.reason = reason;
     }
 
-    /** Says why the library refuses the push header of a message whose outline is in order. */
-    static ProvisioningException ofHeader(byte[] message) {
-        int at = unsigned(message, HEADERS) == LENGTH_QUOTE ? QUOTED_CONTENT_TYPE : HEADERS;
-        if (at >= message.length) {
-            return exception(
-                    Reason.HEADER_CUT_OFF, "the message ends in front of the content type");
+    /** Of a body that a walk has ended in. */
+    static Refusal of(LibraryWalk walk, LibraryStop stop) {
+        Words words = new Words(walk, stop);
+        String found = words.found();
+        int offset = stop.offset;
+        if (stop.cause == Cause.DOCUMENT_TYPE && walk.unreadItem != null && walk.at >= walk.size) {
+            offset = walk.size;
+        } else if (stop.cause == Cause.DOCUMENT_TYPE && words.isTypeInTable()) {
+            offset = walk.tableAt;
         }
-        int first = unsigned(message, at);
-        String name = null;
-        if (first >= FIRST_TEXT && first <= LAST_TEXT) {
-            int end = endOfText(message, at);
-            if (end == message.length) {
-                return exception(
-                        Reason.HEADER_CUT_OFF, "the message ends within its content type");
+        return of(walk, offset, found, words.expected(), words.reason(found));
+    }
+
+    /** Of a body that can be decoded and holds no characteristic at all. */
+    static Refusal ofEmpty(LibraryWalk walk) {
+        int offset = walk.elementsAt;
+        List<String> expected = Arrays.asList(LibraryStop.DOCUMENT, LibraryStop.CHARACTERISTIC);
+        int first = walk.data[offset] & LibraryText.TAG_MASK;
+        String reason;
+        if (walk.inDocument) {
+            reason = "the document is empty";
+            expected = expected.subList(1, 2);
+            offset = Math.max(offset, walk.at - 1);
+        } else if (first == LibraryText.END) {
+            reason = "the body holds no document";
+        } else if (first != LibraryText.SWITCH_PAGE) {
+            reason = "a document that begins with a parm is taken for an empty one";
+        } else if (walk.isSwitchWhole) {
+            reason = "a document that begins with a SWITCH_PAGE is taken for an empty one";
+        } else {
+            reason = "the body ends within a SWITCH_PAGE";
+        }
+        return of(walk, offset, new Words(walk, null).elementAt(offset), expected, reason);
+    }
+
+    /** Tells too what was skipped against the format in front of where the walk ended. */
+    private static Refusal of(
+            LibraryWalk walk, int offset, String found, List<String> expected, String why) {
+        String reason = why;
+        if (walk.skipped != null) {
+            reason += "; skipped before: " + bytes(walk.skippedEnd - walk.skippedStart);
+            reason += " from offset " + walk.skippedStart + " on, " + walk.skipped;
+        }
+        return new Refusal(offset, LibraryPath.of(walk), found, expected, reason);
+    }
+
+    /** The same of a body that is not the message's, which begins so many bytes behind it. */
+    Refusal ofShiftedBody(int shift) {
+        String where = "; the library takes the body to begin " + bytes(Math.abs(shift));
+        where += shift < 0 ? " later" : " earlier";
+        return new Refusal(offset, path, found, expected, reason + where);
+    }
+
+    static String bytes(long count) {
+        return count == 1 ? "1 byte" : count + " bytes";
+    }
+
+    static String hex(int octet) {
+        return String.format(Locale.ROOT, "0x%02X", octet & 0xFF);
+    }
+
+    /** A text of a message in quotes, fit for a log. */
+    static String quoted(byte[] data, int from, int end) {
+        return Printable.quoted(CharacterSet.UTF_8.decode(data, from, end));
+    }
+
+    /** What there is to say where a walk has ended. */
+    private static final class Words {
+        private static final int LITERAL = 0x04;
+        private static final int FIRST_VALUE = 0x80;
+
+        /** The tokens that WBXML itself gives a meaning; null for the others. */
+        private static final String[] GLOBAL = new String[256];
+
+        static {
+            String[] names = {"SWITCH_PAGE", "END", "ENTITY", "STR_I", "LITERAL"};
+            System.arraycopy(names, 0, GLOBAL, 0, names.length);
+            for (int i = 0; i < 3; ++i) {
+                GLOBAL[0x40 + i] = "EXT_I_" + i;
+                GLOBAL[0x80 + i] = "EXT_T_" + i;
+                GLOBAL[0xC0 + i] = "EXT_" + i;
             }
-            name = new String(message, at, end - at, StandardCharsets.ISO_8859_1);
+            GLOBAL[0x43] = "PI";
+            GLOBAL[0x44] = "LITERAL_C";
+            GLOBAL[0x83] = "STR_T";
+            GLOBAL[0x84] = "LITERAL_A";
+            GLOBAL[0xC3] = "OPAQUE";
+            GLOBAL[0xC4] = "LITERAL_AC";
         }
-        if (ContentType.named(name) == null && ContentType.ofCode(first & 0x7F) == null) {
-            return exception(
-                    Reason.UNKNOWN_CONTENT_TYPE,
-                    "unknown content type %s",
-                    name == null ? hex(first) : '"' + shown(name) + '"');
+
+        private final LibraryWalk walk;
+
+        /** Null when the walk has come to an end of its own. */
+        private final LibraryStop stop;
+
+        /** The innermost characteristic; null outside of any, and for one of no known type. */
+        private final LibraryKind kind;
+
+        Words(LibraryWalk walk, LibraryStop stop) {
+            this.walk = walk;
+            this.stop = stop;
+            kind = walk.depth == 0 ? null : walk.kinds[walk.depth - 1];
         }
-        return exception(
-                Reason.BAD_MAC, "the MAC of the push header does not end, or is too long");
-    }
 
-    /**
-     * Says why the library refuses a body whose push header it has taken.
-     *
-     * @param decoder the decoder's word on the body; null without it
-     */
-    static ProvisioningException ofBody(PushHeader header, NativeDecoder decoder) {
-        String mediaType = header.getContentType().getMediaType();
-        if (header.getBodyLength() == 0) {
-            return new ProvisioningException(
-                    Reason.EMPTY_BODY,
-                    text("the message (%s) ends with its push header: it has no body", mediaType),
-                    decoder);
+        /** Where the walk has ended, which may be behind the one text between characteristics. */
+        private Place place() {
+            boolean isText =
+                    stop.offset < walk.size
+                            && (walk.data[stop.offset] & LibraryText.TAG_MASK) == LibraryText.STR_I;
+            return stop.place == Place.NEXT_CHARACTERISTIC && isText
+                    ? Place.BEHIND_TEXT
+                    : stop.place;
         }
-        return new ProvisioningException(
-                Reason.BODY_REFUSED,
-                text(
-                        "the body (%s, %d bytes) is not a provisioning document that can be"
-                                + " decoded%s",
-                        mediaType, header.getBodyLength(), detail(header, decoder)),
-                decoder);
-    }
 
-    private static String detail(PushHeader header, NativeDecoder decoder) {
-        if (header.firstBodyByte() == '<') {
-            return ": it is XML, not WBXML";
+        /** Whether the body begins with its table, where its type has to be. */
+        boolean isTypeInTable() {
+            return walk.publicId == 0 && walk.unreadItem == null;
         }
-        if (decoder == null) {
-            return "";
+
+        // ---- What stands there
+
+        String found() {
+            if (stop.cause == Cause.DOCUMENT_TYPE) {
+                return documentType();
+            }
+            if (stop.offset >= walk.size) {
+                return END_OF_DATA;
+            }
+            switch (stop.place) {
+                case DOCUMENT:
+                case IN_DOCUMENT:
+                case NEXT_CHARACTERISTIC:
+                case IN_CHARACTERISTIC:
+                    return elementAt(stop.offset);
+                default:
+                    break;
+            }
+            String found = attributeAt(stop.offset);
+            if (stop.cause == Cause.NO_SUCH_PAGE) {
+                return found + " to page " + wantedPage();
+            }
+            return stop.cause == Cause.UNKNOWN_NAME
+                    ? found + " behind NAME=" + Printable.quoted(walk.nameText())
+                    : found;
         }
-        return decoder.code == 0
-                ? ": it holds no document"
-                : text(": result code %d behind %d bytes of it", decoder.code, decoder.read);
-    }
 
-    private static ProvisioningException exception(Reason reason, String text, Object... values) {
-        return new ProvisioningException(reason, text(text, values));
-    }
-
-    private static String text(String text, Object... values) {
-        return String.format(Locale.ROOT, text, values);
-    }
-
-    private static int unsigned(byte[] message, int at) {
-        return message[at] & 0xFF;
-    }
-
-    private static String hex(int value) {
-        return String.format(Locale.ROOT, "0x%02X", value);
-    }
-
-    /** Where the zero behind a text stands; the length of the message when there is none. */
-    private static int endOfText(byte[] message, int at) {
-        int end = at;
-        while (end < message.length && message[end] != 0) {
-            ++end;
+        private int wantedPage() {
+            return walk.data[stop.offset + 1] & 0xFF;
         }
-        return end;
-    }
 
-    /** A text of the message as one line of plain characters, not too long. */
-    private static String shown(String text) {
-        String start = text.length() > LONGEST_SHOWN ? text.substring(0, LONGEST_SHOWN) : text;
-        return start.replaceAll("[^ -~]", "?") + (start.length() < text.length() ? "..." : "");
+        private String documentType() {
+            if (isTypeInTable()) {
+                return quoted(walk.data, walk.tableAt, walk.endOfTableText(walk.tableAt));
+            }
+            if (walk.publicId != 0) {
+                return "public identifier " + walk.publicId;
+            }
+            return walk.at >= walk.size ? END_OF_DATA : "public identifier";
+        }
+
+        /** The token of an element. */
+        String elementAt(int offset) {
+            int token = walk.data[offset] & 0xFF;
+            Element element = CodePage.of(0).element(token & LibraryText.TAG_MASK);
+            if (GLOBAL[token] != null) {
+                return global(offset);
+            }
+            return element == null
+                    ? "element " + hex(token)
+                    : LibraryKind.withToken(element.text, token);
+        }
+
+        /** The token of an attribute or of a value. */
+        private String attributeAt(int offset) {
+            int token = walk.data[offset] & 0xFF;
+            if (GLOBAL[token] != null) {
+                return global(offset);
+            }
+            String name = nameOf(CodePage.of(walk.page), token);
+            name = name != null ? name : nameOf(CodePage.of(0), token);
+            return name == null ? hex(token) : LibraryKind.withToken(name, token);
+        }
+
+        private static String nameOf(CodePage page, int token) {
+            if (token >= FIRST_VALUE) {
+                return page.value(token);
+            }
+            Attribute attribute = page.attribute(token);
+            String value = page.begin(token);
+            if (attribute == null || attribute == Attribute.NAME && value != null) {
+                return value;
+            }
+            return value == null ? attribute.name() : attribute.name() + "=" + value;
+        }
+
+        /** A token of WBXML itself; a literal one with the name that it refers to. */
+        private String global(int offset) {
+            int token = walk.data[offset] & 0xFF;
+            String name = GLOBAL[token];
+            if ((token & LibraryText.TAG_MASK) == LITERAL && walk.unreadItem == null) {
+                long index = new Cursor(walk.data, offset + 1, walk.size).integer();
+                if (index >= 0 && index < walk.tablePresent) {
+                    int start = walk.tableAt + (int) index;
+                    name += " " + quoted(walk.data, start, walk.endOfTableText(start));
+                }
+            }
+            return LibraryKind.withToken(name, token);
+        }
+
+        // ---- What would have been taken
+
+        List<String> expected() {
+            switch (stop.cause) {
+                case EMPTY_BODY:
+                    return Collections.singletonList("a WBXML document");
+                case DOCUMENT_TYPE:
+                    return Arrays.asList(
+                            "public identifier 11",
+                            "public identifier 0 with a string table that begins with \""
+                                    + LibraryWalk.DOCUMENT_TYPE
+                                    + '"');
+                case NO_SUCH_PAGE:
+                    return Arrays.asList("page 0", "page 1");
+                case NO_SUCH_STRING:
+                    return walk.unreadItem == null
+                            ? Collections.singletonList("an index below " + walk.tableLength)
+                            : Collections.<String>emptyList();
+                case OPAQUE_TOO_LONG:
+                    return Collections.singletonList("at most " + bytes(walk.size - walk.at));
+                case EMPTY_NAME:
+                case UNKNOWN_NAME:
+                    return names();
+                case TOO_MUCH_TEXT:
+                case OPAQUE_WITHOUT_LENGTH:
+                    return Collections.emptyList();
+                default:
+                    return expectedThere();
+            }
+        }
+
+        private List<String> names() {
+            if (kind.names() == null) {
+                return Collections.singletonList("a name");
+            }
+            List<String> names = new ArrayList<>();
+            for (String name : kind.names()) {
+                names.add("NAME=\"" + name + '"');
+            }
+            return names;
+        }
+
+        private List<String> expectedThere() {
+            List<String> expected = new ArrayList<>(place().expected);
+            switch (stop.place) {
+                case TYPE:
+                    expected.addAll(LibraryKind.expectedTypes(walk.page));
+                    break;
+                case IN_CHARACTERISTIC:
+                    if (kind != null && kind.nests) {
+                        expected.add(LibraryStop.CHARACTERISTIC);
+                    }
+                    if (kind != null) {
+                        expected.add(LibraryStop.PARM);
+                    }
+                    break;
+                case PARM:
+                case MASKED_NAME:
+                    expected.addAll(kind.expectedParms());
+                    break;
+                default:
+                    break;
+            }
+            return expected;
+        }
+
+        // ---- Why
+
+        String reason(String found) {
+            switch (stop.cause) {
+                case EMPTY_BODY:
+                    return "the body is empty";
+                case DOCUMENT_TYPE:
+                    return wrongType();
+                case ENDED:
+                    return ended();
+                case NO_SUCH_PAGE:
+                    return "there is no code page " + wantedPage();
+                case NO_SUCH_STRING:
+                    return walk.at >= walk.size && walk.data[walk.size - 1] < 0
+                            ? "the body ends within a reference to the string table"
+                            : "there is no such string in the string table";
+                case OPAQUE_WITHOUT_LENGTH:
+                    return walk.at >= walk.size
+                            ? "the body ends within the length of opaque data"
+                            : "the length of the opaque data has no end";
+                case OPAQUE_TOO_LONG:
+                    return "the opaque data is longer than the rest of the body";
+                case EMPTY_NAME:
+                    return "the name of the parameter is empty";
+                case UNKNOWN_NAME:
+                    return Printable.quoted(walk.nameText()) + " is no parameter of " + kind.type;
+                case TOO_MUCH_TEXT:
+                    return "the body is decoded to too much text";
+                default:
+                    return found + " " + place().refused + characteristic();
+            }
+        }
+
+        private String wrongType() {
+            if (walk.unreadItem != null) {
+                return unreadItem();
+            }
+            return walk.publicId == 0
+                    ? "the string table does not begin with the type of a provisioning document"
+                    : "public identifier " + walk.publicId + " is no provisioning document";
+        }
+
+        private String unreadItem() {
+            if (walk.at < walk.size) {
+                return "the " + walk.unreadItem + " has no end";
+            }
+            String within = "the body ends within its header, where its ";
+            return walk.size == 1
+                    ? "the body ends behind its version"
+                    : within + walk.unreadItem + " is expected";
+        }
+
+        private String ended() {
+            if (walk.elementsAt == walk.size) {
+                if (walk.unreadItem != null) {
+                    return unreadItem();
+                }
+                return walk.tablePresent < walk.tableLength
+                        ? "the body ends within its string table of " + bytes(walk.tableLength)
+                        : "the body ends behind its header";
+            }
+            if (walk.unendedText >= 0) {
+                return "the body ends within the text at offset " + walk.unendedText;
+            }
+            if (walk.switchEnd == walk.size) {
+                String where = walk.isSwitchWhole ? "behind" : "within";
+                return "the body ends " + where + " a SWITCH_PAGE";
+            }
+            return "the body ends " + stop.place.where + characteristic();
+        }
+
+        /** Names the characteristic where the words of a place end with it. */
+        private String characteristic() {
+            boolean isEnd = stop.cause == Cause.ENDED;
+            if (stop.place == Place.PARM) {
+                return isEnd ? "" : " " + kind.type;
+            }
+            if (stop.place != Place.IN_CHARACTERISTIC) {
+                return "";
+            }
+            if (kind != null) {
+                return " " + kind.type;
+            }
+            String type = isEnd ? null : walk.nameText();
+            return type != null
+                    ? " a characteristic of the unknown TYPE " + Printable.quoted(type)
+                    : isEnd ? " a characteristic" : " a characteristic without a TYPE";
+        }
     }
 }

@@ -2,93 +2,60 @@ package com.qvomacp.eng.omacp;
 
 /**
  * A resource of a service: a RESOURCE.
+ *
+ * <pre>{@code
+ * for (Resource resource : message.applications().get(0).resources()) {
+ *     System.out.println(resource.uri() + (resource.hasStartPage() ? ", to begin with" : ""));
+ * }
+ * }</pre>
  */
-public final class Resource extends Characteristic {
-    private static final String[] NAMES = {
-        "URI",
-        "NAME",
-        "AACCEPT",
-        "AAUTHTYPE",
-        "AAUTHNAME",
-        "AAUTHSECRET",
-        "AAUTHDATA",
-        "STARTPAGE",
-    };
-
-    Resource(String[] values) {
-        super(NAMES, values);
+public final class Resource extends TypedCharacteristic {
+    Resource(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Tells the address of the resource.
-     *
-     * @return URI, or {@code null} when the message does not set it
-     */
-    public String getUri() {
+    /** {@return URI: the address of the resource} */
+    public String uri() {
         return value("URI");
     }
 
-    /**
-     * Tells the name to show to the user.
-     *
-     * @return NAME, or {@code null} when the message does not set it
-     */
-    public String getName() {
+    /** {@return NAME: the name to show to the user} */
+    public String name() {
         return value("NAME");
     }
 
-    /**
-     * Lists the content types of the resource.
-     *
-     * @return AACCEPT, or {@code null} when the message does not set it
-     */
-    public String getAccept() {
+    /** {@return AACCEPT: the content types of the resource, with commas between them} */
+    public String accept() {
         return value("AACCEPT");
     }
 
-    /**
-     * Tells the authentication scheme.
-     *
-     * @return AAUTHTYPE, or {@code null} when the message does not set it
-     */
-    public String getAuthenticationType() {
+    /** {@return AAUTHTYPE: the authentication scheme} */
+    public String authenticationType() {
         return value("AAUTHTYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return AAUTHNAME, or {@code null} when the message does not set it
-     */
-    public String getAuthenticationName() {
+    /** {@return AAUTHNAME: the name of the user} */
+    public String authenticationName() {
         return value("AAUTHNAME");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return AAUTHSECRET, or {@code null} when the message does not set it
-     */
-    public String getAuthenticationSecret() {
+    /** {@return AAUTHSECRET: the password} */
+    public String authenticationSecret() {
         return value("AAUTHSECRET");
     }
 
-    /**
-     * Tells what else the scheme needs.
-     *
-     * @return AAUTHDATA, or {@code null} when the message does not set it
-     */
-    public String getAuthenticationData() {
+    /** {@return AAUTHDATA: what else the scheme needs} */
+    public String authenticationData() {
         return value("AAUTHDATA");
     }
 
-    /**
-     * Tells whether this is the resource to begin with.
-     *
-     * @return STARTPAGE, which is {@code startpage} when the message gives it without a value;
-     *     {@code null} when the message does not set it
-     */
-    public String getStartPage() {
+    /** {@return whether STARTPAGE stands here: by the standard, this is where to begin} */
+    public boolean hasStartPage() {
+        return has("STARTPAGE");
+    }
+
+    /** {@return the value of STARTPAGE, which by the standard has none} */
+    public String startPage() {
         return value("STARTPAGE");
     }
 }

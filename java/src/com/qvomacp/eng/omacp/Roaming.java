@@ -2,29 +2,25 @@ package com.qvomacp.eng.omacp;
 
 /**
  * What an application may do while roaming: a ROAMING.
+ *
+ * <pre>{@code
+ * for (Roaming roaming : message.applications().get(0).roamings()) {
+ *     System.out.println(roaming.syncAllowed() + ", unless told " + roaming.syncDefault());
+ * }
+ * }</pre>
  */
-public final class Roaming extends Characteristic {
-    private static final String[] NAMES = {"SYNC-ALLOWED", "SYNC-DEFAULT"};
-
-    Roaming(String[] values) {
-        super(NAMES, values);
+public final class Roaming extends TypedCharacteristic {
+    Roaming(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Tells whether synchronisation is allowed.
-     *
-     * @return SYNC-ALLOWED, or {@code null} when the message does not set it
-     */
-    public String getSyncAllowed() {
+    /** {@return SYNC-ALLOWED: whether synchronisation is allowed} */
+    public String syncAllowed() {
         return value("SYNC-ALLOWED");
     }
 
-    /**
-     * Tells whether synchronisation is on unless the user says otherwise.
-     *
-     * @return SYNC-DEFAULT, or {@code null} when the message does not set it
-     */
-    public String getSyncDefault() {
+    /** {@return SYNC-DEFAULT: whether synchronisation is on unless the user says otherwise} */
+    public String syncDefault() {
         return value("SYNC-DEFAULT");
     }
 }

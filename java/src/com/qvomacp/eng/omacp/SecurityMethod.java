@@ -1,6 +1,14 @@
 package com.qvomacp.eng.omacp;
 
-/** The security methods of OMA Provisioning Bootstrap: what the key of the MAC is made of. */
+/**
+ * The security methods of OMA Provisioning Bootstrap: what the key of the MAC is made of.
+ *
+ * <pre>{@code
+ * if (header.securityMethod() == SecurityMethod.NETWPIN) {
+ *     System.out.println("the user need not type a PIN");
+ * }
+ * }</pre>
+ */
 public enum SecurityMethod {
     /** The message states no security method. */
     NONE,
@@ -20,14 +28,23 @@ public enum SecurityMethod {
     /** The message states a security method that is none of these. */
     UNKNOWN;
 
-    private static final SecurityMethod[] BY_CODE = {NETWPIN, USERPIN, USERNETWPIN, USERPINMAC};
+    private static final SecurityMethod[] BY_NUMBER = {NETWPIN, USERPIN, USERNETWPIN, USERPINMAC};
 
-    /** The method that a SEC byte stands for, with or without its high bit. */
-    static SecurityMethod ofSec(int sec) {
-        if (sec == 0) {
-            return NONE;
+    /** The name of the method that a number stands for; its digits when it stands for none. */
+    static String nameOf(long number) {
+        return number >= 0 && number < BY_NUMBER.length
+                ? BY_NUMBER[(int) number].name()
+                : Long.toString(number);
+    }
+
+    /** The method that SEC states, by its name or number; null is a SEC without value. */
+    static SecurityMethod stated(String sec) {
+        for (int number = 0; number < BY_NUMBER.length; ++number) {
+            SecurityMethod method = BY_NUMBER[number];
+            if (method.name().equalsIgnoreCase(sec) || Integer.toString(number).equals(sec)) {
+                return method;
+            }
         }
-        int code = sec & 0x7F;
-        return code < BY_CODE.length ? BY_CODE[code] : UNKNOWN;
+        return UNKNOWN;
     }
 }

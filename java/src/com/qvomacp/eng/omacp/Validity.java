@@ -2,56 +2,40 @@ package com.qvomacp.eng.omacp;
 
 /**
  * Where and until when an access point may be used: a VALIDITY.
+ *
+ * <pre>{@code
+ * for (Validity validity : message.accessPoints().get(0).validities()) {
+ *     System.out.println(validity.country() + " " + validity.network());
+ * }
+ * }</pre>
  */
-public final class Validity extends Characteristic {
-    private static final String[] NAMES = {"COUNTRY", "NETWORK", "SID", "SOC", "VALIDUNTIL"};
-
-    Validity(String[] values) {
-        super(NAMES, values);
+public final class Validity extends TypedCharacteristic {
+    Validity(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Tells the mobile country code.
-     *
-     * @return COUNTRY, or {@code null} when the message does not set it
-     */
-    public String getCountry() {
+    /** {@return COUNTRY: the mobile country code} */
+    public String country() {
         return value("COUNTRY");
     }
 
-    /**
-     * Tells the mobile network code.
-     *
-     * @return NETWORK, or {@code null} when the message does not set it
-     */
-    public String getNetwork() {
+    /** {@return NETWORK: the mobile network code} */
+    public String network() {
         return value("NETWORK");
     }
 
-    /**
-     * Tells the identifier of the system.
-     *
-     * @return SID, or {@code null} when the message does not set it
-     */
-    public String getSystemId() {
+    /** {@return SID: the identifier of the system} */
+    public String systemId() {
         return value("SID");
     }
 
-    /**
-     * Tells the code of the system operator.
-     *
-     * @return SOC, or {@code null} when the message does not set it
-     */
-    public String getSystemOperatorCode() {
+    /** {@return SOC: the code of the system operator} */
+    public String systemOperatorCode() {
         return value("SOC");
     }
 
-    /**
-     * Tells the last point in time, as the message writes it.
-     *
-     * @return VALIDUNTIL, or {@code null} when the message does not set it
-     */
-    public String getValidUntil() {
+    /** {@return VALIDUNTIL: the last point in time, as the message writes it} */
+    public String validUntil() {
         return value("VALIDUNTIL");
     }
 }

@@ -1,42 +1,39 @@
 package com.qvomacp.eng.omacp;
 
-/**
- * What a vendor's own software is told: a VENDORCONFIG of the message.
- *
- * <p>The library keeps the last parameter with a name of the vendor's own. When that one has no
- * value, the value is that of the one before.
- */
-public final class VendorConfiguration extends Characteristic {
-    private static final String[] NAMES = {"NAME", "name", "value"};
+import java.util.List;
 
-    VendorConfiguration(String[] values) {
-        super(NAMES, values);
+/**
+ * What a vendor's own software is told: a VENDORCONFIG. But for NAME its parameters are the
+ * vendor's own.
+ *
+ * <pre>{@code
+ * for (VendorConfiguration configuration : message.vendorConfigurations()) {
+ *     for (Parameter parameter : configuration.parameters()) {
+ *         System.out.println(parameter.name() + ": " + parameter.value());
+ *     }
+ * }
+ * }</pre>
+ */
+public final class VendorConfiguration extends TypedCharacteristic {
+    VendorConfiguration(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Names the vendor or what the configuration is for.
-     *
-     * @return NAME, or {@code null} when the message does not set it
-     */
-    public String getName() {
+    /** {@return NAME: the name of the vendor or what the configuration is for} */
+    public String name() {
         return value("NAME");
     }
 
-    /**
-     * Tells the name of the vendor's own parameter.
-     *
-     * @return the name; {@code null} when the message gives no parameter of the vendor's own
-     */
-    public String getParameterName() {
-        return value("name");
+    /** {@return every parameter, NAME included, in the order of the message; not modifiable} */
+    public List<Parameter> parameters() {
+        return characteristic().parameters();
     }
 
     /**
-     * Tells the value of the vendor's own parameter.
-     *
-     * @return the value; {@code null} when the message gives none
+     * {@return the first parameter of a name; {@code null} when there is none}
+     * @param name what NAME is, in exactly this case
      */
-    public String getParameterValue() {
-        return value("value");
+    public Parameter parameter(String name) {
+        return characteristic().parameter(name);
     }
 }

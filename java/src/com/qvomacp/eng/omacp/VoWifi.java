@@ -1,21 +1,21 @@
 package com.qvomacp.eng.omacp;
 
 /**
- * Voice over Wi-Fi: a characteristic of the message.
+ * Voice over Wi-Fi: a characteristic of a type of its own, which {@link #characteristic} tells.
+ *
+ * <pre>{@code
+ * for (VoWifi voWifi : message.voWifis()) {
+ *     System.out.println(voWifi.epdgHostName());
+ * }
+ * }</pre>
  */
-public final class VoWifi extends Characteristic {
-    private static final String[] NAMES = {"ePDG FQDN"};
-
-    VoWifi(String[] values) {
-        super(NAMES, values);
+public final class VoWifi extends TypedCharacteristic {
+    VoWifi(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Tells the full domain name of the gateway.
-     *
-     * @return ePDG FQDN, or {@code null} when the message does not set it
-     */
-    public String getEpdgHostName() {
+    /** {@return ePDG FQDN: the full domain name of the gateway} */
+    public String epdgHostName() {
         return value("ePDG FQDN");
     }
 }

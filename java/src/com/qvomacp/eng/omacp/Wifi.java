@@ -1,133 +1,76 @@
 package com.qvomacp.eng.omacp;
 
 /**
- * A Wi-Fi network: a WI-FI of the message.
+ * A Wi-Fi network: a WI-FI.
+ *
+ * <pre>{@code
+ * for (Wifi wifi : message.wifis()) {
+ *     System.out.println(wifi.ssid() + ": " + wifi.securityMode());
+ * }
+ * }</pre>
  */
-public final class Wifi extends Characteristic {
-    private static final String[] NAMES = {
-        "NETSSID",
-        "SECMODE",
-        "EAPMETHOD",
-        "EAPTYPE",
-        "USERNAME",
-        "ANONUSERNAME",
-        "PASSWORD",
-        "CACERT",
-        "USERCERT",
-        "PHASE1",
-        "AUTHALGORITHM",
-        "PRIORITY",
-    };
-
-    Wifi(String[] values) {
-        super(NAMES, values);
+public final class Wifi extends TypedCharacteristic {
+    Wifi(Characteristic characteristic) {
+        super(characteristic);
     }
 
-    /**
-     * Names the network.
-     *
-     * @return NETSSID, or {@code null} when the message does not set it
-     */
-    public String getSsid() {
+    /** {@return NETSSID: the name of the network} */
+    public String ssid() {
         return value("NETSSID");
     }
 
-    /**
-     * Tells how the network is secured.
-     *
-     * @return SECMODE, or {@code null} when the message does not set it
-     */
-    public String getSecurityMode() {
+    /** {@return SECMODE: how the network is secured} */
+    public String securityMode() {
         return value("SECMODE");
     }
 
-    /**
-     * Tells the method of EAP.
-     *
-     * @return EAPMETHOD, or {@code null} when the message does not set it
-     */
-    public String getEapMethod() {
+    /** {@return EAPMETHOD: the method of EAP} */
+    public String eapMethod() {
         return value("EAPMETHOD");
     }
 
-    /**
-     * Tells the type of EAP.
-     *
-     * @return EAPTYPE, or {@code null} when the message does not set it
-     */
-    public String getEapType() {
+    /** {@return EAPTYPE: the type of EAP} */
+    public String eapType() {
         return value("EAPTYPE");
     }
 
-    /**
-     * Tells the name of the user.
-     *
-     * @return USERNAME, or {@code null} when the message does not set it
-     */
-    public String getUserName() {
+    /** {@return USERNAME: the name of the user} */
+    public String userName() {
         return value("USERNAME");
     }
 
-    /**
-     * Tells the name that is sent unprotected.
-     *
-     * @return ANONUSERNAME, or {@code null} when the message does not set it
-     */
-    public String getAnonymousUserName() {
+    /** {@return ANONUSERNAME: the name that is sent unprotected} */
+    public String anonymousUserName() {
         return value("ANONUSERNAME");
     }
 
-    /**
-     * Tells the password.
-     *
-     * @return PASSWORD, or {@code null} when the message does not set it
-     */
-    public String getPassword() {
+    /** {@return PASSWORD: the password} */
+    public String password() {
         return value("PASSWORD");
     }
 
-    /**
-     * Tells the certificate of the authority.
-     *
-     * @return CACERT, or {@code null} when the message does not set it
-     */
-    public String getCaCertificate() {
+    /** {@return CACERT: the certificate of the authority} */
+    public String caCertificate() {
         return value("CACERT");
     }
 
-    /**
-     * Tells the certificate of the user.
-     *
-     * @return USERCERT, or {@code null} when the message does not set it
-     */
-    public String getUserCertificate() {
+    /** {@return USERCERT: the certificate of the user} */
+    public String userCertificate() {
         return value("USERCERT");
     }
 
-    /**
-     * Tells the parameters of the first phase.
-     *
-     * @return PHASE1, or {@code null} when the message does not set it
-     */
-    public String getPhase1() {
+    /** {@return PHASE1: the parameters of the first phase} */
+    public String phase1() {
         return value("PHASE1");
     }
 
-    /**
-     * Tells the algorithm of the authentication.
-     *
-     * @return AUTHALGORITHM, or {@code null} when the message does not set it
-     */
-    public String getAuthenticationAlgorithm() {
+    /** {@return AUTHALGORITHM: the algorithm of the authentication} */
+    public String authenticationAlgorithm() {
         return value("AUTHALGORITHM");
     }
 
-    /**
-     * Tells the priority among the networks.
-     *
-     * @return PRIORITY, or {@code null} when the message does not set it
-     */
-    public String getPriority() {
+    /** {@return PRIORITY: the priority among the networks} */
+    public String priority() {
         return value("PRIORITY");
     }
 }

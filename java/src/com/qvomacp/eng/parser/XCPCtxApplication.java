@@ -6,113 +6,94 @@ package com.qvomacp.eng.parser;
  *
  * <p>Parameter names used here: {@code application} counts the APPLICATION of the message, the
  * others count within the characteristic before them. All count from 1.
+ *
+ * <pre>{@code
+ * XCPCtxApplication applications = new XCPCtxApplication();
+ * for (int a = 1; a <= applications.qvomacp_GetPxApplicationCount(); ++a) {
+ *     System.out.println(applications.qvomacp_GetApplicationData(a)[0]);
+ * }
+ * }</pre>
  */
 public class XCPCtxApplication {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxApplication() {}
 
-    /**
-     * Counts the APPLICATION of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the APPLICATION of the message} */
     public native int qvomacp_GetPxApplicationCount();
 
     /**
-     * Counts the TO-PROXY values of an application.
-     *
+     * {@return the number of TO-PROXY values of an application}
      * @param application APPLICATION, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxToProxyCount(int application);
 
     /**
-     * One TO-PROXY of an application.
-     *
+     * {@return one TO-PROXY of an application: its text, or {@code null}}
      * @param application APPLICATION, from 1
      * @param proxy TO-PROXY of that application, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxToProxyData(int application, int proxy);
 
     /**
-     * Counts the TO-NAPID values of an application.
-     *
+     * {@return the number of TO-NAPID values of an application}
      * @param application APPLICATION, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxNapIdCount(int application);
 
     /**
-     * One TO-NAPID of an application.
-     *
+     * {@return one TO-NAPID of an application: its text, or {@code null}}
      * @param application APPLICATION, from 1
      * @param napId TO-NAPID of that application, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxNapIdData(int application, int napId);
 
     /**
-     * Counts the ADDR values directly in an application.
-     *
+     * {@return the number of ADDR values directly in an application}
      * @param application APPLICATION, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxToAddrCount(int application);
 
     /**
-     * One ADDR directly in an application.
-     *
+     * {@return one ADDR directly in an application: its text, or {@code null}}
      * @param application APPLICATION, from 1
      * @param address ADDR of that application, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxToAddrData(int application, int address);
 
     /**
-     * Counts the APPADDR of an application.
-     *
+     * {@return the number of APPADDR of an application}
      * @param application APPLICATION, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxAppAddrCount(int application);
 
     /**
-     * One APPADDR of an application.
-     *
+     * {@return one APPADDR of an application in 3 elements: 0 ADDR, 1 ADDRTYPE (the text as it is
+     * held), 2 always {@code null}; or {@code null}}
      * @param application APPLICATION, from 1
      * @param appAddr APPADDR of that application, from 1
-     * @return 3 elements: 0 ADDR, 1 ADDRTYPE (the text as it is held), 2 always {@code null}; or
-     *     {@code null}
      */
     public native String[] qvomacp_GetPxAppAddrData(int application, int appAddr);
 
     /**
-     * Counts the PORT of an APPADDR.
-     *
+     * {@return the number of PORT of an APPADDR}
      * @param application APPLICATION, from 1
      * @param appAddr APPADDR of that application, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxAppPortCount(int application, int appAddr);
 
     /**
-     * The PORTNBR of a port of an APPADDR.
-     *
+     * {@return the PORTNBR of a port of an APPADDR: its text, or {@code null}}
      * @param application APPLICATION, from 1
      * @param appAddr APPADDR of that application, from 1
      * @param port PORT of that APPADDR, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxAppPortData(int application, int appAddr, int port);
 
     /**
-     * Counts the SERVICE values of a port of an APPADDR.
-     *
+     * {@return the number of SERVICE values of a port of an APPADDR}
      * @param application APPLICATION, from 1
      * @param appAddr APPADDR of that application, from 1
      * @param port PORT of that APPADDR, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxServiceCount(int application, int appAddr, int port);
 
@@ -129,10 +110,8 @@ public class XCPCtxApplication {
             int application, int appAddr, int port, int service);
 
     /**
-     * Counts the APPAUTH of an application.
-     *
+     * {@return the number of APPAUTH of an application}
      * @param application APPLICATION, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxAppAuthCount(int application);
 
@@ -151,31 +130,25 @@ public class XCPCtxApplication {
     public native String[] qvomacp_GetPxAppAuthData(int application, int appAuth);
 
     /**
-     * Counts the RESOURCE of an application.
-     *
+     * {@return the number of RESOURCE of an application}
      * @param application APPLICATION, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxResourceCount(int application);
 
     /**
-     * One RESOURCE of an application.
-     *
+     * {@return one RESOURCE of an application in 9 elements: 0 URI, 1 NAME, 2 AACCEPT, 3 AAUTHTYPE,
+     * 4 AAUTHNAME, 5 AAUTHSECRET, 6 AAUTHDATA, 7 STARTPAGE (the text {@code startpage} when the
+     * message has it without a value), 8 always {@code null}; or {@code null}}
      * @param application APPLICATION, from 1
      * @param resource RESOURCE of that application, from 1
-     * @return 9 elements: 0 URI, 1 NAME, 2 AACCEPT, 3 AAUTHTYPE, 4 AAUTHNAME, 5 AAUTHSECRET, 6
-     *     AAUTHDATA, 7 STARTPAGE (the text {@code startpage} when the message has it without a
-     *     value), 8 always {@code null}; or {@code null}
      */
     public native String[] qvomacp_GetPxResourceData(int application, int resource);
 
     /**
-     * The parameters of an application.
-     *
+     * {@return the parameters of an application in 13 elements: 0 APPID, 1 PROVIDER-ID, 2 FROM, 3
+     * NAME, 4 AACCEPT, 5 APROTOCOL, 6 INTERNET, 7 XCAP_AUID_DCS, 8 XCAP_AUID_PMS, 9 XCAP_AUID_CDMS,
+     * 10 XCAP_IMEI_HEADER, 11 XCAP_TID_HEADER, 12 always {@code null}; or {@code null}}
      * @param application APPLICATION, from 1
-     * @return 13 elements: 0 APPID, 1 PROVIDER-ID, 2 FROM, 3 NAME, 4 AACCEPT, 5 APROTOCOL, 6
-     *     INTERNET, 7 XCAP_AUID_DCS, 8 XCAP_AUID_PMS, 9 XCAP_AUID_CDMS, 10 XCAP_IMEI_HEADER, 11
-     *     XCAP_TID_HEADER, 12 always {@code null}; or {@code null}
      */
     public native String[] qvomacp_GetApplicationData(int application);
 

@@ -1,57 +1,52 @@
 package com.qvomacp.eng.parser;
 
-/** The BOOTSTRAP characteristics of the message. All indexes count from 1. */
+/**
+ * The BOOTSTRAP characteristics of the message. All indexes count from 1.
+ *
+ * <pre>{@code
+ * XCPCtxBootstrap bootstraps = new XCPCtxBootstrap();
+ * for (int b = 1; b <= bootstraps.qvomacp_GetPxBootstrapCount(); ++b) {
+ *     System.out.println(bootstraps.qvomacp_GetBootstrapData(b)[2]);
+ * }
+ * }</pre>
+ */
 public class XCPCtxBootstrap {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxBootstrap() {}
 
-    /**
-     * Counts the BOOTSTRAP of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the BOOTSTRAP of the message} */
     public native int qvomacp_GetPxBootstrapCount();
 
     /**
-     * Counts the PROXY-ID values of a BOOTSTRAP.
-     *
+     * {@return the number of PROXY-ID values of a BOOTSTRAP}
      * @param bootstrap BOOTSTRAP, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxProxyIdCount(int bootstrap);
 
     /**
-     * One PROXY-ID of a BOOTSTRAP.
-     *
+     * {@return one PROXY-ID of a BOOTSTRAP: its text, or {@code null}}
      * @param bootstrap BOOTSTRAP, from 1
      * @param proxyId PROXY-ID of that BOOTSTRAP, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxProxyIdData(int bootstrap, int proxyId);
 
     /**
-     * Counts the NETWORK values of a BOOTSTRAP.
-     *
+     * {@return the number of NETWORK values of a BOOTSTRAP}
      * @param bootstrap BOOTSTRAP, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxNetworkCount(int bootstrap);
 
     /**
-     * One NETWORK of a BOOTSTRAP.
-     *
+     * {@return one NETWORK of a BOOTSTRAP: its text, or {@code null}}
      * @param bootstrap BOOTSTRAP, from 1
      * @param network NETWORK of that BOOTSTRAP, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxNetworkData(int bootstrap, int network);
 
     /**
-     * The parameters of a BOOTSTRAP.
-     *
+     * {@return the parameters of a BOOTSTRAP in 5 elements: 0 NAME, 1 COUNTRY, 2 PROVURL, 3
+     * CONTEXT-ALLOW, 4 always {@code null}; or {@code null}}
      * @param bootstrap BOOTSTRAP, from 1
-     * @return 5 elements: 0 NAME, 1 COUNTRY, 2 PROVURL, 3 CONTEXT-ALLOW, 4 always {@code null}; or
-     *     {@code null}
      */
     public native String[] qvomacp_GetBootstrapData(int bootstrap);
 }

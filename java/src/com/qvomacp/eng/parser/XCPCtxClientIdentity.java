@@ -1,14 +1,20 @@
 package com.qvomacp.eng.parser;
 
-/** The CLIENTIDENTITY of the message. Only the first one of a message is kept. */
+/**
+ * The CLIENTIDENTITY of the message. Only the first one of a message is kept.
+ *
+ * <pre>{@code
+ * String clientId = new XCPCtxClientIdentity().qvomacp_GetPxClientIdentityData();
+ * System.out.println(clientId);
+ * }</pre>
+ */
 public class XCPCtxClientIdentity {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxClientIdentity() {}
 
     /**
-     * The CLIENT-ID of the CLIENTIDENTITY.
-     *
-     * @return its text; {@code null} when there is no CLIENTIDENTITY or it sets no CLIENT-ID
+     * {@return the CLIENT-ID of the CLIENTIDENTITY: its text; {@code null} when there is no
+     * CLIENTIDENTITY or it sets no CLIENT-ID}
      */
     public native String qvomacp_GetPxClientIdentityData();
 }

@@ -6,33 +6,34 @@ package com.qvomacp.eng.parser;
  *
  * <p>Parameter names used here: {@code napDef} counts the NAPDEF of the message, or those that
  * {@link #qvomacp_SetPxNapDefIndex} has left; everything counts from 1.
+ *
+ * <pre>{@code
+ * XCPCtxNapDef napDefs = new XCPCtxNapDef();
+ * for (int n = 1; n <= napDefs.qvomacp_GetPxNapDefCount(); ++n) {
+ *     System.out.println(napDefs.qvomacp_GetPxNapDefData(n)[0]);
+ * }
+ * }</pre>
  */
 public class XCPCtxNapDef {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxNapDef() {}
 
     /**
-     * Counts the NAPDEF of the message, from the one on that {@link #qvomacp_SetPxNapDefIndex} has
-     * made the first.
-     *
-     * @return their number
+     * {@return the number of the NAPDEF of the message, from the one on that
+     * {@link #qvomacp_SetPxNapDefIndex} has made the first}
      */
     public native int qvomacp_GetPxNapDefCount();
 
     /**
-     * Counts the DNS-ADDR values of an access point.
-     *
+     * {@return the number of DNS-ADDR values of an access point}
      * @param napDef NAPDEF, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxDnsAddrCount(int napDef);
 
     /**
-     * One DNS-ADDR of an access point.
-     *
+     * {@return one DNS-ADDR of an access point: its text, or {@code null}}
      * @param napDef NAPDEF, from 1
      * @param address DNS-ADDR of that access point, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxDnsAddrData(int napDef, int address);
 
@@ -72,10 +73,8 @@ public class XCPCtxNapDef {
     public native String qvomacp_GetPxBearerData(int napDef, int bearer);
 
     /**
-     * Counts the NAPAUTHINFO of an access point.
-     *
+     * {@return the number of NAPAUTHINFO of an access point}
      * @param napDef NAPDEF, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxNapAuthInfoCount(int napDef);
 
@@ -83,7 +82,8 @@ public class XCPCtxNapDef {
      * One NAPAUTHINFO of an access point.
      *
      * <p>Element 0 is one of {@code PAP}, {@code CHAP}, {@code HTTP-BASIC}, {@code HTTP-DIGEST},
-     * {@code WTLS-SS} and {@code MD5}, and {@code NONE} for any other value that the message gives.
+     * {@code WTLS-SS} and {@code MD5}, and {@code NONE} for any other value that the message gives:
+     * for the token of WTLS-SS too, which the library holds under a name with an underscore.
      *
      * @param napDef NAPDEF, from 1
      * @param authInfo NAPAUTHINFO of that access point, from 1
@@ -93,39 +93,31 @@ public class XCPCtxNapDef {
     public native String[] qvomacp_GetPxNapAuthInfoData(int napDef, int authInfo);
 
     /**
-     * Counts the AUTH-ENTITY values of a NAPAUTHINFO.
-     *
+     * {@return the number of AUTH-ENTITY values of a NAPAUTHINFO}
      * @param napDef NAPDEF, from 1
      * @param authInfo NAPAUTHINFO of that access point, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxNapAuthEntityCount(int napDef, int authInfo);
 
     /**
-     * One AUTH-ENTITY of a NAPAUTHINFO.
-     *
+     * {@return one AUTH-ENTITY of a NAPAUTHINFO: its text, or {@code null}}
      * @param napDef NAPDEF, from 1
      * @param authInfo NAPAUTHINFO of that access point, from 1
      * @param entity AUTH-ENTITY of that NAPAUTHINFO, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxAuthInfopAuthEntityData(int napDef, int authInfo, int entity);
 
     /**
-     * Counts the VALIDITY of an access point.
-     *
+     * {@return the number of VALIDITY of an access point}
      * @param napDef NAPDEF, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxNapValidityCount(int napDef);
 
     /**
-     * One VALIDITY of an access point.
-     *
+     * {@return one VALIDITY of an access point in 6 elements: 0 COUNTRY, 1 NETWORK, 2 SID, 3 SOC, 4
+     * VALIDUNTIL, 5 always {@code null}; or {@code null}}
      * @param napDef NAPDEF, from 1
      * @param validity VALIDITY of that access point, from 1
-     * @return 6 elements: 0 COUNTRY, 1 NETWORK, 2 SID, 3 SOC, 4 VALIDUNTIL, 5 always {@code null};
-     *     or {@code null}
      */
     public native String[] qvomacp_GetPxValidityData(int napDef, int validity);
 
@@ -136,10 +128,10 @@ public class XCPCtxNapDef {
      * NAP-ADDRTYPE:
      *
      * <ul>
-     *   <li>not set: element 4 is {@code null}; held as the token itself: element 4 is the token in
-     *       hexadecimal, {@code 0x85} (IPV4) to {@code 0x8c} (MAN). The other parameters stand on
+     *   <li>not set: element 4 is {@code null}; a text that begins with a byte from 85 to 8C: element
+     *       4 is that byte in hexadecimal, {@code 0x85} to {@code 0x8c}. The other parameters stand on
      *       elements 5 to 27 and element 28 is {@code null}.
-     *   <li>held as a text, which is the usual case, since a token that the message carries is held
+     *   <li>any other text, which is the usual case, since a token that the message carries is held
      *       under its name: there is no element for it, the other parameters move down to elements
      *       4 to 26, element 27 is {@code null} and element 28 is the empty string. So an array of
      *       this shape is known by its last element.

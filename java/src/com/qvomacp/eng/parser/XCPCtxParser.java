@@ -5,6 +5,14 @@ package com.qvomacp.eng.parser;
  *
  * <p>Calling order: {@link #qvomacp_parser}, then (if it answered {@code true}) queries, then
  * {@link #qvomacp_parser_del}. See the package description for loading and for threads.
+ *
+ * <pre>{@code
+ * XCPCtxParser parser = new XCPCtxParser();
+ * if (parser.qvomacp_parser(push, push.length, 0)) {
+ *     System.out.println(parser.qvomacp_GetParserBodyLen());
+ * }
+ * parser.qvomacp_parser_del();
+ * }</pre>
  */
 public class XCPCtxParser {
     /** Makes an object to call the natives on; it holds no state. */
@@ -17,8 +25,8 @@ public class XCPCtxParser {
      * that cannot be decoded neither a header nor a context is there.
      *
      * @param message the push as it was received, from its transaction identifier on
-     * @param length how many bytes of {@code message} to read; the low 32 bits count, and nothing
-     *     compares them with the length of the array, so it must not be more than that
+     * @param length how many bytes of {@code message} to read; the low 32 bits count. A message is
+     *     refused when they are more than the array has
      * @param mode 1 to read the header only; every other value for the whole message
      * @return {@code true} when header and (unless mode is 1) body were understood; {@code false}
      *     when the push is refused (not a connectionless push, an unknown content type) or its body
@@ -32,58 +40,46 @@ public class XCPCtxParser {
     public native void qvomacp_parser_del();
 
     /**
-     * The content type of the push, as its well-known number.
-     *
-     * @return 54 {@code application/vnd.wap.connectivity-wbxml}, 53
-     *     {@code application/vnd.wap.connectivity-xml}, 68
-     *     {@code application/vnd.syncml.notification}, 78
-     *     {@code application/vnd.syncml.ds.notification}, 66
-     *     {@code application/vnd.syncml.dm+wbxml}; -1 without a parsed header
+     * {@return the content type of the push, as its well-known number: 54
+     * {@code application/vnd.wap.connectivity-wbxml}, 53
+     * {@code application/vnd.wap.connectivity-xml}, 68 {@code application/vnd.syncml.notification},
+     * 78 {@code application/vnd.syncml.ds.notification}, 66
+     * {@code application/vnd.syncml.dm+wbxml}; -1 without a parsed header}
      */
     public native int qvomacp_GetParserContentType();
 
     /**
-     * The length of the push's headers.
-     *
-     * @return bytes, 0 to 255, as the message states them; -1 without a parsed header
+     * {@return the length of the push's headers: bytes, 0 to 255, as the message states them; -1
+     * without a parsed header}
      */
     public native int qvomacp_GetParserHeaderLen();
 
-    /**
-     * The length of the body.
-     *
-     * @return bytes behind the headers; -1 without a parsed header
-     */
+    /** {@return the length of the body: bytes behind the headers; -1 without a parsed header} */
     public native int qvomacp_GetParserBodyLen();
 
     /**
-     * The length of the MAC.
-     *
-     * @return characters of the MAC text, 0 when the message has none; -1 without a parsed header
+     * {@return the length of the MAC: characters of the MAC text, 0 when the message has none; -1
+     * without a parsed header}
      */
     public native int qvomacp_GetParserMACLen();
 
     /**
-     * The security method SEC.
-     *
-     * @return the byte as sent, high bit included: 0x80 NETWPIN, 0x81 USERPIN, 0x82 USERNETWPIN,
-     *     0x83 USERPINMAC; 0 when the message has none; -1 without a parsed header
+     * {@return the security method SEC: the byte as sent, high bit included: 0x80 NETWPIN, 0x81
+     * USERPIN, 0x82 USERNETWPIN, 0x83 USERPINMAC; 0 when the message has none; -1 without a parsed
+     * header}
      */
     public native int qvomacp_GetParserSEC();
 
     /**
-     * The text of the MAC, which is carried and not verified.
-     *
-     * @return a new array of the MAC's characters without a terminator, empty when the message has
-     *     none; {@code null} without a parsed header
+     * {@return the text of the MAC, which is carried and not verified: a new array of the MAC's
+     * characters without a terminator, empty when the message has none; {@code null} without a
+     * parsed header}
      */
     public native byte[] qvomacp_GetParserMAC();
 
     /**
-     * The body of the message: the bytes behind the headers.
-     *
-     * @return a new array, empty when the message ends with its headers; {@code null} without a
-     *     parsed header
+     * {@return the bytes behind the headers, which are the body: a new array, empty when the
+     * message ends with its headers; {@code null} without a parsed header}
      */
     public native byte[] qvomacp_GetParserBody();
 }

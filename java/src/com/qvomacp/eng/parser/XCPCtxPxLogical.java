@@ -7,76 +7,65 @@ package com.qvomacp.eng.parser;
  * <p>Parameter names used here: {@code proxy} counts the PXLOGICAL of the message, {@code physical}
  * the PXPHYSICAL of that PXLOGICAL, {@code port} the PORT of the one or of the other. All count
  * from 1.
+ *
+ * <pre>{@code
+ * XCPCtxPxLogical proxies = new XCPCtxPxLogical();
+ * for (int p = 1; p <= proxies.qvomacp_GetPxLogicalCount(); ++p) {
+ *     System.out.println(proxies.qvomacp_GetProxyData(p)[0]);
+ * }
+ * }</pre>
  */
 public class XCPCtxPxLogical {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxPxLogical() {}
 
-    /**
-     * Counts the PXLOGICAL of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the PXLOGICAL of the message} */
     public native int qvomacp_GetPxLogicalCount();
 
     /**
-     * Counts the DOMAIN values of a proxy.
-     *
+     * {@return the number of DOMAIN values of a proxy}
      * @param proxy PXLOGICAL, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxDomainCount(int proxy);
 
     /**
-     * One DOMAIN of a proxy.
-     *
+     * {@return one DOMAIN of a proxy: its text, or {@code null}}
      * @param proxy PXLOGICAL, from 1
      * @param domain DOMAIN of that proxy, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxDomainData(int proxy, int domain);
 
     /**
-     * Counts the PXAUTHINFO of a proxy.
-     *
+     * {@return the number of PXAUTHINFO of a proxy}
      * @param proxy PXLOGICAL, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxAuthInfoCount(int proxy);
 
     /**
-     * One PXAUTHINFO of a proxy.
-     *
+     * {@return one PXAUTHINFO of a proxy in 4 elements: 0 PXAUTH-TYPE, 1 PXAUTH-ID, 2 PXAUTH-PW, 3
+     * always {@code null}; or {@code null}}
      * @param proxy PXLOGICAL, from 1
      * @param authInfo PXAUTHINFO of that proxy, from 1
-     * @return 4 elements: 0 PXAUTH-TYPE, 1 PXAUTH-ID, 2 PXAUTH-PW, 3 always {@code null}; or
-     *     {@code null}
      */
     public native String[] qvomacp_GetPxAuthInfoData(int proxy, int authInfo);
 
     /**
-     * Counts the PORT directly below a proxy.
-     *
+     * {@return the number of PORT directly below a proxy}
      * @param proxy PXLOGICAL, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxPortCount(int proxy);
 
     /**
-     * The PORTNBR of a port directly below a proxy.
-     *
+     * {@return the PORTNBR of a port directly below a proxy: its text, or {@code null}}
      * @param proxy PXLOGICAL, from 1
      * @param port PORT of that proxy, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxPortData(int proxy, int port);
 
     /**
-     * Counts the SERVICE values of a port directly below a proxy.
-     *
+     * {@return the number of SERVICE values of a port directly below a proxy}
      * @param proxy PXLOGICAL, from 1
      * @param port PORT of that proxy, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxPortServiceCount(int proxy, int port);
 
@@ -96,10 +85,8 @@ public class XCPCtxPxLogical {
     public native String qvomacp_GetPxPortServiceData(int proxy, int port, int service);
 
     /**
-     * Counts the PXPHYSICAL of a proxy.
-     *
+     * {@return the number of PXPHYSICAL of a proxy}
      * @param proxy PXLOGICAL, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxPhysicalCount(int proxy);
 
@@ -117,81 +104,66 @@ public class XCPCtxPxLogical {
     public native String[] qvomacp_GetPxPhysicalData(int proxy, int physical);
 
     /**
-     * Counts the DOMAIN values of a physical proxy.
-     *
+     * {@return the number of DOMAIN values of a physical proxy}
      * @param proxy PXLOGICAL, from 1
      * @param physical PXPHYSICAL of that proxy, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxPhysicalDomainCount(int proxy, int physical);
 
     /**
-     * One DOMAIN of a physical proxy.
-     *
+     * {@return one DOMAIN of a physical proxy: its text, or {@code null}}
      * @param proxy PXLOGICAL, from 1
      * @param physical PXPHYSICAL of that proxy, from 1
      * @param domain DOMAIN of that physical proxy, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxPhsicalDomainData(int proxy, int physical, int domain);
 
     /**
-     * Counts the TO-NAPID values of a physical proxy.
-     *
+     * {@return the number of TO-NAPID values of a physical proxy}
      * @param proxy PXLOGICAL, from 1
      * @param physical PXPHYSICAL of that proxy, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxPhsicalNapIdCount(int proxy, int physical);
 
     /**
-     * One TO-NAPID of a physical proxy.
-     *
+     * {@return one TO-NAPID of a physical proxy: its text, or {@code null}}
      * @param proxy PXLOGICAL, from 1
      * @param physical PXPHYSICAL of that proxy, from 1
      * @param napId TO-NAPID of that physical proxy, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxPhysicalNapIdData(int proxy, int physical, int napId);
 
     /**
-     * Counts the PORT of a physical proxy.
-     *
+     * {@return the number of PORT of a physical proxy}
      * @param proxy PXLOGICAL, from 1
      * @param physical PXPHYSICAL of that proxy, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxPhysicalPortCount(int proxy, int physical);
 
     /**
-     * The PORTNBR of a port of a physical proxy.
-     *
+     * {@return the PORTNBR of a port of a physical proxy: its text, or {@code null}}
      * @param proxy PXLOGICAL, from 1
      * @param physical PXPHYSICAL of that proxy, from 1
      * @param port PORT of that physical proxy, from 1
-     * @return its text, or {@code null}
      */
     public native String qvomacp_GetPxPhysicalPortData(int proxy, int physical, int port);
 
     /**
-     * Counts the SERVICE values of a port of a physical proxy.
-     *
+     * {@return the number of SERVICE values of a port of a physical proxy}
      * @param proxy PXLOGICAL, from 1
      * @param physical PXPHYSICAL of that proxy, from 1
      * @param port PORT of that physical proxy, from 1
-     * @return their number
      */
     public native int qvomacp_GetPxPhysicalPortServiceCount(int proxy, int physical, int port);
 
     /**
-     * A service name for a port of a physical proxy, chosen by the index alone.
-     *
+     * {@return a service name for a port of a physical proxy, chosen by the index alone: the name
+     * that {@link #qvomacp_GetPxPortServiceData} gives for the same index, or {@code null} when
+     * there is no such SERVICE, and from the eleventh on}
      * @param proxy PXLOGICAL, from 1
      * @param physical PXPHYSICAL of that proxy, from 1
      * @param port PORT of that physical proxy, from 1
      * @param service SERVICE of that port, from 1
-     * @return the name that {@link #qvomacp_GetPxPortServiceData} gives for the same index, or
-     *     {@code null} when there is no such SERVICE, and from the eleventh on
      */
     public native String qvomacp_GetPxPhysicalPortServiceData(
             int proxy, int physical, int port, int service);

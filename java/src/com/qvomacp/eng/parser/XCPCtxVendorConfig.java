@@ -1,15 +1,20 @@
 package com.qvomacp.eng.parser;
 
-/** The VENDORCONFIG characteristics of the message. Indexes count from 1. */
+/**
+ * The VENDORCONFIG characteristics of the message. Indexes count from 1.
+ *
+ * <pre>{@code
+ * XCPCtxVendorConfig vendors = new XCPCtxVendorConfig();
+ * for (int v = 1; v <= vendors.qvomacp_GetPxVenderConfigCount(); ++v) {
+ *     System.out.println(vendors.qvomacp_GetPxVenderConfigData(v)[0]);
+ * }
+ * }</pre>
+ */
 public class XCPCtxVendorConfig {
     /** Makes an object to call the natives on; it holds no state. */
     public XCPCtxVendorConfig() {}
 
-    /**
-     * Counts the VENDORCONFIG of the message.
-     *
-     * @return their number
-     */
+    /** {@return the number of the VENDORCONFIG of the message} */
     public native int qvomacp_GetPxVenderConfigCount();
 
     /**

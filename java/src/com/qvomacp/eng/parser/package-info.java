@@ -4,15 +4,16 @@
  *
  * <h2>Loading</h2>
  *
- * <p>The classes do not load the library: whoever uses them calls
- * {@code System.loadLibrary("omacp")} (or {@code System.load} with the path of the file) once
- * before the first call. The library looks up all ten classes while it is loaded and registers
- * their natives, so all ten must be visible to the class loader of the class that loads it; without
- * one of them the loading fails.
+ * <p>The ten classes do not load the library: whoever uses them calls {@link
+ * com.qvomacp.eng.parser.NativeLibrary#load NativeLibrary.load()} once before the first call, or
+ * {@code System.loadLibrary("omacp")}, or {@code System.load} with the path of the file. The library
+ * looks up all ten classes while it is loaded and registers their natives, so all ten must be visible
+ * to the class loader of the class that loads it; without one of them, or one native, the loading
+ * fails.
  *
  * <h2>One message at a time</h2>
  *
- * <p>The library holds one parse result for the whole process. A use is:
+ * <p>The library holds one parse result, for whatever thread asks. A use is:
  * {@link com.qvomacp.eng.parser.XCPCtxParser#qvomacp_parser parse}, then the queries of these
  * classes, then {@link com.qvomacp.eng.parser.XCPCtxParser#qvomacp_parser_del delete}. The next
  * parse must not come before the delete, since it would lose the memory of the result before. There

@@ -14,7 +14,7 @@ import com.qvomacp.support.ChildVm;
 import com.qvomacp.support.Document;
 import com.qvomacp.support.Everything;
 import com.qvomacp.support.Json;
-import com.qvomacp.support.Natives;
+import com.qvomacp.support.Push;
 import java.io.ByteArrayInputStream;
 import java.io.ByteArrayOutputStream;
 import java.io.IOException;
@@ -26,6 +26,7 @@ import java.nio.file.Path;
 import java.util.HexFormat;
 import java.util.List;
 import java.util.Map;
+import java.util.Set;
 import org.junit.jupiter.api.Test;
 import org.junit.jupiter.api.io.TempDir;
 import org.junit.jupiter.params.ParameterizedTest;
@@ -33,16 +34,16 @@ import org.junit.jupiter.params.provider.CsvSource;
 import org.junit.jupiter.params.provider.ValueSource;
 
 /** The command-line program. */
-class MainTest extends Natives {
+class MainTest {
     private static final byte[] SMALL =
             withShortType(0xB6, body("NAME", "Café")).sec(0x81).mac("AB12").bytes();
 
     private static final String SMALL_SHOWN =
             """
             Content type    application/vnd.wap.connectivity-wbxml (54)
-            Header length   9 bytes
+            Header length   12 bytes
             Body length     23 bytes
-            SEC             USERPIN (0x81)
+            SEC             USERPIN
             MAC             AB12
 
             NAPDEF
@@ -59,15 +60,10 @@ class MainTest extends Natives {
     }
 
     private int run(byte[] input, String... arguments) {
-        ByteArrayOutputStream out = new ByteArrayOutputStream();
-        ByteArrayOutputStream err = new ByteArrayOutputStream();
-        int status = Main.run(
-                        new ByteArrayInputStream(input), out, err, Terminal.NONE, arguments);
-        output = out.toString(StandardCharsets.UTF_8);
-        errors = err.toString(StandardCharsets.UTF_8);
-        assertEquals(-1, parser.qvomacp_GetParserContentType(), "a header is left behind");
-        assertEquals(0, napDefs.qvomacp_GetPxNapDefCount(), "a context is left behind");
-        return status;
+        Program program = Program.run(input, arguments);
+        output = program.output();
+        errors = program.errors();
+        return program.status();
     }
 
     private void assertShows(String shown, byte[] input, String... arguments) {
@@ -114,12 +110,22 @@ class MainTest extends Natives {
     }
 
     @ParameterizedTest
-    @ValueSource(strings = {"", "\n", "0106", "01 06 0", "0x0106", "hello", "A"})
-    void refusesTextThatIsNoMessage(String text) {
+    @ValueSource(strings = {"", "\n", "01 06 0", "hello", "A", "<?xml version='1.0'?>"})
+    void callsWhatItLooksLikeATextThatIsNoMessage(String text) {
         assertEquals(1, run(ascii(text)));
         assertEquals("", output);
-        assertTrue(errors.startsWith("omacp: standard input: refused: "), errors);
-        assertTrue(errors.contains(", in push header.\n"), errors);
+        assertTrue(errors.startsWith("omacp: standard input: no message: this is "), errors);
+        assertEquals(1, run(ascii(text), "--json"));
+        assertEquals(Set.of("error"), ((Map<?, ?>) Json.parse(output)).keySet());
+    }
+
+    @Test
+    void refusesAPushThatEnds() {
+        for (String text : List.of("0106", "0x0106")) {
+            assertEquals(1, run(ascii(text)));
+            assertTrue(errors.startsWith("omacp: standard input: refused: "), errors);
+            assertTrue(errors.contains(", in push header.\n"), errors);
+        }
     }
 
     @Test
@@ -133,61 +139,12 @@ class MainTest extends Natives {
         Json.parse(output);
     }
 
-    /** A PORT outside a proxy or an address is decoded and dropped. */
-    @Test
-    void showsADocumentThatSetsNothing() {
-        assertShows(
-                """
-                Content type    application/vnd.wap.connectivity-wbxml (54)
-                Header length   1 bytes
-                Body length     12 bytes
-                """,
-                push(characteristic("PORT")));
-        assertShows(
-                """
-                {
-                  "header": {
-                    "contentType": "application/vnd.wap.connectivity-wbxml",
-                    "contentTypeCode": 54,
-                    "headerLength": 1,
-                    "bodyLength": 12
-                  },
-                  "characteristics": []
-                }
-                """,
-                push(characteristic("PORT")),
-                "--json");
-        Json.parse(output);
-    }
-
     @ParameterizedTest
-    @CsvSource({
-        "0xB5, application/vnd.wap.connectivity-xml (53)",
-        "0xB6, application/vnd.wap.connectivity-wbxml (54)",
-        "0xC2, application/vnd.syncml.dm+wbxml (66)",
-        "0xC4, application/vnd.syncml.notification (68)",
-        "0xCE, application/vnd.syncml.ds.notification (78)",
-    })
-    void namesTheContentType(String sent, String shown) {
-        assertEquals(0, run(withShortType(Integer.decode(sent), body("NAME", "x")).bytes()));
-        assertEquals("Content type    " + shown, output.lines().findFirst().orElseThrow());
-    }
-
-    @ParameterizedTest
-    @CsvSource({
-        "0x80, NETWPIN (0x80)",
-        "0x81, USERPIN (0x81)",
-        "0x82, USERNETWPIN (0x82)",
-        "0x83, USERPINMAC (0x83)",
-        "0x01, USERPIN (0x01)",
-        "0x84, unknown (0x84)",
-        "0xFF, unknown (0xFF)",
-    })
+    @CsvSource({"0x80, NETWPIN", "0x81, USERPIN", "0x82, USERNETWPIN", "0x83, USERPINMAC", "0x84, 4"})
     void namesTheSecurityMethod(String sent, String shown) {
-        byte[] message = withShortType(0xB6, body("NAME", "x")).sec(Integer.decode(sent)).bytes();
-        assertEquals(0, run(message));
+        run(Push.secured(Integer.decode(sent), "AB", body("NAME", "x")));
         assertTrue(output.contains("\nSEC             " + shown + "\n"), output);
-        assertFalse(output.contains("\nMAC"), output);
+        assertTrue(output.contains("\nMAC             AB\n"), output);
     }
 
     @Test
@@ -207,29 +164,45 @@ class MainTest extends Natives {
     }
 
     @Test
-    void showsThatAnAddressTypeIsSet() {
-        assertEquals(
-                """
-                  NAP-ADDRTYPE  (set, value not answered)
-                  CALLTYPE      ANALOG-MODEM
-                """,
-                shownParms(parm("NAP-ADDRTYPE", token(0x89)), parm("CALLTYPE", token(0x90))));
-        assertEquals(
-                "  NAP-ADDRTYPE  0x89\n",
-                shownParms(parm("NAP-ADDRTYPE", (Object) new byte[] {(byte) 0x89})));
+    void showsTheMessageInItsOrder() {
+        run(
+                push(
+                        characteristic(
+                                "NAPDEF",
+                                characteristic("VALIDITY", parm("COUNTRY", "001")),
+                                parm("NAME", "n")),
+                        characteristic("BOOTSTRAP"),
+                        characteristic("NAPDEF")));
+        assertTrue(
+                output.endsWith(
+                        """
+
+                        NAPDEF
+                          VALIDITY
+                            COUNTRY  001
+                          NAME  n
+
+                        BOOTSTRAP
+
+                        NAPDEF
+                        """),
+                output);
     }
 
     @Test
-    void showsABearerAsTheLibraryAnswersIt() {
+    void tellsNoValueFromAnEmptyOne() {
+        assertEquals(
+                "  INIT\n  NAME  \"\"\n",
+                shownParms(named("INIT"), parm("NAME", "")));
+        assertEquals(
+                "  NAME  \" a \"\n  NAME  \"\\\"\\\"\"\n",
+                shownParms(parm("NAME", " a "), parm("NAME", "\"\"")));
+    }
+
+    @Test
+    void namesATokenAsTheStandardDoes() {
         assertEquals("  BEARER  GSM-GPRS\n", shownParms(parm("BEARER", token(0xAB))));
-        assertEquals(
-                """
-                  NAP-ADDRESS  apn.example
-                  BEARER       apn.example
-                """,
-                shownParms(parm("NAP-ADDRESS", "apn.example"), parm("BEARER", "GSM-GPRS")));
-        assertEquals(
-                "  BEARER  (set, value not answered)\n", shownParms(parm("BEARER", "GSM-GPRS")));
+        assertEquals("  BEARER  LTE\n", shownParms(parm("BEARER", "LTE")));
     }
 
     @Test
@@ -238,93 +211,40 @@ class MainTest extends Natives {
                 "  NAME  a\\u001b[31m\\u000ab\\u202ec\\u0085\n",
                 shownParms(parm("NAME", "a\u001b[31m\nb\u202ec\u0085")));
         assertEquals(
-                "  NAME  \"quoted\" \\ €\n", shownParms(parm("NAME", "\"quoted\" \\ €")));
+                "  NAME  a \"quoted\" \\\\ €\n",
+                shownParms(parm("NAME", "a \"quoted\" \\ €")));
     }
 
     @Test
-    void escapesWhatJsonAsksFor() {
-        String name = "\"q\" \\ /\b\f\n\r\t\u0001\u007f€ 中";
-        assertEquals(0, run(push(body("NAME", name)), "--json"));
-        assertTrue(
-                output.contains(
-                        "\"\\\"q\\\" \\\\ /\\u0008\\u000c\\n\\r\\t\\u0001\\u007f€ 中\""),
-                output);
-        assertEquals(name, parmsOf(output, 0).get(0).get("value"));
-    }
-
-    @Test
-    void escapesSurrogatesWithoutAPartner() {
-        byte[] lone = {(byte) 0xED, (byte) 0xA0, (byte) 0x80};
-        byte[] message = push(characteristic("NAPDEF", parm("NAME", (Object) lone)));
-        assertEquals(0, run(message, "--json"));
-        assertTrue(output.contains("\"value\": \"\\ud800\""), output);
-        assertEquals(0, run(message));
-        assertTrue(output.contains("NAME  \\ud800\n"), output);
-    }
-
-    @Test
-    void writesNullForAValueThatIsNotAnswered() {
-        assertEquals(
-                0,
-                run(
-                        push(
-                                characteristic("NAPDEF", parm("NAP-ADDRTYPE", "APN")),
-                                characteristic("VENDORCONFIG", named("Own"))),
-                        "--json"));
-        assertTrue(output.contains("{\"name\": \"NAP-ADDRTYPE\", \"value\": null}"), output);
-        assertTrue(output.contains("{\"name\": \"Own\", \"value\": null}"), output);
-    }
-
-    @Test
-    void showsTheRoamingOfTheFirstApplication() {
-        Document.Element roaming = characteristic("ROAMING", named("SYNC-DEFAULT", "1"));
-        Document.Element application = characteristic("APPLICATION", roaming);
-        assertEquals(0, run(push(application, application)));
-        assertEquals(1, output.split("ROAMING", -1).length - 1, output);
-        assertTrue(
-                output.endsWith(
-                        """
-
-                        APPLICATION
-                          ROAMING
-                            SYNC-DEFAULT  1
-
-                        APPLICATION
-                        """),
-                output);
+    void escapesInJsonWhatItAsksForAndWhatATerminalObeys() {
+        String name = "\"q\" \\ /\b\f\n\r\t\u0001\u007f\u202e\u2028\udb40\udc01€ 中";
+        run(push(body("NAME", name)), "--json");
+        String escaped =
+                "\"\\\"q\\\" \\\\ /\\u0008\\u000c\\n\\r\\t\\u0001\\u007f"
+                        + "\\u202e\\u2028\\udb40\\udc01€ 中\"";
+        assertTrue(output.contains(escaped), output);
+        assertTrue(childrenOf(output).toString().contains("value=" + name), output);
     }
 
     @Test
     void refusesAMessageThatIsNoPush() {
         byte[] message = SMALL.clone();
+        message[0] = 99;
         message[1] = 7;
         assertFails(
                 1,
-                """
-                omacp: standard input: refused: PDU type 0x07 is no push
-                  message offset 1 (0x1), in push header.
-                    0000  01 07 09 B6 91 81 92 41 42
-                             ^^
-                  Accepted here: 0x06 (Push).
-                """,
+                "omacp: standard input: no message: this is a confirmed push of a provisioning"
+                        + " document\n",
                 message);
-    }
-
-    @Test
-    void refusesABodyThatCannotBeDecoded() {
-        assertFails(
-                1,
-                """
-                omacp: standard input: refused: public identifier 2 (WML 1.0) is no
-                  provisioning document
-                  4107 QVS_ERROR_WBXML_DOCUMENT_TYPE, body offset 1 (0x1), message offset 5
-                  (0x5).
-                    0000  01 06 01 C4 01 02 03
-                                         ^^^^^
-                  Accepted here: public identifier 11, or 0 with a string table that begins with
-                  "-//WAPFORUM//DTD PROV 1.0//EN".
-                """,
-                withShortType(0xC4, new byte[] {1, 2, 3}).bytes());
+        assertEquals(1, run(message, "--as", "push"));
+        assertTrue(
+                errors.endsWith(
+                        """
+                          message offset 1 (0x1), in push header.
+                            0000  63 07 09 B6 91 81 92 41 42
+                                     ^^
+                        """),
+                errors);
     }
 
     @Test
@@ -390,20 +310,33 @@ class MainTest extends Natives {
     void refusesWrongUsage() {
         for (String[] arguments :
                 List.of(
-                        array("--xml"),
+                        array("--yaml"),
+                        array("--limit=0"),
+                        array("--limit=1G"),
+                        array("--limit=9999999999M"),
+                        array("--json", "--json-lines"),
+                        array("--bytes", "--answers"),
+                        array("--answers", "--header"),
+                        array("--\u001b[2Jx"),
+                        array("--limit", "\u001b"),
+                        array("--color=\u001b"),
                         array("show", "--pin", "1"),
                         array("--bytes", "--json"),
                         array("--bytes", "--header"),
                         array("--color=blue"),
                         array("verify"),
                         array("verify", "--json"),
+                        array("encode", "--\u001b[2Jx"),
+                        array("encode", "--sms=\u001b"),
+                        array("encode", "--to=\u001b", "--sms=submit"),
                         array("completion", "bash"))) {
             assertEquals(2, run(SMALL, arguments));
             assertEquals("", output);
             assertTrue(errors.startsWith("omacp: "), errors);
             assertTrue(errors.contains("\nUsage: omacp "), errors);
             assertTrue(errors.endsWith(" --help\" tells more.\n"), errors);
-            assertTrue(errors.lines().count() < 6, errors);
+            assertTrue(errors.lines().count() < 7, errors);
+            assertFalse(errors.contains("\u001b"), errors);
         }
     }
 
@@ -415,7 +348,7 @@ class MainTest extends Natives {
             assertTrue(output.startsWith("Usage: omacp [show] [OPTION...] [FILE...]\n"), output);
             assertTrue(output.contains("Exit status:\n"), output);
         }
-        for (String command : List.of("show", "verify", "completion")) {
+        for (String command : List.of("show", "verify", "encode", "completion")) {
             assertEquals(0, run(new byte[0], command, "--help"));
             assertEquals("", errors);
             assertTrue(output.startsWith("Usage: omacp " + command + " [-h]"), output);
@@ -445,26 +378,97 @@ class MainTest extends Natives {
         assertEquals(new ChildVm.Result(0, resource("everything.json"), ""), json);
         String refusal =
                 """
-                omacp: standard input: refused: there is no message, not a single byte
-                  message offset 0 (0x0), in push header.
+                omacp: standard input: no message: this is no bytes at all
                 """;
         assertEquals(new ChildVm.Result(1, "", refusal), child(new byte[0]));
         Path missing = directory.resolve("missing");
         assertEquals(
                 new ChildVm.Result(2, "", "omacp: " + missing + ": no such file\n"),
                 child(SMALL, missing.toString()));
-        assertEquals(2, child(SMALL, "--xml").status());
+        assertEquals(2, child(SMALL, "--yaml").status());
     }
 
     @Test
-    void saysThatItCannotLoadTheLibrary() throws Exception {
-        String classPath = System.getProperty("java.class.path");
+    void takesNoFileOfArguments() throws Exception {
+        Path list = Files.writeString(directory.resolve("list"), "--help");
+        assertFails(2, "omacp: @" + list + ": no such file\n", SMALL, "@" + list);
+    }
+
+    @Test
+    void readsNoMoreThanTheLimit() throws Exception {
+        byte[] message = push(body("NAME", "x".repeat(1 << 16)));
+        assertFails(
+                2,
+                "omacp: standard input: is longer than 65536 bytes; --limit has more of them"
+                        + " read\n",
+                message);
+        assertEquals(0, run(message, "--limit=128K"), errors);
+        assertEquals(0, run(message, "--limit", "" + message.length), errors);
+        Path file = Files.write(directory.resolve("long"), message);
+        assertEquals(2, run(SMALL, "--limit", "" + (message.length - 1), file.toString()));
+    }
+
+    @Test
+    void showsNoByteOfAFileNameThatATerminalObeys() throws Exception {
+        String name = "loop\u001b[31m\u202e";
+        assertFails(2, "omacp: loop\\u001b[31m\\u202e: no such file\n", SMALL, name);
+        Path inFile = Files.createDirectory(directory.resolve("a\u001b[31m"));
+        assertEquals(2, run(SMALL, inFile + "/.."  + "/a\u001b[31m"));
+        assertFalse(errors.contains("\u001b"), errors);
+        Path file = Files.write(directory.resolve("f\u001b[2J"), SMALL);
+        for (String option : List.of("--json", "--bytes", "--color=never")) {
+            assertEquals(0, run(SMALL, option, file.toString(), file.toString()), errors);
+            assertFalse(output.contains("\u001b"), output);
+        }
+        run(SMALL, "verify", "--pin=1", file.toString());
+        assertFalse(output.contains("\u001b"), output);
+    }
+
+    @Test
+    void stopsWhenNobodyReadsOn() throws Exception {
+        int[] blocks = {0};
+        OutputStream closing =
+                new OutputStream() {
+                    @Override
+                    public void write(int b) throws IOException {
+                        throw new IOException("Broken pipe");
+                    }
+
+                    @Override
+                    public void write(byte[] bytes, int from, int count) throws IOException {
+                        if (++blocks[0] > 2) {
+                            throw new IOException("Broken pipe");
+                        }
+                    }
+                };
+        byte[] message = push(body("NAME", "x".repeat(1 << 20)));
+        int status =
+                Main.run(
+                        new ByteArrayInputStream(message),
+                        closing,
+                        OutputStream.nullOutputStream(),
+                        Terminal.NONE,
+                        "--bytes",
+                        "--limit=2M");
+        assertEquals(2, status);
+        assertEquals(3, blocks[0]);
+    }
+
+    @Test
+    void saysThatMemoryRunsOut() throws Exception {
+        Path file = directory.resolve("huge");
+        Files.write(file, new byte[40 << 20]);
         ChildVm.Result result =
-                ChildVm.run(directory.toString(), classPath, SMALL, Main.class);
-        assertEquals(2, result.status());
-        assertEquals("", result.output());
-        String start = "omacp: standard input: The library omacp cannot be loaded: ";
-        assertTrue(result.errors().startsWith(start), result.errors());
+                ChildVm.run(
+                        List.of("-Xmx32m"),
+                        new byte[0],
+                        Main.class,
+                        "--limit=100M",
+                        file.toString());
+        assertEquals(
+                new ChildVm.Result(
+                        2, "", "omacp: " + file + ": needs more memory than there is\n"),
+                result);
     }
 
     private ChildVm.Result child(byte[] input, String... arguments) throws Exception {
@@ -486,12 +490,13 @@ class MainTest extends Natives {
         return text.getBytes(StandardCharsets.US_ASCII);
     }
 
-    /** The parms of one top-level characteristic of a JSON answer. */
-    @SuppressWarnings("unchecked")
-    private static List<Map<String, Object>> parmsOf(String json, int index) {
-        Map<String, Object> message = (Map<String, Object>) Json.parse(json);
-        List<Object> characteristics = (List<Object>) message.get("characteristics");
-        return (List<Map<String, Object>>)
-                ((Map<String, Object>) characteristics.get(index)).get("parms");
+    /** The children of the document of a JSON answer. */
+    private static List<?> childrenOf(String json) {
+        Map<?, ?> message = (Map<?, ?>) Json.parse(json);
+        return (List<?>) ((Map<?, ?>) message.get("document")).get("children");
+    }
+
+    private static String[] array(String... elements) {
+        return elements;
     }
 }

@@ -20,9 +20,29 @@ public final class ChildVm {
         return run(libraryPath, classPath, new byte[0], main, arguments);
     }
 
-    /** Runs {@code main} to its end; the locale is C, which knows ASCII alone. */
+    /** Runs {@code main} with options of the virtual machine, and the class path of this one. */
+    public static Result run(
+            List<String> options, byte[] input, Class<?> main, String... arguments)
+            throws IOException, InterruptedException {
+        String libraryPath = System.getProperty("java.library.path");
+        String classPath = System.getProperty("java.class.path");
+        return run(libraryPath, classPath, options, input, main, arguments);
+    }
+
     public static Result run(
             String libraryPath, String classPath, byte[] input, Class<?> main, String... arguments)
+            throws IOException, InterruptedException {
+        return run(libraryPath, classPath, List.of(), input, main, arguments);
+    }
+
+    /** Runs {@code main} to its end; the locale is C, which knows ASCII alone. */
+    public static Result run(
+            String libraryPath,
+            String classPath,
+            List<String> options,
+            byte[] input,
+            Class<?> main,
+            String... arguments)
             throws IOException, InterruptedException {
         Path directory = Files.createTempDirectory("omacp-child");
         Path in = Files.write(directory.resolve("in"), input);
@@ -32,6 +52,7 @@ public final class ChildVm {
         command.add(Path.of(System.getProperty("java.home"), "bin", "java").toString());
         command.add("-Xcheck:jni");
         command.add("-Djava.library.path=" + libraryPath);
+        command.addAll(options);
         command.add("-cp");
         command.add(classPath);
         command.add(main.getName());

@@ -1,5 +1,8 @@
 package com.qvomacp.support;
 
+import com.qvomacp.eng.omacp.EncodeOptions;
+import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.ProvisioningEncoder;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.Path;
@@ -11,7 +14,8 @@ import java.util.Map;
 /**
  * A message from elsewhere, of the file that OMACP_FIELD_MESSAGES names: a JSON object a line. Of its
  * members, {@code id} names the message, {@code kind} says what {@code data} is: {@code push-hex} a
- * whole push, {@code wbxml-hex} a body, {@code xml} a document, which is encoded as a sample is.
+ * whole push, {@code wbxml-hex} a body, {@code xml} a document, which is encoded as a sample is; {@code
+ * expected} may hold the PIN that its MAC is made with.
  */
 public final class FieldMessage {
     public static final String VARIABLE = "OMACP_FIELD_MESSAGES";
@@ -24,8 +28,12 @@ public final class FieldMessage {
     /** Null for another kind, and for a document that cannot be encoded. */
     public final byte[] bytes;
 
-    private FieldMessage(String id, String kind, String data) throws Exception {
+    /** Null when it is not known. */
+    public final String pin;
+
+    private FieldMessage(String id, String kind, String data, String pin) throws Exception {
         this.id = id;
+        this.pin = pin;
         this.isPush = !kind.equals("wbxml-hex");
         if (kind.equals("xml")) {
             this.bytes = encoded(data);
@@ -46,10 +54,20 @@ public final class FieldMessage {
                         new FieldMessage(
                                 String.valueOf(fields.get("id")),
                                 String.valueOf(fields.get("kind")),
-                                String.valueOf(fields.get("data"))));
+                                String.valueOf(fields.get("data")),
+                                pin(fields.get("expected"))));
             }
         }
         return messages;
+    }
+
+    private static String pin(Object expected) {
+        if (!(expected instanceof Map)) {
+            return null;
+        }
+        Map<?, ?> facts = (Map<?, ?>) expected;
+        Object pin = facts.get("user_pin");
+        return (String) (pin != null ? pin : facts.get("MAC_verified_with_userpin"));
     }
 
     /** The message as a push. */
@@ -57,22 +75,14 @@ public final class FieldMessage {
         return isPush ? bytes : Push.push(bytes);
     }
 
-    /** What the samples' encoder makes of a document; null, and said so, when it refuses it. */
-    private static byte[] encoded(String document) throws Exception {
-        Path file = Files.writeString(Files.createTempFile("field", ".xml"), document);
+    /** What becomes of a document; null, and said so, when it is refused. */
+    private static byte[] encoded(String document) {
         try {
-            Process encoder =
-                    new ProcessBuilder("tools/encode-sample", "-o", "-", file.toString())
-                            .redirectErrorStream(true)
-                            .start();
-            byte[] output = encoder.getInputStream().readAllBytes();
-            if (encoder.waitFor() == 0) {
-                return output;
-            }
-            System.out.print(new String(output, StandardCharsets.UTF_8));
+            byte[] xml = document.getBytes(StandardCharsets.UTF_8);
+            return ProvisioningEncoder.ofXml(xml, EncodeOptions.NONE).push();
+        } catch (EncodingException refused) {
+            System.out.println(refused);
             return null;
-        } finally {
-            Files.delete(file);
         }
     }
 }

@@ -2,8 +2,12 @@ package com.qvomacp.eng.omacp;
 
 import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertFalse;
+import static org.junit.jupiter.api.Assertions.assertNotEquals;
+import static org.junit.jupiter.api.Assertions.assertNull;
 import static org.junit.jupiter.api.Assertions.assertTrue;
+import static org.junit.jupiter.api.Assumptions.assumeTrue;
 
+import com.qvomacp.support.FieldMessage;
 import com.qvomacp.support.Push;
 import java.math.BigInteger;
 import java.nio.charset.StandardCharsets;
@@ -21,6 +25,7 @@ import javax.crypto.Mac;
 import javax.crypto.spec.SecretKeySpec;
 import org.junit.jupiter.api.Test;
 import org.junit.jupiter.params.ParameterizedTest;
+import org.junit.jupiter.params.provider.EnumSource;
 import org.junit.jupiter.params.provider.MethodSource;
 import org.junit.jupiter.params.provider.ValueSource;
 
@@ -38,12 +43,41 @@ class MacTest {
     /** Those bytes, each modulo ten. */
     private static final String TOLD = "82108";
 
+    private static final String IMSI = "001010123456789";
+
     private static byte[] ascii(String text) {
         return text.getBytes(StandardCharsets.US_ASCII);
     }
 
-    private static PushHeader header(int sec, String mac, byte[] body) throws Exception {
-        return ProvisioningMessage.parseHeader(Push.secured(sec, mac, body));
+    /** A push whose MAC is to be checked. */
+    private static final class Pushed {
+        final PushHeader header;
+        final byte[] body;
+
+        Pushed(byte[] push) throws Exception {
+            header = PushHeader.parse(push);
+            body = Arrays.copyOfRange(push, header.length(), push.length);
+        }
+
+        Pushed(int sec, String mac, byte[] body) throws Exception {
+            this(Push.secured(sec, mac, body));
+        }
+
+        MacResult verify(String pin, String imsi) {
+            return ProvisioningMac.verify(header.securityMethod(), header.mac(), body, pin, imsi);
+        }
+
+        boolean isRight(String pin) {
+            return verify(pin, null) == MacResult.RIGHT;
+        }
+
+        MacResult verify(byte[] key) {
+            return ProvisioningMac.verify(header.securityMethod(), header.mac(), body, key);
+        }
+
+        String computed(String pin, String imsi) {
+            return ProvisioningMac.compute(header.securityMethod(), body, pin, imsi);
+        }
     }
 
     static List<Path> samples() throws Exception {
@@ -80,33 +114,69 @@ class MacTest {
     @MethodSource("samples")
     void theMacOfEverySampleIsRight(Path document) throws Exception {
         Map<String, String> options = options(document);
-        Path push = Path.of(document.toString().replaceAll("xml$", "push"));
-        ProvisioningMessage message = ProvisioningMessage.parse(Files.readAllBytes(push));
-        String method = options.getOrDefault("sec", "none").toUpperCase(Locale.ROOT);
-        assertEquals(SecurityMethod.valueOf(method), message.getHeader().getSecurityMethod());
+        Path file = Path.of(document.toString().replaceAll("xml$", "push"));
+        Pushed message = new Pushed(Files.readAllBytes(file));
+        String name = options.getOrDefault("sec", "none").toUpperCase(Locale.ROOT);
+        SecurityMethod method = SecurityMethod.valueOf(name);
+        assertEquals(method, message.header.securityMethod());
         String pin = options.get("pin");
         String imsi = options.get("imsi");
-        boolean carries = message.getHeader().getMac() != null;
-        assertEquals(carries, pin != null || imsi != null);
-        assertEquals(carries, message.verifyMac(pin, imsi));
-        assertEquals(carries && imsi == null, message.verifyMac(pin));
-        assertEquals(carries && pin == null, message.verifyMacWithImsi(imsi));
-        assertFalse(message.verifyMac("4321", imsi) && pin != null);
-        assertFalse(message.verifyMac(pin, "001010123456780") && imsi != null);
-        assertFalse(message.verifyMac(null, null));
-        assertFalse(message.verifyMac("", ""));
+        if (method == SecurityMethod.NONE) {
+            assertNull(message.header.mac());
+            assertEquals(MacResult.NO_METHOD, message.verify("1234", IMSI));
+            assertNull(message.computed("1234", IMSI));
+            return;
+        }
+        if (pin == null && imsi == null) {
+            assertEquals(SecurityMethod.USERPINMAC, method);
+            assertEquals(MacResult.UNUSABLE_PIN, message.verify(null, null));
+            return;
+        }
+        assertEquals(MacResult.RIGHT, message.verify(pin, imsi));
+        MacResult withoutImsi = imsi == null ? MacResult.RIGHT : MacResult.UNUSABLE_IMSI;
+        assertEquals(withoutImsi, message.verify(pin, null));
+        MacResult withoutPin = pin == null ? MacResult.RIGHT : MacResult.UNUSABLE_PIN;
+        assertEquals(withoutPin, message.verify(null, imsi));
+        if (pin != null) {
+            assertNotEquals(MacResult.RIGHT, message.verify("4321", imsi));
+        }
+        if (imsi != null) {
+            assertEquals(MacResult.WRONG, message.verify(pin, "001010123456780"));
+        }
+        MacResult without = imsi == null ? MacResult.UNUSABLE_PIN : MacResult.UNUSABLE_IMSI;
+        assertEquals(without, message.verify(null, null));
+        assertEquals(without, message.verify("", ""));
+        String told = method == SecurityMethod.USERPINMAC ? pin : message.header.mac();
+        assertTrue(told.endsWith(message.computed(pin, imsi)));
+    }
+
+    @Test
+    void theMacsOfFieldMessagesAreRightWithTheirPins() throws Exception {
+        String file = System.getenv(FieldMessage.VARIABLE);
+        assumeTrue(
+                file != null && !file.isEmpty(), FieldMessage.VARIABLE + " names no file: skipped");
+        for (FieldMessage message : FieldMessage.all()) {
+            if (message.isPush && message.pin != null) {
+                Pushed pushed = new Pushed(message.push());
+                assertEquals(MacResult.RIGHT, pushed.verify(message.pin, null), message.id);
+                System.out.println("field message " + message.id + ": the MAC is right");
+            }
+        }
     }
 
     @Test
     void knowsTheHmacOfAPublishedCase() throws Exception {
-        assertTrue(header(0x81, HMAC, DATA).verifyMac(KEY));
-        assertTrue(header(0x81, HMAC.toLowerCase(Locale.ROOT), DATA).verifyMac(KEY));
-        assertTrue(header(0x80, HMAC, DATA).verifyMacWithKey(ascii(KEY)));
-        assertFalse(header(0x80, HMAC, DATA).verifyMacWithKey(ascii("jefe")));
-        assertFalse(header(0x80, HMAC, DATA).verifyMacWithKey(null));
-        assertFalse(header(0x80, HMAC, DATA).verifyMacWithKey(new byte[0]));
-        assertFalse(header(0x81, HMAC, DATA).verifyMac("jefe"));
-        assertFalse(header(0x81, HMAC, BODY).verifyMac(KEY));
+        assertTrue(new Pushed(0x81, HMAC, DATA).isRight(KEY));
+        assertTrue(new Pushed(0x81, HMAC.toLowerCase(Locale.ROOT), DATA).isRight(KEY));
+        Pushed message = new Pushed(0x80, HMAC, DATA);
+        assertEquals(MacResult.RIGHT, message.verify(ascii(KEY)));
+        assertEquals(MacResult.WRONG, message.verify(ascii("jefe")));
+        assertEquals(MacResult.UNUSABLE_KEY, message.verify((byte[]) null));
+        assertEquals(MacResult.UNUSABLE_KEY, message.verify(new byte[0]));
+        assertEquals(MacResult.WRONG, new Pushed(0x81, HMAC, DATA).verify("jefe", null));
+        assertEquals(MacResult.WRONG, new Pushed(0x81, HMAC, BODY).verify(KEY, null));
+        assertEquals(HMAC, ProvisioningMac.compute(ascii(KEY), DATA));
+        assertEquals(HMAC, ProvisioningMac.compute(SecurityMethod.USERPIN, DATA, KEY, null));
     }
 
     @Test
@@ -114,11 +184,12 @@ class MacTest {
         for (int i = 0; i < HMAC.length(); ++i) {
             char other = HMAC.charAt(i) == '0' ? '1' : '0';
             String wrong = HMAC.substring(0, i) + other + HMAC.substring(i + 1);
-            assertFalse(header(0x81, wrong, DATA).verifyMac(KEY), wrong);
+            assertEquals(MacResult.WRONG, new Pushed(0x81, wrong, DATA).verify(KEY, null), wrong);
         }
-        assertFalse(header(0x81, HMAC.substring(1), DATA).verifyMac(KEY));
-        assertFalse(header(0x81, HMAC.substring(0, 39), DATA).verifyMac(KEY));
-        assertFalse(header(0x81, HMAC + "0", DATA).verifyMac(KEY));
+        String shorter = HMAC.substring(1);
+        for (String wrong : List.of(shorter, HMAC.substring(0, 39), HMAC + "0", "\u00df")) {
+            assertEquals(MacResult.WRONG, new Pushed(0x81, wrong, DATA).verify(KEY, null), wrong);
+        }
     }
 
     /** Key: semi-octets of the IMSI with the parity in front. */
@@ -126,23 +197,26 @@ class MacTest {
     void makesAKeyOfAnImsi() throws Exception {
         byte[] odd = {0x09, 0x10, 0x10, 0x10, 0x32, 0x54, 0x76, (byte) 0x98};
         byte[] even = {0x01, 0x10, 0x10, 0x10, 0x32, 0x54, 0x76, (byte) 0xF8};
-        assertSameKey("001010123456789", odd);
+        assertSameKey(IMSI, odd);
         assertSameKey("00101012345678", even);
     }
 
     private static void assertSameKey(String imsi, byte[] key) throws Exception {
         String mac = mac(key);
-        assertTrue(header(0x80, mac, DATA).verifyMacWithKey(key));
-        assertTrue(header(0x80, mac, DATA).verifyMacWithImsi(imsi));
-        assertTrue(header(0x80, mac, DATA).verifyMac("1234", imsi), "the PIN does not matter");
-        assertFalse(header(0x80, mac, DATA).verifyMac(imsi));
+        Pushed net = new Pushed(0x80, mac, DATA);
+        assertEquals(MacResult.RIGHT, net.verify(key));
+        assertEquals(MacResult.RIGHT, net.verify(null, imsi));
+        assertEquals(MacResult.RIGHT, net.verify("1234", imsi), "the PIN does not matter");
+        assertEquals(MacResult.UNUSABLE_IMSI, net.verify(imsi, null));
         byte[] both = Arrays.copyOf(key, key.length + 4);
         System.arraycopy(ascii("1234"), 0, both, key.length, 4);
-        assertTrue(header(0x82, mac(both), DATA).verifyMac("1234", imsi));
-        assertFalse(header(0x82, mac(key), DATA).verifyMac("1234", imsi));
-        assertFalse(header(0x82, mac(key), DATA).verifyMac("", imsi), "a part is missing");
-        assertFalse(header(0x82, mac(key), DATA).verifyMac(null, imsi), "a part is missing");
-        assertFalse(header(0x82, mac(ascii("1234")), DATA).verifyMac("1234", null));
+        assertEquals(MacResult.RIGHT, new Pushed(0x82, mac(both), DATA).verify("1234", imsi));
+        Pushed user = new Pushed(0x82, mac(key), DATA);
+        assertEquals(MacResult.WRONG, user.verify("1234", imsi));
+        assertEquals(MacResult.UNUSABLE_PIN, user.verify("", imsi));
+        assertEquals(MacResult.UNUSABLE_PIN, user.verify(null, imsi));
+        Pushed pinAlone = new Pushed(0x82, mac(ascii("1234")), DATA);
+        assertEquals(MacResult.UNUSABLE_IMSI, pinAlone.verify("1234", null));
     }
 
     private static String mac(byte[] key) throws Exception {
@@ -152,35 +226,54 @@ class MacTest {
     }
 
     @ParameterizedTest
-    @ValueSource(strings = {"", "00101012345678x", "0010101234567890", "+0101012345678"})
+    @ValueSource(strings = {"", "00101012345678x", "0010101234567890", "+0101012345678", "\u0661"})
     void takesNoImsiThatIsNone(String imsi) throws Exception {
-        byte[] message = Files.readAllBytes(Path.of("samples/internet.push"));
-        PushHeader header = ProvisioningMessage.parseHeader(message);
-        assertTrue(header.verifyMacWithImsi("001010123456789"));
-        assertFalse(header.verifyMacWithImsi(imsi));
+        Pushed message = new Pushed(Files.readAllBytes(Path.of("samples/internet.push")));
+        assertEquals(MacResult.RIGHT, message.verify(null, IMSI));
+        assertEquals(MacResult.UNUSABLE_IMSI, message.verify(null, imsi));
+        assertNull(message.computed(null, imsi));
     }
 
     @Test
     void looksAtTheMacThatTheUserHasBeenTold() throws Exception {
-        PushHeader header = header(0x83, "00", BODY);
-        assertTrue(header.verifyMac("12345" + TOLD));
-        assertTrue(header.verifyMac("12345" + TOLD, "001010123456789"));
+        Pushed message = new Pushed(0x83, "00", BODY);
+        assertTrue(message.isRight("12345" + TOLD));
+        assertEquals(MacResult.RIGHT, message.verify("12345" + TOLD, IMSI));
         for (int i = 0; i < TOLD.length(); ++i) {
             char other = TOLD.charAt(i) == '0' ? '1' : '0';
             String wrong = TOLD.substring(0, i) + other + TOLD.substring(i + 1);
-            assertFalse(header.verifyMac("12345" + wrong), wrong);
+            assertEquals(MacResult.WRONG, message.verify("12345" + wrong, null), wrong);
         }
-        assertFalse(header.verifyMac("12346" + TOLD));
-        assertFalse(header.verifyMac("12345" + TOLD + "0"), "an odd number of digits");
-        assertFalse(header.verifyMac("12345"), "a key alone");
-        assertFalse(header.verifyMac(null));
-        assertFalse(header(0x83, "00", DATA).verifyMac("12345" + TOLD));
-        assertFalse(header(0x81, "00", BODY).verifyMac("12345" + TOLD));
+        assertEquals(MacResult.WRONG, message.verify("12346" + TOLD, null));
+        for (String pin : new String[] {"12345" + TOLD + "0", "12345", "1234582l08", null}) {
+            assertEquals(MacResult.UNUSABLE_PIN, message.verify(pin, null), pin);
+        }
+        assertEquals(MacResult.WRONG, new Pushed(0x83, "00", DATA).verify("12345" + TOLD, null));
+        assertEquals(MacResult.WRONG, new Pushed(0x81, "00", BODY).verify("12345" + TOLD, null));
+        assertEquals(MacResult.NO_MAC, message.verify(ascii("12345")), "a key cannot be compared");
+    }
+
+    @Test
+    void needsNoMacInTheMessageForWhatTheUserHasBeenTold() throws Exception {
+        Pushed message = new Pushed(Push.withShortType(0xB6, BODY).sec(0x83).bytes());
+        assertNull(message.header.mac());
+        assertTrue(message.isRight("12345" + TOLD));
+    }
+
+    @Test
+    void tellsTheDigitsForTheUser() {
+        assertEquals("12345" + TOLD, ProvisioningMac.digitsToTell("12345", BODY));
+        assertEquals(
+                TOLD,
+                ProvisioningMac.compute(SecurityMethod.USERPINMAC, BODY, "1234500000", null));
+        for (String key : new String[] {null, "", "1234", "1234x", "1".repeat(21)}) {
+            assertNull(ProvisioningMac.digitsToTell(key, BODY), key);
+        }
     }
 
     @Test
     void takesAToldMacOfTenToFortyDigits() throws Exception {
-        PushHeader header = header(0x83, "00", BODY);
+        Pushed message = new Pushed(0x83, "00", BODY);
         for (int half = 1; half < 30; ++half) {
             String key = "1".repeat(half);
             Mac mac = Mac.getInstance("HmacSHA1");
@@ -189,19 +282,39 @@ class MacTest {
             for (byte b : Arrays.copyOf(mac.doFinal(BODY), half)) {
                 pin.append(Byte.toUnsignedInt(b) % 10);
             }
-            assertEquals(half >= 5 && half <= 20, header.verifyMac(pin.toString()), pin.toString());
+            MacResult expected =
+                    half >= 5 && half <= 20 ? MacResult.RIGHT : MacResult.UNUSABLE_PIN;
+            assertEquals(expected, message.verify(pin.toString(), null), pin.toString());
+            String told = expected == MacResult.RIGHT ? pin.toString() : null;
+            assertEquals(told, ProvisioningMac.digitsToTell(key, BODY));
         }
     }
 
     @Test
-    void verifiesNothingWithoutAMethodOrAMac() throws Exception {
-        PushHeader unsecured = ProvisioningMessage.parseHeader(Push.push(DATA));
-        assertFalse(unsecured.verifyMac(KEY));
-        assertFalse(unsecured.verifyMacWithKey(ascii(KEY)));
-        byte[] macAlone = Push.withShortType(0xB6, DATA).mac(HMAC).bytes();
-        assertFalse(ProvisioningMessage.parseHeader(macAlone).verifyMac(KEY, KEY));
-        byte[] secAlone = Push.withShortType(0xB6, DATA).sec(0x81).bytes();
-        assertFalse(ProvisioningMessage.parseHeader(secAlone).verifyMac(KEY));
-        assertFalse(header(0x84, HMAC, DATA).verifyMac(KEY, KEY), "an unknown method");
+    void tellsAMissingMethodFromAMissingMac() throws Exception {
+        Pushed unsecured = new Pushed(Push.push(DATA));
+        assertEquals(MacResult.NO_METHOD, unsecured.verify(KEY, null));
+        assertEquals(MacResult.NO_METHOD, unsecured.verify(ascii(KEY)));
+        Pushed macAlone = new Pushed(Push.withShortType(0xB6, DATA).mac(HMAC).bytes());
+        assertEquals(HMAC, macAlone.header.mac());
+        assertEquals(MacResult.NO_METHOD, macAlone.verify(KEY, KEY));
+        Pushed secAlone = new Pushed(Push.withShortType(0xB6, DATA).sec(0x81).bytes());
+        assertEquals(MacResult.NO_MAC, secAlone.verify(KEY, null));
+        assertEquals(MacResult.NO_MAC, secAlone.verify(null, null));
+        assertEquals(MacResult.NO_METHOD, new Pushed(0x84, HMAC, DATA).verify(KEY, KEY));
+    }
+
+    @ParameterizedTest
+    @EnumSource(SecurityMethod.class)
+    void computesWhatItTakesForRight(SecurityMethod method) {
+        String mac = ProvisioningMac.compute(method, BODY, "1234567890", IMSI);
+        boolean isKnown = method != SecurityMethod.NONE && method != SecurityMethod.UNKNOWN;
+        assertEquals(isKnown, mac != null);
+        if (mac != null) {
+            String pin = method == SecurityMethod.USERPINMAC ? "12345" + mac : "1234567890";
+            assertEquals(
+                    MacResult.RIGHT, ProvisioningMac.verify(method, mac, BODY, pin, IMSI));
+        }
+        assertFalse(mac != null && mac.isEmpty());
     }
 }

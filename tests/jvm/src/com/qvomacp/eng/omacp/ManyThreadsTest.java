@@ -16,22 +16,35 @@ import java.util.concurrent.Future;
 import java.util.stream.Stream;
 import org.junit.jupiter.api.Test;
 
-/** Threads that parse at once get what one thread alone gets. */
+/** Threads that read at once, each its own message or all the same one, get what one alone gets. */
 class ManyThreadsTest {
     private static final int THREADS = 8;
     private static final int ROUNDS = 20;
 
+    /** What a message tells, in one text. */
+    private static String told(ProvisioningMessage message) {
+        StringBuilder text = new StringBuilder();
+        for (Characteristic characteristic : message.document().characteristics()) {
+            text.append(message.document().path(characteristic)).append('\n');
+            for (Parameter parameter : characteristic.parameters()) {
+                text.append(parameter.name()).append('=').append(parameter.value()).append('\n');
+            }
+        }
+        Verdict verdict = message.verdict();
+        return text.append(message).append(verdict.isAccepted()).append(verdict.code()).toString();
+    }
+
     private static Reason refusal(byte[] message) {
         try {
-            ProvisioningMessage.parse(message);
+            ProvisioningMessage.parsePush(message, ReadOptions.DEFAULT.withAcceptedOnly(true));
             return null;
         } catch (ProvisioningException e) {
-            return e.getReason();
+            return e.reason();
         }
     }
 
     @Test
-    void parseTheSameAsOneAlone() throws Exception {
+    void readTheSameAsOneAlone() throws Exception {
         List<byte[]> messages = new ArrayList<>();
         try (Stream<Path> files = Files.list(Path.of("samples"))) {
             for (Path file : files.filter(f -> f.toString().endsWith(".push")).toList()) {
@@ -39,9 +52,11 @@ class ManyThreadsTest {
             }
         }
         assertTrue(messages.size() >= 8);
-        List<ProvisioningMessage> expected = new ArrayList<>();
+        List<ProvisioningMessage> shared = new ArrayList<>();
+        List<String> expected = new ArrayList<>();
         for (byte[] message : messages) {
-            expected.add(ProvisioningMessage.parse(message));
+            shared.add(ProvisioningMessage.parsePush(message));
+            expected.add(told(ProvisioningMessage.parsePush(message)));
         }
         byte[] refused = Push.push(new byte[] {0x03, 0x0B, 0x6A, 0x00, 0x7F});
 
@@ -56,20 +71,18 @@ class ManyThreadsTest {
                                 () -> {
                                     start.countDown();
                                     start.await();
-                                    int parsed = 0;
+                                    int read = 0;
                                     for (int i = 0; i < ROUNDS * messages.size(); ++i) {
                                         int m = (first + i) % messages.size();
-                                        byte[] message = messages.get(m);
-                                        assertEquals(
-                                                expected.get(m),
-                                                ProvisioningMessage.parse(message));
-                                        assertEquals(
-                                                expected.get(m).getHeader(),
-                                                ProvisioningMessage.parseHeader(message));
-                                        assertEquals(Reason.BODY_REFUSED, refusal(refused));
-                                        ++parsed;
+                                        ProvisioningMessage message =
+                                                ProvisioningMessage.parsePush(messages.get(m));
+                                        assertEquals(expected.get(m), told(message));
+                                        assertEquals(expected.get(m), told(shared.get(m)));
+                                        assertEquals(shared.get(m), message);
+                                        assertEquals(Reason.REFUSED, refusal(refused));
+                                        ++read;
                                     }
-                                    return parsed;
+                                    return read;
                                 }));
             }
             for (Future<Integer> result : results) {

@@ -151,7 +151,7 @@ class NativeMethodsTest extends Natives {
             strings = {
                 "/com/qvomacp/eng/parser/XCPCtxParser.class",
                 "/com/qvomacp/cli/Main.class",
-                "/com/qvomacp/cli/MessageReader.class"
+                "/com/qvomacp/eng/omacp/ProvisioningMessage.class"
             })
     void areJava8ByteCode(String resource) throws IOException {
         try (InputStream in = getClass().getResourceAsStream(resource);

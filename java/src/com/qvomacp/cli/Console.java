@@ -1,0 +1,58 @@
+package com.qvomacp.cli;
+
+import java.io.BufferedWriter;
+import java.io.InputStream;
+import java.io.OutputStream;
+import java.io.OutputStreamWriter;
+import java.io.PrintWriter;
+import java.nio.charset.StandardCharsets;
+
+/** What the program reads and writes, and the status that it ends with. */
+final class Console {
+    static final int DONE = 0;
+    static final int REFUSED = 1;
+    static final int FAILED = 2;
+
+    final InputStream in;
+    final PrintWriter out;
+    private final Output bytes;
+    final PrintWriter err;
+    final Terminal terminal;
+    private int status = DONE;
+
+    Console(InputStream in, OutputStream out, OutputStream err, Terminal terminal) {
+        this.in = in;
+        this.bytes = new Output(out);
+        this.out = writer(bytes);
+        this.err = writer(err);
+        this.terminal = terminal;
+    }
+
+    private static PrintWriter writer(OutputStream to) {
+        return new PrintWriter(
+                new BufferedWriter(new OutputStreamWriter(to, StandardCharsets.UTF_8)));
+    }
+
+    /** Writes bytes to standard output, behind what has been written as text. */
+    void write(byte[] content) {
+        out.flush();
+        bytes.write(content, 0, content.length);
+        bytes.flush();
+    }
+
+    /** Writes to standard error, in its place among what has been written. */
+    void complain(String text) {
+        out.flush();
+        err.print(text);
+        err.flush();
+    }
+
+    int status() {
+        return status;
+    }
+
+    /** The status is the worst of all files. */
+    void raise(int raised) {
+        status = Math.max(status, raised);
+    }
+}

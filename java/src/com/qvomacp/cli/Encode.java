@@ -1,0 +1,214 @@
+package com.qvomacp.cli;
+
+import com.qvomacp.eng.omacp.EncodeOption;
+import com.qvomacp.eng.omacp.EncodeOptions;
+import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.ProvisioningEncoder;
+import java.io.ByteArrayOutputStream;
+import java.io.IOException;
+import java.nio.charset.StandardCharsets;
+import java.util.Base64;
+import java.util.List;
+import java.util.Locale;
+import picocli.CommandLine.Command;
+import picocli.CommandLine.Option;
+
+/** Makes messages of documents in XML, or of messages. */
+@Command(
+        name = "encode",
+        description = {
+            "Make a push, or its body alone, of a document in XML or of a message.",
+            "A FILE may hold such a document, too. An option wins over its <?omacp-push?>",
+            "instruction."
+        },
+        customSynopsis = "omacp encode [-h] [OPTION...] [FILE...]",
+        sortOptions = false,
+        parameterListHeading = "%n",
+        optionListHeading = "%nOptions:%n",
+        exitCodeListHeading = "%nExit status:%n",
+        exitCodeList = {
+            "0:everything was written, and the library takes it",
+            "1:a document or message is refused, or the library refuses what was written",
+            "2:wrong usage, an option that does not fit, a file that cannot be read or written"
+        })
+final class Encode extends Job {
+    private static final String USERPINMAC = "userpinmac";
+
+    /** How the parts of an SMS are written. */
+    enum Sms {
+        UD,
+        SUBMIT
+    }
+
+    @Option(names = "--body", description = "Write the body alone.")
+    private boolean body;
+
+    @Option(names = "--hex", description = "Write a line of hexadecimal digits.")
+    private boolean hex;
+
+    @Option(names = "--base64", description = "Write a line of base64.")
+    private boolean base64;
+
+    @Option(
+            names = "--sms",
+            paramLabel = "FORM",
+            description =
+                    "Write the parts of an SMS, each a line of hexadecimal digits: ud (user data) or"
+                            + " submit (an SMS-SUBMIT).")
+    private Sms sms;
+
+    @Option(
+            names = "--to",
+            paramLabel = "NUMBER",
+            description = "Who gets the SMS-SUBMIT: up to 20 digits, with \"+\" or without.")
+    private String to;
+
+    @Option(
+            names = {"-o", "--output"},
+            paramLabel = "FILE",
+            description = "Write to a file that is not there yet.")
+    private String output;
+
+    @Option(names = "--force", description = "Overwrite the file.")
+    private boolean force;
+
+    private EncodeOptions options = EncodeOptions.NONE;
+    private final ByteArrayOutputStream written = new ByteArrayOutputStream();
+
+    @Override
+    void begin() {
+        int forms = (hex ? 1 : 0) + (base64 ? 1 : 0) + (sms != null ? 1 : 0);
+        if (forms > 1 || sms != null && body) {
+            throw new UsageException("--hex, --base64 and --sms go not together, nor --sms with --body");
+        }
+        if (sms == Sms.SUBMIT ? to == null || !to.matches("\\+?[0-9]{1,20}") : to != null) {
+            throw new UsageException("--sms=submit, and nothing else, needs --to with 1 to 20 digits");
+        }
+        if (output == null || output.equals(Input.STANDARD_INPUT)) {
+            output = null;
+            if (isRaw() && console.terminal.isScreen) {
+                throw new UsageException(
+                        "bytes are not for a terminal: --hex, --base64, --sms or --output is needed");
+            }
+        }
+        Choices choices = new Choices(this);
+        for (EncodeOption option : EncodeOption.values()) {
+            String value = choices.value(option);
+            try {
+                options = value == null ? options : options.with(option, value);
+            } catch (IllegalArgumentException wrong) {
+                throw new UsageException("--" + wrong.getMessage());
+            }
+        }
+    }
+
+    private boolean isRaw() {
+        return !hex && !base64 && sms == null;
+    }
+
+    @Override
+    boolean takes(String name, byte[] content) {
+        if (!isXml(content)) {
+            return false;
+        }
+        try {
+            encode(name, ProvisioningEncoder.ofXml(content, options));
+        } catch (EncodingException refused) {
+            refuse(name, refused);
+        }
+        return true;
+    }
+
+    /** Whether it begins with a tag, in UTF-8 or UTF-16, and not with that of a push. */
+    private static boolean isXml(byte[] content) {
+        int at = 0;
+        while (at < content.length
+                && "\u00EF\u00BB\u00BF\u00FE\u00FF\0 \t\r\n".indexOf(content[at] & 0xFF) >= 0) {
+            ++at;
+        }
+        return at < content.length && content[at] == '<' && (at > 0 || !Intake.isPush(content));
+    }
+
+    @Override
+    void run(Held held) {
+        Reading reading = Reading.of(held, limit());
+        if (reading.message == null) {
+            explain(reading);
+            return;
+        }
+        try {
+            encode(held.name, ProvisioningEncoder.of(reading.message, options));
+        } catch (EncodingException refused) {
+            refuse(held.name, refused);
+        }
+    }
+
+    private void encode(String name, ProvisioningEncoder encoder) throws EncodingException {
+        if (isRaw() && isOneOfSeveral()) {
+            fail(
+                    Console.FAILED,
+                    name,
+                    "is one of several, which only --hex, --base64 and --sms can write");
+            return;
+        }
+        byte[] message = body ? encoder.body() : encoder.push();
+        List<byte[]> parts = sms == null ? null : ShortMessageWriter.userData(message);
+        if (sms != null && parts == null) {
+            fail(Console.FAILED, name, "is too long for an SMS");
+            return;
+        }
+        write(message, parts);
+        if (USERPINMAC.equals(encoder.options().value(EncodeOption.SEC))) {
+            tell(name, encoder.digitsToTell());
+        }
+        Reading reading = Reading.of(Held.message(name, message, !body), message.length);
+        if (reading.isAccepted()) {
+            complain(startOf(name) + "the library takes it\n");
+        }
+        explain(reading);
+    }
+
+    private void tell(String name, String digits) {
+        String told = digits != null ? digits : "digits, for which a PIN of 5 to 20 is needed";
+        complain(startOf(name) + "the user has to be told " + told + "\n");
+    }
+
+    private void write(byte[] message, List<byte[]> parts) {
+        if (isRaw()) {
+            written.write(message, 0, message.length);
+        } else if (hex) {
+            line(digits(message));
+        } else if (base64) {
+            line(Base64.getEncoder().encodeToString(message));
+        } else {
+            for (byte[] part : parts) {
+                line(digits(sms == Sms.UD ? part : ShortMessageWriter.submit(to, part)));
+            }
+        }
+    }
+
+    private static String digits(byte[] bytes) {
+        return HexText.digits(bytes).toUpperCase(Locale.ROOT);
+    }
+
+    private void line(String text) {
+        byte[] line = (text + '\n').getBytes(StandardCharsets.US_ASCII);
+        written.write(line, 0, line.length);
+    }
+
+    @Override
+    void end() {
+        if (written.size() == 0) {
+            return;
+        }
+        if (output == null) {
+            console.write(written.toByteArray());
+            return;
+        }
+        try {
+            Input.write(output, written.toByteArray(), force);
+        } catch (IOException unwritable) {
+            fail(Console.FAILED, output, unwritable.getMessage());
+        }
+    }
+}

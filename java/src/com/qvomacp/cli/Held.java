@@ -1,0 +1,54 @@
+package com.qvomacp.cli;
+
+import java.util.Collections;
+import java.util.List;
+
+/** What came of something that people hold: a push, a body, or why there is no message. */
+final class Held {
+    private static final List<String> NONE = Collections.emptyList();
+
+    /** Where it comes from, for people: the input, its line, or all the parts of an SMS. */
+    final String name;
+
+    /** The push or the body, or what is neither; null when there is nothing of all. */
+    final byte[] bytes;
+
+    /** False for a body alone. */
+    final boolean isPush;
+
+    /** Why there is no message, as a sentence without a full stop; null when there is one. */
+    final String error;
+
+    /** What is worth a remark, each a sentence without a full stop. */
+    final List<String> notes;
+
+    private Held(String name, byte[] bytes, boolean isPush, String error, List<String> notes) {
+        this.name = name;
+        this.bytes = bytes;
+        this.isPush = isPush;
+        this.error = error;
+        this.notes = notes;
+    }
+
+    static Held push(String name, byte[] push, List<String> notes) {
+        return new Held(name, push, true, null, notes);
+    }
+
+    static Held message(String name, byte[] bytes, boolean isPush) {
+        return new Held(name, bytes, isPush, null, NONE);
+    }
+
+    static Held error(String name, String sentence) {
+        return new Held(name, null, false, sentence, NONE);
+    }
+
+    /** Bytes that are no message. */
+    static Held unknown(String name, byte[] bytes, String sentence) {
+        return new Held(name, bytes, true, sentence, NONE);
+    }
+
+    /** A remark that belongs to no message. */
+    static Held note(String name, String sentence) {
+        return new Held(name, null, false, null, Collections.singletonList(sentence));
+    }
+}

@@ -1,0 +1,297 @@
+package com.qvomacp.cli;
+
+import java.io.ByteArrayOutputStream;
+import java.nio.charset.Charset;
+import java.nio.charset.StandardCharsets;
+import java.util.ArrayList;
+import java.util.Arrays;
+import java.util.Base64;
+import java.util.List;
+import java.util.Locale;
+
+/**
+ * Reads bytes out of text, as logs, dumps, gateways and source code write them. A text is a row of
+ * pieces; which of them belong together only their bytes can say.
+ */
+final class HexText {
+    /** Digits on one line, or all the bytes of a dump or of a gateway's form. */
+    static final class Piece {
+        /** Counted from 1. */
+        final int line;
+
+        /** Hexadecimal digits; an odd number of them when a line breaks within a byte. */
+        final String digits;
+
+        /** Whether it stands for itself, and is not to be joined with others. */
+        final boolean isWhole;
+
+        /** Whether it is user data with its header, by what the text says. */
+        final boolean isUserData;
+
+        /** Whether it follows the piece before it on the next line. */
+        final boolean follows;
+
+        Piece(int line, String digits, boolean isWhole, boolean isUserData, boolean follows) {
+            this.line = line;
+            this.digits = digits;
+            this.isWhole = isWhole;
+            this.isUserData = isUserData;
+            this.follows = follows;
+        }
+    }
+
+    private static final String BYTE_ORDER_MARK = "\uFEFF";
+
+    /** So many digits are behind a label at least, lest words and times be taken for bytes. */
+    private static final int FEWEST_BEHIND_LABEL = 16;
+
+    /** What may stand between and around digits, with the letters of a prefix. */
+    private static final String AROUND = "xX \t:,;-\"'{}[]()<>";
+
+    private HexText() {}
+
+    /** The content as text when it can be one, without a byte order mark; null otherwise. */
+    static String text(byte[] content) {
+        boolean isWide = content.length > 1 && (content[0] & 0xFF) + (content[1] & 0xFF) == 0x1FD;
+        Charset charset = isWide ? StandardCharsets.UTF_16 : StandardCharsets.UTF_8;
+        String text = new String(content, charset);
+        for (int i = 0; i < text.length(); ++i) {
+            char c = text.charAt(i);
+            if (c < ' ' && !Character.isWhitespace(c) || c == '\u007F') {
+                return null;
+            }
+        }
+        return text.startsWith(BYTE_ORDER_MARK) ? text.substring(1) : text;
+    }
+
+    /** The pieces of a text, in their order. */
+    static List<Piece> pieces(String text) {
+        List<String> lines = Arrays.asList(text.split("\r\n|[\r\n\f]", -1));
+        List<Piece> pieces = new ArrayList<>();
+        HexDump.Repeats repeats = new HexDump.Repeats();
+        int last = -2;
+        for (int i = 0; i < lines.size(); ) {
+            HexDump dump = HexDump.at(lines, i, repeats);
+            if (dump != null) {
+                pieces.add(new Piece(i + 1, digits(dump.bytes), true, false, false));
+                i = dump.next;
+                continue;
+            }
+            Piece piece = piece(lines.get(i).trim(), i, last == i - 1);
+            if (piece != null) {
+                pieces.add(piece);
+                last = i;
+            }
+            ++i;
+        }
+        return pieces;
+    }
+
+    private static Piece piece(String line, int index, boolean follows) {
+        if (line.isEmpty() || isOfModem(line)) {
+            return null;
+        }
+        Piece form = gatewayForm(line, index);
+        if (form != null) {
+            return form;
+        }
+        if (line.contains("\\x")) {
+            return new Piece(index + 1, digits(escaped(line)), false, false, follows);
+        }
+        String digits = behindLabel(line);
+        return digits == null ? null : new Piece(index + 1, digits, false, false, follows);
+    }
+
+    /** Whether a modem or its user says something about messages, and not one of them. */
+    private static boolean isOfModem(String line) {
+        String upper = line.toUpperCase(Locale.ROOT);
+        return upper.startsWith("+C") || upper.startsWith("AT") || upper.equals("OK");
+    }
+
+    /**
+     * The digits that a line ends with, separators, prefixes and brackets left out. Something else
+     * in front is a label. Null when there are none, or too few behind a label.
+     */
+    private static String behindLabel(String line) {
+        int from = line.length();
+        while (from > 0 && isDigitOrAround(line, from - 1)) {
+            --from;
+        }
+        boolean hasLabel = from > 0;
+        boolean isInWord = hasLabel && Character.isLetterOrDigit(line.charAt(from - 1));
+        // A label may end with letters that are digits too.
+        while (isInWord && from < line.length() && Character.isLetterOrDigit(line.charAt(from))) {
+            ++from;
+        }
+        int colon = line.indexOf(':', from);
+        if (!hasLabel && colon > 2) {
+            // A word of such letters, and no byte.
+            boolean isWord = true;
+            for (int i = 0; i < colon; ++i) {
+                isWord &= Character.isLetterOrDigit(line.charAt(i));
+            }
+            hasLabel = isWord && colon + 1 < line.length();
+            from = hasLabel ? colon + 1 : from;
+        }
+        String digits = digitsOf(line.substring(from));
+        int fewest = hasLabel ? FEWEST_BEHIND_LABEL : 1;
+        return digits != null && digits.length() >= fewest ? digits : null;
+    }
+
+    private static boolean isDigitOrAround(String line, int at) {
+        return isDigit(line, at) || AROUND.indexOf(line.charAt(at)) >= 0;
+    }
+
+    /** The digits without what may stand around them; null for an x that is no prefix. */
+    private static String digitsOf(String text) {
+        StringBuilder digits = new StringBuilder(text.length());
+        for (int i = 0; i < text.length(); ++i) {
+            char c = text.charAt(i);
+            if (text.startsWith("0x", i) || text.startsWith("0X", i)) {
+                ++i;
+                boolean isSingle = isDigit(text, i + 1) && !isDigit(text, i + 2);
+                digits.append(isSingle ? "0" : "");
+            } else if (isDigit(text, i)) {
+                digits.append(c);
+            } else if (c == 'x' || c == 'X') {
+                return null;
+            }
+        }
+        return digits.toString();
+    }
+
+    private static boolean isDigit(String text, int at) {
+        return at < text.length() && text.charAt(at) < 0x80 && digit(text, at) >= 0;
+    }
+
+    private static int digit(String text, int at) {
+        return Character.digit(text.charAt(at), 16);
+    }
+
+    /** What two digits stand for; -1 where there are none. */
+    private static int byteAt(String text, int at) {
+        boolean isByte = isDigit(text, at) && isDigit(text, at + 1);
+        return isByte ? digit(text, at) << 4 | digit(text, at + 1) : -1;
+    }
+
+    /** A literal of source code, where some bytes are escapes and others stand for themselves. */
+    private static byte[] escaped(String line) {
+        ByteArrayOutputStream bytes = new ByteArrayOutputStream();
+        int from = line.indexOf('\\');
+        int quote = Math.max(line.lastIndexOf('"', from), line.lastIndexOf('\'', from));
+        boolean isQuoted = quote >= 0;
+        String others = line.substring(from).replaceAll("\\\\x[0-9A-Fa-f]{2}|[\\s,;+\"']", "");
+        boolean isPure = others.isEmpty();
+        for (int i = isQuoted ? quote + 1 : from; i < line.length(); ++i) {
+            char c = line.charAt(i);
+            boolean isEscape = c == '\\' && i + 1 < line.length();
+            if (isEscape && line.charAt(i + 1) == 'x' && byteAt(line, i + 2) >= 0) {
+                bytes.write(byteAt(line, i + 2));
+                i += 3;
+            } else if (isEscape) {
+                int known = "nrt0".indexOf(line.charAt(i + 1));
+                bytes.write(known >= 0 ? "\n\r\t\0".charAt(known) : line.charAt(i + 1));
+                ++i;
+            } else if (isQuoted && c == line.charAt(quote) && !isPure) {
+                break;
+            } else if (!isPure) {
+                bytes.write(c);
+            }
+        }
+        return bytes.toByteArray();
+    }
+
+    /** What a gateway is asked to send: {@code udh=%06%05...&text=%01%06...}. */
+    private static Piece gatewayForm(String line, int index) {
+        byte[] header = member(line, "udh");
+        byte[] data = null;
+        for (String name : new String[] {"text", "data", "message", "msg", "ud", "binary"}) {
+            data = data == null ? member(line, name) : data;
+        }
+        boolean isForm = header != null || data != null && line.indexOf('%') >= 0;
+        if (!isForm && line.charAt(0) != '%') {
+            return null;
+        }
+        data = isForm ? data : percentDecoded(line);
+        String digits = (header == null ? "" : digits(header)) + (data == null ? "" : digits(data));
+        return new Piece(index + 1, digits, true, header != null, false);
+    }
+
+    /** A member of a form; null when the line has none of that name. */
+    private static byte[] member(String line, String name) {
+        String lower = line.toLowerCase(Locale.ROOT);
+        int at = lower.indexOf(name + "=");
+        while (at > 0 && Character.isLetterOrDigit(line.charAt(at - 1))) {
+            at = lower.indexOf(name + "=", at + 1);
+        }
+        if (at < 0) {
+            return null;
+        }
+        int from = at + name.length() + 1;
+        int end = from;
+        while (end < line.length() && "&\"' \t".indexOf(line.charAt(end)) < 0) {
+            ++end;
+        }
+        String value = line.substring(from, end);
+        String digits = value.indexOf('%') < 0 ? digitsOf(value) : null;
+        boolean isWhole = digits != null && digits.length() == value.length();
+        return isWhole && digits.length() % 2 == 0 ? bytes(digits) : percentDecoded(value);
+    }
+
+    private static byte[] percentDecoded(String value) {
+        ByteArrayOutputStream bytes = new ByteArrayOutputStream();
+        for (int i = 0; i < value.length(); ++i) {
+            char c = value.charAt(i);
+            if (c == '%' && byteAt(value, i + 1) >= 0) {
+                bytes.write(byteAt(value, i + 1));
+                i += 2;
+            } else {
+                bytes.write(c == '+' ? ' ' : c);
+            }
+        }
+        return bytes.toByteArray();
+    }
+
+    /**
+     * What base64 of either alphabet stands for, white space left out; null for anything else, and
+     * for what is nothing but hexadecimal digits.
+     */
+    static byte[] base64(String text) {
+        StringBuilder letters = new StringBuilder(text.length());
+        boolean areDigits = true;
+        for (int i = 0; i < text.length(); ++i) {
+            char c = text.charAt(i);
+            if (!Character.isWhitespace(c)) {
+                areDigits &= isDigit(text, i);
+                letters.append(c == '-' ? '+' : c == '_' ? '/' : c);
+            }
+        }
+        if (areDigits) {
+            return null;
+        }
+        try {
+            byte[] bytes = Base64.getDecoder().decode(letters.toString());
+            return bytes.length == 0 ? null : bytes;
+        } catch (IllegalArgumentException other) {
+            return null;
+        }
+    }
+
+    /** The bytes of an even number of digits. */
+    static byte[] bytes(String digits) {
+        byte[] bytes = new byte[digits.length() / 2];
+        for (int i = 0; i < bytes.length; ++i) {
+            bytes[i] = (byte) (digit(digits, 2 * i) << 4 | digit(digits, 2 * i + 1));
+        }
+        return bytes;
+    }
+
+    static String digits(byte[] bytes) {
+        StringBuilder digits = new StringBuilder(2 * bytes.length);
+        for (byte b : bytes) {
+            digits.append(Character.forDigit(b >> 4 & 0xF, 16));
+            digits.append(Character.forDigit(b & 0xF, 16));
+        }
+        return digits.toString();
+    }
+}

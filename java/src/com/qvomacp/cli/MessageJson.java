@@ -1,0 +1,185 @@
+package com.qvomacp.cli;
+
+import com.qvomacp.eng.omacp.Characteristic;
+import com.qvomacp.eng.omacp.Deviation;
+import com.qvomacp.eng.omacp.HeaderField;
+import com.qvomacp.eng.omacp.Item;
+import com.qvomacp.eng.omacp.Other;
+import com.qvomacp.eng.omacp.Parameter;
+import com.qvomacp.eng.omacp.ProvisioningDocument;
+import com.qvomacp.eng.omacp.PushHeader;
+import com.qvomacp.eng.omacp.Verdict;
+import com.qvomacp.eng.omacp.Writing;
+import java.util.List;
+import java.util.Locale;
+
+/**
+ * Writes a message as the members of a JSON object. {@code header} is null for a body alone, {@code
+ * document} is null when the message cannot be read, which {@code error} then explains. {@code children} stand in the order of the message; each tells by its members what it
+ * is: {@code type} a characteristic, {@code name} and {@code value} a parameter, {@code other}
+ * whatever else.
+ */
+final class MessageJson {
+    private final JsonWriter json;
+
+    MessageJson(JsonWriter json) {
+        this.json = json;
+    }
+
+    void message(Reading reading) {
+        header(reading.header, reading.held.bytes.length - reading.bodyAt());
+        if (reading.document == null) {
+            json.nullMember("document");
+        } else {
+            document(reading.document);
+        }
+        json.name("deviations").beginArray();
+        if (reading.document != null) {
+            for (Deviation deviation : reading.document.deviations()) {
+                json.beginFlatObject();
+                json.member("offset", deviation.offset());
+                json.member("path", deviation.path());
+                json.member("sentence", deviation.sentence()).end();
+            }
+        }
+        json.end();
+        verdict(reading.verdict, reading.document);
+        if (reading.failure != null) {
+            json.member("error", reading.failure.getMessage());
+        }
+    }
+
+    void header(PushHeader header, int bodyLength) {
+        if (header == null) {
+            json.nullMember("header");
+            return;
+        }
+        json.name("header").beginObject();
+        if (header.transactionIdentifier() >= 0) {
+            json.member("transactionIdentifier", header.transactionIdentifier());
+        }
+        json.member("contentType", header.contentType().mediaType());
+        if (header.contentType().code() >= 0) {
+            json.member("contentTypeCode", header.contentType().code());
+        }
+        json.member("headerLength", header.length());
+        json.member("bodyLength", bodyLength);
+        json.member("securityMethod", header.securityMethod().name());
+        json.member("mac", header.mac());
+        fields("parameters", header.contentType().parameters());
+        fields("fields", header.fields());
+        json.end();
+    }
+
+    private void fields(String member, List<HeaderField> fields) {
+        json.name(member).beginArray();
+        for (HeaderField field : fields) {
+            json.beginFlatObject().member("name", field.name()).member("value", field.value());
+            json.member("offset", field.offset()).member("length", field.length()).end();
+        }
+        json.end();
+    }
+
+    private void document(ProvisioningDocument document) {
+        json.name("document").beginObject();
+        json.member("wbxmlVersion", document.wbxmlVersion());
+        json.member("publicIdentifier", document.publicIdentifier());
+        json.member("documentType", document.documentType());
+        json.member("charset", document.charset());
+        json.member("charsetName", document.charsetName());
+        json.member("version", document.version());
+        json.name("children").beginArray();
+        new Walk() {
+            @Override
+            void enter(Item item, int depth) {
+                boolean isOpen = isOpen(item);
+                if (isOpen) {
+                    json.beginObject();
+                } else {
+                    json.beginFlatObject();
+                }
+                describe(item);
+                if (isOpen) {
+                    json.name("children").beginArray();
+                }
+            }
+
+            @Override
+            void leave(Item item) {
+                if (isOpen(item)) {
+                    json.end();
+                }
+                json.end();
+            }
+        }.through(document.children());
+        json.end().end();
+    }
+
+    /** Whether others stand in an item, or have their place there. */
+    private static boolean isOpen(Item item) {
+        return item instanceof Characteristic || !item.children().isEmpty();
+    }
+
+    private void describe(Item item) {
+        if (item instanceof Characteristic) {
+            Characteristic characteristic = (Characteristic) item;
+            json.member("type", characteristic.type());
+            writing("typeWriting", characteristic.typeWriting());
+        } else if (item instanceof Parameter) {
+            Parameter parameter = (Parameter) item;
+            json.member("name", parameter.name()).member("value", parameter.value());
+            writing("nameWriting", parameter.nameWriting());
+            writing("valueWriting", parameter.valueWriting());
+        } else {
+            Other other = (Other) item;
+            json.member("other", lowerCase(other.kind()));
+            json.member("name", other.name()).member("text", other.text());
+            writing("textWriting", other.textWriting());
+        }
+        place(item);
+    }
+
+    private void writing(String member, Writing writing) {
+        if (writing != null) {
+            json.member(member, lowerCase(writing));
+        }
+    }
+
+    private void place(Item item) {
+        json.member("offset", item.offset()).member("length", item.length());
+    }
+
+    private static String lowerCase(Enum<?> constant) {
+        return constant.name().toLowerCase(Locale.ROOT).replace('_', '-');
+    }
+
+    private void verdict(Verdict verdict, ProvisioningDocument document) {
+        json.name("verdict").beginObject();
+        json.member("accepted", verdict.isAccepted());
+        if (!verdict.isAccepted()) {
+            json.member("part", verdict.isHeaderRefused() ? "header" : "body");
+        }
+        json.member("code", verdict.code()).member("codeName", verdict.codeName());
+        json.member("bytesRead", verdict.bytesRead());
+        if (verdict.isAccepted()) {
+            json.nullMember("offset");
+        } else {
+            json.member("offset", verdict.offset());
+        }
+        json.member("path", verdict.path());
+        json.member("reason", verdict.reason());
+        json.member("found", verdict.found());
+        json.name("expected").beginArray();
+        for (String expected : verdict.expected()) {
+            json.text(expected);
+        }
+        json.end();
+        json.name("readOtherwise").beginArray();
+        for (Item item : verdict.readOtherwise()) {
+            json.beginFlatObject().member("path", document.path(item));
+            place(item);
+            json.end();
+        }
+        json.end().end();
+    }
+}

@@ -1,0 +1,526 @@
+package com.qvomacp.eng.omacp;
+
+import java.util.Arrays;
+import java.util.HashMap;
+import java.util.Locale;
+import java.util.Map;
+
+/**
+ * Reads a body as WBXML 1.0 to 1.3 has it, and tells a {@link Reading} what it reads. A loop over the
+ * tokens: depth costs no stack. What departs from the format is told, and read as far as it can be.
+ */
+final class BodyReader {
+    static final int SWITCH_PAGE = 0x00;
+    static final int END = 0x01;
+    static final int ENTITY = 0x02;
+    static final int STR_I = 0x03;
+    static final int LITERAL = 0x04;
+    static final int EXT_I_0 = 0x40;
+    static final int EXT_I_2 = 0x42;
+    static final int PI = 0x43;
+    static final int EXT_T_0 = 0x80;
+    static final int EXT_T_2 = 0x82;
+    static final int STR_T = 0x83;
+    static final int EXT_0 = 0xC0;
+    static final int OPAQUE = 0xC3;
+
+    private static final int ATTRIBUTES = 0x80;
+    private static final int CONTENT = 0x40;
+    private static final int ELEMENT = 0x3F;
+    private static final int FIRST_VALUE = 0x80;
+
+    /** The token of a parm with attributes and without content, and that of VALUE on either page. */
+    private static final int PLAIN_PARM = 0x87;
+
+    private static final int VALUE = 0x06;
+
+    /** The tokens that are a piece of text, in values as well as where elements stand. */
+    private static final boolean[] PIECES = new boolean[0x100];
+
+    static {
+        int[] single = {ENTITY, STR_I, STR_T, OPAQUE};
+        for (int token : single) {
+            PIECES[token] = true;
+        }
+        int[] extensions = {EXT_I_0, EXT_T_0, EXT_0};
+        for (int first : extensions) {
+            Arrays.fill(PIECES, first, first + 3, true);
+        }
+    }
+
+    private static final String NO_LITERAL = "unknown-literal";
+
+    private final byte[] body;
+    private final BodyHeader header;
+    private final CharacterSet charset;
+    private final Cursor cursor;
+    private final Reading reading;
+    private final int textLimit;
+
+    private int elementPage;
+    private int attributePage;
+    private CodePage elements = CodePage.of(0);
+    private CodePage attributes = CodePage.of(0);
+
+    private int depth;
+    private boolean rootEnded;
+
+    /** The element whose attributes are read. */
+    private Element element;
+
+    /** How many pieces the value has that is read. */
+    private int pieces;
+
+    /** Bytes of all texts so far. */
+    private int textLength;
+
+    /** The texts of the string table that were referred to, by their offsets, and their lengths. */
+    private String[] tableTexts;
+
+    private int[] tableLengths;
+
+    /** Names for tokens that stand for nothing, so that equal ones are one text. */
+    private Map<Integer, String> unknown;
+
+    BodyReader(byte[] body, BodyHeader header, int textLimit, Reading reading) {
+        this.body = body;
+        this.header = header;
+        this.charset = header.charset;
+        this.cursor = new Cursor(body, header.elementsAt, body.length);
+        this.reading = reading;
+        this.textLimit = textLimit;
+    }
+
+    /** Reads everything behind the header. */
+    void read() throws ProvisioningException {
+        Cursor cursor = this.cursor;
+        deviationsOfHeader();
+        for (int token; (token = cursor.take()) >= 0; ) {
+            int from = cursor.at() - 1;
+            if (depth == 0 && (rootEnded ? token != PI : token == END)) {
+                trailing(from);
+                break;
+            }
+            if (token == END) {
+                end(from);
+            } else if (token == SWITCH_PAGE) {
+                elementPage = switchPage(from, false, elementPage);
+                elements = CodePage.of(elementPage);
+            } else if (token == PI) {
+                instruction(from);
+            } else if (PIECES[token]) {
+                piece(from, token);
+            } else {
+                element(from, token);
+            }
+        }
+        int end = cursor.at();
+        if (depth > 0) {
+            reading.deviation(end, Deviation.Kind.END_MISSING);
+        } else if (!rootEnded) {
+            reading.deviation(end, Deviation.Kind.NO_ROOT);
+        }
+        for (; depth > 0; --depth) {
+            reading.end(end, end);
+        }
+    }
+
+    private void deviationsOfHeader() {
+        if (!header.isVersionKnown()) {
+            reading.deviation(0, Deviation.Kind.VERSION);
+        }
+        if (!header.isStated()) {
+            reading.deviation(header.identifierAt, Deviation.Kind.DOCUMENT_TYPE);
+        }
+        if (charset.name() == null && charset.number() != CharacterSet.NOT_STATED) {
+            reading.deviation(header.charsetAt, Deviation.Kind.CHARSET);
+        }
+    }
+
+    private void trailing(int from) {
+        cursor.skip(cursor.left());
+        reading.deviation(from, Deviation.Kind.TRAILING);
+        reading.trailing(from, cursor.at());
+    }
+
+    // --- Elements and instructions -------------------------------------------------------------
+
+    private void element(int from, int token) throws ProvisioningException {
+        String name = null;
+        if ((token & ELEMENT) == LITERAL) {
+            name = literal(from);
+            element = Element.of(name);
+        } else {
+            element = elementOf(from, token & ELEMENT);
+            name = element == Element.OTHER ? unknown(elementPage, token & ELEMENT) : element.text;
+        }
+        if (element == Element.DOCUMENT && depth > 0) {
+            element = Element.OTHER;
+        }
+        if (token == PLAIN_PARM && element == Element.PARM && depth > 0 && plainParm(from)) {
+            return;
+        }
+        reading.element(from, cursor.at(), element, name, (token & ATTRIBUTES) != 0);
+        ++depth;
+        if ((token & ATTRIBUTES) != 0) {
+            attributes((token & CONTENT) != 0);
+        } else if ((token & CONTENT) == 0) {
+            end(cursor.at());
+        }
+    }
+
+    /**
+     * Reads a parm whose attributes are what nearly all are, in one go: a token for its name, and as
+     * its value one token, or one text of ASCII in its place. Of another one it reads nothing.
+     */
+    private boolean plainParm(int from) throws ProvisioningException {
+        CodePage page = attributes;
+        int name = cursor.peek();
+        if (page == null || name < 0 || name >= FIRST_VALUE || cursor.peek(1) != VALUE) {
+            return false;
+        }
+        if (page.attribute(name) != Attribute.NAME || page.begin(name) == null || PIECES[name]) {
+            return false;
+        }
+        int value = cursor.peek(2);
+        String text = null;
+        Writing writing = Writing.TOKEN;
+        int ahead = 3;
+        if (value == STR_I) {
+            int start = cursor.at() + ahead;
+            int zero = asciiEnd(start);
+            if (zero >= 0 && cursor.peek(ahead + zero - start + 1) == END) {
+                charge(start - 1, zero - start);
+                text = CharacterSet.ascii(body, start, zero);
+                writing = Writing.INLINE;
+                ahead += zero - start + 1;
+            }
+        } else if (value >= FIRST_VALUE && !PIECES[value] && cursor.peek(ahead) == END) {
+            text = page.value(value);
+        }
+        if (text == null) {
+            return false;
+        }
+        cursor.skip(ahead + 1);
+        reading.parameter(from, cursor.at(), page.begin(name), text, writing);
+        return true;
+    }
+
+    private Element elementOf(int from, int token) {
+        Element found = elements == null ? null : elements.element(token);
+        if (found == null && elementPage != 0) {
+            found = CodePage.of(0).element(token);
+            if (found != null) {
+                reading.deviation(from, Deviation.Kind.OTHER_PAGE);
+            }
+        }
+        if (found == null) {
+            reading.deviation(from, Deviation.Kind.UNKNOWN_TOKEN);
+            return Element.OTHER;
+        }
+        return found;
+    }
+
+    private void instruction(int from) throws ProvisioningException {
+        element = Element.INSTRUCTION;
+        reading.element(from, cursor.at(), element, null, true);
+        boolean ended = rootEnded;
+        ++depth;
+        attributes(false);
+        rootEnded = ended;
+    }
+
+    /** The innermost element ends, by the END at {@code from} or, when that is not taken, by itself. */
+    private void end(int from) {
+        reading.end(from, cursor.at());
+        rootEnded = --depth == 0;
+    }
+
+    private int switchPage(int from, boolean ofAttributes, int before) {
+        int page = cursor.take();
+        if (page < 0) {
+            reading.deviation(from, Deviation.Kind.CUT_OFF);
+            page = before;
+        }
+        reading.page(from, cursor.at(), ofAttributes, page);
+        return page;
+    }
+
+    // --- Attributes ----------------------------------------------------------------------------
+
+    /** Reads attributes up to their END, which is that of the element when it has no content. */
+    private void attributes(boolean content) throws ProvisioningException {
+        Cursor cursor = this.cursor;
+        for (int token; (token = cursor.take()) >= 0; ) {
+            int from = cursor.at() - 1;
+            if (token == END) {
+                if (content) {
+                    reading.attributesEnd(from, cursor.at());
+                } else {
+                    end(from);
+                }
+                return;
+            }
+            if (token == SWITCH_PAGE) {
+                attributePage = switchPage(from, true, attributePage);
+                attributes = CodePage.of(attributePage);
+            } else if (PIECES[token] && !isOfPage(token)) {
+                piece(from, token);
+                ++pieces;
+            } else if (token >= FIRST_VALUE) {
+                value(from, token);
+                ++pieces;
+            } else {
+                attribute(from, token);
+            }
+        }
+    }
+
+    /**
+     * Whether a token that WBXML gives another meaning is one of the code page all the same, as some
+     * of page 1 are. They stand for extensions, which mean nothing to the format, and for a reference
+     * to the string table, which it can only be where there is a table.
+     */
+    private boolean isOfPage(int token) {
+        if (attributePage == 0 || attributes == null) {
+            return false;
+        }
+        if (token < FIRST_VALUE) {
+            return attributes.attribute(token) != null;
+        }
+        return attributes.value(token) != null
+                && (token != STR_T || header.tableAt == header.elementsAt);
+    }
+
+    private void attribute(int from, int token) throws ProvisioningException {
+        if (token == LITERAL) {
+            String name = literal(from);
+            Attribute attribute = Attribute.of(name);
+            reading.attribute(
+                    from,
+                    cursor.at(),
+                    attribute,
+                    attribute == Attribute.OTHER ? name : null,
+                    null);
+            pieces = 0;
+            return;
+        }
+        if (PIECES[token]) {
+            reading.deviation(from, Deviation.Kind.OTHER_MEANING);
+        }
+        CodePage page = attributes;
+        Attribute attribute = page == null ? null : page.attribute(token);
+        if (attribute == null && attributePage != 0) {
+            page = CodePage.of(0);
+            attribute = page.attribute(token);
+            if (attribute != null) {
+                reading.deviation(from, Deviation.Kind.OTHER_PAGE);
+            }
+        }
+        if (attribute != null) {
+            String value = page.begin(token);
+            reading.attribute(from, cursor.at(), attribute, null, value);
+            pieces = value == null ? 0 : 1;
+            return;
+        }
+        reading.deviation(from, Deviation.Kind.UNKNOWN_TOKEN);
+        String name = unknown(attributePage, token);
+        if (element.name != null) {
+            // Nearly all tokens say what a parm or characteristic is, so this one may do so too.
+            reading.attribute(from, cursor.at(), element.name, null, name);
+            pieces = 1;
+        } else {
+            reading.attribute(from, cursor.at(), Attribute.OTHER, name, null);
+            pieces = 0;
+        }
+    }
+
+    private void value(int from, int token) throws ProvisioningException {
+        if (PIECES[token]) {
+            reading.deviation(from, Deviation.Kind.OTHER_MEANING);
+        }
+        String value = attributes == null ? null : attributes.value(token);
+        if (value == null && attributePage != 0) {
+            value = CodePage.of(0).value(token);
+            if (value != null) {
+                reading.deviation(from, Deviation.Kind.OTHER_PAGE);
+            }
+        }
+        if (value == null) {
+            reading.deviation(from, Deviation.Kind.UNKNOWN_TOKEN);
+            value = unknown(attributePage, token);
+        }
+        if (pieces > 0) {
+            charge(from, value.length());
+        }
+        reading.text(from, cursor.at(), Writing.TOKEN, value);
+    }
+
+    // --- Texts ---------------------------------------------------------------------------------
+
+    private void piece(int from, int token) throws ProvisioningException {
+        String text;
+        Writing writing;
+        if (token == STR_I) {
+            text = inline(from);
+            writing = Writing.INLINE;
+        } else if (token == STR_T) {
+            text = reference(from, "");
+            writing = Writing.TABLE;
+        } else if (token == OPAQUE) {
+            text = opaque(from);
+            writing = Writing.OPAQUE;
+        } else {
+            writing = Writing.ENTITY;
+            text = token == ENTITY ? character(from) : extension(from, token);
+        }
+        reading.text(from, cursor.at(), writing, text);
+    }
+
+    private String inline(int from) throws ProvisioningException {
+        int start = cursor.at();
+        int zero = asciiEnd(start);
+        if (zero >= 0) {
+            cursor.skip(zero - start + 1);
+            charge(from, zero - start);
+            return CharacterSet.ascii(body, start, zero);
+        }
+        int end = start + cursor.left();
+        zero = charset.zero(body, start, end);
+        if (zero == end) {
+            reading.deviation(from, Deviation.Kind.CUT_OFF);
+        }
+        cursor.skip(zero - start + charset.unit());
+        return decode(from, start, zero);
+    }
+
+    /** Where the zero stands behind a text that is all ASCII; -1 for another text. */
+    private int asciiEnd(int start) {
+        byte[] body = this.body;
+        int end = body.length;
+        int at = start;
+        if (charset.isAscii()) {
+            while (at < end && body[at] > 0) {
+                ++at;
+            }
+            if (at < end && body[at] == 0) {
+                return at;
+            }
+        }
+        return -1;
+    }
+
+    private String opaque(int from) throws ProvisioningException {
+        long length = integer(from);
+        int start = cursor.at();
+        if (length > cursor.left()) {
+            reading.deviation(from, Deviation.Kind.CUT_OFF);
+        }
+        cursor.skip((int) Math.max(0, Math.min(length, cursor.left())));
+        return decode(from, start, cursor.at());
+    }
+
+    private String decode(int from, int start, int end) throws ProvisioningException {
+        charge(from, end - start);
+        String text = charset.decode(body, start, end);
+        if (text.indexOf(CharacterSet.REPLACEMENT) >= 0) {
+            reading.deviation(from, Deviation.Kind.BAD_TEXT);
+        }
+        return text;
+    }
+
+    private String character(int from) throws ProvisioningException {
+        long point = integer(from);
+        charge(from, 1);
+        if (point == Cursor.NO_INTEGER) {
+            return String.valueOf(CharacterSet.REPLACEMENT);
+        }
+        if (point > Character.MAX_CODE_POINT
+                || point >= Character.MIN_SURROGATE && point <= Character.MAX_SURROGATE) {
+            reading.deviation(from, Deviation.Kind.NO_CHARACTER);
+            return String.valueOf(CharacterSet.REPLACEMENT);
+        }
+        return new String(Character.toChars((int) point));
+    }
+
+    private String extension(int from, int token) throws ProvisioningException {
+        reading.deviation(from, Deviation.Kind.EXTENSION);
+        if (token <= EXT_I_2) {
+            return inline(from);
+        }
+        if (token <= EXT_T_2) {
+            long number = integer(from);
+            String text = number == Cursor.NO_INTEGER ? "" : Long.toString(number);
+            charge(from, text.length());
+            return text;
+        }
+        return "";
+    }
+
+    /** A multi-byte integer; {@link Cursor#NO_INTEGER}, which is told, for one that cannot be read. */
+    private long integer(int from) {
+        long value = cursor.integer();
+        if (value == Cursor.NO_INTEGER) {
+            reading.deviation(
+                    from,
+                    cursor.left() == 0 ? Deviation.Kind.CUT_OFF : Deviation.Kind.NUMBER);
+        }
+        return value;
+    }
+
+    private String literal(int from) throws ProvisioningException {
+        return reference(from, NO_LITERAL);
+    }
+
+    /** A text of the string table, or {@code otherwise} when there is none. */
+    private String reference(int from, String otherwise) throws ProvisioningException {
+        long index = cursor.integer();
+        int length = header.elementsAt - header.tableAt;
+        if (index == Cursor.NO_INTEGER || index >= length) {
+            reading.deviation(
+                    from,
+                    index == Cursor.NO_INTEGER && cursor.left() == 0
+                            ? Deviation.Kind.CUT_OFF
+                            : Deviation.Kind.REFERENCE);
+            return otherwise;
+        }
+        if (tableTexts == null) {
+            tableTexts = new String[length];
+            tableLengths = new int[length];
+        }
+        int place = (int) index;
+        if (tableTexts[place] == null) {
+            int start = header.tableAt + place;
+            int zero = charset.zero(body, start, header.elementsAt);
+            tableTexts[place] = decode(from, start, zero);
+            tableLengths[place] = zero - start;
+        } else {
+            charge(from, tableLengths[place]);
+        }
+        return tableTexts[place];
+    }
+
+    private void charge(int from, int length) throws ProvisioningException {
+        textLength += length;
+        if (textLength > textLimit || textLength < 0) {
+            throw new ProvisioningException(
+                    ProvisioningException.Reason.TEXT_TOO_LONG,
+                    from,
+                    "the texts of the document are more than " + textLimit + " bytes");
+        }
+    }
+
+    private String unknown(int page, int token) {
+        if (unknown == null) {
+            unknown = new HashMap<>();
+        }
+        Integer key = page << Byte.SIZE | token;
+        String name = unknown.get(key);
+        if (name == null) {
+            String digits = Integer.toHexString(0x100 | token).substring(1);
+            name = "unknown-" + page + "-" + digits.toUpperCase(Locale.ROOT);
+            unknown.put(key, name);
+        }
+        return name;
+    }
+}

@@ -1,0 +1,126 @@
+package com.qvomacp.eng.omacp;
+
+import java.util.ArrayList;
+import java.util.Collections;
+import java.util.List;
+
+/**
+ * A characteristic of a kind that is known, with an accessor for each parameter of its kind. It is
+ * a view of the tree and holds nothing of its own: what it has no accessor for is within reach by
+ * {@link #characteristic}.
+ *
+ * <p>An accessor for one value answers that of the first parameter of its name, {@code null} when
+ * there is none and when it has no value; whether there is one, with or without a value, is told by
+ * those that begin with {@code has}. One for several answers all, in the order of the message, in a
+ * list that cannot be modified and is empty when there is none. What stands in inner
+ * characteristics is theirs.
+ *
+ * <pre>{@code
+ * for (AccessPoint accessPoint : message.accessPoints()) {
+ *     System.out.println(accessPoint.name() + ": " + accessPoint.characteristic().parameters());
+ * }
+ * }</pre>
+ */
+public abstract class TypedCharacteristic {
+    private final Characteristic characteristic;
+
+    TypedCharacteristic(Characteristic characteristic) {
+        this.characteristic = characteristic;
+    }
+
+    /**
+     * The view of a characteristic of a type. A switch: for the first method reference a new
+     * virtual machine takes longer than for everything else of a message; and not of the classes'
+     * own type, for which it would load them all.
+     */
+    private static Object of(String type, Characteristic in) {
+        switch (type) {
+            case "NAPDEF": return new AccessPoint(in);
+            case "NAPAUTHINFO": return new AccessPointAuthentication(in);
+            case "ACCESS": return new AccessRule(in);
+            case "APPLICATION": return new Application(in);
+            case "APPADDR": return new ApplicationAddress(in);
+            case "APPAUTH": return new ApplicationAuthentication(in);
+            case "BOOTSTRAP": return new Bootstrap(in);
+            case "CLIENTIDENTITY": return new ClientIdentity(in);
+            case "EAP": return new Eap(in);
+            case "CERT": return new EapCertificate(in);
+            case "PXPHYSICAL": return new PhysicalProxy(in);
+            case "PORT": return new Port(in);
+            case "PXLOGICAL": return new Proxy(in);
+            case "PXAUTHINFO": return new ProxyAuthentication(in);
+            case "RESOURCE": return new Resource(in);
+            case "ROAMING": return new Roaming(in);
+            case "SEC-SSID": return new SecondarySsid(in);
+            case "VALIDITY": return new Validity(in);
+            case "VENDORCONFIG": return new VendorConfiguration(in);
+            case "Vodafone VoWiFi": return new VoWifi(in);
+            case "WEPKEY": return new WepKey(in);
+            case "WI-FI": return new Wifi(in);
+            case "WLAN": return new Wlan(in);
+            default: throw new AssertionError(type);
+        }
+    }
+
+    /** A view of each characteristic of a type directly in an item, in a list that stays so. */
+    static <V> List<V> views(Item item, Class<V> kind, String type) {
+        // Most messages lack most kinds: the list is made for the first.
+        List<V> views = Collections.emptyList();
+        for (Item child : item.inside()) {
+            if (child instanceof Characteristic && type.equals(((Characteristic) child).type())) {
+                if (views.isEmpty()) {
+                    views = new ArrayList<>();
+                }
+                views.add(kind.cast(of(type, (Characteristic) child)));
+            }
+        }
+        return views.isEmpty() ? views : Collections.unmodifiableList(views);
+    }
+
+    /** {@return the characteristic of the tree, with everything in it; never {@code null}} */
+    public final Characteristic characteristic() {
+        return characteristic;
+    }
+
+    final boolean has(String name) {
+        return characteristic.parameter(name) != null;
+    }
+
+    final String value(String name) {
+        return characteristic.value(name);
+    }
+
+    final List<String> values(String name) {
+        return characteristic.values(name);
+    }
+
+    final <V> List<V> views(Class<V> kind, String type) {
+        return views(characteristic, kind, type);
+    }
+
+    /**
+     * {@return whether the other object is of the same class and its characteristic equal}
+     * @param other what to compare with
+     */
+    @Override
+    public final boolean equals(Object other) {
+        return other != null
+                && other.getClass() == getClass()
+                && ((TypedCharacteristic) other).characteristic.equals(characteristic);
+    }
+
+    /** {@return a number that fits {@link #equals}: the same number for equal objects} */
+    @Override
+    public final int hashCode() {
+        return characteristic.hashCode();
+    }
+
+    /** {@return how much is set, in one line without any value, which may go to a log} */
+    @Override
+    public final String toString() {
+        int parameters = characteristic.parameters().size();
+        int inner = characteristic.characteristics().size();
+        String kind = getClass().getSimpleName();
+        return kind + "{parameters=" + parameters + ", characteristics=" + inner + "}";
+    }
+}

@@ -1,0 +1,152 @@
+package com.qvomacp.eng.parser;
+
+import java.io.IOException;
+import java.io.InputStream;
+import java.io.OutputStream;
+import java.nio.file.Files;
+import java.nio.file.Path;
+import java.util.Locale;
+
+/**
+ * Loads the library {@code omacp} for the ten classes of this package, once for each class loader
+ * that has them.
+ *
+ * <pre>{@code
+ * NativeLibrary.load();
+ * XCPCtxParser parser = new XCPCtxParser();
+ * if (parser.qvomacp_parser(push, push.length, 0)) {
+ *     System.out.println(new XCPCtxNapDef().qvomacp_GetPxNapDefCount());
+ * }
+ * parser.qvomacp_parser_del();
+ * }</pre>
+ */
+public final class NativeLibrary {
+    /** The system property with the path of the library's file: {@value}. */
+    public static final String PATH_PROPERTY = "com.qvomacp.library";
+
+    private static final String NAME = "omacp";
+
+    private static boolean loaded;
+    private static LinkageError failure;
+
+    private NativeLibrary() {}
+
+    /**
+     * Makes sure that the library is loaded. It is the file that {@link #PATH_PROPERTY} names; without
+     * that property it is looked for in {@code java.library.path} (on Android, in the application),
+     * and else it is the copy beside these classes for the platform that runs.
+     *
+     * <p>The first call decides: where it fails, every later one does, with the same cause. A class
+     * loader that is not the first to load a file needs a file of its own, such as the copy.
+     *
+     * @throws UnsatisfiedLinkError when the library cannot be loaded; its cause says what failed,
+     *     such as the {@code NoClassDefFoundError} or {@code NoSuchMethodError} of a class or native
+     *     that is missing
+     */
+    public static synchronized void load() {
+        if (failure == null && !loaded) {
+            try {
+                find();
+                loaded = true;
+            } catch (LinkageError error) {
+                failure = error;
+            }
+        }
+        if (failure != null) {
+            throw error("The library " + NAME + " cannot be loaded: " + failure.getMessage(), failure);
+        }
+    }
+
+    private static void find() {
+        String path = System.getProperty(PATH_PROPERTY);
+        if (path != null) {
+            System.load(path);
+            return;
+        }
+        try {
+            System.loadLibrary(NAME);
+        } catch (UnsatisfiedLinkError notThere) {
+            Copy.load(notThere);
+        }
+    }
+
+    /** The resource with the library for an operating system and an architecture. */
+    static String resource(String system, String architecture) {
+        String platform = system.toLowerCase(Locale.ROOT).replaceAll("[^a-z0-9]", "");
+        return "/com/qvomacp/eng/native/" + platform + '-' + machine(architecture) + "/lib" + NAME + ".so";
+    }
+
+    private static String machine(String architecture) {
+        switch (architecture.toLowerCase(Locale.ROOT)) {
+            case "x86":
+            case "i386":
+            case "i486":
+            case "i586":
+            case "i686":
+                return "x86";
+            case "amd64":
+            case "x86_64":
+                return "x86_64";
+            default:
+                return architecture.toLowerCase(Locale.ROOT);
+        }
+    }
+
+    private static UnsatisfiedLinkError error(String text, Throwable cause) {
+        UnsatisfiedLinkError error = new UnsatisfiedLinkError(text);
+        error.initCause(cause);
+        return error;
+    }
+
+    /** The copy beside the classes; a class of its own, so that Android never gets to see it. */
+    private static final class Copy {
+        private Copy() {}
+
+        /** Loads the copy; what is thrown says as well why it came to that. */
+        static void load(UnsatisfiedLinkError first) {
+            String resource = resource(System.getProperty("os.name"), System.getProperty("os.arch"));
+            String why = first.getMessage() + "; and ";
+            try (InputStream in = NativeLibrary.class.getResourceAsStream(resource)) {
+                if (in == null) {
+                    throw error(why + "there is no " + resource + " beside its classes", first);
+                }
+                Path file = Files.createTempFile("lib" + NAME, ".so");
+                try {
+                    fill(file, in);
+                    load(file, why + "the copy " + resource + " cannot be loaded: ");
+                } finally {
+                    delete(file);
+                }
+            } catch (IOException e) {
+                throw error(why + "the copy " + resource + " cannot be unpacked: " + e, e);
+            }
+        }
+
+        private static void load(Path file, String why) {
+            try {
+                System.load(file.toString());
+            } catch (UnsatisfiedLinkError e) {
+                throw error(why + e.getMessage(), e);
+            }
+        }
+
+        /** Writes a file that is there already, with the rights for its owner alone. */
+        private static void fill(Path file, InputStream in) throws IOException {
+            try (OutputStream out = Files.newOutputStream(file)) {
+                byte[] bytes = new byte[1 << 13];
+                for (int count = in.read(bytes); count >= 0; count = in.read(bytes)) {
+                    out.write(bytes, 0, count);
+                }
+            }
+        }
+
+        /** Deletes the file, which a loaded library no longer needs, now or when the VM ends. */
+        private static void delete(Path file) {
+            try {
+                Files.deleteIfExists(file);
+            } catch (IOException e) {
+                file.toFile().deleteOnExit();
+            }
+        }
+    }
+}
