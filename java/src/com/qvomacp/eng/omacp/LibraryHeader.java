@@ -1,9 +1,6 @@
 package com.qvomacp.eng.omacp;
 
 import java.nio.charset.StandardCharsets;
-import java.util.ArrayList;
-import java.util.Collections;
-import java.util.List;
 
 /**
  * What the native library makes of a push header: PDU type, length, content type, SEC and MAC,
@@ -45,47 +42,41 @@ final class LibraryHeader {
         this.refusal = refusal;
     }
 
-    private static LibraryHeader refused(
-            int offset, String found, List<String> expected, String reason) {
-        return new LibraryHeader(0, new Refusal(offset, null, found, expected, reason));
-    }
-
     boolean isTaken() {
         return refusal == null;
     }
 
     /** Reads the header of a push. */
     static LibraryHeader of(byte[] push) {
+        Refusal refusal = refusal(push);
+        return new LibraryHeader(refusal == null ? bodyAt(push) : 0, refusal);
+    }
+
+    private static int bodyAt(byte[] push) {
+        return HEADERS + (push[LENGTH] & 0xFF);
+    }
+
+    private static Refusal refusal(byte[] push) {
         if (push.length > PDU_TYPE && push[PDU_TYPE] != PUSH) {
             String type = Refusal.hex(push[PDU_TYPE]);
-            List<String> expected = Collections.singletonList("Push (0x06)");
-            return refused(PDU_TYPE, type, expected, "PDU type " + type + " is no push");
+            String reason = "PDU type " + type + " is no push";
+            return Refusal.ofHeader(PDU_TYPE, type, reason, "Push (0x06)");
         }
         if (push.length <= HEADERS) {
             String within = "the message ends within its push header, after ";
-            return refused(
-                    push.length,
-                    Refusal.END_OF_DATA,
-                    Collections.<String>emptyList(),
-                    push.length == 0
-                            ? "the message is empty"
-                            : within + Refusal.bytes(push.length));
+            String reason =
+                    push.length == 0 ? "the message is empty" : within + Refusal.bytes(push.length);
+            return Refusal.ofHeader(push.length, Refusal.END_OF_DATA, reason);
         }
-        int length = push[LENGTH] & 0xFF;
-        int left = push.length - HEADERS;
-        if (length > left) {
-            return refused(
-                    LENGTH,
-                    Refusal.hex(length),
-                    Collections.singletonList("at most " + left),
-                    "headers of "
-                            + Refusal.bytes(length)
-                            + " are longer than the rest of the message");
+        if (bodyAt(push) > push.length) {
+            String length = Refusal.bytes(push[LENGTH] & 0xFF);
+            String reason = "headers of " + length + " are longer than the rest of the message";
+            String most = "at most " + (push.length - HEADERS);
+            return Refusal.ofHeader(LENGTH, Refusal.hex(push[LENGTH]), reason, most);
         }
         int at = push[HEADERS] == LENGTH_QUOTE ? QUOTED_CONTENT_TYPE : HEADERS;
         int behind = behindContentType(push, at);
-        Refusal refusal = behind < 0 ? unknownContentType(push, at) : refusedMac(push, behind);
-        return new LibraryHeader(refusal == null ? HEADERS + length : 0, refusal);
+        return behind < 0 ? unknownContentType(push, at) : refusedMac(push, behind);
     }
 
     /** Where the content type ends: a name with its zero, or else a short code; -1 for neither. */
@@ -119,24 +110,25 @@ final class LibraryHeader {
     }
 
     private static Refusal unknownContentType(byte[] push, int at) {
-        List<String> expected = new ArrayList<>();
+        String[] expected = new String[CODES.length];
         for (int i = 0; i < CODES.length; ++i) {
-            expected.add(LibraryKind.withToken(MEDIA_TYPES[i], CODES[i] | 0x80));
+            expected[i] = LibraryKind.withToken(MEDIA_TYPES[i], CODES[i] | 0x80);
         }
-        String found = at < push.length ? Refusal.hex(push[at]) : Refusal.END_OF_DATA;
-        String reason = "the content type " + found + " is not known";
         if (at >= push.length) {
-            reason = "the message ends in front of its content type";
-        } else if (push[at] >= ' ') {
-            int end = endOfText(push, at);
-            boolean isWhole = end < push.length;
-            found = isWhole ? Refusal.quoted(push, at, end) : "a text";
-            reason =
-                    isWhole
-                            ? "the content type " + found + " is not known"
-                            : "the message ends within its content type";
+            String reason = "the message ends in front of its content type";
+            return Refusal.ofHeader(push.length, Refusal.END_OF_DATA, reason, expected);
         }
-        return new Refusal(Math.min(at, push.length), null, found, expected, reason);
+        String found = Refusal.hex(push[at]);
+        if (push[at] >= ' ') {
+            int end = endOfText(push, at);
+            if (end == push.length) {
+                String reason = "the message ends within its content type";
+                return Refusal.ofHeader(at, "a text", reason, expected);
+            }
+            found = Refusal.quoted(push, at, end);
+        }
+        String reason = "the content type " + found + " is not known";
+        return Refusal.ofHeader(at, found, reason, expected);
     }
 
     /** SEC and MAC are looked for once each, in this order; anything else hides what follows. */
@@ -156,7 +148,7 @@ final class LibraryHeader {
             return null;
         }
         String expected = "at most " + LONGEST_MAC + " characters and a zero byte";
-        return new Refusal(at, null, "a text", Collections.singletonList(expected), reason);
+        return Refusal.ofHeader(at, "a text", reason, expected);
     }
 
     /** Where the value of the parameter begins, if that is what comes next; else -1. */

@@ -22,12 +22,17 @@ final class Refusal {
     final List<String> expected;
     final String reason;
 
-    Refusal(int offset, String path, String found, List<String> expected, String reason) {
+    private Refusal(int offset, String path, String found, List<String> expected, String reason) {
         this.offset = offset;
         this.path = path;
         this.found = found;
         this.expected = Collections.unmodifiableList(expected);
         this.reason = reason;
+    }
+
+    /** Of the header of a push. */
+    static Refusal ofHeader(int offset, String found, String reason, String... expected) {
+        return new Refusal(offset, null, found, Arrays.asList(expected), reason);
     }
 
     /** Of a body that a walk has ended in. */
