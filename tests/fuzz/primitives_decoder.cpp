@@ -43,7 +43,8 @@ public:
     {
         for (size_t i = 0; i + 1 < ops.size(); i += 2) {
             step(ops[i], ops[i + 1]);
-            // Behind the data strings are empty, and reading goes no further than one byte behind it.
+            // Behind the data strings are empty, and reading goes no further than one byte behind
+            // it.
             position = std::min<size_t>(position, decoder->ptBuffer->nCapacity + size_t{1});
             check(qvsClientProvWbxmlDecoderDecodingSize(decoder) == position,
                   "as much is read as the format says", i / 2, ". reader ", ops[i] % 29, ": ",
