@@ -101,12 +101,14 @@ struct Naming {
 };
 
 template <class Record>
-struct NamingOf : Naming {
-    constexpr NamingOf() = default;
-    constexpr NamingOf(char *Record::*text, const char *(*name)(const char *value))
-        : Naming{numberOf(text), name}
+struct NamingOf {
+    consteval NamingOf() = default;
+    consteval NamingOf(char *Record::*text, const char *(*name)(const char *value))
+        : naming{numberOf(text), name}
     {
     }
+
+    Naming naming;
 };
 
 // What an array shows: the first `shown` fields of a record, and a null behind them.
@@ -132,7 +134,7 @@ template <class Record>
 Shown show(const Record *record, NamingOf<Record> naming = {})
 {
     static_assert(textsOf<Record>() <= Shown::kMost);
-    return {record, textsOf<Record>(), naming};
+    return {record, textsOf<Record>(), naming.naming};
 }
 
 // The texts of a record as a String[]; null for a missing record.
@@ -141,7 +143,7 @@ template <class Record>
 jobjectArray array(JNIEnv *env, const Record *record, NamingOf<Record> naming = {})
 {
     static_assert(textsOf<Record>() <= Shown::kMost);
-    return array(env, record, textsOf<Record>(), naming);
+    return array(env, record, textsOf<Record>(), naming.naming);
 }
 
 // ---- Registration
