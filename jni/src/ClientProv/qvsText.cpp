@@ -81,9 +81,10 @@ inline uint32_t separatorOf(const Piece &piece)
 }
 
 // Appends pieces that add so many bytes, in one block. Answers the first one that is not appended.
-const Piece *appendAll(DecodeState *state, Text *text, const Piece *piece, const Piece *end,
+const Piece *appendAll(DecodeState *state, Text *text, const Piece *first, const Piece *end,
                        uint64_t added)
 {
+    const Piece *piece = first;
     bool joins = text->str() != nullptr;
     if (!reserve(state, text, added, piece->join == Join::kOpaque ? 1 : 0)) [[unlikely]] {
         return appendNone(piece, end);
@@ -201,6 +202,21 @@ inline qvsResult enterValue(qvsWbxmlDecoder *decoder, bool *present)
     return result;
 }
 
+// Appends the pieces of a run, which may be none. Answers the first one that is not appended: where
+// the texts of the message come near their limit, what is in front of the piece that passes it is.
+const Piece *appendRun(DecodeState *state, Text *text, const Piece *first, const Piece *end,
+                       uint64_t added)
+{
+    if (added + text->length <= state->textLeft) [[likely]] {
+        return first != end ? appendAll(state, text, first, end, added) : end;
+    }
+    const Piece *piece = first;
+    while (piece != end && append(state, text, *piece)) {
+        ++piece;
+    }
+    return piece;
+}
+
 } // namespace
 
 DecodeState qvs::wholeDecode(const qvsWbxmlDecoder *decoder, qvsArena *arena)
@@ -217,9 +233,8 @@ bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
     return appendAll(state, text, &piece, &piece + 1, added) != &piece;
 }
 
-// All pieces are looked at before a block is made for them; of many, so many at a time. Each by
-// itself while blocks are tracked, and where the texts of the message come near their limit: what
-// is in front of the piece that passes it is read.
+// All pieces are looked at before a block is made for them; of many, so many at a time, and while
+// blocks are tracked each by itself.
 bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
     Piece pieces[kMostPieces];
@@ -251,14 +266,7 @@ bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
             added += found ? piece++->length : 0;
             joins = true;
         }
-        const Piece *left = piece;
-        if (added + text->length > state->textLeft) [[unlikely]] {
-            for (left = pieces; left != piece && append(state, text, *left);) {
-                ++left;
-            }
-        } else if (piece != pieces) {
-            left = appendAll(state, text, pieces, piece, added);
-        }
+        const Piece *const left = appendRun(state, text, pieces, piece, added);
         if (left != piece) [[unlikely]] {
             decoder->ptBuffer->pHead = left->unread;
             return false;

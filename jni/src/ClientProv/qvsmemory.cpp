@@ -77,8 +77,10 @@ constexpr uint32_t kClearedByHand = 512;
 void *cleared(uint32_t size)
 {
     if (size > kClearedByHand) {
-        void *block = calloc(1, size);
-        return block ? block : qvs::refused();
+        if (void *block = calloc(1, size)) {
+            return block;
+        }
+        return qvs::refused();
     }
     void *block = malloc(size);
     asm("" : "+r"(block)); // keeps a compiler from making a calloc of the two

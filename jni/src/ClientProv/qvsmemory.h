@@ -84,8 +84,10 @@ extern uint32_t refusals;
 // A block that is not tracked.
 inline void *requested(size_t size)
 {
-    void *block = malloc(size);
-    return block ? block : refused();
+    if (void *block = malloc(size)) {
+        return block;
+    }
+    return refused();
 }
 
 // qvsMemAlloc_debug and qvsMemFree_debug where a parse spends its time: with one test of tracking,
