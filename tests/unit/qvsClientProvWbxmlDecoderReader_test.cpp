@@ -59,6 +59,11 @@ TEST_F(ByteReader, AnswersZeroWithoutADecoderOrABuffer)
     char *text = nullptr;
     EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(nullptr, &text), 0U);
     EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(&empty, &text), 0U);
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStrTable(nullptr, &text), 0U);
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStrTable(&empty, &text), 0U);
+    uint32_t length = 0;
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStrExtension(nullptr, 0xC3, &text, &length), 0U);
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStrExtension(&empty, 0xC3, &text, &length), 0U);
     EXPECT_EQ(text, nullptr);
 }
 
