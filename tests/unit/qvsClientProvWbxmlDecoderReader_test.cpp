@@ -54,6 +54,10 @@ TEST_F(ByteReader, AnswersZeroWithoutADecoderOrABuffer)
     EXPECT_EQ(qvsClientProvWbxmlDecoderBufferReadByte(nullptr, &byte), 0U);
     qvsWbxmlDecoder empty = {};
     EXPECT_EQ(qvsClientProvWbxmlDecoderBufferReadByte(&empty, &byte), 0U);
+    uint32_t number = 7;
+    EXPECT_EQ(qvsClientProvWbxmlDecoderBufferReadUint32(nullptr, &number), 0U);
+    EXPECT_EQ(qvsClientProvWbxmlDecoderBufferReadUint32(&empty, &number), 0U);
+    EXPECT_EQ(number, 7U);
     EXPECT_EQ(qvsClientProvWbxmlDecoderDecodingSize(nullptr), 0U);
     EXPECT_EQ(qvsClientProvWbxmlDecoderDecodingSize(&empty), 0U);
     char *text = nullptr;
