@@ -212,7 +212,9 @@ qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvs
 qvsResult qvs::readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t field,
                         uint8_t place)
 {
-    return readOnto(decoder, state, listAt(record, field), state->open->last + place);
+    qvsListNode *unknown = nullptr;
+    qvsListNode **last = state->open ? state->open->last + place : &unknown;
+    return readOnto(decoder, state, listAt(record, field), last);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
