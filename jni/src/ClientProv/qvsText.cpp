@@ -28,7 +28,10 @@ inline uint32_t separatorOf(const Piece &piece)
         if (needed <= text->capacity) {
             return true;
         }
-        needed = needed < uint64_t{text->capacity} * 2 ? uint64_t{text->capacity} * 2 : needed;
+        // Twice as long, but no longer than the limit of texts lets it become.
+        const uint64_t twice = uint64_t{text->capacity} * 2;
+        const uint64_t more = twice > needed ? twice - needed : 0;
+        needed += more < state->textLeft ? more : state->textLeft;
     }
     char *block = needed > UINT32_MAX - kSpareZeros
                       ? nullptr
