@@ -9,6 +9,9 @@ namespace {
 // Pieces of a run that are looked at before they are appended.
 constexpr uint32_t kMostPieces = 4;
 
+// Bytes that a block for a text may have.
+constexpr uint32_t kLongest = UINT32_MAX - kSpareZeros;
+
 // Bytes in front of a piece that joins a text.
 inline uint32_t separatorOf(const Piece &piece)
 {
@@ -28,14 +31,16 @@ inline uint32_t separatorOf(const Piece &piece)
         if (needed <= text->capacity) {
             return true;
         }
-        // Twice as long, but no longer than the limit of texts lets it become.
+        // Twice as long, and as long as the limit of texts lets it become once that is more than
+        // half of it: the old block and the new one are there together.
+        const uint64_t limit = needed + state->textLeft;
+        const uint64_t most = limit < kLongest ? limit : kLongest;
         const uint64_t twice = uint64_t{text->capacity} * 2;
-        const uint64_t more = twice > needed ? twice - needed : 0;
-        needed += more < state->textLeft ? more : state->textLeft;
+        const uint64_t grown = twice > most / 2 ? most : twice;
+        needed = grown > needed ? grown : needed;
     }
-    char *block = needed > UINT32_MAX - kSpareZeros
-                      ? nullptr
-                      : newText(static_cast<uint32_t>(needed), kDecoderModule);
+    char *block =
+        needed > kLongest ? nullptr : newText(static_cast<uint32_t>(needed), kDecoderModule);
     if (!block) [[unlikely]] {
         return false;
     }
@@ -119,7 +124,7 @@ const Piece *appendAll(DecodeState *state, Text *text, const Piece *first, const
 inline char *copyOf(DecodeState *state, const Piece &piece)
 {
     const uint32_t length = piece.length;
-    char *block = countText(state, length) && length < UINT32_MAX - kSpareZeros
+    char *block = countText(state, length) && length < kLongest
                       ? newText(length + 1, kDecoderModule)
                       : nullptr;
     if (block) {
