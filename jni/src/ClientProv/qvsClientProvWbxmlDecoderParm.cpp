@@ -9,6 +9,17 @@ namespace {
 
 // ---- Values
 
+// Takes the VALUE behind a NAME and reads what it carries, as a new text, or as one that continues
+// the text `before`.
+inline qvsResult readPairValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                               const char *before)
+{
+    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
+        return result;
+    }
+    return before ? continueValue(decoder, state, text, before) : readValue(decoder, state, text);
+}
+
 // Reads NAME and VALUE of one parameter into `*text`, which is null without a value: as a new text,
 // or as one that continues the text `before`.
 inline qvsResult readPair(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token,
@@ -25,7 +36,7 @@ inline qvsResult readPair(qvsWbxmlDecoder *decoder, DecodeState *state, char **t
             (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
             [[fallthrough]];
         case attr::kValue:
-            result = readValue(decoder, state, text, before);
+            result = readPairValue(decoder, state, text, before);
             break;
         case wbxml::kEnd:
             trace("DecoderParam : Value is NULL\n");
@@ -182,6 +193,8 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
         return readText(decoder, state, textAt(record, parm->field), token);
     case ParmType::kList:
         return readList(decoder, state, record, parm->field, parm->place);
+    case ParmType::kNamed:
+        return readNamed(decoder, state, record, token, *table.named);
     default:
         return table.reader(decoder, state, record);
     }

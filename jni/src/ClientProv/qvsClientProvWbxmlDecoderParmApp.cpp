@@ -71,7 +71,7 @@ qvsResult readStartPage(qvsWbxmlDecoder *decoder, DecodeState *state, qvsWapReso
 namespace application {
 using R = qvsWapApplication;
 constexpr auto kParms = tableOf<Parm<R>>({
-    {attr::kName, kByReader},
+    {attr::kName, kByName},
     {page1::kName, &R::pszName},
     {page1::kInternet, &R::pszInternet},
     {page1::kToNapId, &R::ptToNapIdList},
@@ -84,7 +84,7 @@ constexpr auto kParms = tableOf<Parm<R>>({
 });
 
 // Parameters whose name is given as text.
-constexpr auto kNames = tableOf<NamedParm<R>>({
+constexpr auto kNames = namesOf<R>({
     {"XCAP_AUID_DCS", &R::pszXcapAuidDcs},
     {"XCAP_AUID_PMS", &R::pszXcapAuidPms},
     {"XCAP_AUID_CDMS", &R::pszXcapAuidCdms},
@@ -94,11 +94,6 @@ constexpr auto kNames = tableOf<NamedParm<R>>({
 });
 
 constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamNameString", true};
-
-qvsResult readName(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
-{
-    return readNamed(decoder, state, record, attr::kName, kNamed);
-}
 } // namespace application
 
 namespace appAddr {
@@ -140,7 +135,7 @@ constexpr auto kParms = tableOf<Parm<R>>({
 constexpr ParmsOf<qvsWapApplication> qvs::kApplicationParms = {
     {.name = "Application", .onParm = traceParm, .onToken = traceToken},
     application::kParms,
-    kReadBy<qvsWapApplication, application::readName>};
+    application::kNamed};
 
 constexpr ParmsOf<qvsWapAppAddr> qvs::kAppAddrParms = {{.name = "AppAddr"}, appAddr::kParms};
 

@@ -12,12 +12,125 @@ constexpr char kRefusedBy[] = "Access";
 
 // The NAME is all that the loop knows of these characteristics.
 template <class Record>
-constexpr auto kNameAlone = tableOf<Parm<Record>>({{attr::kName, kByReader}});
+constexpr auto kNameAlone = tableOf<Parm<Record>>({{attr::kName, kByName}});
 
-// readParmName() where it is known whether the name is kept.
-[[gnu::always_inline]] inline qvsResult readNameOf(qvsWbxmlDecoder *decoder, DecodeState *state,
-                                                   uint8_t tag, const char *label, bool isKept,
-                                                   ParmName *name)
+// The field of `record` that a name selects; null for a name that is not listed.
+inline char **findNamed(void *record, const Rows<NamedRow> &names, const char *name,
+                        uint32_t length)
+{
+    for (size_t at = homeOf(name, length);; ++at) {
+        const NamedRow &known = names.first[at & (names.count - 1U)];
+        if (known.length == length && memcmp(known.name, name, length) == 0) {
+            return textAt(record, known.field);
+        }
+        if (known.length == 0) {
+            return nullptr;
+        }
+    }
+}
+
+// Takes the NAME attribute `tag` and a name of one string in front of a VALUE. False, with nothing
+// read, for any other.
+[[gnu::always_inline]] inline bool takeName(qvsWbxmlDecoder *decoder, DecodeState *state,
+                                            uint8_t tag, Piece *name)
+{
+    const uint32_t left = bytesLeft(decoder);
+    if (left < 2 || *decoder->ptBuffer->pHead != tag) {
+        return false;
+    }
+    uint8_t *at = decoder->ptBuffer->pHead + 2;
+    if (!onlyString(decoder, at[-1], &at, at + (left - 2), name) || *at != attr::kValue ||
+        name->length == 0 || name->length > state->textLeft) {
+        return false;
+    }
+    state->textLeft -= name->length;
+    decoder->ptBuffer->pHead = at;
+    return true;
+}
+
+// Reads the VALUE that comes next into a field.
+inline qvsResult readField(qvsWbxmlDecoder *decoder, DecodeState *state, char **field)
+{
+    ++decoder->ptBuffer->pHead;
+    return readValue(decoder, state, field);
+}
+
+// Reads the VALUE of a name that is not listed and drops it, or leaves it.
+[[gnu::noinline]] qvsResult leaveUnknown(qvsWbxmlDecoder *decoder, DecodeState *state,
+                                         const NamedParms &parms)
+{
+    if (!parms.dropsUnknown) {
+        // kept[named-unknown-refused]: the VALUE of another unknown name is not read.
+        return QVS_OK;
+    }
+    Text dropped;
+    const qvsResult result = paramValue(decoder, state, &dropped, lookAt);
+    if (result == QVS_OK) {
+        trace("[%s] pszValue [%s]", parms.label, dropped.str() ? dropped.str() : "");
+    }
+    return result;
+}
+
+// readNamed() for a name in any encoding, and traced.
+[[gnu::noinline]] qvsResult readAnyNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                                         uint8_t tag, const NamedParms &parms)
+{
+    ParmName name;
+    qvsResult result = readParmName(decoder, state, tag, parms.label, false, &name);
+    if (result == QVS_OK && name.next == attr::kValue) {
+        const Text &text = name.text;
+        char **field = findNamed(record, parms.names, text.str(), text.length);
+        result = field ? readField(decoder, state, field) : leaveUnknown(decoder, state, parms);
+    }
+    if (result == QVS_OK && !parms.dropsUnknown) {
+        trace("[%s] nID [0x%x]", parms.label, name.next);
+    }
+    return result;
+}
+
+namespace roaming {
+using R = qvsWapRoaming;
+constexpr auto kNames = namesOf<R>({
+    {"SYNC-ALLOWED", &R::pszSyncAllowed},
+    {"SYNC-DEFAULT", &R::pszSyncDefault},
+});
+
+constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamRoamingNameString"};
+} // namespace roaming
+
+namespace wifi {
+using R = qvsWapWifi;
+constexpr auto kNames = namesOf<R>({
+    {"NETSSID", &R::pszNetSsid},
+    {"SECMODE", &R::pszSecMode},
+    {"EAPMETHOD", &R::pszEapMethod},
+    {"EAPTYPE", &R::pszEapType},
+    {"USERNAME", &R::pszUserName},
+    {"ANONUSERNAME", &R::pszAnonUserName},
+    {"PASSWORD", &R::pszPassword},
+    {"CACERT", &R::pszCaCert},
+    {"USERCERT", &R::pszUserCert},
+    {"PHASE1", &R::pszPhase1},
+    {"AUTHALGORITHM", &R::pszAuthAlgorithm},
+    {"PRIORITY", &R::pszPriority},
+});
+
+constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamNameString"};
+} // namespace wifi
+
+namespace voWifi {
+using R = qvsWapVoWifi;
+constexpr auto kNames = namesOf<R>({
+    {"ePDG FQDN", &R::pszEpdgFqdn},
+});
+
+constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamNameString"};
+} // namespace voWifi
+
+} // namespace
+
+qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag,
+                            const char *label, bool isKept, ParmName *name)
 {
     trace("[%s] nTagID [0x%x]", label, tag);
     if (qvsResult result = checkAttr(decoder, tag)) {
@@ -43,128 +156,25 @@ constexpr auto kNameAlone = tableOf<Parm<Record>>({{attr::kName, kByReader}});
     return QVS_OK;
 }
 
-// The field of `record` that the name selects; null for a name that is not listed.
-char **findNamed(void *record, const Rows<NamedRow> &names, const Text &name)
-{
-    const char *const text = name.str();
-    const uint32_t length = name.length;
-    for (const NamedRow &known : names) {
-        if (known.length == length && known.name[0] == *text &&
-            memcmp(known.name, text, length) == 0) {
-            return textAt(record, known.field);
-        }
-    }
-    return nullptr;
-}
-
-// Reads a value and drops it.
-[[gnu::noinline]] qvsResult dropValue(qvsWbxmlDecoder *decoder, DecodeState *state,
-                                      const char *label)
-{
-    Text dropped;
-    const qvsResult result = paramValue(decoder, state, &dropped, lookAt);
-    if (result == QVS_OK) {
-        trace("[%s] pszValue [%s]", label, dropped.str() ? dropped.str() : "");
-    }
-    return result;
-}
-
-namespace roaming {
-using R = qvsWapRoaming;
-constexpr auto kNames = tableOf<NamedParm<R>>({
-    {"SYNC-ALLOWED", &R::pszSyncAllowed},
-    {"SYNC-DEFAULT", &R::pszSyncDefault},
-});
-
-constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamRoamingNameString"};
-
-qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
-{
-    return readNamed(decoder, state, record, attr::kName, kNamed);
-}
-} // namespace roaming
-
-namespace wifi {
-using R = qvsWapWifi;
-constexpr auto kNames = tableOf<NamedParm<R>>({
-    {"NETSSID", &R::pszNetSsid},
-    {"SECMODE", &R::pszSecMode},
-    {"EAPMETHOD", &R::pszEapMethod},
-    {"EAPTYPE", &R::pszEapType},
-    {"USERNAME", &R::pszUserName},
-    {"ANONUSERNAME", &R::pszAnonUserName},
-    {"PASSWORD", &R::pszPassword},
-    {"CACERT", &R::pszCaCert},
-    {"USERCERT", &R::pszUserCert},
-    {"PHASE1", &R::pszPhase1},
-    {"AUTHALGORITHM", &R::pszAuthAlgorithm},
-    {"PRIORITY", &R::pszPriority},
-});
-
-constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamNameString"};
-
-qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
-{
-    return readNamed(decoder, state, record, attr::kName, kNamed);
-}
-} // namespace wifi
-
-namespace voWifi {
-using R = qvsWapVoWifi;
-constexpr auto kNames = tableOf<NamedParm<R>>({
-    {"ePDG FQDN", &R::pszEpdgFqdn},
-});
-
-constexpr NamedOf<R> kNamed = {kNames, "qvsClientProvWbxmlDecoderParamNameString"};
-
-qvsResult read(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
-{
-    return readNamed(decoder, state, record, attr::kName, kNamed);
-}
-} // namespace voWifi
-
-} // namespace
-
-qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag,
-                            const char *label, bool isKept, ParmName *name)
-{
-    return readNameOf(decoder, state, tag, label, isKept, name);
-}
-
 qvsResult qvs::readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag,
                          const NamedParms &parms)
 {
-    ParmName name;
-    if (qvsResult result = readNameOf(decoder, state, tag, parms.label, false, &name)) {
-        return result;
+    Piece name;
+    if (traceSink || !takeName(decoder, state, tag, &name)) {
+        return readAnyNamed(decoder, state, record, tag, parms);
     }
-    if (name.next == attr::kValue) {
-        if (char **field = findNamed(record, parms.names, name.text)) {
-            if (qvsResult result = readValue(decoder, state, field)) {
-                return result;
-            }
-        } else if (parms.dropsUnknown) {
-            return dropValue(decoder, state, parms.label);
-        }
-        // kept[named-unknown-refused]: the VALUE of another unknown name is not read.
-    }
-    if (!parms.dropsUnknown) {
-        trace("[%s] nID [0x%x]", parms.label, name.next);
-    }
-    return QVS_OK;
+    char **field = findNamed(record, parms.names, name.bytes, name.length);
+    return field ? readField(decoder, state, field) : leaveUnknown(decoder, state, parms);
 }
 
-constexpr ParmsOf<qvsWapRoaming> qvs::kRoamingParms = {{.name = kRefusedBy, .entered = "Roming"},
-                                                       kNameAlone<qvsWapRoaming>,
-                                                       kReadBy<qvsWapRoaming, roaming::read>};
+constexpr ParmsOf<qvsWapRoaming> qvs::kRoamingParms = {
+    {.name = kRefusedBy, .entered = "Roming"}, kNameAlone<qvsWapRoaming>, roaming::kNamed};
 
-constexpr ParmsOf<qvsWapWifi> qvs::kWifiParms = {{.name = kRefusedBy, .entered = "Wifi"},
-                                                 kNameAlone<qvsWapWifi>,
-                                                 kReadBy<qvsWapWifi, wifi::read>};
+constexpr ParmsOf<qvsWapWifi> qvs::kWifiParms = {
+    {.name = kRefusedBy, .entered = "Wifi"}, kNameAlone<qvsWapWifi>, wifi::kNamed};
 
-constexpr ParmsOf<qvsWapVoWifi> qvs::kVoWifiParms = {{.name = kRefusedBy, .entered = "VoWifi"},
-                                                     kNameAlone<qvsWapVoWifi>,
-                                                     kReadBy<qvsWapVoWifi, voWifi::read>};
+constexpr ParmsOf<qvsWapVoWifi> qvs::kVoWifiParms = {
+    {.name = kRefusedBy, .entered = "VoWifi"}, kNameAlone<qvsWapVoWifi>, voWifi::kNamed};
 
 qvsResult qvsClientProvWbxmlDecoderParamRoaming(qvsWbxmlDecoder *decoder, qvsWapRoaming *record)
 {

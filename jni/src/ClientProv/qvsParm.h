@@ -13,8 +13,9 @@
 
 namespace [[gnu::visibility("hidden")]] qvs {
 
-// What a parameter holds: a text, a list of texts, or what the reader of its table makes of it.
-enum class ParmType : uint8_t { kText, kList, kOther };
+// What a parameter holds: a text, a list of texts, the text that its name given as text selects, or
+// what the reader of its table makes of it.
+enum class ParmType : uint8_t { kText, kList, kNamed, kOther };
 
 // One parameter of a characteristic: the NAME token that announces it and the field it fills.
 struct ParmRow {
@@ -24,8 +25,8 @@ struct ParmRow {
     uint8_t place; // of a list
 };
 
-struct OtherField {};
-constexpr OtherField kByReader;
+constexpr ParmType kByName = ParmType::kNamed;
+constexpr ParmType kByReader = ParmType::kOther;
 
 template <class Record>
 struct Parm {
@@ -38,9 +39,74 @@ struct Parm {
               kListPlaces[kFieldsOf<Record> - 1 - numberOf(list)]}
     {
     }
-    consteval Parm(uint8_t t, OtherField) : row{t, ParmType::kOther, kNoField, 0} {}
+    consteval Parm(uint8_t t, ParmType by) : row{t, by, kNoField, 0} {}
 
     ParmRow row;
+};
+
+// A name given as text, and the text that its value goes to.
+struct NamedRow {
+    uint8_t length; // of the name
+    char name[17];
+    uint8_t field;
+};
+
+template <class Record>
+struct NamedParm {
+    using Of = Record;
+    using Row = NamedRow;
+
+    template <size_t N>
+    consteval NamedParm(const char (&text)[N], char *Record::*to) : row{N - 1, {}, numberOf(to)}
+    {
+        for (size_t i = 0; i < N - 1; ++i) {
+            row.name[i] = text[i];
+        }
+    }
+
+    NamedRow row;
+};
+
+// Where the search for a name begins.
+constexpr size_t homeOf(const char *name, uint32_t length)
+{
+    return static_cast<uint8_t>(*name) + 2 * length;
+}
+
+// Names as they are looked up: a name is in its home, in a table of a power of two of rows, or
+// behind it, with no empty row between.
+template <class Record, size_t N>
+consteval auto namesOf(const NamedParm<Record> (&names)[N])
+{
+    constexpr size_t kRows = 2U << (31 - __builtin_clz(N));
+    Table<Record, NamedRow, kRows> table = {};
+    for (const NamedParm<Record> &name : names) {
+        size_t at = homeOf(name.row.name, name.row.length);
+        while (table.rows[at % kRows].length != 0) {
+            ++at;
+        }
+        table.rows[at % kRows] = name.row;
+    }
+    return table;
+}
+
+// The named parameters of one kind of characteristic.
+struct NamedParms {
+    Rows<NamedRow> names;
+    const char *label;
+    bool dropsUnknown; // the value of a name that is not listed; the loop refuses it otherwise
+};
+
+template <class Record>
+struct NamedOf {
+    template <size_t N>
+    consteval NamedOf(const Table<Record, NamedRow, N> &names, const char *label,
+                      bool dropsUnknown = false)
+        : parms{rowsFor<Record>(names), label, dropsUnknown}
+    {
+    }
+
+    NamedParms parms;
 };
 
 // What sets the decoder of one kind of characteristic apart. But for the way past a page switch all
@@ -59,6 +125,7 @@ struct ParmStyle {
 struct ParmTable {
     ParmStyle style;
     Rows<ParmRow> rows;
+    const NamedParms *named; // of kByName
     // Of kByReader.
     qvsResult (*reader)(qvsWbxmlDecoder *decoder, DecodeState *state, void *record);
 };
@@ -79,7 +146,13 @@ struct ParmsOf {
     template <size_t N>
     consteval ParmsOf(const ParmStyle &style, const Table<Record, ParmRow, N> &rows,
                       ParmReader<Record> reader = {})
-        : table{style, rowsFor<Record>(rows), reader.read}
+        : table{style, rowsFor<Record>(rows), nullptr, reader.read}
+    {
+    }
+    template <size_t N>
+    consteval ParmsOf(const ParmStyle &style, const Table<Record, ParmRow, N> &rows,
+                      const NamedOf<Record> &named)
+        : table{style, rowsFor<Record>(rows), &named.parms, nullptr}
     {
     }
 
@@ -132,29 +205,6 @@ qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, Record *record,
 
 // ---- Parameters whose name is given as text
 
-// A name, and the text that its value goes to.
-struct NamedRow {
-    uint8_t length; // of the name
-    char name[17];
-    uint8_t field;
-};
-
-template <class Record>
-struct NamedParm {
-    using Of = Record;
-    using Row = NamedRow;
-
-    template <size_t N>
-    consteval NamedParm(const char (&text)[N], char *Record::*to) : row{N - 1, {}, numberOf(to)}
-    {
-        for (size_t i = 0; i < N - 1; ++i) {
-            row.name[i] = text[i];
-        }
-    }
-
-    NamedRow row;
-};
-
 // The name of one parameter, compared where it lies, and the token behind it.
 struct ParmName {
     Text text;
@@ -166,25 +216,6 @@ struct ParmName {
 // is one for `isKept` alone, whose name is a block.
 qvsResult readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag, const char *label,
                        bool isKept, ParmName *name);
-
-// The named parameters of one kind of characteristic.
-struct NamedParms {
-    Rows<NamedRow> names;
-    const char *label;
-    bool dropsUnknown; // the value of a name that is not listed; the loop refuses it otherwise
-};
-
-template <class Record>
-struct NamedOf {
-    template <size_t N>
-    consteval NamedOf(const Table<Record, NamedRow, N> &names, const char *label,
-                      bool dropsUnknown = false)
-        : parms{rowsFor<Record>(names), label, dropsUnknown}
-    {
-    }
-
-    NamedParms parms;
-};
 
 // Reads one named parameter of `record`.
 qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag,

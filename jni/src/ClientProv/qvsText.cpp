@@ -119,14 +119,11 @@ const Piece *appendAll(DecodeState *state, Text *text, const Piece *first, const
     return QVS_ERROR_WBXML_NO_DATA;
 }
 
-// A block with a copy of the only piece of a value; null without memory, or once the texts of the
-// message passed their limit.
-inline char *copyOf(DecodeState *state, const Piece &piece)
+// A block with a copy of the only piece of a value; null without memory.
+inline char *copyOf(const Piece &piece)
 {
     const uint32_t length = piece.length;
-    char *block = countText(state, length) && length < kLongest
-                      ? newText(length + 1, kDecoderModule)
-                      : nullptr;
+    char *block = length < kLongest ? newText(length + 1, kDecoderModule) : nullptr;
     if (block) {
         memcpy(block, piece.bytes, length);
         memset(block + length, 0, 1 + kSpareZeros);
@@ -190,24 +187,6 @@ inline qvsResult enterValue(qvsWbxmlDecoder *decoder, bool *present)
     }
     *present = next != wbxml::kEnd;
     return left ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
-}
-
-// Reads what a VALUE carries, as readValue() does.
-[[gnu::noinline]] qvsResult readNew(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
-                                    const char *before)
-{
-    bool present = false;
-    qvsResult result = enterValue(decoder, &present);
-    Text read;
-    if (result == QVS_OK && present) {
-        read.before = before;
-        read.length = qvsStrlen(before);
-        result = content(decoder, state, &read);
-    }
-    if (result == QVS_OK) {
-        *text = read.take();
-    }
-    return result;
 }
 
 // Appends the pieces of a run, which may be none. Answers the first one that is not appended: where
@@ -304,15 +283,11 @@ qvsResult qvs::content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 qvsResult qvs::lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
     Piece piece;
-    if (!takeOnlyPiece(decoder, &piece)) {
+    if (!takeOnlyPiece(decoder, state, &piece)) {
         return content(decoder, state, text);
     }
-    if (countText(state, piece.length)) {
-        text->before = piece.bytes;
-        text->length = piece.length;
-    } else if (piece.unread) {
-        decoder->ptBuffer->pHead = piece.unread;
-    }
+    text->before = piece.bytes;
+    text->length = piece.length;
     return endOfContent(state, QVS_OK);
 }
 
@@ -327,23 +302,33 @@ qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *te
     return result == QVS_OK && present ? reader(decoder, state, text) : result;
 }
 
-qvsResult qvs::readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
-                         const char *before)
+qvsResult qvs::continueValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                             const char *before)
 {
-    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
-        return result;
+    bool present = false;
+    qvsResult result = enterValue(decoder, &present);
+    Text read;
+    if (result == QVS_OK && present) {
+        read.before = before;
+        read.length = qvsStrlen(before);
+        result = content(decoder, state, &read);
     }
-    Piece piece;
-    if (before || !takeOnlyPiece(decoder, &piece)) {
-        return readNew(decoder, state, text, before);
-    }
-    char *read = copyOf(state, piece);
-    const qvsResult result =
-        endOfContent(state, read ? qvsResult{QVS_OK} : lackPiece(decoder, piece.unread));
     if (result == QVS_OK) {
-        *text = read;
-    } else if (read) {
-        freeBlock(read);
+        *text = read.take();
     }
     return result;
+}
+
+qvsResult qvs::readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text)
+{
+    Piece piece;
+    if (!takeOnlyPiece(decoder, state, &piece)) {
+        return continueValue(decoder, state, text, nullptr);
+    }
+    char *read = copyOf(piece);
+    if (!read) [[unlikely]] {
+        return endOfContent(state, lackPiece(decoder, piece.unread));
+    }
+    *text = read;
+    return endOfContent(state, QVS_OK);
 }

@@ -309,27 +309,36 @@ constexpr bool endsRun(uint8_t token)
     return token == wbxml::kEnd || token == attr::kValue;
 }
 
-// Takes a value of one piece, as most have. False, with nothing read, for any other. Inline, with
-// nothing that a function outside writes to, since nothing is called as often.
-[[gnu::always_inline]] inline bool takeOnlyPiece(qvsWbxmlDecoder *decoder, Piece *piece)
+// A run of one string, whose token was read: the string, and whether a run ends behind it. Inline
+// as what follows, with nothing that a function outside writes to, since nothing is called as
+// often.
+[[gnu::always_inline]] inline bool onlyString(const qvsWbxmlDecoder *decoder, uint8_t token,
+                                              uint8_t **at, const uint8_t *end, Piece *piece)
+{
+    if (token == wbxml::kStrI) {
+        inlinePiece(at, end, piece);
+    } else if (token != wbxml::kStrT || !tablePiece(decoder, at, end, piece)) {
+        return false;
+    }
+    return *at < end && endsRun(**at);
+}
+
+// Takes a value of one piece, as most have, and counts it. False, with nothing read, for any other,
+// and where it would pass the limit of texts.
+[[gnu::always_inline]] inline bool takeOnlyPiece(qvsWbxmlDecoder *decoder, DecodeState *state,
+                                                 Piece *piece)
 {
     uint8_t *at = decoder->ptBuffer->pHead;
     const uint8_t *const end = at + bytesLeft(decoder);
     const uint8_t token = at != end ? *at++ : 0;
-    if (token == wbxml::kStrI) {
-        inlinePiece(&at, end, piece);
-    } else if (token != wbxml::kStrT) {
-        if (!tokenPiece(token, piece)) {
-            return false;
-        }
-        decoder->ptBuffer->pHead = at;
-        return true;
-    } else if (!tablePiece(decoder, &at, end, piece)) {
+    if (wbxml::isString(token) ? !onlyString(decoder, token, &at, end, piece)
+                               : !tokenPiece(token, piece)) {
         return false;
     }
-    if (at >= end || !endsRun(*at)) {
+    if (piece->length > state->textLeft) [[unlikely]] {
         return false;
     }
+    state->textLeft -= piece->length;
     decoder->ptBuffer->pHead = at;
     return true;
 }
@@ -349,12 +358,15 @@ using ValueReader = qvsResult (*)(qvsWbxmlDecoder *decoder, DecodeState *state, 
 qvsResult content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
 qvsResult lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
 
-// A VALUE and what it carries: as a reader has it, or as a new text, which may continue the text
-// `before` and is null for nothing.
+// A VALUE and what it carries, as a reader has it.
 qvsResult paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text,
                      ValueReader reader = content);
-qvsResult readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
-                    const char *before = nullptr);
+
+// What a VALUE that was taken carries: as a new text, which is null for nothing. continueValue()
+// has it continue the text `before`.
+qvsResult readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text);
+qvsResult continueValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                        const char *before);
 
 // qvsCommaAdd onto a text of which `known` may tell more.
 qvsResult commaAdd(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, JoinedText *known);
