@@ -193,7 +193,7 @@ qvsCtxStrNode *qvs::copyTexts(qvsList *list, Texts texts)
         return nullptr;
     }
     qvsCtxStrNode *head = nullptr;
-    qvsCtxStrNode **end = &head;
+    qvsCtxStrNode *last = nullptr;
     list->ptCursor = list->ptFirst;
     while (qvsListNode *from = list->ptCursor) {
         list->ptCursor = from->ptNext;
@@ -202,8 +202,12 @@ qvsCtxStrNode *qvs::copyTexts(qvsList *list, Texts texts)
         if (!node) {
             break;
         }
-        *end = node;
-        end = &node->ptNext;
+        if (last) {
+            last->ptNext = node;
+        } else {
+            head = node;
+        }
+        last = node;
         if (texts == Texts::kTaken) {
             from->pItem = nullptr;
             node->pszValue = text;
@@ -234,9 +238,13 @@ void *qvs::copyRecord(void *record, const CopyKind &kind, Texts texts)
     }
     for (const CopyRow &row : kind.rows) {
         void *field = pointerAt(record, row.field);
-        if (row.type == CopyRow::kList) {
+        if (!field) {
+            if (row.type == CopyRow::kList) {
+                traceError(QVS_ERROR_LIST_ARGUMENT);
+            }
+        } else if (row.type == CopyRow::kList) {
             setPointer(copy, row.to, copyTexts(static_cast<qvsList *>(field), texts));
-        } else if (field) {
+        } else {
             auto *text = static_cast<char *>(field);
             if (texts == Texts::kTaken && row.type == CopyRow::kText) {
                 setPointer(record, row.field, nullptr);

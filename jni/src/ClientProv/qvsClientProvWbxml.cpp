@@ -83,22 +83,30 @@ void closeRecord(const qvsArena *arena, void *record, const ReleaseKind &kind)
     freeBlock(record);
 }
 
+// Releases the record in a slot, unless it has children: then it answers their list.
+[[gnu::noinline]] qvsList *releaseSlot(qvsArena *arena, Node *node, const ReleaseKind &kind)
+{
+    void *record = pointerAt(node, kind.slot);
+    releaseFields(arena, record, kind);
+    if (qvsList *children = childrenOf(record, kind)) {
+        return children;
+    }
+    closeRecord(arena, record, kind);
+    setPointer(node, kind.slot, nullptr);
+    return nullptr;
+}
+
 // Releases the records of a node in the order of its slots. Stops at a record with children, which
 // have to go first, and answers their list; does the rest when called again. Null when nothing is
 // left but the node itself.
 qvsList *releaseSlots(qvsArena *arena, Node *node)
 {
     for (const ReleaseKind &kind : kKinds.rows) {
-        void *record = pointerAt(node, kind.slot);
-        if (!record) {
-            continue;
+        if (pointerAt(node, kind.slot)) {
+            if (qvsList *children = releaseSlot(arena, node, kind)) {
+                return children;
+            }
         }
-        releaseFields(arena, record, kind);
-        if (qvsList *children = childrenOf(record, kind)) {
-            return children;
-        }
-        closeRecord(arena, record, kind);
-        setPointer(node, kind.slot, nullptr);
     }
     return nullptr;
 }
@@ -149,7 +157,7 @@ void releaseChildren(qvsArena *arena, qvsList *list)
 }
 
 // Releases the record in a slot of a node with everything nested in it.
-[[gnu::noinline]] qvsResult releaseSlot(uint8_t slot, void *record)
+[[gnu::noinline]] qvsResult releaseAlone(uint8_t slot, void *record)
 {
     if (!record) {
         return kNothing;
@@ -171,7 +179,7 @@ struct SlotOf {
 template <class Record>
 qvsResult releaseRecord(Record *record, SlotOf<Record> slot)
 {
-    return releaseSlot(slot.number, record);
+    return releaseAlone(slot.number, record);
 }
 
 } // namespace

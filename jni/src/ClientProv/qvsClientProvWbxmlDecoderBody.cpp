@@ -114,12 +114,9 @@ const Kind *findNamedKind(const char *name)
     return nullptr;
 }
 
-// The kind of a TYPE token on a code page, and of a TYPE given as `name`; null for none.
-const Kind *findKind(uint8_t token, uint8_t page, const char *name)
+// The kind of a TYPE token on a code page; null for none.
+const Kind *findKind(uint8_t token, uint8_t page)
 {
-    if (token == attr::kType) {
-        return findNamedKind(name);
-    }
     if (token < attr::kType || token > attr::kTypeAccess) {
         return nullptr;
     }
@@ -159,19 +156,22 @@ qvsList **childrenOf(Node *node, const Kind &kind)
     return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
 }
 
-// A TYPE given as text. Other names than the three known ones make no record.
-qvsResult readNamedType(qvsWbxmlDecoder *decoder, DecodeState *state, ValueReader reader,
-                        Node *node, Text *name)
+// A TYPE given as text. Other names than the three known ones make no record. The text goes to
+// `*name`, if there is such a place, in the place of one that is there.
+qvsResult readNamedType(qvsWbxmlDecoder *decoder, DecodeState *state, Node *node, const Kind **kind,
+                        char **name)
 {
     ++decoder->ptBuffer->pHead; // behind the attribute start
     Text read;
-    const qvsResult result = reader(decoder, state, &read);
-    qvsMemFree_debug(name->take());
-    name->before = read.before;
-    name->data = read.take();
-    if (const Kind *kind = findKind(attr::kType, decoder->nCodePage, name->str())) {
-        trace("%s", kind->created);
-        if (qvsResult failure = create(node, *kind)) {
+    const qvsResult result = name ? content(decoder, state, &read) : lookAt(decoder, state, &read);
+    *kind = findNamedKind(read.str());
+    if (name) {
+        qvsMemFree_debug(*name);
+        *name = read.take();
+    }
+    if (*kind) {
+        trace("%s", (*kind)->created);
+        if (qvsResult failure = create(node, **kind)) {
             return failure;
         }
     }
@@ -179,22 +179,22 @@ qvsResult readNamedType(qvsWbxmlDecoder *decoder, DecodeState *state, ValueReade
 }
 
 // A TYPE that is a token of its own.
-qvsResult readType(qvsWbxmlDecoder *decoder, Node *node, uint8_t token)
+qvsResult readType(qvsWbxmlDecoder *decoder, Node *node, uint8_t token, const Kind **kind)
 {
-    const Kind *kind = findKind(token, decoder->nCodePage, nullptr);
-    if (!kind) {
+    *kind = findKind(token, decoder->nCodePage);
+    if (!*kind) {
         return refuseAttribute(token);
     }
-    if (qvsResult result = create(node, *kind)) {
+    if (qvsResult result = create(node, **kind)) {
         return result;
     }
     ++decoder->ptBuffer->pHead;
     return QVS_OK;
 }
 
-// Reads the attributes of a characteristic and the END behind them.
-qvsResult readAttributes(qvsWbxmlDecoder *decoder, DecodeState *state, ValueReader reader,
-                         Node *node, uint8_t *attrId, Text *name)
+// Reads the attributes of a characteristic, whose last one is its kind, and the END behind them.
+qvsResult readAttributes(qvsWbxmlDecoder *decoder, DecodeState *state, Node *node, uint8_t *attrId,
+                         const Kind **kind, char **name)
 {
     uint8_t token = 0;
     while (peekByte(decoder, &token)) {
@@ -207,11 +207,12 @@ qvsResult readAttributes(qvsWbxmlDecoder *decoder, DecodeState *state, ValueRead
         *attrId = token;
         qvsResult result = QVS_OK;
         if (token == wbxml::kSwitchPage) {
-            result = qvsClientProvWbxmlDecoderCheckCodePage(decoder);
+            *kind = nullptr;
+            result = switchPage(decoder);
         } else if (token == attr::kType) {
-            result = readNamedType(decoder, state, reader, node, name);
+            result = readNamedType(decoder, state, node, kind, name);
         } else {
-            result = readType(decoder, node, token);
+            result = readType(decoder, node, token, kind);
         }
         if (result != QVS_OK) {
             return result;
@@ -251,14 +252,12 @@ qvsResult enter(qvsWbxmlDecoder *decoder, DecodeState *state, Open **innermost)
         return QVS_ERROR_FAILED;
     }
     if (hasAttributes) {
-        Text name;
         if (qvsResult result =
-                readAttributes(decoder, state, lookAt, &open->node, &open->attrId, &name)) {
+                readAttributes(decoder, state, &open->node, &open->attrId, &open->kind, nullptr)) {
             // hardened: what a characteristic that fails has read is released with it.
             releaseNode(state->arena, &open->node);
             return result;
         }
-        open->kind = findKind(open->attrId, decoder->nCodePage, name.str());
     }
     open->parent = *innermost;
     *innermost = open;
@@ -465,8 +464,9 @@ qvsResult qvsClientProvWbxmlDecoderCharacterAttribute(qvsWbxmlDecoder *decoder,
                                                       uint8_t *codePage, char **name)
 {
     DecodeState alone;
-    Text type;
-    if (qvsResult result = readAttributes(decoder, &alone, content, node, attrId, &type)) {
+    const Kind *kind = nullptr;
+    ScopedText type;
+    if (qvsResult result = readAttributes(decoder, &alone, node, attrId, &kind, &type.text)) {
         return result;
     }
     *codePage = decoder->nCodePage;

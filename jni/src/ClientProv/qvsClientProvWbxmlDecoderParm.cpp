@@ -9,15 +9,30 @@ namespace {
 
 // ---- Values
 
-// Takes the VALUE behind a NAME and reads what it carries, as a new text, or as one that continues
-// the text `before`.
-inline qvsResult readPairValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
-                               const char *before)
+// readValue() where a VALUE of one piece is next, as most are.
+[[gnu::noinline]] qvsResult readNext(qvsWbxmlDecoder *decoder, DecodeState *state, char **text)
 {
-    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
-        return result;
+    smlBuffer *const buffer = decoder->ptBuffer;
+    uint8_t *const start = buffer->pHead;
+    const uint8_t *const end = endOf(buffer);
+    uint8_t *at = start + 1;
+    Piece piece;
+    if (at >= end || *start != attr::kValue || !onlyPiece(decoder, &at, end, &piece) ||
+        piece.length > state->textLeft) {
+        return readValue(decoder, state, text);
     }
-    return before ? continueValue(decoder, state, text, before) : readValue(decoder, state, text);
+    const uint32_t length = piece.length;
+    state->textLeft -= length;
+    buffer->pHead = at;
+    char *block = length < kLongest ? newText(length + 1, kDecoderModule) : nullptr;
+    if (!block) [[unlikely]] {
+        return lackValue(decoder, state, start + 1);
+    }
+    memcpy(block, piece.bytes, length);
+    memset(block + length, 0, 1 + kSpareZeros);
+    *text = block;
+    trace("qvsClientProvWbxmlDecoderContent Error:%d", 0);
+    return QVS_OK;
 }
 
 // Reads NAME and VALUE of one parameter into `*text`, which is null without a value: as a new text,
@@ -33,10 +48,11 @@ inline qvsResult readPair(qvsWbxmlDecoder *decoder, DecodeState *state, char **t
     if (peekByte(decoder->ptBuffer, &next)) {
         switch (next) {
         case wbxml::kSwitchPage:
-            (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
+            (void)switchPage(decoder);
             [[fallthrough]];
         case attr::kValue:
-            result = readPairValue(decoder, state, text, before);
+            result =
+                before ? readValue(decoder, state, text, before) : readNext(decoder, state, text);
             break;
         case wbxml::kEnd:
             trace("DecoderParam : Value is NULL\n");
@@ -112,15 +128,35 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
     return result;
 }
 
+// ---- Names given as text
+
+// readNamed() where a name of one piece and a VALUE are next.
+[[gnu::noinline]] qvsResult readNamedNext(qvsWbxmlDecoder *decoder, DecodeState *state,
+                                          void *record, const NamedParms &parms)
+{
+    smlBuffer *const buffer = decoder->ptBuffer;
+    const uint8_t *const end = endOf(buffer);
+    uint8_t *at = buffer->pHead;
+    Piece name;
+    if (traceSink || *at++ != attr::kName || at == end || !onlyPiece(decoder, &at, end, &name) ||
+        *at != attr::kValue || name.length == 0 || name.length > state->textLeft) {
+        return readNamed(decoder, state, record, attr::kName, parms);
+    }
+    state->textLeft -= name.length;
+    buffer->pHead = at;
+    char **field = findNamed(record, parms.names, name.bytes, name.length);
+    return field ? readNext(decoder, state, field) : leaveUnknown(decoder, state, parms);
+}
+
 // ---- The loop
 
 // The token behind page switches; another switch at the end of the data.
-[[gnu::noinline, gnu::cold]] uint8_t skipSwitches(qvsWbxmlDecoder *decoder, const ParmTable &table)
+[[gnu::noinline]] uint8_t skipSwitches(qvsWbxmlDecoder *decoder, const ParmTable &table)
 {
     uint8_t token = 0;
     do {
         // kept[parm-switch-ignored]: a switch to an unknown page is no failure by itself.
-        (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
+        (void)switchPage(decoder);
         if (!peekByte(decoder->ptBuffer, &token)) {
             return wbxml::kSwitchPage;
         }
@@ -130,6 +166,21 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
         }
     } while (token == wbxml::kSwitchPage);
     return token;
+}
+
+// Takes the start of a parm element, which nearly always has attributes and no content.
+inline qvsResult takeStart(qvsWbxmlDecoder *decoder)
+{
+    if (bytesLeft(decoder) > 1) {
+        uint8_t *const at = decoder->ptBuffer->pHead;
+        if (at[0] == (tag::kParm | wbxml::kHasAttr) && (at[1] & wbxml::kTagMask) != wbxml::kEnd) {
+            decoder->ptBuffer->pHead = at + 1;
+            decoder->nHasContent = 0;
+            decoder->nHasAttr = 1;
+            return QVS_OK;
+        }
+    }
+    return checkElement(decoder, tag::kParm);
 }
 
 // Takes the END of a parm element, whose flags the decoder keeps: it has none unless it was masked.
@@ -166,13 +217,12 @@ const ParmRow *findParm(const ParmTable &table, uint8_t token)
 }
 
 // What a decoder traces of its own behind a parameter and at the end.
-[[gnu::noinline, gnu::cold]] void traceStep(const ParmTable &table, uint8_t token, bool end,
-                                            qvsResult result)
+inline void traceStep(const ParmTable &table, uint8_t token, qvsResult result)
 {
-    if (table.style.onToken) {
+    if (traceSink && table.style.onToken) {
         table.style.onToken(token);
     }
-    if (table.style.onEnd && (end || result != QVS_OK)) {
+    if (traceSink && table.style.onEnd && (token == wbxml::kEnd || result != QVS_OK)) {
         table.style.onEnd(token, result);
     }
 }
@@ -190,11 +240,11 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
     }
     switch (parm->type) {
     case ParmType::kText:
-        return readText(decoder, state, textAt(record, parm->field), token);
+        return readPair(decoder, state, textAt(record, parm->field), token, nullptr);
     case ParmType::kList:
         return readList(decoder, state, record, parm->field, parm->place);
     case ParmType::kNamed:
-        return readNamed(decoder, state, record, token, *table.named);
+        return readNamedNext(decoder, state, record, *table.named);
     default:
         return table.reader(decoder, state, record);
     }
@@ -203,7 +253,8 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
 } // namespace
 
 // kept[repeated-parm]: the text that was there stays allocated.
-qvsResult qvs::readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token)
+[[gnu::noinline]] qvsResult qvs::readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                                          uint8_t token)
 {
     return readPair(decoder, state, text, token, nullptr);
 }
@@ -246,7 +297,7 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *rec
     if (!record) {
         return QVS_ERROR_BAD_ARGUMENT;
     }
-    if (qvsResult result = checkElement(decoder, tag::kParm)) {
+    if (qvsResult result = takeStart(decoder)) {
         return result;
     }
     uint8_t token = 0;
@@ -258,17 +309,14 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *rec
                 break;
             }
         }
-        qvsResult result = QVS_OK;
-        const bool end = token == wbxml::kEnd;
-        if (end) {
+        if (token == wbxml::kEnd) {
             takeEnd(decoder, behindSwitch);
-        } else {
-            result = readParm(decoder, state, record, table, token);
+            traceStep(table, token, QVS_OK);
+            return QVS_OK;
         }
-        if (traceSink) {
-            traceStep(table, token, end, result);
-        }
-        if (end || result != QVS_OK) {
+        const qvsResult result = readParm(decoder, state, record, table, token);
+        traceStep(table, token, result);
+        if (result != QVS_OK) {
             return result;
         }
     }

@@ -14,80 +14,6 @@ constexpr char kRefusedBy[] = "Access";
 template <class Record>
 constexpr auto kNameAlone = tableOf<Parm<Record>>({{attr::kName, kByName}});
 
-// The field of `record` that a name selects; null for a name that is not listed.
-inline char **findNamed(void *record, const Rows<NamedRow> &names, const char *name,
-                        uint32_t length)
-{
-    for (size_t at = homeOf(name, length);; ++at) {
-        const NamedRow &known = names.first[at & (names.count - 1U)];
-        if (known.length == length && memcmp(known.name, name, length) == 0) {
-            return textAt(record, known.field);
-        }
-        if (known.length == 0) {
-            return nullptr;
-        }
-    }
-}
-
-// Takes the NAME attribute `tag` and a name of one string in front of a VALUE. False, with nothing
-// read, for any other.
-[[gnu::always_inline]] inline bool takeName(qvsWbxmlDecoder *decoder, DecodeState *state,
-                                            uint8_t tag, Piece *name)
-{
-    const uint32_t left = bytesLeft(decoder);
-    if (left < 2 || *decoder->ptBuffer->pHead != tag) {
-        return false;
-    }
-    uint8_t *at = decoder->ptBuffer->pHead + 2;
-    if (!onlyString(decoder, at[-1], &at, at + (left - 2), name) || *at != attr::kValue ||
-        name->length == 0 || name->length > state->textLeft) {
-        return false;
-    }
-    state->textLeft -= name->length;
-    decoder->ptBuffer->pHead = at;
-    return true;
-}
-
-// Reads the VALUE that comes next into a field.
-inline qvsResult readField(qvsWbxmlDecoder *decoder, DecodeState *state, char **field)
-{
-    ++decoder->ptBuffer->pHead;
-    return readValue(decoder, state, field);
-}
-
-// Reads the VALUE of a name that is not listed and drops it, or leaves it.
-[[gnu::noinline]] qvsResult leaveUnknown(qvsWbxmlDecoder *decoder, DecodeState *state,
-                                         const NamedParms &parms)
-{
-    if (!parms.dropsUnknown) {
-        // kept[named-unknown-refused]: the VALUE of another unknown name is not read.
-        return QVS_OK;
-    }
-    Text dropped;
-    const qvsResult result = paramValue(decoder, state, &dropped, lookAt);
-    if (result == QVS_OK) {
-        trace("[%s] pszValue [%s]", parms.label, dropped.str() ? dropped.str() : "");
-    }
-    return result;
-}
-
-// readNamed() for a name in any encoding, and traced.
-[[gnu::noinline]] qvsResult readAnyNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
-                                         uint8_t tag, const NamedParms &parms)
-{
-    ParmName name;
-    qvsResult result = readParmName(decoder, state, tag, parms.label, false, &name);
-    if (result == QVS_OK && name.next == attr::kValue) {
-        const Text &text = name.text;
-        char **field = findNamed(record, parms.names, text.str(), text.length);
-        result = field ? readField(decoder, state, field) : leaveUnknown(decoder, state, parms);
-    }
-    if (result == QVS_OK && !parms.dropsUnknown) {
-        trace("[%s] nID [0x%x]", parms.label, name.next);
-    }
-    return result;
-}
-
 namespace roaming {
 using R = qvsWapRoaming;
 constexpr auto kNames = namesOf<R>({
@@ -156,15 +82,37 @@ qvsResult qvs::readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_
     return QVS_OK;
 }
 
+qvsResult qvs::leaveUnknown(qvsWbxmlDecoder *decoder, DecodeState *state, const NamedParms &parms)
+{
+    if (!parms.dropsUnknown) {
+        // kept[named-unknown-refused]: the VALUE of another unknown name is not read.
+        return QVS_OK;
+    }
+    Text dropped;
+    const qvsResult result = paramValue(decoder, state, &dropped, lookAt);
+    if (result == QVS_OK) {
+        trace("[%s] pszValue [%s]", parms.label, dropped.str() ? dropped.str() : "");
+    }
+    return result;
+}
+
 qvsResult qvs::readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag,
                          const NamedParms &parms)
 {
-    Piece name;
-    if (traceSink || !takeName(decoder, state, tag, &name)) {
-        return readAnyNamed(decoder, state, record, tag, parms);
+    ParmName name;
+    qvsResult result = readParmName(decoder, state, tag, parms.label, false, &name);
+    if (result == QVS_OK && name.next == attr::kValue) {
+        const Text &text = name.text;
+        if (char **field = findNamed(record, parms.names, text.str(), text.length)) {
+            result = readValue(decoder, state, field);
+        } else {
+            result = leaveUnknown(decoder, state, parms);
+        }
     }
-    char **field = findNamed(record, parms.names, name.bytes, name.length);
-    return field ? readField(decoder, state, field) : leaveUnknown(decoder, state, parms);
+    if (result == QVS_OK && !parms.dropsUnknown) {
+        trace("[%s] nID [0x%x]", parms.label, name.next);
+    }
+    return result;
 }
 
 constexpr ParmsOf<qvsWapRoaming> qvs::kRoamingParms = {

@@ -18,7 +18,6 @@ qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, char **name, c
         trace("[qvsClientProvWbxmlDecoderParamNameString] nID [0x%x]", read.next);
     }
     if (read.next == attr::kValue) {
-        ++decoder->ptBuffer->pHead;
         if (qvsResult result = readValue(decoder, state, value)) {
             return result;
         }

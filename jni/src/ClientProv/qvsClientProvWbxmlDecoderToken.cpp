@@ -180,19 +180,20 @@ qvsResult qvsClientProvWbxmlDecoderCheckCodePage(qvsWbxmlDecoder *decoder)
     // kept[page-masked]: both bytes are read as element tokens: the first is not verified, the page
     // is masked, and the flags of the decoder become those of the page byte.
     uint8_t page = 0;
-    if (!takeTag(decoder, &page) || !takeTag(decoder, &page)) {
+    if (bytesLeft(decoder) < 2) {
+        (void)takeTag(decoder, &page);
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
-    switch (page) {
-    case 0:
-        trace("QVS_WBXML_TAG_SWITCH_PAGE0");
-        break;
-    case 1:
-        trace("QVS_WBXML_TAG_SWITCH_PAGE1");
-        break;
-    default:
+    ++decoder->ptBuffer->pHead;
+    page = takeSeenTag(decoder);
+    if (page > 1) {
         trace("ERROR::QVS_CODE_PAGE_UNKNOWN");
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+    }
+    if (page == 0) {
+        trace("QVS_WBXML_TAG_SWITCH_PAGE0");
+    } else {
+        trace("QVS_WBXML_TAG_SWITCH_PAGE1");
     }
     decoder->nCodePage = page;
     return QVS_OK;

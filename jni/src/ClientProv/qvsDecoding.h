@@ -7,6 +7,7 @@
 #include "qvsClientProvWbxml.h"
 #include "qvsFields.h"
 
+#include <stddef.h>
 #include <stdint.h>
 
 struct qvsArena;
@@ -29,10 +30,10 @@ struct OpenRecord {
 // The state of one decode. As it is here it serves a single step that a host calls: its texts are
 // not limited, it walks to the tail of a list, and all it makes is a block.
 struct DecodeState {
-    uint64_t textLeft = UINT64_MAX; // bytes of text that may still be read or appended
-    bool textLimit = false;         // the texts of the message passed their limit
-    OpenRecord *open = nullptr;     // the record being read; whoever reads parms gives one
-    qvsArena *arena = nullptr;      // of nodes and lists
+    size_t textLeft = SIZE_MAX; // bytes of text that may still be read or appended
+    bool textLimit = false;     // the texts of the message passed their limit
+    OpenRecord *open = nullptr; // the record being read; whoever reads parms gives one
+    qvsArena *arena = nullptr;  // of nodes and lists
 };
 
 // The state of a whole decode, of which a decoder's data gives the limit.
@@ -46,7 +47,7 @@ inline bool countText(DecodeState *state, uint64_t count)
         state->textLeft = 0;
         return false;
     }
-    state->textLeft -= count;
+    state->textLeft -= static_cast<size_t>(count);
     return true;
 }
 

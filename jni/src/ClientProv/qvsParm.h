@@ -109,6 +109,21 @@ struct NamedOf {
     NamedParms parms;
 };
 
+// The field of `record` that a name selects; null for a name that is not listed.
+inline char **findNamed(void *record, const Rows<NamedRow> &names, const char *name,
+                        uint32_t length)
+{
+    for (size_t at = homeOf(name, length);; ++at) {
+        const NamedRow &known = names.first[at & (names.count - 1U)];
+        if (known.length == length && memcmp(known.name, name, length) == 0) {
+            return textAt(record, known.field);
+        }
+        if (known.length == 0) {
+            return nullptr;
+        }
+    }
+}
+
 // What sets the decoder of one kind of characteristic apart. But for the way past a page switch all
 // of it is wording.
 struct ParmStyle {
@@ -217,7 +232,10 @@ struct ParmName {
 qvsResult readParmName(qvsWbxmlDecoder *decoder, DecodeState *state, uint8_t tag, const char *label,
                        bool isKept, ParmName *name);
 
-// Reads one named parameter of `record`.
+// Reads the VALUE of a name that is not listed and drops it, or leaves it.
+qvsResult leaveUnknown(qvsWbxmlDecoder *decoder, DecodeState *state, const NamedParms &parms);
+
+// Reads one named parameter of `record`, in any encoding.
 qvsResult readNamed(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t tag,
                     const NamedParms &parms);
 template <class Record>

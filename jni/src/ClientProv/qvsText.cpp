@@ -1,6 +1,5 @@
 // The text that strings and value tokens are appended to, and the one reader of all their runs.
 #include "qvsText.h"
-#include "qvsClientProvWbxmlDecoder.h"
 
 using namespace qvs;
 
@@ -8,9 +7,6 @@ namespace {
 
 // Pieces of a run that are looked at before they are appended.
 constexpr uint32_t kMostPieces = 4;
-
-// Bytes that a block for a text may have.
-constexpr uint32_t kLongest = UINT32_MAX - kSpareZeros;
 
 // Bytes in front of a piece that joins a text.
 inline uint32_t separatorOf(const Piece &piece)
@@ -108,7 +104,7 @@ const Piece *appendAll(DecodeState *state, Text *text, const Piece *first, const
     return piece;
 }
 
-// The result where the only piece of a value, which has been taken, is not appended.
+// The result where a piece that has been taken is not appended.
 [[gnu::noinline, gnu::cold]] qvsResult lackPiece(qvsWbxmlDecoder *decoder, uint8_t *unread)
 {
     const Piece piece = {nullptr, 0, Join::kDirect, unread};
@@ -117,18 +113,6 @@ const Piece *appendAll(DecodeState *state, Text *text, const Piece *first, const
     }
     decoder->ptBuffer->pHead = unread;
     return QVS_ERROR_WBXML_NO_DATA;
-}
-
-// A block with a copy of the only piece of a value; null without memory.
-inline char *copyOf(const Piece &piece)
-{
-    const uint32_t length = piece.length;
-    char *block = length < kLongest ? newText(length + 1, kDecoderModule) : nullptr;
-    if (block) {
-        memcpy(block, piece.bytes, length);
-        memset(block + length, 0, 1 + kSpareZeros);
-    }
-    return block;
 }
 
 // Reads a run, a value token, opaque data, or a token that stands for no text.
@@ -181,7 +165,7 @@ inline qvsResult enterValue(qvsWbxmlDecoder *decoder, bool *present)
     uint8_t next = 0;
     bool left = peekByte(decoder->ptBuffer, &next);
     if (left && next == wbxml::kSwitchPage) {
-        (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
+        (void)switchPage(decoder);
         left = peekByte(decoder->ptBuffer, &next);
         next &= wbxml::kTagMask;
     }
@@ -210,7 +194,8 @@ DecodeState qvs::wholeDecode(const qvsWbxmlDecoder *decoder, qvsArena *arena)
 {
     const uint64_t forLength =
         kTextPerByte * (decoder ? smlBufferGetDataSize(decoder->ptBuffer) : 0);
-    return {.textLeft = forLength > kTextAlways ? forLength : kTextAlways, .arena = arena};
+    const uint64_t limit = forLength > kTextAlways ? forLength : kTextAlways;
+    return {.textLeft = limit < SIZE_MAX ? static_cast<size_t>(limit) : SIZE_MAX, .arena = arena};
 }
 
 bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
@@ -282,10 +267,15 @@ qvsResult qvs::content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 
 qvsResult qvs::lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
+    smlBuffer *const buffer = decoder->ptBuffer;
+    uint8_t *at = buffer->pHead;
     Piece piece;
-    if (!takeOnlyPiece(decoder, state, &piece)) {
+    if (bytesLeft(decoder) == 0 || !onlyPiece(decoder, &at, endOf(buffer), &piece) ||
+        piece.length > state->textLeft) {
         return content(decoder, state, text);
     }
+    state->textLeft -= piece.length;
+    buffer->pHead = at;
     text->before = piece.bytes;
     text->length = piece.length;
     return endOfContent(state, QVS_OK);
@@ -302,9 +292,12 @@ qvsResult qvs::paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *te
     return result == QVS_OK && present ? reader(decoder, state, text) : result;
 }
 
-qvsResult qvs::continueValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
-                             const char *before)
+qvsResult qvs::readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                         const char *before)
 {
+    if (qvsResult result = checkAttr(decoder, attr::kValue)) {
+        return result;
+    }
     bool present = false;
     qvsResult result = enterValue(decoder, &present);
     Text read;
@@ -319,16 +312,9 @@ qvsResult qvs::continueValue(qvsWbxmlDecoder *decoder, DecodeState *state, char 
     return result;
 }
 
-qvsResult qvs::readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text)
+qvsResult qvs::lackValue(qvsWbxmlDecoder *decoder, const DecodeState *state, uint8_t *value)
 {
     Piece piece;
-    if (!takeOnlyPiece(decoder, state, &piece)) {
-        return continueValue(decoder, state, text, nullptr);
-    }
-    char *read = copyOf(piece);
-    if (!read) [[unlikely]] {
-        return endOfContent(state, lackPiece(decoder, piece.unread));
-    }
-    *text = read;
-    return endOfContent(state, QVS_OK);
+    (void)onlyPiece(decoder, &value, endOf(decoder->ptBuffer), &piece);
+    return endOfContent(state, lackPiece(decoder, piece.unread));
 }

@@ -3,7 +3,7 @@
 #ifndef QVSTEXT_H
 #define QVSTEXT_H
 
-#include "qvsClientProvWbxml.h"
+#include "qvsClientProvWbxmlDecoder.h"
 #include "qvsDecoding.h"
 #include "qvsTokens.h"
 #include "qvsmemory.h"
@@ -24,6 +24,9 @@ inline constexpr char kDecoderModule[] = "jni/src/ClientProv/qvsClientProvWbxmlD
 // beyond to this many times its length.
 constexpr uint64_t kTextAlways = 8U << 20U;
 constexpr uint64_t kTextPerByte = 100;
+
+// Bytes that a block for a text may have.
+constexpr uint32_t kLongest = UINT32_MAX - kSpareZeros;
 
 // The length of a string table that could not be read.
 constexpr uint32_t kUnreadTable = 0xFFFFFFFF;
@@ -205,6 +208,20 @@ inline void dropPageSwitch(qvsWbxmlDecoder *decoder)
     (void)takeByte(decoder, &byte);
 }
 
+// qvsClientProvWbxmlDecoderCheckCodePage of a switch that is next.
+inline qvsResult switchPage(qvsWbxmlDecoder *decoder)
+{
+    const uint8_t *const at = decoder->ptBuffer->pHead;
+    if (traceSink || bytesLeft(decoder) < 2 || at[1] > 1) [[unlikely]] {
+        return qvsClientProvWbxmlDecoderCheckCodePage(decoder);
+    }
+    decoder->nHasContent = 0;
+    decoder->nHasAttr = 0;
+    decoder->nCodePage = at[1];
+    decoder->ptBuffer->pHead += 2;
+    return QVS_OK;
+}
+
 // Gives the byte read last back.
 inline void stepBack(qvsWbxmlDecoder *decoder)
 {
@@ -309,38 +326,31 @@ constexpr bool endsRun(uint8_t token)
     return token == wbxml::kEnd || token == attr::kValue;
 }
 
-// A run of one string, whose token was read: the string, and whether a run ends behind it. Inline
-// as what follows, with nothing that a function outside writes to, since nothing is called as
-// often.
-[[gnu::always_inline]] inline bool onlyString(const qvsWbxmlDecoder *decoder, uint8_t token,
-                                              uint8_t **at, const uint8_t *end, Piece *piece)
+// The only piece of a value, as most have. False for any other, and for one that the data ends
+// with. Inline, with nothing that a function outside writes to, since nothing is called as often.
+[[gnu::always_inline]] inline bool onlyPiece(const qvsWbxmlDecoder *decoder, uint8_t **at,
+                                             const uint8_t *end, Piece *piece)
 {
+    const uint8_t token = *(*at)++;
     if (token == wbxml::kStrI) {
-        inlinePiece(at, end, piece);
-    } else if (token != wbxml::kStrT || !tablePiece(decoder, at, end, piece)) {
+        auto *nul = static_cast<uint8_t *>(memchr(*at, '\0', static_cast<size_t>(end - *at)));
+        if (!nul) {
+            return false;
+        }
+        *piece = {reinterpret_cast<const char *>(*at), static_cast<uint32_t>(nul - *at)};
+        *at = nul + 1;
+    } else if (token != wbxml::kStrT) {
+        return tokenPiece(token, piece) && *at < end;
+    } else if (!tablePiece(decoder, at, end, piece)) {
         return false;
     }
     return *at < end && endsRun(**at);
 }
 
-// Takes a value of one piece, as most have, and counts it. False, with nothing read, for any other,
-// and where it would pass the limit of texts.
-[[gnu::always_inline]] inline bool takeOnlyPiece(qvsWbxmlDecoder *decoder, DecodeState *state,
-                                                 Piece *piece)
+// The end of the data, where the read position is in front of it.
+inline const uint8_t *endOf(const smlBuffer *buffer)
 {
-    uint8_t *at = decoder->ptBuffer->pHead;
-    const uint8_t *const end = at + bytesLeft(decoder);
-    const uint8_t token = at != end ? *at++ : 0;
-    if (wbxml::isString(token) ? !onlyString(decoder, token, &at, end, piece)
-                               : !tokenPiece(token, piece)) {
-        return false;
-    }
-    if (piece->length > state->textLeft) [[unlikely]] {
-        return false;
-    }
-    state->textLeft -= piece->length;
-    decoder->ptBuffer->pHead = at;
-    return true;
+    return buffer->pStorage + buffer->nSize;
 }
 
 // ---- The readers of a text.
@@ -358,15 +368,16 @@ using ValueReader = qvsResult (*)(qvsWbxmlDecoder *decoder, DecodeState *state, 
 qvsResult content(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
 qvsResult lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text);
 
-// A VALUE and what it carries, as a reader has it.
+// A VALUE and what it carries: as a reader has it, or as a new text, which may continue the text
+// `before` and is null for nothing.
 qvsResult paramValue(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text,
                      ValueReader reader = content);
+qvsResult readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                    const char *before = nullptr);
 
-// What a VALUE that was taken carries: as a new text, which is null for nothing. continueValue()
-// has it continue the text `before`.
-qvsResult readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text);
-qvsResult continueValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
-                        const char *before);
+// The result where there is no memory for a value of one piece, which begins at `value`.
+[[gnu::cold]] qvsResult lackValue(qvsWbxmlDecoder *decoder, const DecodeState *state,
+                                  uint8_t *value);
 
 // qvsCommaAdd onto a text of which `known` may tell more.
 qvsResult commaAdd(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, JoinedText *known);

@@ -74,7 +74,7 @@ void remember(void *block, uint32_t size, const char *file, int line)
 // Blocks up to this size come from a cache of the C library's that calloc passes by.
 constexpr uint32_t kClearedByHand = 512;
 
-void *cleared(uint32_t size)
+[[gnu::always_inline]] inline void *cleared(uint32_t size)
 {
     if (size > kClearedByHand) {
         if (void *block = calloc(1, size)) {
@@ -87,7 +87,12 @@ void *cleared(uint32_t size)
     return block ? memset(block, 0, size) : qvs::refused();
 }
 
-char *copyOf(const char *str, size_t length)
+[[gnu::cold, gnu::noinline]] void *clearedTracked(uint32_t size, const char *file, int line)
+{
+    return remembered(cleared(size), size, file, line);
+}
+
+[[gnu::always_inline]] inline char *copyOf(const char *str, size_t length)
 {
     char *block = static_cast<char *>(qvs::requested(length + 1 + qvs::kSpareZeros));
     if (block) {
@@ -96,6 +101,14 @@ char *copyOf(const char *str, size_t length)
         memset(block + length, 0, 1 + qvs::kSpareZeros);
     }
     return block;
+}
+
+[[gnu::cold, gnu::noinline]] char *copyTracked(const char *str, const char *file, int line)
+{
+    const size_t length = strlen(str);
+    // kept[memcheck-text-length]: the size that is remembered leaves the terminator out.
+    return static_cast<char *>(
+        remembered(copyOf(str, length), static_cast<uint32_t>(length), file, line));
 }
 
 } // namespace
@@ -115,7 +128,7 @@ void *qvs::newTrackedText(uint32_t size, const char *module, int line)
 
 void *qvsMemAllocSetZero_debug(uint32_t size, const char *file, int line)
 {
-    return qvs::tracking ? remembered(cleared(size), size, file, line) : cleared(size);
+    return qvs::tracking ? clearedTracked(size, file, line) : cleared(size);
 }
 
 uint16_t *qvsMemAllocW_debug(uint32_t count, const char *file, int line)
@@ -135,13 +148,7 @@ char *qvsStrdup_debug(const char *str, const char *file, int line)
     if (!str) {
         return nullptr;
     }
-    const size_t length = strlen(str);
-    if (!qvs::tracking) {
-        return copyOf(str, length);
-    }
-    // kept[memcheck-text-length]: the size that is remembered leaves the terminator out.
-    return static_cast<char *>(
-        remembered(copyOf(str, length), static_cast<uint32_t>(length), file, line));
+    return qvs::tracking ? copyTracked(str, file, line) : copyOf(str, strlen(str));
 }
 
 void *qvsMemDup_debug(const void *src, uint32_t size, const char *file, int line)
