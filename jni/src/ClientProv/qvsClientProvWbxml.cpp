@@ -45,8 +45,21 @@ struct ReleaseKind {
     uint8_t slot = kNoField;
 };
 
-// A node's slots are released in their order.
-constexpr auto kKinds = inOrder<ReleaseKind, Node>();
+// A node's slots are released in their order. One that is left has a kind without a slot.
+struct SlotKinds {
+    ReleaseKind of[kFieldsOf<Node>];
+};
+
+consteval SlotKinds kindsBySlot()
+{
+    SlotKinds kinds;
+    for (const ReleaseKind &kind : inOrder<ReleaseKind, Node>().rows) {
+        kinds.of[kind.slot] = kind;
+    }
+    return kinds;
+}
+
+constexpr SlotKinds kKinds = kindsBySlot();
 
 // Releases the fields of a record and clears them. Harmless when it was done before.
 void releaseFields(qvsArena *arena, void *record, const ReleaseKind &kind)
@@ -84,15 +97,19 @@ void closeRecord(const qvsArena *arena, void *record, const ReleaseKind &kind)
 }
 
 // Releases the record in a slot, unless it has children: then it answers their list.
-[[gnu::noinline]] qvsList *releaseSlot(qvsArena *arena, Node *node, const ReleaseKind &kind)
+[[gnu::noinline]] qvsList *releaseSlot(qvsArena *arena, Node *node, uint8_t slot)
 {
-    void *record = pointerAt(node, kind.slot);
+    const ReleaseKind &kind = kKinds.of[slot];
+    if (kind.slot == kNoField) {
+        return nullptr;
+    }
+    void *record = pointerAt(node, slot);
     releaseFields(arena, record, kind);
     if (qvsList *children = childrenOf(record, kind)) {
         return children;
     }
     closeRecord(arena, record, kind);
-    setPointer(node, kind.slot, nullptr);
+    setPointer(node, slot, nullptr);
     return nullptr;
 }
 
@@ -101,9 +118,9 @@ void closeRecord(const qvsArena *arena, void *record, const ReleaseKind &kind)
 // left but the node itself.
 qvsList *releaseSlots(qvsArena *arena, Node *node)
 {
-    for (const ReleaseKind &kind : kKinds.rows) {
-        if (pointerAt(node, kind.slot)) {
-            if (qvsList *children = releaseSlot(arena, node, kind)) {
+    for (uint8_t slot = 0; slot < kFieldsOf<Node>; ++slot) {
+        if (pointerAt(node, slot)) {
+            if (qvsList *children = releaseSlot(arena, node, slot)) {
                 return children;
             }
         }

@@ -71,17 +71,17 @@ qvsResult readDocument(const uint8_t *data, uint32_t length, qvsArena *arena, qv
 qvsResult qvsClientProvWbxmlDecoderWbxmlHeader(qvsWbxmlDecoder *decoder, uint8_t *version,
                                                uint32_t *publicId, uint32_t *charset)
 {
-    if (!qvsClientProvWbxmlDecoderBufferReadByte(decoder, version)) {
+    if (!takeByte(decoder, version)) {
         return QVS_ERROR_WBXML_NO_DATA;
     }
-    if (!qvsClientProvWbxmlDecoderBufferReadUint32(decoder, publicId)) {
+    if (!takeUint32(decoder, publicId)) {
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
     uint32_t index = 0;
-    if (*publicId == 0 && !qvsClientProvWbxmlDecoderBufferReadUint32(decoder, &index)) {
+    if (*publicId == 0 && !takeUint32(decoder, &index)) {
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
-    if (!qvsClientProvWbxmlDecoderBufferReadUint32(decoder, charset)) {
+    if (!takeUint32(decoder, charset)) {
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
     // kept[table-failure-ignored]: a table that could not be read is known by its length alone.

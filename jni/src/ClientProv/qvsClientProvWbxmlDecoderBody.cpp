@@ -158,8 +158,8 @@ qvsList **childrenOf(Node *node, const Kind &kind)
 
 // A TYPE given as text. Other names than the three known ones make no record. The text goes to
 // `*name`, if there is such a place, in the place of one that is there.
-qvsResult readNamedType(qvsWbxmlDecoder *decoder, DecodeState *state, Node *node, const Kind **kind,
-                        char **name)
+[[gnu::noinline]] qvsResult readNamedType(qvsWbxmlDecoder *decoder, DecodeState *state, Node *node,
+                                          const Kind **kind, char **name)
 {
     ++decoder->ptBuffer->pHead; // behind the attribute start
     Text read;
@@ -302,24 +302,20 @@ qvsResult readContent(qvsWbxmlDecoder *decoder, DecodeState *state, Open *open, 
         trace("qvsClientProvWbxmlDecoderCharacter :: nId[0x%02x], nAttrId[0x%02x]", tag,
               open->attrId);
         qvsResult result = QVS_OK;
-        switch (tag) {
-        case wbxml::kEnd:
+        if (tag == tag::kParm) {
+            result = readParmElement(decoder, state, open);
+        } else if (tag == wbxml::kEnd) {
             *child = false;
             (void)takeSeenTag(decoder);
             return QVS_OK;
-        case wbxml::kStrI:
-            result = dropInlineString(decoder, state);
-            break;
-        case wbxml::kSwitchPage:
-            dropPageSwitch(decoder);
-            break;
-        case tag::kCharacteristic:
+        } else if (tag == tag::kCharacteristic) {
             *child = true;
             return acceptChild(open);
-        case tag::kParm:
-            result = readParmElement(decoder, state, open);
-            break;
-        default:
+        } else if (tag == wbxml::kStrI) {
+            result = dropInlineString(decoder, state);
+        } else if (tag == wbxml::kSwitchPage) {
+            dropPageSwitch(decoder);
+        } else {
             trace("Tag Code = QVS_ERROR_WBXML_UNKNOWN_ELEMENT");
             trace("qvsClientProvWbxmlDecoderCharacter[%x]", tag);
             return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;

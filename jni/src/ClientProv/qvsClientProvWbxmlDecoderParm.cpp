@@ -35,18 +35,18 @@ namespace {
     return QVS_OK;
 }
 
-// Reads NAME and VALUE of one parameter into `*text`, which is null without a value: as a new text,
-// or as one that continues the text `before`.
+// Reads NAME and VALUE of one parameter, of which a byte was seen, into `*text`, which is null
+// without a value: as a new text, or as one that continues the text `before`.
 inline qvsResult readPair(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token,
                           const char *before)
 {
-    if (qvsResult result = checkAttr(decoder, token)) {
+    if (qvsResult result = checkSeenAttr(decoder, token)) {
         return result;
     }
-    uint8_t next = 0;
+    const uint8_t *const at = decoder->ptBuffer->pHead;
     qvsResult result = QVS_ERROR_WBXML_NO_DATA;
-    if (peekByte(decoder->ptBuffer, &next)) {
-        switch (next) {
+    if (at < endOf(decoder->ptBuffer)) {
+        switch (*at) {
         case wbxml::kSwitchPage:
             (void)switchPage(decoder);
             [[fallthrough]];
@@ -60,7 +60,7 @@ inline qvsResult readPair(qvsWbxmlDecoder *decoder, DecodeState *state, char **t
             result = QVS_OK;
             break;
         default:
-            trace("DecoderParam : Tag Code [%d] = QVS_ERROR_WBXML_UNKNOWN_ELEMENT\n", next);
+            trace("DecoderParam : Tag Code [%d] = QVS_ERROR_WBXML_UNKNOWN_ELEMENT\n", *at);
             result = QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
             break;
         }
@@ -168,28 +168,25 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
     return token;
 }
 
-// Takes the start of a parm element, which nearly always has attributes and no content.
+// Nearly every parm element has attributes and no content.
+constexpr uint8_t kParmStart = tag::kParm | wbxml::kHasAttr;
+
 inline qvsResult takeStart(qvsWbxmlDecoder *decoder)
 {
-    if (bytesLeft(decoder) > 1) {
-        uint8_t *const at = decoder->ptBuffer->pHead;
-        if (at[0] == (tag::kParm | wbxml::kHasAttr) && (at[1] & wbxml::kTagMask) != wbxml::kEnd) {
-            decoder->ptBuffer->pHead = at + 1;
-            decoder->nHasContent = 0;
-            decoder->nHasAttr = 1;
-            return QVS_OK;
-        }
+    uint8_t *const at = decoder->ptBuffer->pHead;
+    if (at + 1 >= endOf(decoder->ptBuffer) || at[0] != kParmStart ||
+        (at[1] & wbxml::kTagMask) == wbxml::kEnd) {
+        return checkElement(decoder, tag::kParm);
     }
-    return checkElement(decoder, tag::kParm);
+    decoder->ptBuffer->pHead = at + 1;
+    decoder->nHasContent = 0;
+    decoder->nHasAttr = 1;
+    return QVS_OK;
 }
 
-// Takes the END of a parm element, whose flags the decoder keeps: it has none unless it was masked.
-inline void takeEnd(qvsWbxmlDecoder *decoder, bool isMasked)
+// Takes the END of a parm element, whose flags the decoder keeps.
+inline void takeEnd(qvsWbxmlDecoder *decoder)
 {
-    if (isMasked) [[unlikely]] {
-        (void)takeSeenTag(decoder);
-        return;
-    }
     ++decoder->ptBuffer->pHead;
     decoder->nHasContent = 0;
     decoder->nHasAttr = 0;
@@ -214,6 +211,13 @@ const ParmRow *findParm(const ParmTable &table, uint8_t token)
         trace("qvsClientProvWbxmlDecoderParam%s[%x]", table.style.name, token);
     }
     return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
+}
+
+inline void traceEntry(const ParmTable &table)
+{
+    if (traceSink && table.style.entered) {
+        trace("qvsClientProvWbxmlDecoderParam%s", table.style.entered);
+    }
 }
 
 // What a decoder traces of its own behind a parameter and at the end.
@@ -250,13 +254,52 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
     }
 }
 
+// Reads a parm element, of which a byte was seen, into `record`.
+[[gnu::noinline]] qvsResult readElement(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                                        const ParmTable &table)
+{
+    traceEntry(table);
+    if (!record) {
+        return QVS_ERROR_BAD_ARGUMENT;
+    }
+    if (qvsResult result = takeStart(decoder)) {
+        return result;
+    }
+    uint8_t token = 0;
+    while (peekByte(decoder->ptBuffer, &token)) {
+        if (token == wbxml::kEnd) {
+            takeEnd(decoder);
+            traceStep(table, token, QVS_OK);
+            return QVS_OK;
+        }
+        if (token == wbxml::kSwitchPage) {
+            token = skipSwitches(decoder, table);
+            if (token == wbxml::kSwitchPage) {
+                break;
+            }
+            if (token == wbxml::kEnd) {
+                (void)takeSeenTag(decoder); // which may have been masked
+                traceStep(table, token, QVS_OK);
+                return QVS_OK;
+            }
+        }
+        const qvsResult result = readParm(decoder, state, record, table, token);
+        traceStep(table, token, result);
+        if (result != QVS_OK) {
+            return result;
+        }
+    }
+    return QVS_ERROR_WBXML_NO_DATA;
+}
+
 } // namespace
 
 // kept[repeated-parm]: the text that was there stays allocated.
 [[gnu::noinline]] qvsResult qvs::readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
                                           uint8_t token)
 {
-    return readPair(decoder, state, text, token, nullptr);
+    return bytesLeft(decoder) ? readPair(decoder, state, text, token, nullptr)
+                              : qvsResult{QVS_ERROR_WBXML_NO_DATA};
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamString(qvsWbxmlDecoder *decoder, char **text, uint8_t token)
@@ -283,42 +326,24 @@ qvsResult qvs::readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *reco
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
 {
+    if (record && bytesLeft(decoder) == 0) {
+        traceEntry(table);
+        return noElement(decoder);
+    }
     OpenRecord open = {};
     DecodeState alone = {.open = &open};
-    return readParms(decoder, &alone, record, table);
+    return readElement(decoder, &alone, record, table);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
                          const ParmTable &table)
 {
-    if (traceSink && table.style.entered) {
-        trace("qvsClientProvWbxmlDecoderParam%s", table.style.entered);
-    }
-    if (!record) {
-        return QVS_ERROR_BAD_ARGUMENT;
-    }
-    if (qvsResult result = takeStart(decoder)) {
-        return result;
-    }
-    uint8_t token = 0;
-    while (peekByte(decoder->ptBuffer, &token)) {
-        const bool behindSwitch = token == wbxml::kSwitchPage;
-        if (behindSwitch) {
-            token = skipSwitches(decoder, table);
-            if (token == wbxml::kSwitchPage) {
-                break;
-            }
-        }
-        if (token == wbxml::kEnd) {
-            takeEnd(decoder, behindSwitch);
-            traceStep(table, token, QVS_OK);
-            return QVS_OK;
-        }
-        const qvsResult result = readParm(decoder, state, record, table, token);
-        traceStep(table, token, result);
-        if (result != QVS_OK) {
+    for (;;) {
+        const qvsResult result = readElement(decoder, state, record, table);
+        const smlBuffer *const buffer = decoder->ptBuffer;
+        if (result != QVS_OK || traceSink || buffer->pHead >= endOf(buffer) ||
+            *buffer->pHead != kParmStart) {
             return result;
         }
     }
-    return QVS_ERROR_WBXML_NO_DATA;
 }

@@ -10,18 +10,6 @@ namespace {
 
 constexpr uint32_t kLongestTable = 0xFFFFFFFD;
 
-// The data of a decoder from its read position on.
-struct Rest {
-    explicit Rest(const qvsWbxmlDecoder *decoder)
-        : at(decoder && decoder->ptBuffer ? decoder->ptBuffer->pHead : nullptr),
-          end(at + bytesLeft(decoder))
-    {
-    }
-
-    uint8_t *at;
-    const uint8_t *end;
-};
-
 // Appends one piece of a single step.
 bool appendOne(char **text, const Piece &piece)
 {
@@ -49,18 +37,13 @@ uint32_t qvsClientProvWbxmlDecoderBufferReadByte(qvsWbxmlDecoder *decoder, uint8
 
 uint32_t qvsClientProvWbxmlDecoderBufferReadUint32(qvsWbxmlDecoder *decoder, uint32_t *value)
 {
-    Rest rest(decoder);
-    const bool read = takeUint32(&rest.at, rest.end, value);
-    if (rest.at) {
-        decoder->ptBuffer->pHead = rest.at;
-    }
-    return read ? 1 : 0;
+    return takeUint32(decoder, value) ? 1 : 0;
 }
 
 int32_t qvsClientProvWbxmlDecoderMakeStrTable(qvsWbxmlDecoder *decoder, char **table)
 {
     uint32_t length = 0;
-    if (!qvsClientProvWbxmlDecoderBufferReadUint32(decoder, &length) || length > kLongestTable) {
+    if (!takeUint32(decoder, &length) || length > kLongestTable) {
         return -1;
     }
     // hardened: the block is as long as the data warrants, whatever length is claimed.

@@ -193,16 +193,19 @@ extern const ParmsOf<qvsWapRoaming> kRoamingParms;
 extern const ParmsOf<qvsWapWifi> kWifiParms;
 extern const ParmsOf<qvsWapVoWifi> kVoWifiParms;
 
-// Reads one parm element into `record`. Stops at the END of its attributes, which it consumes,
-// or at the first token that is refused or cannot be read. Without a state it is a step alone.
-qvsResult readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
-                    const ParmTable &table);
+// Reads one parm element into `record`. Stops at the END of its attributes, which it consumes, or
+// at the first token that is refused or cannot be read.
 qvsResult readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table);
 template <class Record>
 qvsResult readParms(qvsWbxmlDecoder *decoder, Record *record, const ParmsOf<Record> &parms)
 {
     return readParms(decoder, record, parms.table);
 }
+
+// The same as a step of a decode that has seen a byte of it; parm elements that follow it are read
+// too, while nobody takes traces.
+qvsResult readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                    const ParmTable &table);
 
 // Reads the parameter that the NAME attribute `token` announces into `*text`.
 qvsResult readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token);

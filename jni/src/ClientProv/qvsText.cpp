@@ -160,12 +160,12 @@ inline qvsResult endOfContent(const DecodeState *state, qvsResult result)
 }
 
 // Takes a page switch behind a VALUE, up to the value. It may be none, where an END stands.
-inline qvsResult enterValue(qvsWbxmlDecoder *decoder, bool *present)
+[[gnu::noinline]] qvsResult enterValue(qvsWbxmlDecoder *decoder, bool *present)
 {
     uint8_t next = 0;
     bool left = peekByte(decoder->ptBuffer, &next);
     if (left && next == wbxml::kSwitchPage) {
-        (void)switchPage(decoder);
+        (void)qvsClientProvWbxmlDecoderCheckCodePage(decoder);
         left = peekByte(decoder->ptBuffer, &next);
         next &= wbxml::kTagMask;
     }

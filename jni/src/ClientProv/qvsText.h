@@ -185,18 +185,21 @@ inline qvsResult checkElement(qvsWbxmlDecoder *decoder, uint8_t tag)
     return QVS_OK;
 }
 
-// Takes an attribute start, which has to be `token`.
-inline qvsResult checkAttr(qvsWbxmlDecoder *decoder, uint8_t token)
+// Takes an attribute start, which has to be `token`, where a byte is left.
+inline qvsResult checkSeenAttr(qvsWbxmlDecoder *decoder, uint8_t token)
 {
-    uint8_t read = 0;
-    if (!takeByte(decoder, &read)) {
-        return QVS_ERROR_WBXML_NO_DATA;
-    }
+    const uint8_t read = *decoder->ptBuffer->pHead++;
     if (read != token) {
         trace("nId:%x, nTemp:%x", token, read);
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
     return QVS_OK;
+}
+
+// The same where there may be none.
+inline qvsResult checkAttr(qvsWbxmlDecoder *decoder, uint8_t token)
+{
+    return bytesLeft(decoder) ? checkSeenAttr(decoder, token) : qvsResult{QVS_ERROR_WBXML_NO_DATA};
 }
 
 // A SWITCH_PAGE between elements.
@@ -245,6 +248,28 @@ inline bool takeUint32(uint8_t **at, const uint8_t *end, uint32_t *value)
         }
     }
     return false;
+}
+
+// The data of a decoder from its read position on.
+struct Rest {
+    explicit Rest(const qvsWbxmlDecoder *decoder)
+        : at(decoder && decoder->ptBuffer ? decoder->ptBuffer->pHead : nullptr),
+          end(at + bytesLeft(decoder))
+    {
+    }
+
+    uint8_t *at;
+    const uint8_t *end;
+};
+
+[[gnu::noinline]] inline bool takeUint32(qvsWbxmlDecoder *decoder, uint32_t *value)
+{
+    Rest rest(decoder);
+    const bool read = takeUint32(&rest.at, rest.end, value);
+    if (rest.at) {
+        decoder->ptBuffer->pHead = rest.at;
+    }
+    return read;
 }
 
 // ---- Pieces, read from `*at` on, which moves behind them; `end` is the end of the data.

@@ -106,9 +106,26 @@ qvsResult addLast(qvsArena *arena, qvsList *list, void *item, qvsListNode **last
     return QVS_OK;
 }
 
+// A list and its first node, as one piece of an arena.
+struct ListOfOne {
+    qvsList list;
+    qvsListNode node;
+};
+
 qvsResult create(qvsArena *arena, qvsList **list, void *item, qvsListNode **last)
 {
     *last = nullptr;
+    if (arena && item) {
+        void *room = qvs::takeRoom(arena, sizeof(ListOfOne));
+        if (!room) {
+            return QVS_ERROR_LIST_NO_MEMORY;
+        }
+        auto *made = static_cast<ListOfOne *>(room);
+        *made = {{1, &made->node, nullptr}, {item, nullptr}};
+        *list = &made->list;
+        *last = &made->node;
+        return QVS_OK;
+    }
     auto *made = static_cast<qvsList *>(newUncleared(arena, sizeof(qvsList)));
     if (!made) {
         return QVS_ERROR_LIST_NO_MEMORY;
