@@ -9,16 +9,15 @@ namespace {
 
 // ---- Values
 
-// readValue() where a VALUE of one piece is next, as most are.
+// readValue() of a VALUE that was seen, while nobody takes traces: most are one piece.
 [[gnu::noinline]] qvsResult readNext(qvsWbxmlDecoder *decoder, DecodeState *state, char **text)
 {
     smlBuffer *const buffer = decoder->ptBuffer;
-    uint8_t *const start = buffer->pHead;
+    uint8_t *const value = buffer->pHead + 1;
     const uint8_t *const end = endOf(buffer);
-    uint8_t *at = start + 1;
+    uint8_t *at = value;
     Piece piece;
-    if (at >= end || *start != attr::kValue || !onlyPiece(decoder, &at, end, &piece) ||
-        piece.length > state->textLeft) {
+    if (at == end || !onlyPiece(decoder, &at, end, &piece) || piece.length > state->textLeft) {
         return readValue(decoder, state, text);
     }
     const uint32_t length = piece.length;
@@ -26,33 +25,31 @@ namespace {
     buffer->pHead = at;
     char *block = length < kLongest ? newText(length + 1, kDecoderModule) : nullptr;
     if (!block) [[unlikely]] {
-        return lackValue(decoder, state, start + 1);
+        return lackValue(decoder, state, value);
     }
     memcpy(block, piece.bytes, length);
     memset(block + length, 0, 1 + kSpareZeros);
     *text = block;
-    trace("qvsClientProvWbxmlDecoderContent Error:%d", 0);
     return QVS_OK;
 }
 
-// Reads NAME and VALUE of one parameter, of which a byte was seen, into `*text`, which is null
-// without a value: as a new text, or as one that continues the text `before`.
-inline qvsResult readPair(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token,
-                          const char *before)
+// Reads NAME and VALUE of one parameter into `*text`, which is null without a value: as a new text,
+// or as one that continues the text `before`.
+[[gnu::noinline]] qvsResult readAnyPair(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                                        uint8_t token, const char *before)
 {
-    if (qvsResult result = checkSeenAttr(decoder, token)) {
+    if (qvsResult result = checkAttr(decoder, token)) {
         return result;
     }
-    const uint8_t *const at = decoder->ptBuffer->pHead;
+    uint8_t next = 0;
     qvsResult result = QVS_ERROR_WBXML_NO_DATA;
-    if (at < endOf(decoder->ptBuffer)) {
-        switch (*at) {
+    if (peekByte(decoder->ptBuffer, &next)) {
+        switch (next) {
         case wbxml::kSwitchPage:
             (void)switchPage(decoder);
             [[fallthrough]];
         case attr::kValue:
-            result =
-                before ? readValue(decoder, state, text, before) : readNext(decoder, state, text);
+            result = readValue(decoder, state, text, before);
             break;
         case wbxml::kEnd:
             trace("DecoderParam : Value is NULL\n");
@@ -60,13 +57,37 @@ inline qvsResult readPair(qvsWbxmlDecoder *decoder, DecodeState *state, char **t
             result = QVS_OK;
             break;
         default:
-            trace("DecoderParam : Tag Code [%d] = QVS_ERROR_WBXML_UNKNOWN_ELEMENT\n", *at);
+            trace("DecoderParam : Tag Code [%d] = QVS_ERROR_WBXML_UNKNOWN_ELEMENT\n", next);
             result = QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
             break;
         }
     }
     trace("qvsClientProvWbxmlDecoderParamString Error Code:%d", static_cast<int>(result));
     return result;
+}
+
+// The same where a byte was seen.
+inline qvsResult readPair(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token,
+                          const char *before)
+{
+    smlBuffer *const buffer = decoder->ptBuffer;
+    const uint8_t *const end = endOf(buffer);
+    uint8_t *const name = buffer->pHead;
+    if (traceSink || before || *name != token || name + 1 >= end) {
+        return readAnyPair(decoder, state, text, token, before);
+    }
+    if (name[1] == wbxml::kSwitchPage) {
+        ++buffer->pHead;
+        (void)switchPage(decoder);
+        return buffer->pHead < end && *buffer->pHead == attr::kValue
+                   ? readNext(decoder, state, text)
+                   : readValue(decoder, state, text);
+    }
+    if (name[1] != attr::kValue) {
+        return readAnyPair(decoder, state, text, token, before);
+    }
+    ++buffer->pHead;
+    return readNext(decoder, state, text);
 }
 
 // Adds a text to a list of texts, which takes it over. A null text adds nothing. `*end` is the
@@ -295,11 +316,9 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
 } // namespace
 
 // kept[repeated-parm]: the text that was there stays allocated.
-[[gnu::noinline]] qvsResult qvs::readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
-                                          uint8_t token)
+qvsResult qvs::readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token)
 {
-    return bytesLeft(decoder) ? readPair(decoder, state, text, token, nullptr)
-                              : qvsResult{QVS_ERROR_WBXML_NO_DATA};
+    return readAnyPair(decoder, state, text, token, nullptr);
 }
 
 qvsResult qvsClientProvWbxmlDecoderParamString(qvsWbxmlDecoder *decoder, char **text, uint8_t token)

@@ -185,21 +185,18 @@ inline qvsResult checkElement(qvsWbxmlDecoder *decoder, uint8_t tag)
     return QVS_OK;
 }
 
-// Takes an attribute start, which has to be `token`, where a byte is left.
-inline qvsResult checkSeenAttr(qvsWbxmlDecoder *decoder, uint8_t token)
+// Takes an attribute start, which has to be `token`.
+inline qvsResult checkAttr(qvsWbxmlDecoder *decoder, uint8_t token)
 {
-    const uint8_t read = *decoder->ptBuffer->pHead++;
+    uint8_t read = 0;
+    if (!takeByte(decoder, &read)) {
+        return QVS_ERROR_WBXML_NO_DATA;
+    }
     if (read != token) {
         trace("nId:%x, nTemp:%x", token, read);
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
     return QVS_OK;
-}
-
-// The same where there may be none.
-inline qvsResult checkAttr(qvsWbxmlDecoder *decoder, uint8_t token)
-{
-    return bytesLeft(decoder) ? checkSeenAttr(decoder, token) : qvsResult{QVS_ERROR_WBXML_NO_DATA};
 }
 
 // A SWITCH_PAGE between elements.
@@ -262,7 +259,7 @@ struct Rest {
     const uint8_t *end;
 };
 
-[[gnu::noinline]] inline bool takeUint32(qvsWbxmlDecoder *decoder, uint32_t *value)
+inline bool takeUint32(qvsWbxmlDecoder *decoder, uint32_t *value)
 {
     Rest rest(decoder);
     const bool read = takeUint32(&rest.at, rest.end, value);
