@@ -250,7 +250,7 @@ TEST_F(ParamString, EndsBehindTheLimitOfText)
         const uint64_t length = bytes[2] == 0x03 ? 2 : 4;
         for (const uint64_t beyond : {0, 1}) {
             Decoder decoder(bytes);
-            qvs::DecodeState state = {.textLeft = length - beyond};
+            qvs::DecodeState state = {.textLeft = static_cast<size_t>(length - beyond)};
             OwnText text;
             EXPECT_EQ(qvs::readText(decoder, &state, &text, 0x15),
                       beyond ? QVS_ERROR_NO_MEMORY : QVS_OK);

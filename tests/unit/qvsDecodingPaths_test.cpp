@@ -98,6 +98,25 @@ std::string ofSteps(const Bytes &bytes)
     return shown;
 }
 
+// One parm element, with result and read position.
+std::string ofElement(const Bytes &bytes)
+{
+    qvsWbxmlDecoder *decoder = nullptr;
+    (void)qvsClientProvWbxmlInitDecoder(&decoder, bytes.data(),
+                                        static_cast<uint32_t>(bytes.size()));
+    qvsWapApplication record = {};
+    const qvsResult result = qvsClientProvWbxmlDecoderParamApplication(decoder, &record);
+    std::string shown = std::to_string(result) + " at " +
+                        std::to_string(qvsClientProvWbxmlDecoderDecodingSize(decoder)) + " on " +
+                        std::to_string(decoder->nCodePage);
+    for (char *text : {record.pszName, record.pszFrom, record.pszXcapTidHeader}) {
+        shown += std::string(", ") + (text ? text : "(null)");
+        qvsMemFree_debug(text);
+    }
+    (void)qvsClientProvWbxmlDeleteDecoder(decoder);
+    return shown;
+}
+
 template <class Run>
 void expectSameOnAllPaths(const Bytes &bytes, Run run)
 {
@@ -170,5 +189,39 @@ TEST(Paths, GiveTheSameForValuesMadeAtRandom)
         }
         bytes.push_back(random.oneIn(4) ? 0x06 : 0x01);
         expectSameOnAllPaths(bytes, ofSteps);
+    }
+}
+
+TEST(Paths, GiveTheSameForParametersMadeAtRandom)
+{
+    const Bytes names[] = {{0x07},
+                           {0x05, 0x03, 'F', 'R', 'O', 'M', 0},
+                           {0x05, 0x03, 'F', 0, 0x03, 'R', 'O', 'M', 0},
+                           {0x05, 0x03, 'O', 't', 'h', 'e', 'r', 0},
+                           {0x05, 0x03, 0},
+                           {0x05, 0x85},
+                           {0x05}};
+    const Bytes switches[] = {{}, {0x00, 0x01}, {0x00, 0x41}, {0x00, 0x02}, {0x00}};
+    fuzz::Random random(15);
+    fuzz::Generator generator(&random);
+    const auto add = [](Bytes *bytes, const auto &part) {
+        bytes->insert(bytes->end(), part.begin(), part.end());
+    };
+    for (int i = 0; i < kGenerated; ++i) {
+        Bytes bytes = {0x87};
+        // A second one fills another field: what a field held before would stay allocated.
+        size_t name = random.below(7);
+        for (size_t pairs = 1 + random.below(2); pairs > 0; --pairs, name = name == 0 ? 1 : 0) {
+            add(&bytes, switches[random.oneIn(2) ? random.below(5) : 0]);
+            add(&bytes, names[name]);
+            add(&bytes, switches[random.oneIn(2) ? random.below(5) : 0]);
+            bytes.push_back(random.oneIn(8) ? 0x08 : 0x06);
+            for (size_t pieces = random.below(4); pieces > 0; --pieces) {
+                add(&bytes, generator.value());
+            }
+        }
+        bytes.push_back(random.oneIn(4) ? 0x81 : 0x01);
+        bytes.resize(bytes.size() - random.below(random.oneIn(3) ? bytes.size() : 1));
+        expectSameOnAllPaths(bytes, ofElement);
     }
 }

@@ -18,9 +18,9 @@ using Bootstrap = qvsCtxBootstrap;
 using PxLogical = qvsCtxPxLogical;
 using Context = qvsClientProvCtx;
 
-// The kinds of record, which are known by their numbers.
+// The records of a context, which are known by their numbers.
 template <class... Records>
-struct Kinds {
+struct RecordList {
     static constexpr uint8_t kCount = sizeof...(Records);
 
     template <class Record>
@@ -33,10 +33,10 @@ struct Kinds {
     }
 };
 
-using AllKinds =
-    Kinds<qvsCtxStrNode, qvsCtxPort, qvsCtxNapAuthInfo, qvsCtxValidity, qvsCtxAppAddr, AppAuth,
-          Resource, qvsCtxPxAuthInfo, PxPhysical, Access, Application, Bootstrap, qvsCtxNapDef,
-          PxLogical, qvsCtxVendorConfig, qvsCtxWifi, qvsCtxVoWifi, qvsCtxClientIdent, Context>;
+using ContextRecords =
+    RecordList<qvsCtxStrNode, qvsCtxPort, qvsCtxNapAuthInfo, qvsCtxValidity, qvsCtxAppAddr, AppAuth,
+               Resource, qvsCtxPxAuthInfo, PxPhysical, Access, Application, Bootstrap, qvsCtxNapDef,
+               PxLogical, qvsCtxVendorConfig, qvsCtxWifi, qvsCtxVoWifi, qvsCtxClientIdent, Context>;
 
 constexpr uint8_t kText = 0xFF;
 
@@ -46,7 +46,7 @@ struct ReleaseRow {
     constexpr ReleaseRow(uint8_t number, char *) : field(number) {}
     template <class Record>
     constexpr ReleaseRow(uint8_t number, Record *)
-        : field(number), owns(AllKinds::numberOf<Record>())
+        : field(number), owns(ContextRecords::numberOf<Record>())
     {
     }
 
@@ -99,13 +99,13 @@ constexpr auto kRelease<Context> = rowsOf<ReleaseRow>(&Context::ptAccess, &Conte
                                                       &Context::ptVendorConfig, &Context::ptVoWifi);
 
 // One kind of record: what it owns, and where its link is.
-struct ReleaseKind {
+struct ChainRelease {
     Rows<ReleaseRow> rows;
     uint8_t link; // kNoField for a kind that forms no chain
 };
 
 template <class Record>
-consteval ReleaseKind releaseOf()
+consteval ChainRelease releaseOf()
 {
     static_assert(isComplete<Record>(kRelease<Record>),
                   "a field is neither released nor left on purpose");
@@ -115,14 +115,14 @@ consteval ReleaseKind releaseOf()
 // The releases by the numbers of the kinds.
 struct Releases {
     template <class... Records>
-    consteval Releases(Kinds<Records...>) : kinds{releaseOf<Records>()...}
+    consteval Releases(RecordList<Records...>) : kinds{releaseOf<Records>()...}
     {
     }
 
-    ReleaseKind kinds[AllKinds::kCount];
+    ChainRelease kinds[ContextRecords::kCount];
 };
 
-constexpr Releases kReleases = AllKinds();
+constexpr Releases kReleases = ContextRecords();
 
 // The kinds of record nest a few levels deep, whatever a message holds.
 // NOLINTBEGIN(misc-no-recursion)
@@ -130,7 +130,7 @@ constexpr Releases kReleases = AllKinds();
 void releaseKind(void *first, uint8_t number);
 
 // Releases what a record owns.
-void releaseRows(void *record, const ReleaseKind &kind)
+void releaseRows(void *record, const ChainRelease &kind)
 {
     for (const ReleaseRow &row : kind.rows) {
         void *owned = pointerAt(record, row.field);
@@ -151,7 +151,7 @@ void releaseRows(void *record, const ReleaseKind &kind)
 // last to the first. The links, turned round on the way there, lead the way back.
 void releaseKind(void *first, uint8_t number)
 {
-    const ReleaseKind &kind = kReleases.kinds[number];
+    const ChainRelease &kind = kReleases.kinds[number];
     if (!first) {
         traceError(QVS_ERROR_BAD_ARGUMENT);
         return;
@@ -181,7 +181,7 @@ void releaseKind(void *first, uint8_t number)
 template <class Record>
 void releaseChain(Record *first)
 {
-    releaseKind(first, AllKinds::numberOf<Record>());
+    releaseKind(first, ContextRecords::numberOf<Record>());
 }
 
 } // namespace

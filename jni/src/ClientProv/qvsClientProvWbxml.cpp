@@ -30,10 +30,10 @@ constexpr auto kRelease<qvsWapAppAddr> =
     inOrder<FieldRow, qvsWapAppAddr>().moved(&qvsWapAppAddr::pszAddr, &qvsWapAppAddr::pszAddrType);
 
 // One kind of record: what it owns, where its children are, and the slot of a node that it is in.
-struct ReleaseKind {
-    constexpr ReleaseKind() = default;
+struct RecordRelease {
+    constexpr RecordRelease() = default;
     template <class Record>
-    constexpr ReleaseKind(uint8_t number, Record *)
+    constexpr RecordRelease(uint8_t number, Record *)
         : rows(rowsFor<Record>(kRelease<Record>)), childList(kChildListOf<Record>), slot(number)
     {
         static_assert(isComplete<Record>(kRelease<Record>),
@@ -46,23 +46,23 @@ struct ReleaseKind {
 };
 
 // A node's slots are released in their order. One that is left has a kind without a slot.
-struct SlotKinds {
-    ReleaseKind of[kFieldsOf<Node>];
+struct SlotReleases {
+    RecordRelease of[kFieldsOf<Node>];
 };
 
-consteval SlotKinds kindsBySlot()
+consteval SlotReleases releasesBySlot()
 {
-    SlotKinds kinds;
-    for (const ReleaseKind &kind : inOrder<ReleaseKind, Node>().rows) {
-        kinds.of[kind.slot] = kind;
+    SlotReleases releases;
+    for (const RecordRelease &kind : inOrder<RecordRelease, Node>().rows) {
+        releases.of[kind.slot] = kind;
     }
-    return kinds;
+    return releases;
 }
 
-constexpr SlotKinds kKinds = kindsBySlot();
+constexpr SlotReleases kReleases = releasesBySlot();
 
 // Releases the fields of a record and clears them. Harmless when it was done before.
-void releaseFields(qvsArena *arena, void *record, const ReleaseKind &kind)
+void releaseFields(qvsArena *arena, void *record, const RecordRelease &kind)
 {
     for (const FieldRow &row : kind.rows) {
         void *owned = pointerAt(record, row.field);
@@ -79,14 +79,14 @@ void releaseFields(qvsArena *arena, void *record, const ReleaseKind &kind)
 }
 
 // The children of a record; null when there are none.
-qvsList *childrenOf(void *record, const ReleaseKind &kind)
+qvsList *childrenOf(void *record, const RecordRelease &kind)
 {
     qvsList *children = kind.childList == kNoField ? nullptr : *listAt(record, kind.childList);
     return children && children->ptFirst ? children : nullptr;
 }
 
 // Releases a record whose fields and children are gone.
-void closeRecord(const qvsArena *arena, void *record, const ReleaseKind &kind)
+void closeRecord(const qvsArena *arena, void *record, const RecordRelease &kind)
 {
     if (kind.childList != kNoField) {
         if (qvsList *children = *listAt(record, kind.childList); children && !arena) {
@@ -99,7 +99,7 @@ void closeRecord(const qvsArena *arena, void *record, const ReleaseKind &kind)
 // Releases the record in a slot, unless it has children: then it answers their list.
 [[gnu::noinline]] qvsList *releaseSlot(qvsArena *arena, Node *node, uint8_t slot)
 {
-    const ReleaseKind &kind = kKinds.of[slot];
+    const RecordRelease &kind = kReleases.of[slot];
     if (kind.slot == kNoField) {
         return nullptr;
     }

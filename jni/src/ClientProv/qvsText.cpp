@@ -314,7 +314,10 @@ qvsResult qvs::readValue(qvsWbxmlDecoder *decoder, DecodeState *state, char **te
 
 qvsResult qvs::lackValue(qvsWbxmlDecoder *decoder, const DecodeState *state, uint8_t *value)
 {
-    Piece piece;
-    (void)onlyPiece(decoder, &value, endOf(decoder->ptBuffer), &piece);
-    return endOfContent(state, lackPiece(decoder, piece.unread));
+    const uint8_t token = *value++;
+    uint32_t index = 0;
+    if (token == wbxml::kStrT) {
+        (void)takeUint32(&value, endOf(decoder->ptBuffer), &index);
+    }
+    return endOfContent(state, lackPiece(decoder, wbxml::isString(token) ? value : nullptr));
 }
