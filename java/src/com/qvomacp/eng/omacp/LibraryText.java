@@ -93,8 +93,11 @@ abstract class LibraryText {
     int skippedStart;
     int skippedEnd;
 
-    LibraryText(byte[] data) {
+    final LibraryTrace trace;
+
+    LibraryText(byte[] data, LibraryTrace trace) {
         this.data = data;
+        this.trace = trace;
         this.size = data.length;
         this.textLimit = Math.max(TEXT_ALWAYS, TEXT_PER_BYTE * size);
     }
@@ -200,6 +203,7 @@ abstract class LibraryText {
         skipped = what;
         skippedStart = start;
         skippedEnd = at;
+        trace.skipped(what, start, at);
     }
 
     // ---- Texts
@@ -419,7 +423,9 @@ abstract class LibraryText {
         int start = at;
         newText();
         inlineString(place, start);
-        if (data[start] != STR_I) {
+        if (data[start] == STR_I) {
+            trace.skipped("as a text", start, at);
+        } else {
             skipped("all up to a zero byte, as one text", start);
         }
     }

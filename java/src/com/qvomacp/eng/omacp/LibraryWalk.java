@@ -30,13 +30,14 @@ final class LibraryWalk extends LibraryText {
 
     private static final byte[] COMMA = {','};
 
-    private final LibraryTrace trace;
-
     /** Whether there is a list of characteristics, be it empty, which a document needs. */
     boolean hasList;
 
     /** 0 also when it could not be read. */
     long publicId;
+
+    /** Where the length of the string table begins; 0 when the header was not read that far. */
+    int tableLengthAt;
 
     /** Where the elements begin; 0 as long as the header is read. */
     int elementsAt;
@@ -60,8 +61,7 @@ final class LibraryWalk extends LibraryText {
     private long continuedLength;
 
     LibraryWalk(byte[] data, LibraryTrace trace) {
-        super(data);
-        this.trace = trace;
+        super(data, trace);
     }
 
     /** Walks over the body. */
@@ -119,6 +119,7 @@ final class LibraryWalk extends LibraryText {
         if (integer() < 0) {
             return "character set";
         }
+        tableLengthAt = at;
         tableLength = integer();
         if (tableLength < 0 || tableLength > LONGEST_TABLE) {
             return "string table's length";
@@ -248,9 +249,10 @@ final class LibraryWalk extends LibraryText {
     private boolean enter() throws LibraryStop {
         int start = at;
         int tag = element(TAG_CHARACTERISTIC, Place.NEXT_CHARACTERISTIC);
+        trace.begin(start, false);
         if ((tag & HAS_CONTENT) == 0) {
             nameLength = -1;
-            trace.characteristic(this, depth, start, null);
+            trace.type(this, depth, start, null);
             trace.end(at);
             return false;
         }
@@ -266,7 +268,7 @@ final class LibraryWalk extends LibraryText {
         isTyped = true;
         kinds[depth - 1] = kind;
         continuedLength = -1;
-        trace.characteristic(this, depth - 1, start, kind);
+        trace.type(this, depth - 1, start, kind);
         return true;
     }
 
@@ -330,7 +332,7 @@ final class LibraryWalk extends LibraryText {
         inParm = true;
         parmToken = -1;
         element(TAG_PARM, Place.IN_CHARACTERISTIC);
-        trace.parm(start);
+        trace.begin(start, true);
         for (; ; ) {
             int token = peek(Place.PARM);
             while (token == SWITCH_PAGE) {

@@ -168,9 +168,31 @@ public final class ProvisioningDocument {
         read(describer);
     }
 
+    /**
+     * Tells what each byte of a body means, as {@link #describe(ByteVisitor)}, as far as it can be
+     * read. Nothing is kept of a document that is too much for {@link #parse}.
+     *
+     * @param body a WBXML body, not to be changed meanwhile
+     * @param options the limits
+     * @param visitor who is told
+     * @throws ProvisioningException as {@link #parse}, once what stands before has been told
+     */
+    public static void describe(byte[] body, ReadOptions options, ByteVisitor visitor)
+            throws ProvisioningException {
+        ProvisioningException.checkInput(body.length, options);
+        BodyHeader header = new BodyHeader(body);
+        Describer describer = new Describer(visitor);
+        describer.header(body, header);
+        new BodyReader(body, header, options.textLimit(), describer).read();
+    }
+
     /** The body, not to be changed. */
     byte[] bytes() {
         return body;
+    }
+
+    BodyHeader header() {
+        return header;
     }
 
     /** The document element. */

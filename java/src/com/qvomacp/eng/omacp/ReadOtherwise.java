@@ -5,41 +5,60 @@ import java.util.Arrays;
 import java.util.List;
 import java.util.Objects;
 
-/** Compares the elements that the native library's walk reads with the items of the tree. */
+/** Compares what the native library's walk reads with the items of the tree. */
 final class ReadOtherwise extends LibraryTrace {
     private static final int OPEN = -1;
-    private static final int NO_PARM = -1;
+    private static final int CHARACTERISTIC = -1;
+    private static final int SKIPPED = -2;
+    private static final int BEGIN = 64;
+    private static final int END_MASK = 0x3F;
 
-    /** The elements in the order in which they begin. */
+    private final byte[] body;
+    private final ProvisioningDocument document;
+
+    /** Where the document begins in what the library takes for the body. */
+    private final int shift;
+
+    private final ByteVisitor visitor;
+
+    /** What the walk reads, in the order in which it begins. */
     private int count;
 
-    private int[] starts = new int[64];
-    private int[] ends = new int[64];
+    private int[] starts = new int[BEGIN];
+    private int[] ends = new int[BEGIN];
 
-    /** What a characteristic or parameter is called; null for what the library does not know. */
-    private String[] names = new String[64];
+    /** What it is called; null for what the library does not know. */
+    private String[] names = new String[BEGIN];
 
-    /** How many pairs of name and value a parm has; -1 for a characteristic. */
-    private int[] pairs = new int[64];
+    /** How many pairs of name and value a parm has; what else it is. */
+    private int[] pairs = new int[BEGIN];
 
     /** The end of a parm's value; 0 without one. */
-    private int[] valueEnds = new int[64];
+    private int[] valueEnds = new int[BEGIN];
 
     /** The elements whose ends have not been read. */
     private int[] open = new int[16];
 
     private int depth;
 
-    private ReadOtherwise() {}
+    private ReadOtherwise(
+            byte[] body, ProvisioningDocument document, int shift, ByteVisitor visitor) {
+        this.body = body;
+        this.document = document;
+        this.shift = shift;
+        this.visitor = visitor;
+    }
 
     /**
-     * Lists the items of a document that the walk skips or reads as something else.
+     * Lists the items of a document that the walk skips or reads as something else, and tells what
+     * it reads instead.
      *
      * @param body what the library takes for the body
      * @param shift where the document begins in it
      */
-    static List<Item> of(byte[] body, ProvisioningDocument document, int shift) {
-        ReadOtherwise read = new ReadOtherwise();
+    static List<Item> of(
+            byte[] body, ProvisioningDocument document, int shift, ByteVisitor visitor) {
+        ReadOtherwise read = new ReadOtherwise(body, document, shift, visitor);
         LibraryWalk walk = new LibraryWalk(body, read);
         int end;
         try {
@@ -47,53 +66,130 @@ final class ReadOtherwise extends LibraryTrace {
             end = walk.at;
         } catch (LibraryStop stop) {
             end = stop.offset;
-            if (walk.depth > 0 && !walk.isTyped) {
-                read.begin(walk.starts[walk.depth - 1], null, false);
-            }
         }
+        read.compareHeaders(walk);
+        return read.compareItems(walk.elementsAt, end);
+    }
+
+    private void tell(int start, int end, String reading) {
+        int from = Math.max(start - shift, 0);
+        visitor.visit(from, Math.max(end - shift - from, 1), 0, "the library " + reading);
+    }
+
+    private void compareHeaders(LibraryWalk walk) {
+        BodyHeader header = document.header();
+        if (shift != 0) {
+            tell(shift, shift, Refusal.shifted(shift));
+        } else if (walk.unreadItem != null) {
+            tell(header.identifierAt, walk.at, "cannot read the " + walk.unreadItem);
+        } else if (walk.elementsAt != header.elementsAt) {
+            String length = "reads " + walk.tableLength + " as the length of the string table";
+            tell(header.charsetAt, walk.tableLengthAt, "reads a character set");
+            tell(walk.tableLengthAt, walk.tableAt, length);
+        }
+    }
+
+    /** Compares from where the walk's elements begin up to where it ends. */
+    private List<Item> compareItems(int from, int end) {
         List<Item> otherwise = new ArrayList<>();
+        int told = from;
         int next = 0;
-        for (Item top : document.children()) {
-            Walk items = new Walk(top);
-            for (Item item; (item = items.next()) != null; ) {
-                int start = item.offset() + shift;
-                if (start >= end) {
-                    return otherwise;
-                }
-                while (next < read.count && read.starts[next] < start) {
-                    ++next;
-                }
-                boolean isThere = next < read.count && read.starts[next] == start;
-                if (!isThere || !read.isAlike(next, item, start + item.length())) {
-                    otherwise.add(item);
-                }
+        Walk items = new Walk(document.root());
+        items.next();
+        for (Item item; (item = items.next()) != null && item.offset() + shift < end; ) {
+            int start = item.offset() + shift;
+            for (; next < count && isBefore(next, start); ++next) {
+                told = tellAlone(next, told);
             }
+            int itemEnd = start + item.length();
+            if (next == count || starts[next] > start) {
+                otherwise.add(item);
+                if (start >= told) {
+                    tell(start, itemEnd, "reads no element here");
+                }
+                continue;
+            }
+            String reading = reading(next, item, itemEnd);
+            if (reading != null) {
+                otherwise.add(item);
+                tell(start, ends[next], reading);
+            }
+            ++next;
+        }
+        for (; next < count; ++next) {
+            told = tellAlone(next, told);
         }
         return otherwise;
     }
 
-    private boolean isAlike(int element, Item item, int end) {
-        boolean isOpen = ends[element] == OPEN;
-        if (!isOpen && ends[element] != end) {
-            return false;
-        }
-        if (item instanceof Characteristic) {
-            // One that is open and of no known type is where the library refuses the message.
-            return pairs[element] == NO_PARM
-                    && (isOpen && names[element] == null
-                            || Objects.equals(names[element], ((Characteristic) item).type()));
-        }
-        if (!(item instanceof Parameter) || pairs[element] == NO_PARM) {
-            return false;
-        }
-        Parameter parameter = (Parameter) item;
-        return isOpen
-                || pairs[element] == 1
-                        && Objects.equals(names[element], parameter.name())
-                        && valueEnds[element] == (parameter.value() == null ? 0 : end - 1);
+    private boolean isBefore(int element, int start) {
+        return starts[element] < start || starts[element] == start && pairs[element] == SKIPPED;
     }
 
-    private void begin(int start, String name, boolean isParm) {
+    /** Tells of what no item stands for, and up to where no more is to be told. */
+    private int tellAlone(int element, int told) {
+        int start = starts[element];
+        if (pairs[element] != SKIPPED) {
+            tell(start, ends[element], reads(element));
+            return told;
+        }
+        String bytes = Refusal.bytes(ends[element] - start);
+        tell(start, ends[element], "skips " + bytes + " from here on, " + names[element]);
+        return Math.max(told, ends[element]);
+    }
+
+    private String reads(int element) {
+        String what = pairs[element] == CHARACTERISTIC ? "a characteristic" : "a parm";
+        return "reads " + what + (names[element] == null ? "" : " " + name(element));
+    }
+
+    private String name(int element) {
+        return Printable.of(names[element]);
+    }
+
+    /** What the library makes of the bytes of an item; null for the same. */
+    private String reading(int element, Item item, int end) {
+        boolean isCharacteristic = pairs[element] == CHARACTERISTIC;
+        Class<?> kind = isCharacteristic ? Characteristic.class : Parameter.class;
+        if (!kind.isInstance(item)) {
+            return reads(element);
+        }
+        boolean isOpen = ends[element] == OPEN;
+        if (isCharacteristic) {
+            String type = ((Characteristic) item).type();
+            // One that is open and of no known type is where the library refuses the message.
+            if (!Objects.equals(names[element], type) && !(isOpen && names[element] == null)) {
+                return names[element] == null ? "knows no such TYPE" : reads(element);
+            }
+        }
+        if (isOpen) {
+            return null;
+        }
+        if (ends[element] != end) {
+            boolean isNext = ends[element] == end + 1 && (body[end] & END_MASK) == BodyReader.END;
+            return isNext ? "takes the next END for its own" : "ends this " + by(ends[element] - end);
+        }
+        return isCharacteristic ? null : reading(element, (Parameter) item, end);
+    }
+
+    private static String by(int bytes) {
+        return Refusal.bytes(Math.abs(bytes)) + (bytes < 0 ? " earlier" : " later");
+    }
+
+    private String reading(int parm, Parameter parameter, int end) {
+        if (pairs[parm] != 1) {
+            return pairs[parm] == 0 ? "reads no NAME" : "joins " + pairs[parm] + " parameters";
+        }
+        if (!Objects.equals(names[parm], parameter.name())) {
+            return reads(parm);
+        }
+        if (valueEnds[parm] == (parameter.value() == null ? 0 : end - 1)) {
+            return null;
+        }
+        return valueEnds[parm] == 0 ? "reads no value" : "ends the value before the END";
+    }
+
+    private int add(int start, int end, String name, int kind) {
         if (count == starts.length) {
             starts = Arrays.copyOf(starts, 2 * count);
             ends = Arrays.copyOf(ends, 2 * count);
@@ -101,30 +197,30 @@ final class ReadOtherwise extends LibraryTrace {
             pairs = Arrays.copyOf(pairs, 2 * count);
             valueEnds = Arrays.copyOf(valueEnds, 2 * count);
         }
+        starts[count] = start;
+        ends[count] = end;
+        names[count] = name;
+        pairs[count] = kind;
+        valueEnds[count] = 0;
+        return count++;
+    }
+
+    @Override
+    void begin(int start, boolean isParm) {
         if (depth == open.length) {
             open = Arrays.copyOf(open, 2 * depth);
         }
-        open[depth++] = count;
-        starts[count] = start;
-        ends[count] = OPEN;
-        names[count] = name;
-        pairs[count] = isParm ? 0 : NO_PARM;
-        valueEnds[count++] = 0;
+        open[depth++] = add(start, OPEN, null, isParm ? 0 : CHARACTERISTIC);
     }
 
     @Override
-    void characteristic(LibraryWalk walk, int depth, int start, LibraryKind kind) {
-        begin(start, kind == null ? null : kind.type, false);
-    }
-
-    @Override
-    void parm(int start) {
-        begin(start, null, true);
+    void type(LibraryWalk walk, int outer, int start, LibraryKind kind) {
+        names[open[depth - 1]] = kind == null ? null : kind.type;
     }
 
     @Override
     void name(LibraryWalk walk) {
-        int parm = count - 1;
+        int parm = open[depth - 1];
         if (pairs[parm]++ == 0) {
             names[parm] = walk.parmName();
         }
@@ -132,11 +228,20 @@ final class ReadOtherwise extends LibraryTrace {
 
     @Override
     void value(int end) {
-        valueEnds[count - 1] = end;
+        valueEnds[open[depth - 1]] = end;
     }
 
     @Override
     void end(int end) {
         ends[open[--depth]] = end;
+    }
+
+    /** What was skipped within it is part of it. */
+    @Override
+    void skipped(String what, int start, int end) {
+        while (count > 0 && pairs[count - 1] == SKIPPED && starts[count - 1] >= start) {
+            --count;
+        }
+        add(start, end, what, SKIPPED);
     }
 }

@@ -83,9 +83,13 @@ final class Refusal {
 
     /** The same of a body that is not the message's, which begins so many bytes behind it. */
     Refusal ofShiftedBody(int shift) {
-        String where = "; the library takes the body to begin " + bytes(Math.abs(shift));
-        where += shift < 0 ? " later" : " earlier";
-        return new Refusal(offset, path, found, expected, reason + where);
+        String why = reason + "; the library " + shifted(shift);
+        return new Refusal(offset, path, found, expected, why);
+    }
+
+    static String shifted(int shift) {
+        String where = shift < 0 ? " later" : " earlier";
+        return "takes the body to begin " + bytes(Math.abs(shift)) + where;
     }
 
     static String bytes(long count) {

@@ -150,9 +150,21 @@ public final class Verdict {
      * where it ends, in the order of the document; not modifiable}
      */
     public List<Item> readOtherwise() {
+        return describeOtherwise((offset, length, depth, meaning) -> {});
+    }
+
+    /**
+     * Tells what the library reads where it reads otherwise, in the order of the body. What it skips
+     * is told once, for all items in it.
+     *
+     * @param visitor hears the offset in the body, how many bytes the library takes, and a few words,
+     *     such as {@code the library reads no value}
+     * @return {@link #readOtherwise}
+     */
+    public List<Item> describeOtherwise(ByteVisitor visitor) {
         return body == null || document == null
                 ? Collections.<Item>emptyList()
-                : Collections.unmodifiableList(ReadOtherwise.of(body, document, shift));
+                : Collections.unmodifiableList(ReadOtherwise.of(body, document, shift, visitor));
     }
 
     @Override

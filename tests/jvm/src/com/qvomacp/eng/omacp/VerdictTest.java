@@ -17,6 +17,7 @@ import com.qvomacp.support.Push;
 import java.io.ByteArrayOutputStream;
 import java.nio.file.Files;
 import java.nio.file.Path;
+import java.util.ArrayList;
 import java.util.Arrays;
 import java.util.Collections;
 import java.util.HexFormat;
@@ -308,6 +309,39 @@ class VerdictTest {
         Verdict verdict = of(Arrays.copyOfRange(push, 3 + push[2], push.length));
         assertTrue(verdict.isAccepted(), verdict.toString());
         assertEquals(List.of(), verdict.readOtherwise());
+    }
+
+    @Test
+    void tellsWhatIsReadInTheOrderOfTheBody() throws Exception {
+        Random random = new Random(12);
+        byte[] push = Files.readAllBytes(Path.of("samples", "everything.push"));
+        int compared = 0;
+        for (int i = 0; i < 5000; ++i) {
+            byte[] body = Arrays.copyOfRange(push, 3 + push[2], push.length);
+            for (int n = 1 + i % 3; n > 0; --n) {
+                body[random.nextInt(body.length)] = (byte) random.nextInt(256);
+            }
+            Verdict verdict;
+            try {
+                verdict = ProvisioningDocument.parse(body).verdict();
+            } catch (ProvisioningException noDocument) {
+                continue;
+            }
+            List<Integer> offsets = new ArrayList<>();
+            List<Item> otherwise =
+                    verdict.describeOtherwise(
+                            (offset, length, depth, meaning) -> {
+                                assertTrue(length > 0 && offset + length <= body.length + 1);
+                                assertTrue(meaning.startsWith("the library "), meaning);
+                                assertFalse(meaning.contains("null"), meaning);
+                                offsets.add(offset);
+                            });
+            assertEquals(verdict.readOtherwise(), otherwise);
+            assertEquals(offsets.stream().sorted().toList(), offsets);
+            compared += otherwise.isEmpty() ? 0 : 1;
+            assertTrue(otherwise.isEmpty() || !offsets.isEmpty(), HexFormat.of().formatHex(body));
+        }
+        assertTrue(compared > 300, compared + " are read otherwise");
     }
 
     // ---- Limits
