@@ -42,10 +42,6 @@ final class LibraryHeader {
         this.refusal = refusal;
     }
 
-    boolean isTaken() {
-        return refusal == null;
-    }
-
     /** Reads the header of a push. */
     static LibraryHeader of(byte[] push) {
         Refusal refusal = refusal(push);

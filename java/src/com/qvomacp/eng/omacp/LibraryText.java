@@ -114,14 +114,12 @@ abstract class LibraryText {
     // ---- Stops
 
     static LibraryStop misplaced(Place place, int offset) {
-        return new LibraryStop(LibraryStop.UNKNOWN_ELEMENT, Cause.MISPLACED, place, offset);
+        return new LibraryStop(Cause.MISPLACED, place, offset);
     }
 
     /** A text that could not be read, or be kept. */
     private LibraryStop unreadable(Cause cause, Place place, int offset) {
-        return limited
-                ? new LibraryStop(LibraryStop.NO_MEMORY, Cause.TOO_MUCH_TEXT, place, offset)
-                : new LibraryStop(LibraryStop.NO_DATA, cause, place, offset);
+        return new LibraryStop(limited ? Cause.TOO_MUCH_TEXT : cause, place, offset);
     }
 
     final void checkLimit(Place place, int offset) throws LibraryStop {
@@ -134,7 +132,7 @@ abstract class LibraryText {
 
     final int peek(Place place) throws LibraryStop {
         if (at >= size) {
-            throw new LibraryStop(LibraryStop.NO_DATA, Cause.ENDED, place, size);
+            throw new LibraryStop(Cause.ENDED, place, size);
         }
         return data[at] & 0xFF;
     }
@@ -323,7 +321,7 @@ abstract class LibraryText {
             } else if (token == STR_T) {
                 tableReference(start);
             } else if (!joinToken(token)) {
-                throw unreadable(Cause.MISPLACED, Place.IN_VALUE, start);
+                throw unreadable(Cause.MISPLACED_IN_VALUE, Place.IN_VALUE, start);
             }
             if (at >= size) {
                 throw unreadable(Cause.ENDED, Place.IN_VALUE, size);

@@ -67,7 +67,7 @@ final class LibraryWalk extends LibraryText {
     /** Walks over the body. */
     void run() throws LibraryStop {
         if (size == 0) {
-            throw new LibraryStop(LibraryStop.BAD_ARGUMENT, Cause.EMPTY_BODY, Place.DOCUMENT, 0);
+            throw new LibraryStop(Cause.EMPTY_BODY, Place.DOCUMENT, 0);
         }
         header();
         elementsAt = at;
@@ -98,12 +98,15 @@ final class LibraryWalk extends LibraryText {
         ++at;
         unreadItem = unreadHeaderItem();
         if (publicId != PROVISIONING && (publicId != 0 || !isTypeInTable())) {
-            throw new LibraryStop(
-                    LibraryStop.WRONG_DOCUMENT_TYPE,
-                    Cause.DOCUMENT_TYPE,
-                    Place.DOCUMENT,
-                    Math.min(1, size));
+            boolean isEnd = unreadItem != null && at >= size;
+            int offset = isEnd ? size : isTypeText() ? tableAt : 1;
+            throw new LibraryStop(Cause.DOCUMENT_TYPE, Place.DOCUMENT, offset);
         }
+    }
+
+    /** Whether the type has to be the text that the string table begins with. */
+    boolean isTypeText() {
+        return publicId == 0 && unreadItem == null;
     }
 
     /** Reads the header behind the version, up to the item that cannot be read. */
@@ -286,8 +289,8 @@ final class LibraryWalk extends LibraryText {
                 nameLength = -1;
                 int start = at;
                 if (!switchPage()) {
-                    Cause cause = isSwitchWhole ? Cause.NO_SUCH_PAGE : Cause.ENDED;
-                    throw new LibraryStop(LibraryStop.UNKNOWN_ELEMENT, cause, Place.TYPE, start);
+                    Cause cause = isSwitchWhole ? Cause.NO_SUCH_PAGE : Cause.ENDED_IN_SWITCH;
+                    throw new LibraryStop(cause, Place.TYPE, start);
                 }
             } else if (token == LibraryKind.TYPE_AS_TEXT) {
                 ++at;
@@ -476,13 +479,12 @@ final class LibraryWalk extends LibraryText {
         parmToken = NAME_AS_TEXT;
         readName();
         if (nameLength <= 0 && !kind.takesEmptyName()) {
-            throw new LibraryStop(LibraryStop.FAILED, Cause.EMPTY_NAME, Place.PARM, start);
+            throw new LibraryStop(Cause.EMPTY_NAME, Place.PARM, start);
         }
         trace.name(this);
         if (peek(Place.BEHIND_NAME) == VALUE) {
             if (!kind.takesName(name, keptLength())) {
-                throw new LibraryStop(
-                        LibraryStop.UNKNOWN_ELEMENT, Cause.UNKNOWN_NAME, Place.PARM, at);
+                throw new LibraryStop(Cause.UNKNOWN_NAME, Place.PARM, at);
             }
             newText();
             value();

@@ -153,7 +153,7 @@ public final class ProvisioningDocument {
 
     /** {@return whether the native library takes the body, worked out at each call} */
     public Verdict verdict() {
-        return LibraryRules.verdictOnBody(body, this);
+        return Verdict.onBody(body, this);
     }
 
     /**

@@ -159,7 +159,7 @@ public final class ProvisioningMessage {
         }
         System.arraycopy(head, 0, push, front, head.length);
         System.arraycopy(body, 0, push, bodyAt, body.length);
-        return LibraryRules.verdictOnPush(push, bodyAt, document);
+        return Verdict.onPush(push, bodyAt, document);
     }
 
     /** How many bytes stand in front of headers: identifier, type, and length, 7 bits a byte. */

@@ -40,7 +40,7 @@ class VerdictTest {
         } catch (ProvisioningException unreadable) {
             // The verdict is on bytes that nobody else can read, too.
         }
-        return LibraryRules.verdictOnBody(body, document);
+        return Verdict.onBody(body, document);
     }
 
     private static Verdict of(String hex) {
@@ -52,7 +52,7 @@ class VerdictTest {
     }
 
     private static Verdict ofPush(byte[] push) {
-        return LibraryRules.verdictOnPush(push, push.length, null);
+        return Verdict.onPush(push, push.length, null);
     }
 
     private static void assertRefused(Verdict verdict, int code, int offset, String reason) {
@@ -358,7 +358,7 @@ class VerdictTest {
             body.writeBytes(HexFormat.of().parseHex("8300"));
         }
         body.writeBytes(HexFormat.of().parseHex("01010101"));
-        Verdict verdict = LibraryRules.verdictOnBody(body.toByteArray(), null);
+        Verdict verdict = Verdict.onBody(body.toByteArray(), null);
         assertRefused(verdict, 4111, 60291, "the body is decoded to too much text");
         assertEquals("QVS_ERROR_NO_MEMORY", verdict.codeName());
         assertEquals("wap-provisioningdoc / NAPDEF 1 / NAME", verdict.path());
@@ -379,7 +379,7 @@ class VerdictTest {
         Thread thread =
                 new Thread(
                         null,
-                        () -> verdict[0] = LibraryRules.verdictOnBody(body, null),
+                        () -> verdict[0] = Verdict.onBody(body, null),
                         "small stack",
                         SMALL_STACK);
         thread.start();
@@ -459,7 +459,7 @@ class VerdictTest {
         ProvisioningDocument document = ProvisioningDocument.parse(body);
         assertEquals(
                 document.verdict(),
-                LibraryRules.verdictOnPush(Push.push(body), 4, document));
+                Verdict.onPush(Push.push(body), 4, document));
     }
 
     /** A length of more than 127 takes two bytes, of which the library reads one. */
@@ -471,7 +471,7 @@ class VerdictTest {
         byte[] body = document(characteristic("PORT"));
         push.writeBytes(body);
         Verdict verdict =
-                LibraryRules.verdictOnPush(
+                Verdict.onPush(
                         push.toByteArray(), 4 + 0xB6, ProvisioningDocument.parse(body));
         assertFalse(verdict.isAccepted());
         assertTrue(
