@@ -76,6 +76,11 @@ public final class Other extends Item {
     }
 
     @Override
+    String called() {
+        return name;
+    }
+
+    @Override
     void step(StringBuilder path) {
         Printable.append(path, name == null ? kind().name().toLowerCase(Locale.ROOT) : name);
     }

@@ -54,6 +54,11 @@ public final class Parameter extends Item {
     }
 
     @Override
+    String called() {
+        return name;
+    }
+
+    @Override
     void step(StringBuilder path) {
         Printable.append(path, name == null ? Element.PARM.text : name);
     }

@@ -112,7 +112,7 @@ public final class ProvisioningDocument {
 
     /** {@return the characteristics directly in the document element; as {@link #children}} */
     public List<Characteristic> characteristics() {
-        return Characteristic.in(root);
+        return root.children(Characteristic.class, null);
     }
 
     /**
@@ -120,7 +120,7 @@ public final class ProvisioningDocument {
      * @param type what TYPE is, in exactly this case
      */
     public List<Characteristic> characteristics(String type) {
-        return Characteristic.in(root, type);
+        return root.children(Characteristic.class, Objects.requireNonNull(type));
     }
 
     /**
@@ -136,7 +136,7 @@ public final class ProvisioningDocument {
      * @param item an item of this document
      */
     public String path(Item item) {
-        return ItemPath.of(item);
+        return item.path();
     }
 
     /** {@return where the body departs from the format, in its order; not modifiable} */

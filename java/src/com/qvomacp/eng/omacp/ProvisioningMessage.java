@@ -1,5 +1,6 @@
 package com.qvomacp.eng.omacp;
 
+import java.io.ByteArrayOutputStream;
 import java.util.Arrays;
 import java.util.List;
 
@@ -148,36 +149,17 @@ public final class ProvisioningMessage {
         if (header == null) {
             return document.verdict();
         }
-        byte[] head = header.bytes();
+        ByteArrayOutputStream head = new ByteArrayOutputStream();
+        if (header.transactionIdentifier() == PushHeader.NO_TRANSACTION) {
+            head.write(0);
+            head.write(PUSH);
+            BodyWriter.integer(header.length(), head);
+        }
+        head.write(header.bytes(), 0, header.length());
         byte[] body = document.bytes();
-        int front = header.transactionIdentifier() == PushHeader.NO_TRANSACTION ? front(head) : 0;
-        int bodyAt = front + head.length;
-        byte[] push = new byte[bodyAt + body.length];
-        if (front > 0) {
-            push[1] = PUSH;
-            putLength(push, front, head.length);
-        }
-        System.arraycopy(head, 0, push, front, head.length);
-        System.arraycopy(body, 0, push, bodyAt, body.length);
-        return Verdict.onPush(push, bodyAt, document);
-    }
-
-    /** How many bytes stand in front of headers: identifier, type, and length, 7 bits a byte. */
-    private static int front(byte[] headers) {
-        int front = 3;
-        for (int rest = headers.length >>> 7; rest != 0; rest >>>= 7) {
-            ++front;
-        }
-        return front;
-    }
-
-    /** Writes a length up to an offset, the high bit set in all bytes but the last. */
-    private static void putLength(byte[] push, int end, int length) {
-        int rest = length;
-        for (int at = end - 1; at > 1; --at) {
-            push[at] = (byte) (rest & 0x7F | (at < end - 1 ? 0x80 : 0));
-            rest >>>= 7;
-        }
+        byte[] push = Arrays.copyOf(head.toByteArray(), head.size() + body.length);
+        System.arraycopy(body, 0, push, head.size(), body.length);
+        return Verdict.onPush(push, head.size(), document);
     }
 
     /**
