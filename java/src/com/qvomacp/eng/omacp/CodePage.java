@@ -13,6 +13,8 @@ final class CodePage {
     private final String[] begins = new String[FIRST_VALUE];
     private final String[] values = new String[0x100 - FIRST_VALUE];
 
+    private static final CodePage NONE = new CodePage();
+
     /** The pages that the format has. */
     private static final CodePage[] PAGES = {
         new CodePage()
@@ -142,9 +144,9 @@ final class CodePage {
         table[place] = entry;
     }
 
-    /** A page, or {@code null} for one that the format does not have. */
+    /** A page; an empty one for a number that the format does not have. */
     static CodePage of(int page) {
-        return page < PAGES.length ? PAGES[page] : null;
+        return page < PAGES.length ? PAGES[page] : NONE;
     }
 
     /** What a token without its bits for attributes and content stands for, or {@code null}. */
