@@ -35,7 +35,7 @@ public final class Characteristic extends Item {
         return type;
     }
 
-    /** {@return how the type is written: how; {@code null} without a type} */
+    /** {@return how the type is written; {@code null} without a type} */
     public Writing typeWriting() {
         return Writing.of(typeWriting);
     }

@@ -149,17 +149,22 @@ public final class ProvisioningMessage {
         if (header == null) {
             return document.verdict();
         }
-        ByteArrayOutputStream head = new ByteArrayOutputStream();
-        if (header.transactionIdentifier() == PushHeader.NO_TRANSACTION) {
-            head.write(0);
-            head.write(PUSH);
-            BodyWriter.integer(header.length(), head);
-        }
-        head.write(header.bytes(), 0, header.length());
+        boolean isAlone = header.transactionIdentifier() == PushHeader.NO_TRANSACTION;
+        byte[] head = isAlone ? push(header.bytes()) : header.bytes();
         byte[] body = document.bytes();
-        byte[] push = Arrays.copyOf(head.toByteArray(), head.size() + body.length);
-        System.arraycopy(body, 0, push, head.size(), body.length);
-        return Verdict.onPush(push, head.size(), document);
+        byte[] push = Arrays.copyOf(head, head.length + body.length);
+        System.arraycopy(body, 0, push, head.length, body.length);
+        return Verdict.onPush(push, head.length, document);
+    }
+
+    /** Headers as they stand in a push. */
+    private static byte[] push(byte[] headers) {
+        ByteArrayOutputStream push = new ByteArrayOutputStream();
+        push.write(0);
+        push.write(PUSH);
+        BodyWriter.integer(headers.length, push);
+        push.write(headers, 0, headers.length);
+        return push.toByteArray();
     }
 
     /**
@@ -261,7 +266,6 @@ public final class ProvisioningMessage {
                 && document.equals(that.document);
     }
 
-    /** {@return a number that fits {@link #equals}: the same number for equal messages} */
     @Override
     public int hashCode() {
         return 31 * (header == null ? 0 : header.hashCode()) + document.hashCode();

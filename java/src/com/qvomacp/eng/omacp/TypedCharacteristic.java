@@ -116,7 +116,6 @@ public abstract class TypedCharacteristic {
                 && ((TypedCharacteristic) other).characteristic.equals(characteristic);
     }
 
-    /** {@return a number that fits {@link #equals}: the same number for equal objects} */
     @Override
     public final int hashCode() {
         return characteristic.hashCode();
