@@ -140,11 +140,8 @@ final class ReadOtherwise extends LibraryTrace {
 
     private String reads(int element) {
         String what = pairs[element] == CHARACTERISTIC ? "a characteristic" : "a parm";
-        return "reads " + what + (names[element] == null ? "" : " " + name(element));
-    }
-
-    private String name(int element) {
-        return Printable.of(names[element]);
+        boolean isNamed = names[element] != null && !names[element].isEmpty();
+        return "reads " + what + (isNamed ? " " + Printable.of(names[element]) : "");
     }
 
     /** What the library makes of the bytes of an item; null for the same. */
