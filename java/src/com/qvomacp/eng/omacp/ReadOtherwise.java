@@ -1,17 +1,38 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.ArrayDeque;
 import java.util.ArrayList;
-import java.util.Arrays;
+import java.util.Deque;
 import java.util.List;
 import java.util.Objects;
 
 /** Compares what the native library's walk reads with the items of the tree. */
 final class ReadOtherwise extends LibraryTrace {
     private static final int OPEN = -1;
-    private static final int CHARACTERISTIC = -1;
-    private static final int SKIPPED = -2;
-    private static final int BEGIN = 64;
     private static final int END_MASK = 0x3F;
+
+    private enum Kind { CHARACTERISTIC, PARM, SKIPPED }
+
+    /** What the walk reads. */
+    private static final class Part {
+        final Kind kind;
+        final int start;
+        int end = OPEN;
+
+        /** What it is called; null for what the library does not know. */
+        String name;
+
+        /** How many pairs of name and value a parm has. */
+        int pairs;
+
+        /** The end of a parm's value; 0 without one. */
+        int valueEnd;
+
+        Part(Kind kind, int start) {
+            this.kind = kind;
+            this.start = start;
+        }
+    }
 
     private final byte[] body;
     private final ProvisioningDocument document;
@@ -21,25 +42,11 @@ final class ReadOtherwise extends LibraryTrace {
 
     private final ByteVisitor visitor;
 
-    /** What the walk reads, in the order in which it begins. */
-    private int count;
+    /** In the order in which they begin. */
+    private final List<Part> parts = new ArrayList<>();
 
-    private int[] starts = new int[BEGIN];
-    private int[] ends = new int[BEGIN];
-
-    /** What it is called; null for what the library does not know. */
-    private String[] names = new String[BEGIN];
-
-    /** How many pairs of name and value a parm has; what else it is. */
-    private int[] pairs = new int[BEGIN];
-
-    /** The end of a parm's value; 0 without one. */
-    private int[] valueEnds = new int[BEGIN];
-
-    /** The elements whose ends have not been read. */
-    private int[] open = new int[16];
-
-    private int depth;
+    /** Those whose ends have not been read, the innermost first. */
+    private final Deque<Part> open = new ArrayDeque<>();
 
     private ReadOtherwise(
             byte[] body, ProvisioningDocument document, int shift, ByteVisitor visitor) {
@@ -98,147 +105,132 @@ final class ReadOtherwise extends LibraryTrace {
         items.next();
         for (Item item; (item = items.next()) != null && item.offset() + shift < end; ) {
             int start = item.offset() + shift;
-            for (; next < count && isBefore(next, start); ++next) {
-                told = tellAlone(next, told);
+            for (; next < parts.size() && isBefore(parts.get(next), start); ++next) {
+                told = tellAlone(parts.get(next), told);
             }
             int itemEnd = start + item.length();
-            if (next == count || starts[next] > start) {
+            if (next == parts.size() || parts.get(next).start > start) {
                 otherwise.add(item);
                 if (start >= told) {
                     tell(start, itemEnd, "reads no element here");
                 }
                 continue;
             }
-            String reading = reading(next, item, itemEnd);
+            Part part = parts.get(next++);
+            String reading = reading(part, item, itemEnd);
             if (reading != null) {
                 otherwise.add(item);
-                tell(start, ends[next], reading);
+                tell(start, part.end, reading);
             }
-            ++next;
         }
-        for (; next < count; ++next) {
-            told = tellAlone(next, told);
+        for (; next < parts.size(); ++next) {
+            told = tellAlone(parts.get(next), told);
         }
         return otherwise;
     }
 
-    private boolean isBefore(int element, int start) {
-        return starts[element] < start || starts[element] == start && pairs[element] == SKIPPED;
+    private static boolean isBefore(Part part, int start) {
+        return part.start < start || part.start == start && part.kind == Kind.SKIPPED;
     }
 
     /** Tells of what no item stands for, and up to where no more is to be told. */
-    private int tellAlone(int element, int told) {
-        int start = starts[element];
-        if (pairs[element] != SKIPPED) {
-            tell(start, ends[element], reads(element));
+    private int tellAlone(Part part, int told) {
+        if (part.kind != Kind.SKIPPED) {
+            tell(part.start, part.end, reads(part));
             return told;
         }
-        String bytes = Refusal.bytes(ends[element] - start);
-        tell(start, ends[element], "skips " + bytes + " from here on, " + names[element]);
-        return Math.max(told, ends[element]);
+        String bytes = Refusal.bytes(part.end - part.start);
+        tell(part.start, part.end, "skips " + bytes + " from here on, " + part.name);
+        return Math.max(told, part.end);
     }
 
-    private String reads(int element) {
-        String what = pairs[element] == CHARACTERISTIC ? "a characteristic" : "a parm";
-        boolean isNamed = names[element] != null && !names[element].isEmpty();
-        return "reads " + what + (isNamed ? " " + Printable.of(names[element]) : "");
+    private static String reads(Part part) {
+        String what = part.kind == Kind.CHARACTERISTIC ? "a characteristic" : "a parm";
+        boolean isNamed = part.name != null && !part.name.isEmpty();
+        return "reads " + what + (isNamed ? " " + Printable.of(part.name) : "");
     }
 
     /** What the library makes of the bytes of an item; null for the same. */
-    private String reading(int element, Item item, int end) {
-        boolean isCharacteristic = pairs[element] == CHARACTERISTIC;
-        Class<?> kind = isCharacteristic ? Characteristic.class : Parameter.class;
-        if (!kind.isInstance(item)) {
-            return reads(element);
+    private String reading(Part part, Item item, int end) {
+        boolean isCharacteristic = part.kind == Kind.CHARACTERISTIC;
+        boolean isOpen = part.end == OPEN;
+        if (!(isCharacteristic ? item instanceof Characteristic : item instanceof Parameter)) {
+            return reads(part);
         }
-        boolean isOpen = ends[element] == OPEN;
-        if (isCharacteristic) {
-            String type = ((Characteristic) item).type();
-            // One that is open and of no known type is where the library refuses the message.
-            if (!Objects.equals(names[element], type) && !(isOpen && names[element] == null)) {
-                return names[element] == null ? "knows no such TYPE" : reads(element);
-            }
+        // One that is open and of no known type is where the library refuses the message.
+        if (isCharacteristic
+                && !Objects.equals(part.name, item.called())
+                && !(isOpen && part.name == null)) {
+            return part.name == null ? "knows no such TYPE" : reads(part);
         }
         if (isOpen) {
             return null;
         }
-        if (ends[element] != end) {
-            boolean isNext = ends[element] == end + 1 && (body[end] & END_MASK) == BodyReader.END;
-            return isNext ? "takes the next END for its own" : "ends this " + by(ends[element] - end);
+        if (part.end != end) {
+            boolean isNext = part.end == end + 1 && (body[end] & END_MASK) == BodyReader.END;
+            String by = Refusal.bytes(Math.abs(part.end - end));
+            String ends = "ends this " + by + (part.end < end ? " earlier" : " later");
+            return isNext ? "takes the next END for its own" : ends;
         }
-        return isCharacteristic ? null : reading(element, (Parameter) item, end);
+        return isCharacteristic ? null : reading(part, (Parameter) item, end);
     }
 
-    private static String by(int bytes) {
-        return Refusal.bytes(Math.abs(bytes)) + (bytes < 0 ? " earlier" : " later");
-    }
-
-    private String reading(int parm, Parameter parameter, int end) {
-        if (pairs[parm] != 1) {
-            return pairs[parm] == 0 ? "reads no NAME" : "joins " + pairs[parm] + " parameters";
+    private static String reading(Part parm, Parameter parameter, int end) {
+        if (parm.pairs != 1) {
+            return parm.pairs == 0 ? "reads no NAME" : "joins " + parm.pairs + " parameters";
         }
-        if (!Objects.equals(names[parm], parameter.name())) {
+        if (!Objects.equals(parm.name, parameter.name())) {
             return reads(parm);
         }
-        if (valueEnds[parm] == (parameter.value() == null ? 0 : end - 1)) {
+        if (parm.valueEnd == (parameter.value() == null ? 0 : end - 1)) {
             return null;
         }
-        return valueEnds[parm] == 0 ? "reads no value" : "ends the value before the END";
+        return parm.valueEnd == 0 ? "reads no value" : "ends the value before the END";
     }
 
-    private int add(int start, int end, String name, int kind) {
-        if (count == starts.length) {
-            starts = Arrays.copyOf(starts, 2 * count);
-            ends = Arrays.copyOf(ends, 2 * count);
-            names = Arrays.copyOf(names, 2 * count);
-            pairs = Arrays.copyOf(pairs, 2 * count);
-            valueEnds = Arrays.copyOf(valueEnds, 2 * count);
-        }
-        starts[count] = start;
-        ends[count] = end;
-        names[count] = name;
-        pairs[count] = kind;
-        valueEnds[count] = 0;
-        return count++;
+    private Part add(Kind kind, int start) {
+        Part part = new Part(kind, start);
+        parts.add(part);
+        return part;
     }
 
     @Override
     void begin(int start, boolean isParm) {
-        if (depth == open.length) {
-            open = Arrays.copyOf(open, 2 * depth);
-        }
-        open[depth++] = add(start, OPEN, null, isParm ? 0 : CHARACTERISTIC);
+        open.push(add(isParm ? Kind.PARM : Kind.CHARACTERISTIC, start));
     }
 
     @Override
     void type(LibraryWalk walk, int outer, int start, LibraryKind kind) {
-        names[open[depth - 1]] = kind == null ? null : kind.type;
+        open.peek().name = kind == null ? null : kind.type;
     }
 
     @Override
     void name(LibraryWalk walk) {
-        int parm = open[depth - 1];
-        if (pairs[parm]++ == 0) {
-            names[parm] = walk.parmName();
+        if (open.peek().pairs++ == 0) {
+            open.peek().name = walk.parmName();
         }
     }
 
     @Override
     void value(int end) {
-        valueEnds[open[depth - 1]] = end;
+        open.peek().valueEnd = end;
     }
 
     @Override
     void end(int end) {
-        ends[open[--depth]] = end;
+        open.pop().end = end;
     }
 
     /** What was skipped within it is part of it. */
     @Override
     void skipped(String what, int start, int end) {
-        while (count > 0 && pairs[count - 1] == SKIPPED && starts[count - 1] >= start) {
-            --count;
+        for (int last = parts.size() - 1;
+                last >= 0 && parts.get(last).kind == Kind.SKIPPED && parts.get(last).start >= start;
+                --last) {
+            parts.remove(last);
         }
-        add(start, end, what, SKIPPED);
+        Part part = add(Kind.SKIPPED, start);
+        part.name = what;
+        part.end = end;
     }
 }
