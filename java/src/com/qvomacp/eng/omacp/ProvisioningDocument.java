@@ -112,7 +112,7 @@ public final class ProvisioningDocument {
 
     /** {@return the characteristics directly in the document element; as {@link #children}} */
     public List<Characteristic> characteristics() {
-        return Characteristic.in(root);
+        return root.children(Characteristic.class, null);
     }
 
     /**
@@ -120,7 +120,7 @@ public final class ProvisioningDocument {
      * @param type what TYPE is, in exactly this case
      */
     public List<Characteristic> characteristics(String type) {
-        return Characteristic.in(root, type);
+        return root.children(Characteristic.class, Objects.requireNonNull(type));
     }
 
     /**
@@ -136,7 +136,7 @@ public final class ProvisioningDocument {
      * @param item an item of this document
      */
     public String path(Item item) {
-        return ItemPath.of(item);
+        return item.path();
     }
 
     /** {@return where the body departs from the format, in its order; not modifiable} */
@@ -153,7 +153,7 @@ public final class ProvisioningDocument {
 
     /** {@return whether the native library takes the body, worked out at each call} */
     public Verdict verdict() {
-        return LibraryRules.verdictOnBody(body, this);
+        return Verdict.onBody(body, this);
     }
 
     /**
@@ -168,42 +168,36 @@ public final class ProvisioningDocument {
         read(describer);
     }
 
+    /**
+     * Tells what each byte of a body means, as {@link #describe(ByteVisitor)}, as far as it can be
+     * read. Nothing is kept of a document that is too much for {@link #parse}.
+     *
+     * @param body a WBXML body, not to be changed meanwhile
+     * @param options the limits
+     * @param visitor who is told
+     * @throws ProvisioningException as {@link #parse}, once what stands before has been told
+     */
+    public static void describe(byte[] body, ReadOptions options, ByteVisitor visitor)
+            throws ProvisioningException {
+        ProvisioningException.checkInput(body.length, options);
+        BodyHeader header = new BodyHeader(body);
+        Describer describer = new Describer(visitor);
+        describer.header(body, header);
+        new BodyReader(body, header, options.textLimit(), describer).read();
+    }
+
     /** The body, not to be changed. */
     byte[] bytes() {
         return body;
     }
 
+    BodyHeader header() {
+        return header;
+    }
+
     /** The document element. */
     Item root() {
         return root;
-    }
-
-    /** The innermost item that some byte of the body is in; the document for one outside of all. */
-    Item itemAt(int offset) {
-        Item item = root;
-        for (Item inner = item; inner != null; inner = childAt(item, offset)) {
-            item = inner;
-        }
-        return item;
-    }
-
-    private static Item childAt(Item item, int offset) {
-        Item[] children = item.inside();
-        int low = 0;
-        int high = children.length;
-        while (low < high) {
-            int middle = (low + high) >>> 1;
-            if (children[middle].offset() <= offset) {
-                low = middle + 1;
-            } else {
-                high = middle;
-            }
-        }
-        if (low == 0) {
-            return null;
-        }
-        Item last = children[low - 1];
-        return offset < last.offset() + last.length() ? last : null;
     }
 
     /** Reads the body again, which went well before, for another listener. */

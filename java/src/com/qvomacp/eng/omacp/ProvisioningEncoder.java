@@ -150,7 +150,7 @@ public final class ProvisioningEncoder {
                 source.parameter(((Parameter) item).name(), ((Parameter) item).value());
             } else {
                 throw EncodingException.in(
-                        ItemPath.of(item), "what stands here is no element of the document type");
+                        item.path(), "what stands here is no element of the document type");
             }
         }
     }

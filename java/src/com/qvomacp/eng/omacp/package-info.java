@@ -5,8 +5,9 @@
  * <h2>The message and its tree</h2>
  *
  * <p>{@link com.qvomacp.eng.omacp.ProvisioningMessage} has the characteristics of a message by their
- * kinds, such as {@link com.qvomacp.eng.omacp.AccessPoint}, with an accessor for each parameter of the
- * kind: the first one of its name, or a list where there may be several. They are views: {@link
+ * kinds, such as {@link com.qvomacp.eng.omacp.AccessPoint}, with accessors for what messages set in
+ * them: the first parameter of its name, or a list where there may be several; any other parameter is
+ * told by its name. They are views: {@link
  * com.qvomacp.eng.omacp.ProvisioningDocument} is the tree that they look at, with everything that was
  * read. Types and names are compared exactly as OMA writes them.
  *

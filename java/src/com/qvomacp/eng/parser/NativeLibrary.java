@@ -77,19 +77,8 @@ public final class NativeLibrary {
     }
 
     private static String machine(String architecture) {
-        switch (architecture.toLowerCase(Locale.ROOT)) {
-            case "x86":
-            case "i386":
-            case "i486":
-            case "i586":
-            case "i686":
-                return "x86";
-            case "amd64":
-            case "x86_64":
-                return "x86_64";
-            default:
-                return architecture.toLowerCase(Locale.ROOT);
-        }
+        String machine = architecture.toLowerCase(Locale.ROOT);
+        return machine.matches("i[3-6]86") ? "x86" : machine.equals("amd64") ? "x86_64" : machine;
     }
 
     private static UnsatisfiedLinkError error(String text, Throwable cause) {
