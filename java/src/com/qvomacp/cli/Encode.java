@@ -120,7 +120,7 @@ final class Encode extends Job {
     }
 
     /** Whether it begins with a tag, in UTF-8 or UTF-16, and not with that of a push. */
-    private static boolean isXml(byte[] content) {
+    static boolean isXml(byte[] content) {
         int at = 0;
         while (at < content.length
                 && "\u00EF\u00BB\u00BF\u00FE\u00FF\0 \t\r\n".indexOf(content[at] & 0xFF) >= 0) {

@@ -31,8 +31,8 @@ import picocli.CommandLine.ParseResult;
         },
         exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
-            "0:every message was shown or written, or its MAC is right",
-            "1:a message or a document is refused, or its MAC is not right",
+            "0:every message was shown or written, its MAC is right, or no error was found",
+            "1:a message or a document is refused, its MAC is not right, or an error was found",
             "2:wrong usage, a message cannot be read, the output cannot be written,"
                     + " or the library that is asked cannot be loaded"
         })
@@ -130,6 +130,7 @@ public final class Main {
                 .addSubcommand(new Show())
                 .addSubcommand(Choices.command(new Verify()))
                 .addSubcommand(Choices.command(new Encode()))
+                .addSubcommand(new Lint())
                 .addSubcommand(new Completion())
                 .setExpandAtFiles(false)
                 .setCaseInsensitiveEnumValuesAllowed(true);

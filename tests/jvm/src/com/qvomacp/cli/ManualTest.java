@@ -3,11 +3,15 @@ package com.qvomacp.cli;
 import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
+import com.qvomacp.eng.omacp.Rule;
 import java.io.ByteArrayInputStream;
 import java.io.ByteArrayOutputStream;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.Path;
+import java.util.EnumMap;
+import java.util.Locale;
+import java.util.Map;
 import java.util.Set;
 import java.util.TreeSet;
 import java.util.concurrent.TimeUnit;
@@ -79,6 +83,22 @@ class ManualTest {
                                 .exitCodeList()
                                 .keySet()),
                 found("\n\\.TP\n\\.B (\\d)\n", section("\"EXIT STATUS\"")));
+    }
+
+    @Test
+    void theManualHasTheRulesByTheirSeverity() throws Exception {
+        Map<Rule.Severity, Set<String>> rules = new EnumMap<>(Rule.Severity.class);
+        for (Rule rule : Rule.values()) {
+            rules.computeIfAbsent(rule.severity(), severity -> new TreeSet<>()).add(rule.ruleName());
+        }
+        Map<Rule.Severity, Set<String>> told = new EnumMap<>(Rule.Severity.class);
+        for (Rule.Severity severity : Rule.Severity.values()) {
+            String[] paragraphs = section("RULES").toLowerCase(Locale.ROOT).split("\n\\.pp\n");
+            String bold = String.join(" ", found("(?m)^\\.br? (.*)$", paragraphs[severity.ordinal()]));
+            told.put(severity, found("(?<![\\w-])([a-z]+(?:-[a-z]+)*)", bold));
+            told.get(severity).remove("and");
+        }
+        assertEquals(rules, told);
     }
 
     @Test

@@ -1,0 +1,155 @@
+package com.qvomacp.cli;
+
+import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.Finding;
+import com.qvomacp.eng.omacp.ProvisioningEncoder;
+import com.qvomacp.eng.omacp.Rule;
+import com.qvomacp.eng.omacp.Rule.Severity;
+import java.util.EnumSet;
+import java.util.List;
+import java.util.Locale;
+import java.util.Set;
+import picocli.CommandLine.Command;
+import picocli.CommandLine.Option;
+
+/** Tells what is wrong with messages. */
+@Command(
+        name = "lint",
+        description = {
+            "Tell what is wrong with messages, and what would be right.",
+            "A FILE may hold a document in XML, too."
+        },
+        customSynopsis = "omacp lint [-h] [OPTION...] [FILE...]",
+        sortOptions = false,
+        parameterListHeading = "%n",
+        optionListHeading = "%nOptions:%n",
+        exitCodeListHeading = "%nExit status:%n",
+        exitCodeList = {
+            "0:no error was found and, with --strict, no warning",
+            "1:an error was found or, with --strict, a warning",
+            "2:wrong usage, a message or document cannot be read, the output cannot be written"
+        })
+final class Lint extends JsonJob {
+    @Option(
+            names = {"--no", "--disable"},
+            paramLabel = "RULE",
+            split = ",",
+            description = "Leave out a rule, or several with commas between their names.")
+    private List<String> disabled;
+
+    @Option(names = "--strict", description = "End with 1 for warnings, too.")
+    private boolean strict;
+
+    private final Set<Rule> left = EnumSet.allOf(Rule.class);
+
+    @Override
+    void begin() {
+        if (disabled != null) {
+            for (String name : disabled) {
+                if (!left.remove(Rule.named(name)) && Rule.named(name) == null) {
+                    throw new UsageException("--no is given what is no rule: " + name);
+                }
+            }
+        }
+        super.begin();
+    }
+
+    @Override
+    boolean takes(String name, byte[] content) {
+        if (!Encode.isXml(content)) {
+            return false;
+        }
+        try {
+            tell(name, ProvisioningEncoder.lint(content));
+        } catch (EncodingException unreadable) {
+            refuse(name, unreadable);
+        }
+        return true;
+    }
+
+    @Override
+    void run(Held held) {
+        Reading reading = Reading.of(held, limit());
+        if (reading.message == null) {
+            console.raise(Console.FAILED);
+            complain(Refusal.of(reading).write(startOf(held.name), errPalette()));
+            failed(held.name, reading.failure.getMessage());
+        } else {
+            tell(held.name, reading.message.lint());
+        }
+    }
+
+    /** What is refused elsewhere is here what cannot be read. */
+    @Override
+    void fail(int status, String name, String reason) {
+        super.fail(Console.FAILED, name, reason);
+    }
+
+    private void tell(String name, List<Finding> findings) {
+        if (isJson()) {
+            beginObject(name);
+            writer.name("findings").beginArray();
+        }
+        for (Finding finding : findings) {
+            if (left.contains(finding.rule())) {
+                Severity severity = finding.rule().severity();
+                boolean counts = severity == Severity.ERROR || strict && severity == Severity.WARNING;
+                console.raise(counts ? Console.REFUSED : Console.DONE);
+                if (isJson()) {
+                    json(finding);
+                } else {
+                    text(name, finding);
+                }
+            }
+        }
+        if (isJson()) {
+            writer.end();
+            endObject();
+        }
+    }
+
+    private static String severity(Finding finding) {
+        return finding.rule().severity().name().toLowerCase(Locale.ROOT);
+    }
+
+    private void text(String name, Finding finding) {
+        StringBuilder place = new StringBuilder(Visible.of(name));
+        if (finding.line() > 0) {
+            place.append(':').append(finding.line()).append(':').append(finding.column());
+        } else if (finding.offset() >= 0) {
+            place.append(':').append(finding.offset());
+        }
+        String severity = severity(finding) + ":";
+        String rule = " [" + finding.rule().ruleName() + "]";
+        String text = place + ": " + severity + " " + Visible.of(finding.sentence()) + rule;
+        List<String> lines = Lines.of(text, Lines.WIDTH - TextWriter.INDENT);
+        boolean isError = finding.rule().severity() == Severity.ERROR;
+        String painted = isError ? outPalette().error(severity) : outPalette().bold(severity);
+        console.out.println(lines.get(0).replaceFirst("(?<=: )" + severity, painted));
+        indented(lines.subList(1, lines.size()));
+        String told = "in " + finding.path() + "; right: " + finding.remedy();
+        told += "; see " + finding.rule().reference();
+        indented(Lines.of(Visible.of(told), Lines.WIDTH - TextWriter.INDENT));
+    }
+
+    private void indented(List<String> lines) {
+        for (String line : lines) {
+            console.out.append("  ").println(line);
+        }
+    }
+
+    private void json(Finding finding) {
+        writer.beginObject();
+        writer.member("rule", finding.rule().ruleName()).member("severity", severity(finding));
+        writer.member("path", finding.path());
+        if (finding.line() > 0) {
+            writer.member("line", finding.line()).member("column", finding.column());
+        } else if (finding.offset() >= 0) {
+            writer.member("offset", finding.offset());
+        } else {
+            writer.nullMember("offset");
+        }
+        writer.member("sentence", finding.sentence()).member("remedy", finding.remedy());
+        writer.member("reference", finding.rule().reference()).end();
+    }
+}
