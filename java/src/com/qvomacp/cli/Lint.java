@@ -29,7 +29,7 @@ import picocli.CommandLine.Option;
             "1:an error was found or, with --strict, a warning",
             "2:wrong usage, a message or document cannot be read, the output cannot be written"
         })
-final class Lint extends JsonJob {
+final class Lint extends MessageJob {
     @Option(
             names = {"--no", "--disable"},
             paramLabel = "RULE",
@@ -55,34 +55,13 @@ final class Lint extends JsonJob {
     }
 
     @Override
-    boolean takes(String name, byte[] content) {
-        if (!Encode.isXml(content)) {
-            return false;
-        }
-        try {
-            tell(name, ProvisioningEncoder.lint(content));
-        } catch (EncodingException unreadable) {
-            refuse(name, unreadable);
-        }
-        return true;
+    void runXml(String name, byte[] xml) throws EncodingException {
+        tell(name, ProvisioningEncoder.lint(xml));
     }
 
     @Override
-    void run(Held held) {
-        Reading reading = Reading.of(held, limit());
-        if (reading.message == null) {
-            console.raise(Console.FAILED);
-            complain(Refusal.of(reading).write(startOf(held.name), errPalette()));
-            failed(held.name, reading.failure.getMessage());
-        } else {
-            tell(held.name, reading.message.lint());
-        }
-    }
-
-    /** What is refused elsewhere is here what cannot be read. */
-    @Override
-    void fail(int status, String name, String reason) {
-        super.fail(Console.FAILED, name, reason);
+    void run(Reading reading) {
+        tell(reading.held.name, reading.message.lint());
     }
 
     private void tell(String name, List<Finding> findings) {

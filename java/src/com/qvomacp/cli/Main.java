@@ -31,8 +31,10 @@ import picocli.CommandLine.ParseResult;
         },
         exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
-            "0:every message was shown or written, its MAC is right, or no error was found",
-            "1:a message or a document is refused, its MAC is not right, or an error was found",
+            "0:every message was shown or written, its MAC is right, no error was found, or two say"
+                    + " the same",
+            "1:a message or a document is refused, its MAC is not right, an error was found, or"
+                    + " two differ",
             "2:wrong usage, a message cannot be read, the output cannot be written,"
                     + " or the library that is asked cannot be loaded"
         })
@@ -131,6 +133,7 @@ public final class Main {
                 .addSubcommand(Choices.command(new Verify()))
                 .addSubcommand(Choices.command(new Encode()))
                 .addSubcommand(new Lint())
+                .addSubcommand(new Diff())
                 .addSubcommand(new Completion())
                 .setExpandAtFiles(false)
                 .setCaseInsensitiveEnumValuesAllowed(true);

@@ -23,7 +23,7 @@ final class TextWriter {
     private static final int HEADER_COLUMN = 16;
 
     /** Deeper items are indented no further. */
-    private static final int DEEPEST = 16;
+    static final int DEEPEST = 16;
 
     /** A wider name has its value two columns behind it. */
     private static final int WIDEST = 32;
@@ -124,7 +124,7 @@ final class TextWriter {
         }
     }
 
-    private static String describe(Other other) {
+    static String describe(Other other) {
         boolean isTrailing = other.kind() == Other.Kind.TRAILING;
         StringBuilder text = new StringBuilder("(");
         text.append(isTrailing ? other.length() + " bytes behind the document" : nameOf(other.kind()));
