@@ -31,7 +31,7 @@ import picocli.CommandLine.ParseResult;
         },
         exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
-            "0:every message was shown or written, its MAC is right, no error was found, or two say"
+            "0:every message was shown, drawn or written, its MAC is right, no error was found, or two say"
                     + " the same",
             "1:a message or a document is refused, its MAC is not right, an error was found, or"
                     + " two differ",
@@ -134,6 +134,7 @@ public final class Main {
                 .addSubcommand(Choices.command(new Encode()))
                 .addSubcommand(new Lint())
                 .addSubcommand(new Diff())
+                .addSubcommand(new Graph())
                 .addSubcommand(new Completion())
                 .setExpandAtFiles(false)
                 .setCaseInsensitiveEnumValuesAllowed(true);

@@ -11,8 +11,12 @@ abstract class MessageJob extends JsonJob {
 
     /** Does it to one document in XML: to what is encoded of it. */
     void runXml(String name, byte[] xml) throws EncodingException {
+        run(ofXml(name, xml));
+    }
+
+    static Reading ofXml(String name, byte[] xml) throws EncodingException {
         byte[] body = ProvisioningEncoder.ofXml(xml, EncodeOptions.NONE).body();
-        run(Reading.of(Held.message(name, body, false), body.length));
+        return Reading.of(Held.message(name, body, false), body.length);
     }
 
     @Override
@@ -36,7 +40,7 @@ abstract class MessageJob extends JsonJob {
             return;
         }
         console.raise(Console.FAILED);
-        complain(Refusal.of(reading).write(startOf(held.name), errPalette()));
+        explain(reading);
         failed(held.name, reading.failure.getMessage());
     }
 
