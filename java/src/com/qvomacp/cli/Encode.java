@@ -138,10 +138,24 @@ final class Encode extends Job {
             explain(reading);
             return;
         }
+        warn(reading);
         try {
             encode(held.name, ProvisioningEncoder.of(reading.message, encoding));
         } catch (EncodingException refused) {
             refuse(held.name, refused);
+        }
+    }
+
+    /** Says that what is written is not all that the message was, when it is not what it should be. */
+    private void warn(Reading reading) {
+        int deviations = reading.document.deviations().size();
+        String places = deviations == 1 ? "1 place" : deviations + " places";
+        String departs = deviations == 0 ? "" : "departs from the format in " + places;
+        String refused = reading.isAccepted() ? "" : "is refused by the library";
+        String and = departs.isEmpty() || refused.isEmpty() ? "" : " and ";
+        if (!(departs + refused).isEmpty()) {
+            String note = "note: what is read " + departs + and + refused + "; only what it sets is encoded";
+            complain(startOf(reading.held.name) + note + "\n");
         }
     }
 
