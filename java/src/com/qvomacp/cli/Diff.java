@@ -20,10 +20,6 @@ import picocli.CommandLine.Command;
             "A FILE may hold a document in XML, too."
         },
         customSynopsis = "omacp diff [-h] [OPTION...] FILE FILE",
-        sortOptions = false,
-        parameterListHeading = "%n",
-        optionListHeading = "%nOptions:%n",
-        exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
             "0:they say the same",
             "1:they differ",

@@ -19,12 +19,8 @@ import picocli.CommandLine.Command;
             "point, in DOT for Graphviz. A FILE may hold a document in XML, too."
         },
         customSynopsis = "omacp graph [-h] [OPTION...] [FILE...]",
-        sortOptions = false,
-        parameterListHeading = "%n",
-        optionListHeading = "%nOptions:%n",
         footerHeading = "%n",
         footer = {"Make a picture by: omacp graph FILE | dot -Tsvg >picture.svg"},
-        exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
             "0:every message was drawn",
             "2:wrong usage, a message or document cannot be read, the output cannot be written"

@@ -10,7 +10,6 @@ import java.util.List;
 import java.util.Locale;
 import java.util.Set;
 import picocli.CommandLine.Command;
-import picocli.CommandLine.Option;
 
 /** Tells what is wrong with messages. */
 @Command(
@@ -20,36 +19,39 @@ import picocli.CommandLine.Option;
             "A FILE may hold a document in XML, too."
         },
         customSynopsis = "omacp lint [-h] [OPTION...] [FILE...]",
-        sortOptions = false,
-        parameterListHeading = "%n",
-        optionListHeading = "%nOptions:%n",
-        exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
             "0:no error was found and, with --strict, no warning",
             "1:an error was found or, with --strict, a warning",
             "2:wrong usage, a message or document cannot be read, the output cannot be written"
         })
 final class Lint extends MessageJob {
-    @Option(
-            names = {"--no", "--disable"},
-            paramLabel = "RULE",
-            split = ",",
-            description = "Leave out a rule, or several with commas between their names.")
-    private List<String> disabled;
+    private static final Option<String> NO =
+            Option.texts(
+                    "--no --disable",
+                    "RULE",
+                    "Leave out a rule, or several with commas between their names.");
 
-    @Option(names = "--strict", description = "End with 1 for warnings, too.")
-    private boolean strict;
+    private static final Option<Boolean> STRICT =
+            Option.flag("--strict", "End with 1 for warnings, too.");
 
     private final Set<Rule> left = EnumSet.allOf(Rule.class);
 
     @Override
+    List<Option<?>> options() {
+        List<Option<?>> options = super.options();
+        options.add(NO);
+        options.add(STRICT);
+        return options;
+    }
+
+    @Override
     void begin() {
-        if (disabled != null) {
-            for (String name : disabled) {
-                if (!left.remove(Rule.named(name)) && Rule.named(name) == null) {
-                    throw new UsageException("--no is given what is no rule: " + name);
-                }
+        for (String name : has(NO) ? value(NO).split(",") : new String[0]) {
+            Rule rule = Rule.named(name);
+            if (rule == null) {
+                throw new UsageException("--no is given what is no rule: " + name);
             }
+            left.remove(rule);
         }
         super.begin();
     }
@@ -72,7 +74,7 @@ final class Lint extends MessageJob {
         for (Finding finding : findings) {
             if (left.contains(finding.rule())) {
                 Severity severity = finding.rule().severity();
-                boolean counts = severity == Severity.ERROR || strict && severity == Severity.WARNING;
+                boolean counts = severity == Severity.ERROR || has(STRICT) && severity == Severity.WARNING;
                 console.raise(counts ? Console.REFUSED : Console.DONE);
                 if (isJson()) {
                     json(finding);

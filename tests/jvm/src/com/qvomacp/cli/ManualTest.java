@@ -30,7 +30,7 @@ class ManualTest {
 
     private static Set<String> options() {
         Set<String> options = new TreeSet<>();
-        CommandLine program = Main.program();
+        CommandLine program = Usage.program();
         for (OptionSpec option : program.getCommandSpec().options()) {
             options.addAll(Set.of(option.names()));
         }
@@ -69,7 +69,7 @@ class ManualTest {
     @Test
     void theManualHasTheCommands() throws Exception {
         assertEquals(
-                new TreeSet<>(Main.program().getSubcommands().keySet()),
+                new TreeSet<>(Usage.program().getSubcommands().keySet()),
                 found("\n\\.TP\n\\.B (\\w+)\n", section("COMMANDS")));
     }
 
@@ -77,7 +77,7 @@ class ManualTest {
     void theManualHasTheExitStatuses() throws Exception {
         assertEquals(
                 new TreeSet<>(
-                        Main.program()
+                        Usage.program()
                                 .getCommandSpec()
                                 .usageMessage()
                                 .exitCodeList()
