@@ -2,6 +2,7 @@ package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.Item;
 import java.util.List;
+import java.util.Objects;
 
 /**
  * Writes the library's answers as the member {@code answers}: null with {@code unanswered} beside
@@ -11,31 +12,26 @@ import java.util.List;
  */
 final class AnswerJson implements Comparison.Listener {
     private final JsonWriter json;
-    private boolean begun;
 
     AnswerJson(JsonWriter json) {
         this.json = json;
     }
 
-    private JsonWriter element() {
-        if (!begun) {
-            begun = true;
-            json.name("answers").beginArray();
-        }
-        return json;
+    @Override
+    public void begin() {
+        json.name("answers").beginArray();
     }
 
     @Override
     public void begin(String type, List<Item> said) {
-        element().beginObject().member("type", type).name("children").beginArray();
+        json.beginObject().member("type", type).name("children").beginArray();
     }
 
     @Override
-    public void answered(
-            String name, String value, Comparison.Agreement agreement, String said) {
-        json.beginFlatObject().member("name", name).member("value", value);
-        json.member("same", agreement == Comparison.Agreement.SAME);
-        if (agreement == Comparison.Agreement.OTHERWISE) {
+    public void answered(String name, String value, boolean isSaid, String said) {
+        boolean isSame = isSaid && Objects.equals(value, said);
+        json.beginFlatObject().member("name", name).member("value", value).member("same", isSame);
+        if (isSaid && !isSame) {
             json.member("said", said);
         }
         json.end();
@@ -43,13 +39,13 @@ final class AnswerJson implements Comparison.Listener {
 
     @Override
     public void notAnswered(String name, String value) {
-        element().beginFlatObject().member("name", name).member("said", value);
+        json.beginFlatObject().member("name", name).member("said", value);
         json.member("answered", false).end();
     }
 
     @Override
     public void notAnswered(String type) {
-        element().beginFlatObject().member("type", type).member("answered", false).end();
+        json.beginFlatObject().member("type", type).member("answered", false).end();
     }
 
     @Override

@@ -3,6 +3,7 @@ package com.qvomacp.cli;
 import com.qvomacp.eng.omacp.Item;
 import java.io.PrintWriter;
 import java.util.List;
+import java.util.Objects;
 
 /** Writes the library's answers for people, with a mark in front of those that the message belies. */
 final class AnswerText implements Comparison.Listener {
@@ -13,7 +14,6 @@ final class AnswerText implements Comparison.Listener {
     private final TextWriter text;
     private int depth;
     private int column;
-    private boolean begun;
 
     AnswerText(PrintWriter out, Palette palette) {
         this.out = out;
@@ -21,17 +21,14 @@ final class AnswerText implements Comparison.Listener {
         this.text = new TextWriter(out, palette);
     }
 
-    private void title() {
-        if (!begun) {
-            begun = true;
-            out.append('\n').append(palette.bold("The native library answers"));
-            out.append(" (! otherwise than the message says, - not at all):\n");
-        }
+    @Override
+    public void begin() {
+        out.append('\n').append(palette.bold("The native library answers"));
+        out.append(" (! otherwise than the message says, - not at all):\n");
     }
 
     @Override
     public void begin(String type, List<Item> said) {
-        title();
         out.append(depth == 0 ? "\n" : "");
         line(' ', type, null);
         ++depth;
@@ -39,31 +36,25 @@ final class AnswerText implements Comparison.Listener {
     }
 
     @Override
-    public void answered(
-            String name, String value, Comparison.Agreement agreement, String said) {
+    public void answered(String name, String value, boolean isSaid, String said) {
         String shown = value == null ? "(none)" : Visible.value(value);
-        switch (agreement) {
-            case SAME:
-                line(' ', name, shown);
-                break;
-            case NOT_SAID:
-                line('!', name, shown + "  (the message does not say it)");
-                break;
-            default:
-                String instead = said == null ? "gives no value" : "says " + Visible.quoted(said);
-                line('!', name, shown + "  (the message " + instead + ")");
+        if (!isSaid) {
+            line('!', name, shown + "  (the message does not say it)");
+        } else if (Objects.equals(value, said)) {
+            line(' ', name, shown);
+        } else {
+            String instead = said == null ? "gives no value" : "says " + Visible.quoted(said);
+            line('!', name, shown + "  (the message " + instead + ")");
         }
     }
 
     @Override
     public void notAnswered(String name, String value) {
-        title();
         line('-', name == null ? "(no NAME)" : name, value == null ? null : Visible.value(value));
     }
 
     @Override
     public void notAnswered(String type) {
-        title();
         out.append(depth == 0 ? "\n" : "");
         line('-', type == null ? "(no TYPE)" : type, null);
     }

@@ -3,17 +3,44 @@ package com.qvomacp.cli;
 import com.qvomacp.eng.omacp.EncodeOption;
 import java.io.IOException;
 import java.nio.charset.StandardCharsets;
+import java.util.ArrayList;
+import java.util.Arrays;
+import java.util.EnumMap;
+import java.util.List;
 import java.util.Locale;
-import picocli.CommandLine;
-import picocli.CommandLine.Model.OptionSpec;
+import java.util.Map;
 
 /**
  * Options of the command line that are those of encoding. A secret may also stand in a file or in the
  * environment, where no list of processes shows it.
  */
 final class Choices {
-    private static final String FILE = "-file";
-    private static final String ENVIRONMENT = "-env";
+    /** What encoding takes, and what a check of a MAC takes of it. */
+    static final List<Option<?>> ALL = new ArrayList<>();
+
+    static final List<Option<?>> SECRETS = new ArrayList<>();
+
+    private static final Map<EncodeOption, Option<String>> VALUES = new EnumMap<>(EncodeOption.class);
+    private static final Map<EncodeOption, Option<String>> FILES = new EnumMap<>(EncodeOption.class);
+    private static final Map<EncodeOption, Option<String>> VARIABLES = new EnumMap<>(EncodeOption.class);
+
+    static {
+        for (EncodeOption option : EncodeOption.values()) {
+            String name = "--" + option.optionName();
+            String label = option.choices().isEmpty() ? option.optionName() : "how";
+            String upper = label.toUpperCase(Locale.ROOT);
+            VALUES.put(option, Option.text(name, upper, described(option), option.choices()));
+            ALL.add(VALUES.get(option));
+            if (option.isSecret()) {
+                FILES.put(option, Option.text(name + "-file", "FILE", "Read " + name + " from a file, or \"-\"."));
+                VARIABLES.put(option, Option.text(name + "-env", "NAME", "Take " + name + " from the environment."));
+                List<Option<String>> ways = Arrays.asList(FILES.get(option), VARIABLES.get(option));
+                ALL.addAll(ways);
+                SECRETS.add(VALUES.get(option));
+                SECRETS.addAll(ways);
+            }
+        }
+    }
 
     private final Job job;
     private boolean isInputTaken;
@@ -21,36 +48,6 @@ final class Choices {
     Choices(Job job) {
         this.job = job;
         this.isInputTaken = job.readsStandardInput();
-    }
-
-    /** A command with the options that it takes: secrets alone, unless it encodes. */
-    static CommandLine command(Job job) {
-        CommandLine command = new CommandLine(job);
-        for (EncodeOption option : EncodeOption.values()) {
-            String name = option.optionName();
-            if (option.isSecret() || job instanceof Encode) {
-                String label = option.choices().isEmpty() ? name : "how";
-                add(command, option, "", label, described(option));
-            }
-            if (option.isSecret()) {
-                add(command, option, FILE, "file", "Read --" + name + " from a file, or \"-\".");
-                add(command, option, ENVIRONMENT, "name", "Take --" + name + " from the environment.");
-            }
-        }
-        return command;
-    }
-
-    private static void add(
-            CommandLine command, EncodeOption option, String way, String label, String text) {
-        OptionSpec.Builder spec =
-                OptionSpec.builder("--" + option.optionName() + way)
-                        .paramLabel(label.toUpperCase(Locale.ROOT))
-                        .type(String.class)
-                        .description(text);
-        if (!option.choices().isEmpty()) {
-            spec.completionCandidates(option.choices());
-        }
-        command.getCommandSpec().addOption(spec.build());
     }
 
     private static String described(EncodeOption option) {
@@ -66,11 +63,13 @@ final class Choices {
 
     /** The value that the command line states for an option, or says where it stands; or null. */
     String value(EncodeOption option) {
+        String value = job.value(VALUES.get(option));
+        if (!option.isSecret()) {
+            return value;
+        }
         String name = "--" + option.optionName();
-        String value = job.spec.findOption(name).getValue();
-        return option.isSecret()
-                ? one(name, value, one(name, ofFile(name + FILE), ofEnvironment(name + ENVIRONMENT)))
-                : value;
+        String ofFile = ofFile(FILES.get(option));
+        return one(name, value, one(name, ofFile, ofEnvironment(VARIABLES.get(option))));
     }
 
     private static String one(String name, String first, String second) {
@@ -80,20 +79,21 @@ final class Choices {
         return first == null ? second : first;
     }
 
-    private String ofEnvironment(String name) {
-        String variable = job.spec.findOption(name).getValue();
+    private String ofEnvironment(Option<String> option) {
+        String variable = job.value(option);
         String value = variable == null ? null : System.getenv(variable);
         if (variable != null && value == null) {
-            throw new UsageException(name + " names no variable: " + variable);
+            throw new UsageException(option.names[0] + " names no variable: " + variable);
         }
         return value;
     }
 
-    private String ofFile(String name) {
-        String file = job.spec.findOption(name).getValue();
+    private String ofFile(Option<String> option) {
+        String file = job.value(option);
         if (file == null) {
             return null;
         }
+        String name = option.names[0];
         boolean isInput = file.equals(Input.STANDARD_INPUT);
         if (isInput && isInputTaken) {
             throw new UsageException(name + ": standard input is read for something else");

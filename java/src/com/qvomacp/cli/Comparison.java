@@ -19,24 +19,20 @@ import java.util.Objects;
  * Holds what the native library answers against what the message says. The characteristics of a type
  * that stand in the same one are compared by their order, and so are the parameters of a name.
  */
-final class Comparison implements Answers.Listener {
+final class Comparison {
     /** In place of a type, for what is answered of the push header. */
     static final String HEADER = "push header";
 
-    /** How an answer stands to the message. */
-    enum Agreement {
-        SAME,
-        OTHERWISE,
-        NOT_SAID
-    }
-
     /** Hears what is answered, compared. */
     interface Listener {
+        /** Told in front of everything else. */
+        void begin();
+
         /** The items of the characteristic in the message; empty when it is not there. */
         void begin(String type, List<Item> said);
 
-        /** Of a parameter; {@code said} is what the message says where that is something else. */
-        void answered(String name, String value, Agreement agreement, String said);
+        /** Of a parameter, with what the message says of it; null when it does not give a value. */
+        void answered(String name, String value, boolean isSaid, String said);
 
         /** A parameter of the message, or a characteristic of it, that is not answered. */
         void notAnswered(String name, String value);
@@ -68,58 +64,21 @@ final class Comparison implements Answers.Listener {
             map.computeIfAbsent(key, first -> new ArrayDeque<>()).add(item);
         }
 
-        Characteristic next(String type) {
-            Deque<Characteristic> left = characteristics.get(type);
-            return left == null ? null : left.poll();
-        }
-
-        /** The next parameter of a name, or the first one that has the value. */
-        Parameter next(String name, String value, boolean anywhere) {
-            Deque<Parameter> left = parameters.get(name);
-            if (left == null) {
-                return null;
-            }
-            if (anywhere) {
-                for (Iterator<Parameter> each = left.iterator(); each.hasNext(); ) {
-                    Parameter parameter = each.next();
-                    if (Objects.equals(parameter.value(), value)) {
-                        each.remove();
-                        return parameter;
-                    }
-                }
-            }
-            return left.poll();
+        private static <T> Deque<T> left(Map<String, Deque<T>> map, String key) {
+            Deque<T> left = map.get(key);
+            return left == null ? new ArrayDeque<>() : left;
         }
     }
 
     private final Listener listener;
-    private final Map<String, String> header;
+
+    /** What the natives should answer of the push header. */
+    private final Map<String, String> facts = new HashMap<>();
+
     private final Deque<Level> open = new ArrayDeque<>();
-    private boolean inHeader;
 
     private Comparison(Reading reading, Listener listener) {
         this.listener = listener;
-        this.header = factsOf(reading);
-        open.push(new Level(reading.document.children()));
-    }
-
-    /**
-     * Asks the library and compares.
-     *
-     * @throws UnsatisfiedLinkError when the library cannot be loaded
-     */
-    static void of(Reading reading, Listener listener) {
-        Comparison comparison = new Comparison(reading, listener);
-        if (Answers.ask(reading.held, comparison)) {
-            comparison.rest();
-        } else {
-            listener.unanswered("it refuses the message");
-        }
-    }
-
-    /** What the natives should answer of the push header. */
-    private static Map<String, String> factsOf(Reading reading) {
-        Map<String, String> facts = new HashMap<>();
         PushHeader header = reading.header;
         if (header != null) {
             facts.put("Content type", "" + header.contentType().code());
@@ -129,58 +88,72 @@ final class Comparison implements Answers.Listener {
             facts.put("SEC", method == SecurityMethod.NONE ? null : method.name());
             facts.put("MAC", header.mac());
         }
-        return facts;
+        open.push(new Level(reading.document.children()));
     }
 
-    @Override
-    public void begin(String type) {
-        inHeader = type.equals(HEADER);
-        Characteristic said = inHeader ? null : open.peek().next(type);
+    /**
+     * Asks the library and compares.
+     *
+     * @throws UnsatisfiedLinkError when the library cannot be loaded
+     */
+    static void of(Reading reading, Listener listener) {
+        if (!Answers.ask(reading.held, new Comparison(reading, listener))) {
+            listener.unanswered("it refuses the message");
+        }
+    }
+
+    void begin() {
+        listener.begin();
+    }
+
+    void begin(String type) {
+        boolean isHeader = type.equals(HEADER);
+        Characteristic said = isHeader ? null : Level.left(open.peek().characteristics, type).poll();
         List<Item> items = said == null ? Collections.<Item>emptyList() : said.children();
         open.push(new Level(items));
         listener.begin(type, items);
     }
 
-    @Override
-    public void single(String name, String value) {
-        if (inHeader) {
-            compare(name, value, header.get(name) != null, header.get(name));
-        } else {
-            compare(name, value, open.peek().next(name, value, true));
+    /** An answer of the push header. */
+    void fact(String name, String value) {
+        String said = facts.get(name);
+        listener.answered(name, value, said != null, said);
+    }
+
+    /** An element of an array: the first parameter of the name that has the value, or the next. */
+    void single(String name, String value) {
+        Deque<Parameter> left = Level.left(open.peek().parameters, name);
+        for (Iterator<Parameter> each = left.iterator(); each.hasNext(); ) {
+            Parameter parameter = each.next();
+            if (Objects.equals(parameter.value(), value)) {
+                each.remove();
+                listener.answered(name, value, true, value);
+                return;
+            }
         }
+        listed(name, value);
     }
 
-    @Override
-    public void listed(String name, String value) {
-        compare(name, value, open.peek().next(name, value, false));
+    /** A parameter that may be answered several times. */
+    void listed(String name, String value) {
+        Parameter said = Level.left(open.peek().parameters, name).poll();
+        listener.answered(name, value, said != null, said == null ? null : said.value());
     }
 
-    private void compare(String name, String value, Parameter said) {
-        compare(name, value, said != null, said == null ? null : said.value());
-    }
-
-    private void compare(String name, String value, boolean isSaid, String said) {
-        Agreement ofSaid = Objects.equals(value, said) ? Agreement.SAME : Agreement.OTHERWISE;
-        listener.answered(name, value, isSaid ? ofSaid : Agreement.NOT_SAID, said);
-    }
-
-    @Override
-    public void end() {
+    void end() {
         rest();
         open.pop();
         listener.end();
-        inHeader = false;
     }
 
     /** Tells what the message says and nobody has answered. */
-    private void rest() {
-        Level level = open.peek();
-        for (Deque<Parameter> left : level.parameters.values()) {
+    void rest() {
+        for (Deque<Parameter> left : open.peek().parameters.values()) {
             for (Parameter parameter : left) {
                 listener.notAnswered(parameter.name(), parameter.value());
             }
         }
-        for (Deque<Characteristic> left : level.characteristics.values()) {
+        for (Deque<Characteristic> left : open.peek().characteristics.values()) {
             for (Characteristic characteristic : left) {
                 listener.notAnswered(characteristic.type());
             }

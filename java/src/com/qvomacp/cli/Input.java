@@ -1,6 +1,8 @@
 package com.qvomacp.cli;
 
 import java.io.ByteArrayOutputStream;
+import java.io.FileInputStream;
+import java.io.FileNotFoundException;
 import java.io.IOException;
 import java.io.InputStream;
 import java.nio.file.AccessDeniedException;
@@ -37,13 +39,22 @@ final class Input {
             if (file.equals(STANDARD_INPUT)) {
                 return read(standardInput, limit);
             }
-            try (InputStream in = Files.newInputStream(Paths.get(file))) {
+            try (InputStream in = open(file)) {
                 return read(in, limit);
             }
         } catch (TooLongException tooLong) {
             throw tooLong;
         } catch (IOException | InvalidPathException unreadable) {
             throw new IOException(reason(unreadable, "cannot be read: "), unreadable);
+        }
+    }
+
+    /** Opens a file in the way that costs least; where that fails, in the way that tells why. */
+    private static InputStream open(String file) throws IOException {
+        try {
+            return new FileInputStream(file);
+        } catch (FileNotFoundException unopened) {
+            return Files.newInputStream(Paths.get(file));
         }
     }
 

@@ -88,7 +88,13 @@ final class MessageJson {
         json.member("charset", document.charset());
         json.member("charsetName", document.charsetName());
         json.member("version", document.version());
-        json.name("children").beginArray();
+        items("children", document.children());
+        json.end();
+    }
+
+    /** Writes items as a member, with everything in them. */
+    void items(String member, List<Item> items) {
+        json.name(member).beginArray();
         new Walk() {
             @Override
             void enter(Item item, int depth) {
@@ -111,8 +117,8 @@ final class MessageJson {
                 }
                 json.end();
             }
-        }.through(document.children());
-        json.end().end();
+        }.through(items);
+        json.end();
     }
 
     /** Whether others stand in an item, or have their place there. */

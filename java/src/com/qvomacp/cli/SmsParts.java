@@ -54,7 +54,7 @@ final class SmsParts {
         }
         Push push = pushes.computeIfAbsent(message.key(), key -> new Push(message));
         int index = message.number() - 1;
-        String part = "part " + message.number() + " of " + message.description();
+        String part = "part " + message.number() + " of " + message;
         if (push.parts[index] != null) {
             return again(push, place, message, part);
         }
@@ -93,7 +93,7 @@ final class SmsParts {
             if (!push.isFinished && !missing.isEmpty()) {
                 boolean isOne = missing.size() == 1;
                 String which = (isOne ? "part " : "parts ") + Place.listed(missing);
-                String of = " of " + push.parts.length + " of " + push.any.description();
+                String of = " of " + push.parts.length + " of " + push.any;
                 String sentence = which + of + (isOne ? " is" : " are") + " missing";
                 errors.add(Held.error(push.name(), sentence));
             }

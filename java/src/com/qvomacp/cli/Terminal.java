@@ -49,8 +49,9 @@ final class Terminal {
         return palette(color, err);
     }
 
+    /** The palette for a wish, which may be null. */
     private static Palette palette(Color color, boolean terminal) {
-        boolean on = color == Color.always || color == Color.auto && terminal;
+        boolean on = color == Color.always || color != Color.never && terminal;
         return on ? Palette.COLORS : Palette.NONE;
     }
 

@@ -10,7 +10,6 @@ import com.qvomacp.eng.omacp.Parameter;
 import com.qvomacp.eng.omacp.ProvisioningDocument;
 import com.qvomacp.eng.omacp.PushHeader;
 import java.io.PrintWriter;
-import java.util.Collections;
 import java.util.List;
 import java.util.Locale;
 
@@ -23,7 +22,7 @@ final class TextWriter {
     private static final int HEADER_COLUMN = 16;
 
     /** Deeper items are indented no further. */
-    private static final int DEEPEST = 16;
+    static final int DEEPEST = 16;
 
     /** A wider name has its value two columns behind it. */
     private static final int WIDEST = 32;
@@ -83,14 +82,9 @@ final class TextWriter {
                 if (item instanceof Parameter) {
                     parameter((Parameter) item, indent * INDENT, columns[indent]);
                 } else {
-                    spaces(indent * INDENT);
-                    if (isCharacteristic) {
-                        String type = ((Characteristic) item).type();
-                        out.append(type == null ? palette.error("(no TYPE)") : Visible.of(type));
-                    } else {
-                        out.append(palette.error(describe((Other) item)));
-                    }
-                    out.append('\n');
+                    String type = isCharacteristic ? ((Characteristic) item).type() : null;
+                    String none = isCharacteristic ? "(no TYPE)" : describe((Other) item);
+                    row(indent * INDENT, type == null ? palette.error(none) : Visible.of(type), 0, null);
                 }
                 if (!item.children().isEmpty()) {
                     columns[Math.min(depth + 1, DEEPEST)] = column(item.children());
@@ -117,14 +111,11 @@ final class TextWriter {
         if (parameter.name() != null) {
             line(indent, column, parameter.name(), shown(parameter.value()));
         } else {
-            spaces(indent);
-            out.append(palette.error("(no NAME)"));
-            out.append(parameter.value() == null ? "" : "  " + Visible.value(parameter.value()));
-            out.append('\n');
+            row(indent, palette.error("(no NAME)"), INDENT, shown(parameter.value()));
         }
     }
 
-    private static String describe(Other other) {
+    static String describe(Other other) {
         boolean isTrailing = other.kind() == Other.Kind.TRAILING;
         StringBuilder text = new StringBuilder("(");
         text.append(isTrailing ? other.length() + " bytes behind the document" : nameOf(other.kind()));
@@ -164,20 +155,22 @@ final class TextWriter {
     /** Writes a name, and in its column the value as it is shown; null for none. */
     void line(int indent, int column, String name, String shown) {
         String shownName = Visible.of(name);
-        spaces(indent);
-        out.append(shownName);
+        int gap = shown == null ? 0 : Math.max(column - Visible.columns(shownName), INDENT);
+        row(indent, shownName, gap, shown);
+    }
+
+    private void row(int indent, String name, int gap, String shown) {
+        StringBuilder row = new StringBuilder(Lines.WIDTH);
+        Listing.pad(row, "", indent);
+        row.append(name);
         if (shown != null) {
-            spaces(Math.max(column - Visible.columns(shownName), INDENT));
-            out.append(shown);
+            Listing.pad(row, "", gap);
+            row.append(shown);
         }
-        out.append('\n');
+        out.append(row.append('\n'));
     }
 
     private static String shown(String value) {
         return value == null ? null : Visible.value(value);
-    }
-
-    private void spaces(int count) {
-        out.append(String.join("", Collections.nCopies(count, " ")));
     }
 }

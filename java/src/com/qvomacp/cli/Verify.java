@@ -7,18 +7,14 @@ import com.qvomacp.eng.omacp.ProvisioningMac;
 import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.SecurityMethod;
 import java.util.Arrays;
+import java.util.List;
 import picocli.CommandLine.Command;
-import picocli.CommandLine.Option;
 
 /** Checks the MAC of messages. */
 @Command(
         name = "verify",
         description = "Check the MAC of messages, by the security method that each of them states.",
         customSynopsis = "omacp verify [-h] [OPTION...] [FILE...]",
-        sortOptions = false,
-        parameterListHeading = "%n",
-        optionListHeading = "%nOptions:%n",
-        exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
             "0:every MAC is right",
             "1:a MAC is not right or not there, or a message has no push header",
@@ -28,14 +24,22 @@ import picocli.CommandLine.Option;
 final class Verify extends JsonJob {
     private static final int MAC_DIGITS = 40;
 
-    @Option(names = "--show-mac", description = "Tell the MAC that the message should have.")
-    private boolean showMac;
+    private static final Option<Boolean> SHOW_MAC =
+            Option.flag("--show-mac", "Tell the MAC that the message should have.");
 
     private String pin;
     private String imsi;
 
     /** In place of PIN and IMSI; null to make it of them. */
     private byte[] key;
+
+    @Override
+    List<Option<?>> options() {
+        List<Option<?>> options = super.options();
+        options.add(SHOW_MAC);
+        options.addAll(Choices.SECRETS);
+        return options;
+    }
 
     @Override
     void begin() {
@@ -83,7 +87,7 @@ final class Verify extends JsonJob {
                         : ProvisioningMac.compute(key, body);
         String reason =
                 result == MacResult.RIGHT ? null : reasonFor(result, header, held.bytes);
-        say(held, method, result, reason, showMac ? computed : null);
+        say(held, method, result, reason, has(SHOW_MAC) ? computed : null);
     }
 
     /** What cannot be tried is not the message's fault. */

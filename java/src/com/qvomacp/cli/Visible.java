@@ -2,6 +2,12 @@ package com.qvomacp.cli;
 
 /** Texts of a stranger as a terminal may have them. */
 final class Visible {
+    /** Characters that take two columns: the first and the last of each range. */
+    private static final int[] WIDE = {
+        0x1100, 0x115F, 0x2E80, 0xA4CF, 0xAC00, 0xD7A3, 0xF900, 0xFAFF, 0xFE30, 0xFE6F,
+        0xFF00, 0xFF60, 0xFFE0, 0xFFE6, 0x1F300, 0x1FAFF, 0x20000, 0x3FFFD
+    };
+
     private static final String DIGITS = "0123456789abcdef";
 
     private Visible() {}
@@ -89,16 +95,12 @@ final class Visible {
     }
 
     static boolean isWide(int codePoint) {
-        return codePoint >= 0x1100
-                && (codePoint <= 0x115F
-                        || codePoint >= 0x2E80 && codePoint <= 0xA4CF
-                        || codePoint >= 0xAC00 && codePoint <= 0xD7A3
-                        || codePoint >= 0xF900 && codePoint <= 0xFAFF
-                        || codePoint >= 0xFE30 && codePoint <= 0xFE6F
-                        || codePoint >= 0xFF00 && codePoint <= 0xFF60
-                        || codePoint >= 0xFFE0 && codePoint <= 0xFFE6
-                        || codePoint >= 0x1F300 && codePoint <= 0x1FAFF
-                        || codePoint >= 0x20000 && codePoint <= 0x3FFFD);
+        for (int i = 0; i < WIDE.length && codePoint >= WIDE[i]; i += 2) {
+            if (codePoint <= WIDE[i + 1]) {
+                return true;
+            }
+        }
+        return false;
     }
 
     /** False for what a terminal or a reader of text obeys, and for half a character. */

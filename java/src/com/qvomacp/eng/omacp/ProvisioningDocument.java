@@ -157,6 +157,15 @@ public final class ProvisioningDocument {
     }
 
     /**
+     * Looks for what is wrong with the document, worked out at each call.
+     *
+     * @return what each {@link Rule} finds, in the order of the body; not modifiable
+     */
+    public List<Finding> lint() {
+        return Linter.lint(null, this, verdict());
+    }
+
+    /**
      * Tells what each byte of the body means by the format, in order, without a gap and without an
      * overlap. Texts are told whole. Nothing is kept: the body is read again.
      *

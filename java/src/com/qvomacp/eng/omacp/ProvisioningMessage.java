@@ -162,6 +162,16 @@ public final class ProvisioningMessage {
         return LibraryRules.verdictOnPush(push, bodyAt, document);
     }
 
+    /**
+     * Looks for what is wrong with the message, worked out at each call.
+     *
+     * @return what each {@link Rule} finds, first in the push header, then in the order of the
+     *     body; not modifiable
+     */
+    public List<Finding> lint() {
+        return Linter.lint(header, document, verdict());
+    }
+
     /** How many bytes stand in front of headers: identifier, type, and length, 7 bits a byte. */
     private static int front(byte[] headers) {
         int front = 3;
