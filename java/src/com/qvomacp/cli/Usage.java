@@ -4,6 +4,7 @@ import java.util.ArrayList;
 import java.util.Arrays;
 import java.util.Collections;
 import java.util.List;
+import java.util.Locale;
 import picocli.AutoComplete;
 import picocli.CommandLine;
 import picocli.CommandLine.Command;
@@ -94,6 +95,11 @@ final class Usage {
             spec.type(List.class).auxiliaryTypes(String.class);
         } else if (option.constants != null) {
             spec.type(option.constants[0].getClass());
+            List<String> names = new ArrayList<>();
+            for (Object constant : option.constants) {
+                names.add(constant.toString().toLowerCase(Locale.ROOT));
+            }
+            spec.completionCandidates(names);
         } else if (!option.completions.isEmpty()) {
             spec.completionCandidates(option.completions);
         }
@@ -119,11 +125,20 @@ final class Usage {
             if (command.userObject() instanceof Job) {
                 Main.run(console, command.name(), (Job) command.userObject(), given(command));
             } else {
-                console.out.print(AutoComplete.bash("omacp", program()));
+                console.out.print(completion());
             }
         } catch (ParameterException wrong) {
             explain(console, wrong.getCommandLine(), wrong.getMessage());
         }
+    }
+
+    /** A script that completes the options of the first command without its name, too, and files. */
+    private static String completion() {
+        CommandLine program = program();
+        for (Option<?> option : Main.command(Main.COMMANDS[0]).options()) {
+            program.getCommandSpec().addOption(specOf(option));
+        }
+        return AutoComplete.bash("omacp", program).replace("compopt +o default", "compopt -o default");
     }
 
     static ParseResult parsed(CommandLine program, String[] arguments) {

@@ -1,6 +1,7 @@
 package com.qvomacp.cli;
 
 import static org.junit.jupiter.api.Assertions.assertEquals;
+import static org.junit.jupiter.api.Assertions.assertFalse;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
 import com.qvomacp.eng.omacp.Rule;
@@ -115,17 +116,22 @@ class ManualTest {
         String script = out.toString(StandardCharsets.UTF_8);
         assertTrue(found("(?<![\\w-])(--?[a-zA-Z][a-zA-Z0-9-]*)", script).containsAll(options()), script);
         Path file = Files.writeString(directory.resolve("completion"), script);
-        String ask =
-                "source "
-                        + file
-                        + " && COMP_WORDS=(omacp show --by) COMP_CWORD=2"
-                        + " && _complete_omacp && echo \"${COMPREPLY[@]}\"";
+        assertEquals("--bytes\n", completed(file, "COMP_WORDS=(omacp show --by) COMP_CWORD=2"));
+        // Without a command, show is meant.
+        assertEquals("--bytes\n", completed(file, "COMP_WORDS=(omacp --by) COMP_CWORD=1"));
+        assertEquals("push\n", completed(file, "COMP_WORDS=(omacp --as pu) COMP_CWORD=2"));
+        assertFalse(script.contains("compopt +o default"), "files are completed, too");
+        assertEquals("verify\n", completed(file, "COMP_WORDS=(omacp ver) COMP_CWORD=1"));
+    }
+
+    private static String completed(Path script, String line) throws Exception {
+        String ask = "source " + script + " && " + line + " && _complete_omacp && echo \"${COMPREPLY[@]}\"";
         Process bash =
                 new ProcessBuilder("bash", "--norc", "-c", ask)
                         .redirectError(ProcessBuilder.Redirect.DISCARD)
                         .start();
         String answer = new String(bash.getInputStream().readAllBytes(), StandardCharsets.UTF_8);
         assertTrue(bash.waitFor(10, TimeUnit.SECONDS));
-        assertEquals("--bytes\n", answer);
+        return answer;
     }
 }
