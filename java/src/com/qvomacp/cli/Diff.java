@@ -79,7 +79,7 @@ final class Diff extends MessageJob {
     private void text(Change change) {
         console.out.println(kind(change) + ": " + Visible.of(change.path));
         if (change.kind == Kind.MOVED) {
-            console.out.println("  from place " + change.from + " to place " + change.to);
+            console.out.println("  from place " + change.before + " to place " + change.after);
             return;
         }
         if (change.kind != Kind.ADDED) {
@@ -129,7 +129,8 @@ final class Diff extends MessageJob {
     private void json(Change change) {
         writer.beginObject().member("change", kind(change)).member("path", change.path);
         if (change.kind == Kind.MOVED) {
-            writer.member("from", change.from).member("to", change.to);
+            writer.member("from", Integer.parseInt(change.before));
+            writer.member("to", Integer.parseInt(change.after));
         } else if (isValue(change)) {
             if (change.kind != Kind.ADDED) {
                 writer.member("before", change.before);

@@ -13,10 +13,12 @@ import java.util.Arrays;
 import java.util.Collections;
 import java.util.Deque;
 import java.util.HashMap;
+import java.util.HashSet;
 import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
 import java.util.Objects;
+import java.util.Set;
 
 /**
  * What differs between two messages, by what they say and not by how it is written. Depth costs no
@@ -40,25 +42,17 @@ final class Differences {
         /** What is added, removed or moved as a whole; null for a value. */
         final Item item;
 
-        /** The values of a parameter or header; null without one. */
+        /** The values of a parameter or header, null without one; the places of what was moved. */
         final String before;
 
         final String after;
 
-        /** The places among what stands in the same element, counted from 1; 0 if not moved. */
-        final int from;
-
-        final int to;
-
-        private Change(
-                Kind kind, String path, Item item, String before, String after, int from, int to) {
+        private Change(Kind kind, String path, Item item, String before, String after) {
             this.kind = kind;
             this.path = path;
             this.item = item;
             this.before = before;
             this.after = after;
-            this.from = from;
-            this.to = to;
         }
     }
 
@@ -149,7 +143,7 @@ final class Differences {
                 String second = i < now.size() ? now.get(i) : null;
                 Kind kind = i >= now.size() ? Kind.REMOVED : i >= old.size() ? Kind.ADDED : Kind.CHANGED;
                 if (kind != Kind.CHANGED || !Objects.equals(first, second)) {
-                    changes.add(new Change(kind, path + " / " + name, null, first, second, 0, 0));
+                    changes.add(new Change(kind, path + " / " + name, null, first, second));
                 }
             }
         }
@@ -164,24 +158,27 @@ final class Differences {
             Item item = before.get(i);
             String path = left.path(item);
             if (matches[i] == NONE) {
-                changes.add(new Change(Kind.REMOVED, path, item, value(item), null, 0, 0));
+                changes.add(new Change(Kind.REMOVED, path, item, value(item), null));
                 continue;
             }
             isThere[matches[i]] = true;
             Item counterpart = after.get(matches[i]);
             if (!stay[i]) {
-                changes.add(new Change(Kind.MOVED, path, item, null, null, i + 1, matches[i] + 1));
+                // Counted from 1, among what stands in the same element.
+                String from = Integer.toString(i + 1);
+                String to = Integer.toString(matches[i] + 1);
+                changes.add(new Change(Kind.MOVED, path, item, from, to));
             }
             if (!Objects.equals(value(item), value(counterpart))) {
                 String now = value(counterpart);
-                changes.add(new Change(Kind.CHANGED, path, null, value(item), now, 0, 0));
+                changes.add(new Change(Kind.CHANGED, path, null, value(item), now));
             }
         }
         for (int j = 0; j < isThere.length; ++j) {
             if (!isThere[j]) {
                 Item item = after.get(j);
                 String path = right.path(item);
-                changes.add(new Change(Kind.ADDED, path, item, null, value(item), 0, 0));
+                changes.add(new Change(Kind.ADDED, path, item, null, value(item)));
             }
         }
         for (int i = matches.length - 1; i >= 0; --i) {
@@ -261,24 +258,17 @@ final class Differences {
         if (!(before instanceof Characteristic) || !NAMED.contains(((Characteristic) before).type())) {
             return true;
         }
-        List<String> identifiers = identifiers((Characteristic) before);
-        Map<Parameter, Integer> counts = new HashMap<>();
-        int old = 0;
-        for (Parameter parameter : ((Characteristic) before).parameters()) {
-            if (!identifiers.contains(parameter.name())) {
-                counts.merge(parameter, 1, Integer::sum);
-                ++old;
-            }
-        }
-        int now = 0;
-        int same = 0;
-        for (Parameter parameter : ((Characteristic) after).parameters()) {
-            if (!identifiers.contains(parameter.name())) {
-                ++now;
-                same += counts.merge(parameter, -1, Integer::sum) >= 0 ? 1 : 0;
-            }
-        }
-        return 2 * same >= Math.max(old, now);
+        Set<Parameter> old = others((Characteristic) before);
+        Set<Parameter> now = others((Characteristic) after);
+        int most = Math.max(old.size(), now.size());
+        now.retainAll(old);
+        return 2 * now.size() >= most;
+    }
+
+    private static Set<Parameter> others(Characteristic characteristic) {
+        Set<Parameter> others = new HashSet<>(characteristic.parameters());
+        others.removeIf(parameter -> identifiers(characteristic).contains(parameter.name()));
+        return others;
     }
 
     /** Which of the counterparts follow each other on both sides: as many as can be. */

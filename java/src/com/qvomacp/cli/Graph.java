@@ -2,7 +2,6 @@ package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.AccessPoint;
 import com.qvomacp.eng.omacp.Application;
-import com.qvomacp.eng.omacp.EncodingException;
 import com.qvomacp.eng.omacp.PhysicalProxy;
 import com.qvomacp.eng.omacp.ProvisioningMessage;
 import com.qvomacp.eng.omacp.Proxy;
@@ -25,7 +24,7 @@ import picocli.CommandLine.Command;
             "0:every message was drawn",
             "2:wrong usage, a message or document cannot be read, the output cannot be written"
         })
-final class Graph extends Job {
+final class Graph extends MessageJob {
     private static final String INTERNET = "INTERNET";
     private static final String MISSING = " [style=dashed, color=red, fontcolor=red]";
 
@@ -35,39 +34,16 @@ final class Graph extends Job {
     /** Where references lead, by the parameter's name and value: a node, and the look of the edge. */
     private final Map<String, Map<String, String>> targets = new HashMap<>();
 
+    /** JSON is no form of a graph. */
     @Override
-    void begin() {}
-
-    @Override
-    boolean takes(String name, byte[] content) {
-        if (!Encode.isXml(content)) {
-            return false;
-        }
-        try {
-            draw(MessageJob.ofXml(name, content));
-        } catch (EncodingException unreadable) {
-            refuse(name, unreadable);
-        }
-        return true;
+    List<Option<?>> options() {
+        List<Option<?>> options = super.options();
+        options.removeIf(option -> option.names[0].startsWith("--json"));
+        return options;
     }
 
     @Override
-    void run(Held held) {
-        Reading reading = Reading.of(held, limit());
-        if (reading.message == null) {
-            console.raise(Console.FAILED);
-            explain(reading);
-        } else {
-            draw(reading);
-        }
-    }
-
-    @Override
-    void fail(int status, String name, String reason) {
-        super.fail(Console.FAILED, name, reason);
-    }
-
-    private void draw(Reading reading) {
+    void run(Reading reading) {
         nodes = 0;
         targets.put("TO-PROXY", new HashMap<>());
         targets.put("TO-NAPID", new HashMap<>());

@@ -11,12 +11,8 @@ abstract class MessageJob extends JsonJob {
 
     /** Does it to one document in XML: to what is encoded of it. */
     void runXml(String name, byte[] xml) throws EncodingException {
-        run(ofXml(name, xml));
-    }
-
-    static Reading ofXml(String name, byte[] xml) throws EncodingException {
         byte[] body = ProvisioningEncoder.ofXml(xml, EncodeOptions.NONE).body();
-        return Reading.of(Held.message(name, body, false), body.length);
+        run(Reading.of(Held.message(name, body, false), body.length));
     }
 
     @Override

@@ -12,7 +12,7 @@ final class AddressSyntax {
     private static final Pattern IPV4 = Pattern.compile(IPV4_PART + "(\\." + IPV4_PART + "){3}");
     private static final Pattern IPV6_PART = Pattern.compile("[0-9A-Fa-f]{1,4}");
     private static final Pattern E164 = Pattern.compile("\\+?[0-9]{1,20}");
-    private static final Pattern APN = Pattern.compile("[A-Za-z0-9_-]+(\\.[A-Za-z0-9_-]+)*");
+    private static final Pattern APN = Pattern.compile("[A-Za-z0-9._-]+");
     private static final Pattern SERVICE_CODE = Pattern.compile("[0-9*#]+");
     private static final Pattern NUMBER = Pattern.compile("[0-9A-Fa-f]+");
 

@@ -180,7 +180,7 @@ final class Linter {
             return name;
         }
         if (!meant.equals(name)) {
-            add(Rule.LETTER_CASE, item, what + " " + Printable.quoted(name) + " is none", meant);
+            add(Rule.LETTER_CASE, item, what + " " + Printable.quoted(name) + " should be " + meant, meant);
         }
         return meant;
     }
@@ -281,7 +281,7 @@ final class Linter {
         } else if (!AddressSyntax.fits(address, type)) {
             boolean isNumbers = AddressSyntax.looksLikeIpv4(address);
             String right = isNumbers && !"APN".equals(type) ? AddressSyntax.withoutZeros(address) : null;
-            add(Rule.ADDRESS, parameter, shown + " is no " + (type == null ? "IPV4" : type), right);
+            add(Rule.ADDRESS, parameter, shown + " is no address of " + (type == null ? "IPV4" : type), right);
         }
     }
 
@@ -305,16 +305,15 @@ final class Linter {
 
     private void number(Parameter parameter, String name, Pattern pattern) {
         String value = parameter.value();
+        String shown = name + " " + (value == null ? "without a value" : Printable.quoted(value));
         if (value == null || !pattern.matcher(value).matches()) {
-            String shown = value == null ? "without a value" : Printable.quoted(value);
-            add(Rule.NUMBER, parameter, name + " " + shown + " is no number", null);
+            add(Rule.NUMBER, parameter, shown + " is no number", null);
         } else if (name.equals(PORT_NUMBER)) {
             String digits = value.replaceFirst("^0+", "");
             if (digits.isEmpty() && isNoProxy(parameter.parent())) {
-                String sentence = "port 0 at " + NO_ADDRESS + " is no proxy";
-                add(Rule.NO_PROXY, parameter, sentence, null);
+                add(Rule.NO_PROXY, parameter, shown + " at " + NO_ADDRESS + " is no proxy", null);
             } else if (digits.isEmpty() || digits.length() > 5 || Integer.parseInt(digits) > LAST_PORT) {
-                add(Rule.PORT, parameter, "port " + Printable.of(value) + " is none", null);
+                add(Rule.PORT, parameter, shown + " is no port", null);
             }
         }
     }

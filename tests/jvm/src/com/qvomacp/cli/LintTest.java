@@ -45,7 +45,7 @@ class LintTest {
         assertEquals("", program.errors());
         assertEquals(
                 """
-                standard input:10: error: port 70000 is none [port]
+                standard input:10: error: PORTNBR "70000" is no port [port]
                   in wap-provisioningdoc / PORT 1 / PORTNBR; right: a number from 1 to 65535;
                   see OMA-WAP-TS-ProvCont, PORTNBR of PORT and of ACCESS
                 """,
@@ -132,7 +132,7 @@ class LintTest {
                                 "severity", "error",
                                 "path", "wap-provisioningdoc / PORT 1 / PORTNBR",
                                 "offset", 10,
-                                "sentence", "port 70000 is none",
+                                "sentence", "PORTNBR \"70000\" is no port",
                                 "remedy", "a number from 1 to 65535",
                                 "reference", "OMA-WAP-TS-ProvCont, PORTNBR of PORT and of ACCESS")),
                 first.get("findings"));

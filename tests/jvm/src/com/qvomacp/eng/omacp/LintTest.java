@@ -29,6 +29,7 @@ import org.junit.jupiter.params.provider.MethodSource;
 
 /** What is found in messages that are wrong, and left alone in those that are right. */
 class LintTest {
+    private static final ReadOptions LARGE = ReadOptions.DEFAULT.withInputLimit(1 << 20);
     private static final Set<Rule> LIBRARY = EnumSet.of(Rule.LIBRARY_DROPS, Rule.LIBRARY_REFUSES);
 
     /** A characteristic; the content may hold others. */
@@ -83,7 +84,7 @@ class LintTest {
         List<Rule> found = rules(ProvisioningEncoder.lint(xml(content)));
         try {
             byte[] body = ProvisioningEncoder.ofXml(xml(content), EncodeOptions.NONE).body();
-            assertEquals(found, rules(ProvisioningDocument.parse(body).lint()), content);
+            assertEquals(found, rules(ProvisioningDocument.parse(body, LARGE).lint()), content);
         } catch (EncodingException lenient) {
             assertTrue(lenient.getMessage().contains("> without "), lenient.getMessage());
         }
@@ -267,7 +268,7 @@ class LintTest {
         assertEquals(1 + document.split("\n")[1].indexOf("<parm name='PXADDR'"), finding.column());
         assertEquals(-1, finding.offset());
         assertEquals("10.0.20.1", finding.remedy());
-        assertEquals("PXADDR \"010.0.20.001\" is no IPV4", finding.sentence());
+        assertEquals("PXADDR \"010.0.20.001\" is no address of IPV4", finding.sentence());
         assertEquals("wap-provisioningdoc / PXLOGICAL 1 / PXPHYSICAL 1 / PXADDR", finding.path());
         byte[] body = ProvisioningEncoder.ofXml(xml(proxy(port("x"))), EncodeOptions.NONE).body();
         ProvisioningDocument read = ProvisioningDocument.parse(body);
@@ -403,6 +404,10 @@ class LintTest {
         assertEquals(2000, ProvisioningEncoder.lint(xml(proxy(many))).size());
         Arrays.setAll(many, i -> parm("ADDR", "010.0.0.1") + parm("TO-NAPID", "n" + i));
         assertEquals(8000, ProvisioningEncoder.lint(xml(application(many))).size());
+        String dotted = "a.".repeat(20000) + "a";
+        String numbers = "0".repeat(20000) + ":".repeat(20000);
+        assertEquals(List.of(), found(nap("APN", dotted)));
+        assertEquals(List.of(Rule.ADDRESS), found(nap("IPV6", numbers)));
         String deep = "<characteristic type='PXLOGICAL'>".repeat(8000) + "</characteristic>".repeat(8000);
         assertTrue(ProvisioningEncoder.lint(xml(deep)).size() >= 8000);
     }
