@@ -36,7 +36,8 @@ final class Visible {
     }
 
     private static boolean isBlank(char c) {
-        return Character.isWhitespace(c) || Character.isSpaceChar(c);
+        boolean mayBe = c <= ' ' || c >= 0x7F;
+        return mayBe && (Character.isWhitespace(c) || Character.isSpaceChar(c));
     }
 
     private static String escaped(String text, char escapedToo) {
