@@ -1,6 +1,8 @@
 package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.ProvisioningException;
+import com.qvomacp.eng.omacp.PushHeader;
 import java.io.IOException;
 import java.util.ArrayList;
 import java.util.Arrays;
@@ -176,6 +178,17 @@ abstract class Job {
         console.raise(reading.status());
         if (!reading.isAccepted()) {
             complain(Refusal.of(reading).write(startOf(reading.held.name), errPalette()));
+        }
+    }
+
+    /** The push header of a message; where it cannot be read, null, and that is said. */
+    PushHeader header(Held held) {
+        try {
+            return PushHeader.parse(held.bytes);
+        } catch (ProvisioningException none) {
+            explain(Reading.of(held, limit()));
+            failed(held.name, none.getMessage());
+            return null;
         }
     }
 

@@ -3,7 +3,6 @@ package com.qvomacp.cli;
 import com.qvomacp.eng.omacp.EncodeOptions;
 import com.qvomacp.eng.omacp.EncodingException;
 import com.qvomacp.eng.omacp.ProvisioningEncoder;
-import com.qvomacp.eng.omacp.ProvisioningException;
 import com.qvomacp.eng.omacp.PushHeader;
 import java.util.Collections;
 import java.util.List;
@@ -119,13 +118,8 @@ final class Show extends JsonJob {
             fail(Console.REFUSED, held.name, "has no push header");
             return;
         }
-        PushHeader read;
-        try {
-            read = PushHeader.parse(held.bytes);
-        } catch (ProvisioningException refused) {
-            console.raise(Console.REFUSED);
-            complain(Refusal.of(held, refused, 0).write(startOf(held.name), errPalette()));
-            failed(held.name, refused.getMessage());
+        PushHeader read = header(held);
+        if (read == null) {
             return;
         }
         int bodyLength = held.bytes.length - read.length();

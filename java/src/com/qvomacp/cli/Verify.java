@@ -2,7 +2,6 @@ package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.EncodeOption;
 import com.qvomacp.eng.omacp.MacResult;
-import com.qvomacp.eng.omacp.ProvisioningException;
 import com.qvomacp.eng.omacp.ProvisioningMac;
 import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.SecurityMethod;
@@ -61,18 +60,13 @@ final class Verify extends JsonJob {
 
     @Override
     void run(Held held) {
-        PushHeader header = null;
-        try {
-            header = held.isPush ? PushHeader.parse(held.bytes) : null;
-        } catch (ProvisioningException none) {
-            console.raise(Console.REFUSED);
-            complain(Refusal.of(held, none, 0).write(startOf(held.name), errPalette()));
-            failed(held.name, none.getMessage());
-            return;
-        }
-        if (header == null) {
+        if (!held.isPush) {
             String reason = "it has no push header, and so no MAC";
             say(held, SecurityMethod.NONE, MacResult.NO_MAC, reason, null);
+            return;
+        }
+        PushHeader header = header(held);
+        if (header == null) {
             return;
         }
         SecurityMethod method = header.securityMethod();
