@@ -74,7 +74,7 @@ final class JsonWriter {
     /** Ends what has been begun since there were so many objects and arrays open. */
     void endTo(int depth) {
         if (isNamed) {
-            nothing();
+            text(null);
         }
         while (open.length() > depth) {
             end();
@@ -94,7 +94,9 @@ final class JsonWriter {
     }
 
     JsonWriter member(String name, long value) {
-        return name(name).number(value);
+        name(name).next();
+        out.print(value);
+        return this;
     }
 
     JsonWriter member(String name, boolean value) {
@@ -104,28 +106,17 @@ final class JsonWriter {
     }
 
     JsonWriter nullMember(String name) {
-        return name(name).nothing();
+        return name(name).text(null);
     }
 
     /** A string, or null. */
     JsonWriter text(String text) {
+        next();
         if (text == null) {
-            return nothing();
+            out.append("null");
+        } else {
+            string(text);
         }
-        next();
-        string(text);
-        return this;
-    }
-
-    private JsonWriter number(long number) {
-        next();
-        out.print(number);
-        return this;
-    }
-
-    private JsonWriter nothing() {
-        next();
-        out.append("null");
         return this;
     }
 
@@ -172,36 +163,20 @@ final class JsonWriter {
     }
 
     private void string(String text) {
-        StringBuilder escaped = new StringBuilder();
-        out.append('"');
-        int written = 0;
-        for (int i = 0; i < text.length(); ) {
+        StringBuilder escaped = new StringBuilder(text.length() + 2).append('"');
+        int next;
+        for (int i = 0; i < text.length(); i = next) {
             int codePoint = text.codePointAt(i);
-            int next = i + Character.charCount(codePoint);
-            boolean isQuoted = codePoint == '"' || codePoint == '\\';
-            if (isQuoted || !Visible.isVisible(codePoint)) {
-                out.write(text, written, i - written);
-                escaped.setLength(0);
-                if (isQuoted) {
-                    escaped.append('\\').append((char) codePoint);
-                } else {
-                    escape(escaped, codePoint, text, i, next);
-                }
-                out.append(escaped);
-                written = next;
+            next = i + Character.charCount(codePoint);
+            int known = "\"\\\n\r\t".indexOf(codePoint);
+            if (known >= 0) {
+                escaped.append('\\').append("\"\\nrt".charAt(known));
+            } else if (Visible.isVisible(codePoint)) {
+                escaped.append(text, i, next);
+            } else {
+                Visible.escape(escaped, text, i, next);
             }
-            i = next;
         }
-        out.write(text, written, text.length() - written);
-        out.append('"');
-    }
-
-    private static void escape(StringBuilder to, int codePoint, String text, int from, int end) {
-        int known = "\n\r\t".indexOf(codePoint);
-        if (known >= 0) {
-            to.append('\\').append("nrt".charAt(known));
-        } else {
-            Visible.escape(to, text, from, end);
-        }
+        out.append(escaped.append('"'));
     }
 }

@@ -59,7 +59,7 @@ public final class Main {
         try {
             run(console, arguments);
             console.out.flush();
-        } catch (Output.ClosedError closed) {
+        } catch (Console.ClosedError closed) {
             console.raise(Console.FAILED);
             if (!closed.isBrokenPipe()) {
                 console.err.println("omacp: the output cannot be written");
