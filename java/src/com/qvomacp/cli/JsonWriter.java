@@ -83,8 +83,7 @@ final class JsonWriter {
 
     JsonWriter name(String name) {
         next();
-        string(name);
-        out.append(": ");
+        out.append(Visible.json(name)).append(": ");
         isNamed = true;
         return this;
     }
@@ -112,11 +111,7 @@ final class JsonWriter {
     /** A string, or null. */
     JsonWriter text(String text) {
         next();
-        if (text == null) {
-            out.append("null");
-        } else {
-            string(text);
-        }
+        out.append(text == null ? "null" : Visible.json(text));
         return this;
     }
 
@@ -160,23 +155,5 @@ final class JsonWriter {
         for (int i = Math.min(open.length(), DEEPEST); i > 0; --i) {
             out.append(INDENT);
         }
-    }
-
-    private void string(String text) {
-        StringBuilder escaped = new StringBuilder(text.length() + 2).append('"');
-        int next;
-        for (int i = 0; i < text.length(); i = next) {
-            int codePoint = text.codePointAt(i);
-            next = i + Character.charCount(codePoint);
-            int known = "\"\\\n\r\t".indexOf(codePoint);
-            if (known >= 0) {
-                escaped.append('\\').append("\"\\nrt".charAt(known));
-            } else if (Visible.isVisible(codePoint)) {
-                escaped.append(text, i, next);
-            } else {
-                Visible.escape(escaped, text, i, next);
-            }
-        }
-        out.append(escaped.append('"'));
     }
 }
