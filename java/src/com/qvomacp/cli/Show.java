@@ -149,7 +149,7 @@ final class Show extends JsonJob {
             text.document(reading.document);
         }
         if (has(ANSWERS)) {
-            answers(reading, new AnswerText(console.out, outPalette()));
+            text.answers(compared(reading));
         }
     }
 
@@ -157,9 +157,10 @@ final class Show extends JsonJob {
         beginObject(reading.held.name);
         int depth = writer.depth();
         try {
-            new MessageJson(writer).message(reading);
+            MessageJson json = new MessageJson(writer);
+            json.message(reading);
             if (has(ANSWERS)) {
-                answers(reading, new AnswerJson(writer));
+                json.answers(compared(reading));
             }
         } finally {
             writer.endTo(depth);
@@ -168,13 +169,13 @@ final class Show extends JsonJob {
     }
 
     /** Asks the library; where it cannot be loaded, that is said. */
-    private void answers(Reading reading, Comparison.Listener listener) {
+    private Comparison compared(Reading reading) {
         try {
-            Comparison.of(reading, listener);
+            return new Comparison(reading);
         } catch (UnsatisfiedLinkError missing) {
             console.raise(Console.FAILED);
             complain(startOf(reading.held.name) + Visible.of(missing.getMessage()) + "\n");
-            listener.unanswered("the library cannot be loaded");
+            return new Comparison("the library cannot be loaded");
         }
     }
 
