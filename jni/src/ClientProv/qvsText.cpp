@@ -33,8 +33,8 @@ inline uint32_t separatorOf(const Piece &piece)
         }
         // Twice as long, and as long as the limit of texts lets it become once that is more than
         // half of it: the old block and the new one are there together.
-        const uint64_t limit = needed + state->textLeft;
-        const uint64_t most = limit < kLongest ? limit : kLongest;
+        const uint64_t left = state->textLeft < kLongest ? state->textLeft : kLongest;
+        const uint64_t most = needed + left < kLongest ? needed + left : kLongest;
         const uint64_t twice = uint64_t{text->capacity} * 2;
         const uint64_t grown = twice > most / 2 ? most : twice;
         needed = grown > needed ? grown : needed;
