@@ -30,11 +30,9 @@ final class Show extends JsonJob {
     private static final Option<Boolean> BYTES =
             Option.flag("--bytes", "List every byte with what it means.");
 
-    private static final Option<Boolean> ANSWERS =
-            Option.flag(
-                    "--answers",
-                    "Ask the native library as well, and mark where it answers otherwise than the"
-                            + " message says.");
+    private static final Option<Boolean> ANSWERS = Option.flag("--answers",
+            "Ask the native library as well, and mark where it answers otherwise than the message"
+                    + " says.");
 
     private static final Option<Boolean> XML =
             Option.flag("--xml", "Print the document as XML, from which encode makes it.");
