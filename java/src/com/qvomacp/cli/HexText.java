@@ -27,20 +27,20 @@ final class HexText {
         /** Whether it is user data with its header, by what the text says. */
         final boolean isUserData;
 
-        /** Whether it follows the piece before it on the next line. */
-        final boolean follows;
-
-        Piece(int line, String digits, boolean isWhole, boolean isUserData, boolean follows) {
+        Piece(int line, String digits, boolean isWhole, boolean isUserData) {
             this.line = line;
             this.digits = digits;
             this.isWhole = isWhole;
             this.isUserData = isUserData;
-            this.follows = follows;
+        }
+
+        boolean follows(Piece other) {
+            return !isWhole && !other.isWhole && line == other.line + 1;
         }
     }
 
     /** A line of numbers that are no bytes. */
-    private static final Piece NUMBERS = new Piece(0, "", false, false, false);
+    private static final Piece NUMBERS = new Piece(0, "", false, false);
 
     private static final String BYTE_ORDER_MARK = "\uFEFF";
 
@@ -79,49 +79,41 @@ final class HexText {
         List<String> lines = Arrays.asList(text.split("\r\n|[\r\n\f]", -1));
         List<Piece> pieces = new ArrayList<>();
         HexDump.Repeats repeats = new HexDump.Repeats();
-        int last = -2;
-        for (int i = 0; i < lines.size(); ) {
+        for (int i = 0; i < lines.size(); ++i) {
             CellDump cells = CellDump.at(lines, i);
             boolean areCells = cells != null && cells.bytes != null;
             HexDump dump = areCells ? null : HexDump.at(lines, i, repeats);
+            Piece piece = null;
             if (areCells || dump != null) {
-                String digits = digits(areCells ? cells.bytes : dump.bytes);
-                pieces.add(new Piece(i + 1, digits, true, false, false));
-                i = areCells ? cells.next : dump.next;
-                continue;
+                piece = new Piece(i + 1, digits(areCells ? cells.bytes : dump.bytes), true, false);
+                i = (areCells ? cells.next : dump.next) - 1;
+            } else {
+                piece = cells != null ? NUMBERS : piece(lines.get(i).trim(), i + 1);
             }
-            if (cells != null) {
-                return null;
-            }
-            Piece piece = piece(lines.get(i).trim(), i, last == i - 1);
             if (piece == NUMBERS) {
                 return null;
             }
             if (piece != null) {
                 pieces.add(piece);
-                last = i;
             }
-            ++i;
         }
         return pieces;
     }
 
-    private static Piece piece(String line, int index, boolean follows) {
+    private static Piece piece(String line, int number) {
         if (line.isEmpty() || isOfModem(line)) {
             return null;
         }
-        Piece form = gatewayForm(line, index);
+        Piece form = gatewayForm(line, number);
         if (form != null) {
             return form;
         }
-        if (line.contains("\\x")) {
-            return new Piece(index + 1, digits(escaped(line)), false, false, follows);
+        boolean isLiteral = line.contains("\\x");
+        String digits = isLiteral ? digits(escaped(line)) : behindLabel(line);
+        if (digits == null) {
+            return null;
         }
-        String digits = behindLabel(line);
-        if (digits != null && areNumbers(line)) {
-            return NUMBERS;
-        }
-        return digits == null ? null : new Piece(index + 1, digits, false, false, follows);
+        return !isLiteral && areNumbers(line) ? NUMBERS : new Piece(number, digits, false, false);
     }
 
     /** Whether a modem or its user says something about messages, and not one of them. */
@@ -241,7 +233,7 @@ final class HexText {
     }
 
     /** What a gateway is asked to send: {@code udh=%06%05...&text=%01%06...}. */
-    private static Piece gatewayForm(String line, int index) {
+    private static Piece gatewayForm(String line, int number) {
         byte[] header = member(line, "udh");
         byte[] data = null;
         for (String name : new String[] {"text", "data", "message", "msg", "ud", "binary"}) {
@@ -253,7 +245,7 @@ final class HexText {
         }
         data = isForm ? data : percentDecoded(line);
         String digits = (header == null ? "" : digits(header)) + (data == null ? "" : digits(data));
-        return new Piece(index + 1, digits, true, header != null, false);
+        return new Piece(number, digits, true, header != null);
     }
 
     /** A member of a form; null when the line has none of that name. */

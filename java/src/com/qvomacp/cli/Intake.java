@@ -143,22 +143,17 @@ final class Intake {
 
         static List<Run> of(List<HexText.Piece> pieces) {
             List<Run> runs = new ArrayList<>();
-            List<HexText.Piece> run = new ArrayList<>();
-            for (HexText.Piece piece : pieces) {
-                if (!run.isEmpty() && (!piece.follows || piece.isWhole)) {
-                    runs.add(new Run(run));
-                    run = new ArrayList<>();
+            int from = 0;
+            for (int i = 1; i <= pieces.size(); ++i) {
+                if (i == pieces.size() || !pieces.get(i).follows(pieces.get(i - 1))) {
+                    runs.add(new Run(pieces.subList(from, i)));
+                    from = i;
                 }
-                run.add(piece);
             }
-            runs.add(new Run(run));
             return runs;
         }
 
         String digits() {
-            if (pieces.size() == 1) {
-                return pieces.get(0).digits;
-            }
             StringBuilder digits = new StringBuilder();
             for (HexText.Piece piece : pieces) {
                 digits.append(piece.digits);
