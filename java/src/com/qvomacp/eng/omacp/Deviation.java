@@ -67,6 +67,11 @@ public final class Deviation {
         return kind;
     }
 
+    /** The item that it is in. */
+    Item item() {
+        return item;
+    }
+
     /** {@return where it is: bytes from the start of the body, counted from 0} */
     public int offset() {
         return offset;

@@ -157,6 +157,15 @@ public final class ProvisioningDocument {
     }
 
     /**
+     * Looks for what is wrong with the document, worked out at each call.
+     *
+     * @return what each {@link Rule} finds, in the order of the body; not modifiable
+     */
+    public List<Finding> lint() {
+        return Linter.lint(null, this, verdict());
+    }
+
+    /**
      * Tells what each byte of the body means by the format, in order, without a gap and without an
      * overlap. Texts are told whole. Nothing is kept: the body is read again.
      *
@@ -198,6 +207,34 @@ public final class ProvisioningDocument {
     /** The document element. */
     Item root() {
         return root;
+    }
+
+    /** The innermost item that some byte of the body is in; the document for one outside of all. */
+    Item itemAt(int offset) {
+        Item item = root;
+        for (Item inner = item; inner != null; inner = childAt(item, offset)) {
+            item = inner;
+        }
+        return item;
+    }
+
+    private static Item childAt(Item item, int offset) {
+        Item[] children = item.inside();
+        int low = 0;
+        int high = children.length;
+        while (low < high) {
+            int middle = (low + high) >>> 1;
+            if (children[middle].offset() <= offset) {
+                low = middle + 1;
+            } else {
+                high = middle;
+            }
+        }
+        if (low == 0) {
+            return null;
+        }
+        Item last = children[low - 1];
+        return offset < last.offset() + last.length() ? last : null;
     }
 
     /** Reads the body again, which went well before, for another listener. */

@@ -157,6 +157,16 @@ public final class ProvisioningMessage {
         return Verdict.onPush(push, head.length, document);
     }
 
+    /**
+     * Looks for what is wrong with the message, worked out at each call.
+     *
+     * @return what each {@link Rule} finds, first in the push header, then in the order of the
+     *     body; not modifiable
+     */
+    public List<Finding> lint() {
+        return Linter.lint(header, document, verdict());
+    }
+
     /** Headers as they stand in a push. */
     private static byte[] push(byte[] headers) {
         ByteArrayOutputStream push = new ByteArrayOutputStream();

@@ -13,7 +13,8 @@
  *
  * <p>Nothing here runs the native library. What it makes of a message, which is not everywhere what the
  * message says, is a {@link com.qvomacp.eng.omacp.Verdict}; its answers come from the classes of {@link
- * com.qvomacp.eng.parser}.
+ * com.qvomacp.eng.parser}. What is wrong with a message, by rules with names, is a list of {@link
+ * com.qvomacp.eng.omacp.Finding}.
  *
  * <h2>Absent values</h2>
  *

@@ -9,7 +9,7 @@ import java.nio.file.Files;
 import java.nio.file.Paths;
 import java.util.Arrays;
 
-/** A program that knows the jar and nothing else: {@code Show MESSAGE PIN}. */
+/** A program that knows the jars and nothing else: {@code Show MESSAGE PIN}. */
 final class Show {
     private Show() {}
 
