@@ -83,7 +83,6 @@ final class Answers {
             if (!parser.qvomacp_parser(push, push.length, 0)) {
                 return false;
             }
-            comparison.begin();
             if (held.isPush) {
                 header();
             }

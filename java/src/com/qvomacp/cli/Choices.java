@@ -4,41 +4,34 @@ import com.qvomacp.eng.omacp.EncodeOption;
 import java.io.IOException;
 import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
-import java.util.Arrays;
-import java.util.EnumMap;
 import java.util.List;
 import java.util.Locale;
-import java.util.Map;
 
 /**
  * Options of the command line that are those of encoding. A secret may also stand in a file or in the
  * environment, where no list of processes shows it.
  */
 final class Choices {
+    private static final String FILE = "-file";
+    private static final String ENVIRONMENT = "-env";
+
     /** What encoding takes, and what a check of a MAC takes of it. */
-    static final List<Option<?>> ALL = new ArrayList<>();
+    static final List<Option<String>> ALL = new ArrayList<>();
 
-    static final List<Option<?>> SECRETS = new ArrayList<>();
-
-    private static final Map<EncodeOption, Option<String>> VALUES = new EnumMap<>(EncodeOption.class);
-    private static final Map<EncodeOption, Option<String>> FILES = new EnumMap<>(EncodeOption.class);
-    private static final Map<EncodeOption, Option<String>> VARIABLES = new EnumMap<>(EncodeOption.class);
+    static final List<Option<String>> SECRETS = new ArrayList<>();
 
     static {
         for (EncodeOption option : EncodeOption.values()) {
             String name = "--" + option.optionName();
             String label = option.choices().isEmpty() ? option.optionName() : "how";
-            String upper = label.toUpperCase(Locale.ROOT);
-            VALUES.put(option, Option.text(name, upper, described(option), option.choices()));
-            ALL.add(VALUES.get(option));
+            List<Option<String>> ways = new ArrayList<>();
+            ways.add(Option.text(name, label.toUpperCase(Locale.ROOT), described(option), option.choices()));
             if (option.isSecret()) {
-                FILES.put(option, Option.text(name + "-file", "FILE", "Read " + name + " from a file, or \"-\"."));
-                VARIABLES.put(option, Option.text(name + "-env", "NAME", "Take " + name + " from the environment."));
-                List<Option<String>> ways = Arrays.asList(FILES.get(option), VARIABLES.get(option));
-                ALL.addAll(ways);
-                SECRETS.add(VALUES.get(option));
+                ways.add(Option.text(name + FILE, "FILE", "Read " + name + " from a file, or \"-\"."));
+                ways.add(Option.text(name + ENVIRONMENT, "NAME", "Take " + name + " from the environment."));
                 SECRETS.addAll(ways);
             }
+            ALL.addAll(ways);
         }
     }
 
@@ -63,13 +56,20 @@ final class Choices {
 
     /** The value that the command line states for an option, or says where it stands; or null. */
     String value(EncodeOption option) {
-        String value = job.value(VALUES.get(option));
-        if (!option.isSecret()) {
-            return value;
-        }
         String name = "--" + option.optionName();
-        String ofFile = ofFile(FILES.get(option));
-        return one(name, value, one(name, ofFile, ofEnvironment(VARIABLES.get(option))));
+        String value = stated(name);
+        return option.isSecret()
+                ? one(name, value, one(name, ofFile(name + FILE), ofEnvironment(name + ENVIRONMENT)))
+                : value;
+    }
+
+    private String stated(String name) {
+        for (Option<String> option : ALL) {
+            if (option.isNamed(name)) {
+                return job.value(option);
+            }
+        }
+        throw new AssertionError(name);
     }
 
     private static String one(String name, String first, String second) {
@@ -79,21 +79,20 @@ final class Choices {
         return first == null ? second : first;
     }
 
-    private String ofEnvironment(Option<String> option) {
-        String variable = job.value(option);
+    private String ofEnvironment(String name) {
+        String variable = stated(name);
         String value = variable == null ? null : System.getenv(variable);
         if (variable != null && value == null) {
-            throw new UsageException(option.names[0] + " names no variable: " + variable);
+            throw new UsageException(name + " names no variable: " + variable);
         }
         return value;
     }
 
-    private String ofFile(Option<String> option) {
-        String file = job.value(option);
+    private String ofFile(String name) {
+        String file = stated(name);
         if (file == null) {
             return null;
         }
-        String name = option.names[0];
         boolean isInput = file.equals(Input.STANDARD_INPUT);
         if (isInput && isInputTaken) {
             throw new UsageException(name + ": standard input is read for something else");

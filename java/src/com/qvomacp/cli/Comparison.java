@@ -6,6 +6,7 @@ import com.qvomacp.eng.omacp.Parameter;
 import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.SecurityMethod;
 import java.util.ArrayDeque;
+import java.util.ArrayList;
 import java.util.Collections;
 import java.util.Deque;
 import java.util.HashMap;
@@ -23,34 +24,16 @@ final class Comparison {
     /** In place of a type, for what is answered of the push header. */
     static final String HEADER = "push header";
 
-    /** Hears what is answered, compared. */
-    interface Listener {
-        /** Told in front of everything else. */
-        void begin();
-
-        /** The items of the characteristic in the message; empty when it is not there. */
-        void begin(String type, List<Item> said);
-
-        /** Of a parameter, with what the message says of it; null when it does not give a value. */
-        void answered(String name, String value, boolean isSaid, String said);
-
-        /** A parameter of the message, or a characteristic of it, that is not answered. */
-        void notAnswered(String name, String value);
-
-        void notAnswered(String type);
-
-        void end();
-
-        /** Told in place of anything else. */
-        void unanswered(String why);
-    }
+    private static final List<Item> NOTHING = Collections.emptyList();
 
     /** A characteristic that is being answered, and what of the message is left of it. */
     private static final class Level {
+        final List<Answer> answers;
         final Map<String, Deque<Parameter>> parameters = new LinkedHashMap<>();
         final Map<String, Deque<Characteristic>> characteristics = new LinkedHashMap<>();
 
-        Level(List<Item> said) {
+        Level(List<Answer> answers, List<Item> said) {
+            this.answers = answers;
             for (Item item : said) {
                 if (item instanceof Parameter) {
                     add(parameters, ((Parameter) item).name(), (Parameter) item);
@@ -70,15 +53,23 @@ final class Comparison {
         }
     }
 
-    private final Listener listener;
+    /** What is answered; empty when nothing is. */
+    final List<Answer> answers = new ArrayList<>();
+
+    /** Why nothing is answered; null when something is. */
+    final String unanswered;
 
     /** What the natives should answer of the push header. */
     private final Map<String, String> facts = new HashMap<>();
 
     private final Deque<Level> open = new ArrayDeque<>();
 
-    private Comparison(Reading reading, Listener listener) {
-        this.listener = listener;
+    /**
+     * Asks the library and compares.
+     *
+     * @throws UnsatisfiedLinkError when the library cannot be loaded
+     */
+    Comparison(Reading reading) {
         PushHeader header = reading.header;
         if (header != null) {
             facts.put("Content type", "" + header.contentType().code());
@@ -88,46 +79,42 @@ final class Comparison {
             facts.put("SEC", method == SecurityMethod.NONE ? null : method.name());
             facts.put("MAC", header.mac());
         }
-        open.push(new Level(reading.document.children()));
+        boolean isRead = reading.document != null;
+        open.push(new Level(answers, isRead ? reading.document.children() : NOTHING));
+        unanswered = Answers.ask(reading.held, this) ? null : "it refuses the message";
     }
 
-    /**
-     * Asks the library and compares.
-     *
-     * @throws UnsatisfiedLinkError when the library cannot be loaded
-     */
-    static void of(Reading reading, Listener listener) {
-        if (!Answers.ask(reading.held, new Comparison(reading, listener))) {
-            listener.unanswered("it refuses the message");
-        }
-    }
-
-    void begin() {
-        listener.begin();
+    /** Says why nothing is answered. */
+    Comparison(String unanswered) {
+        this.unanswered = unanswered;
     }
 
     void begin(String type) {
         boolean isHeader = type.equals(HEADER);
         Characteristic said = isHeader ? null : Level.left(open.peek().characteristics, type).poll();
-        List<Item> items = said == null ? Collections.<Item>emptyList() : said.children();
-        open.push(new Level(items));
-        listener.begin(type, items);
+        List<Item> items = said == null ? NOTHING : said.children();
+        int column = isHeader ? TextWriter.HEADER_COLUMN : TextWriter.column(items);
+        Answer answer = Answer.characteristic(type, column, true);
+        open.peek().answers.add(answer);
+        open.push(new Level(answer.children, items));
     }
 
     /** An answer of the push header. */
     void fact(String name, String value) {
         String said = facts.get(name);
-        listener.answered(name, value, said != null, said);
+        add(Answer.parameter(name, value, said != null, said));
+    }
+
+    private void add(Answer answer) {
+        open.peek().answers.add(answer);
     }
 
     /** An element of an array: the first parameter of the name that has the value, or the next. */
     void single(String name, String value) {
-        Deque<Parameter> left = Level.left(open.peek().parameters, name);
-        for (Iterator<Parameter> each = left.iterator(); each.hasNext(); ) {
-            Parameter parameter = each.next();
-            if (Objects.equals(parameter.value(), value)) {
-                each.remove();
-                listener.answered(name, value, true, value);
+        for (Iterator<Parameter> left = Level.left(open.peek().parameters, name).iterator(); left.hasNext(); ) {
+            if (Objects.equals(left.next().value(), value)) {
+                left.remove();
+                add(Answer.parameter(name, value, true, value));
                 return;
             }
         }
@@ -137,25 +124,24 @@ final class Comparison {
     /** A parameter that may be answered several times. */
     void listed(String name, String value) {
         Parameter said = Level.left(open.peek().parameters, name).poll();
-        listener.answered(name, value, said != null, said == null ? null : said.value());
+        add(Answer.parameter(name, value, said != null, said == null ? null : said.value()));
     }
 
     void end() {
         rest();
         open.pop();
-        listener.end();
     }
 
-    /** Tells what the message says and nobody has answered. */
+    /** Adds what the message says and nobody has answered. */
     void rest() {
         for (Deque<Parameter> left : open.peek().parameters.values()) {
             for (Parameter parameter : left) {
-                listener.notAnswered(parameter.name(), parameter.value());
+                add(Answer.missing(parameter.name(), parameter.value()));
             }
         }
         for (Deque<Characteristic> left : open.peek().characteristics.values()) {
             for (Characteristic characteristic : left) {
-                listener.notAnswered(characteristic.type());
+                add(Answer.characteristic(characteristic.type(), 0, false));
             }
         }
     }

@@ -44,19 +44,12 @@ final class Encode extends Job {
     private static final Option<Boolean> BASE64 =
             Option.flag("--base64", "Write a line of base64.");
 
-    private static final Option<Sms> SMS =
-            Option.constant(
-                    "--sms",
-                    "FORM",
-                    Sms.values(),
-                    "Write the parts of an SMS, each a line of hexadecimal digits: ud (user data) or"
-                            + " submit (an SMS-SUBMIT).");
+    private static final Option<Sms> SMS = Option.constant("--sms", "FORM", Sms.values(),
+            "Write the parts of an SMS, each a line of hexadecimal digits: ud (user data) or submit"
+                    + " (an SMS-SUBMIT).");
 
-    private static final Option<String> TO =
-            Option.text(
-                    "--to",
-                    "NUMBER",
-                    "Who gets the SMS-SUBMIT: up to 20 digits, with \"+\" or without.");
+    private static final Option<String> TO = Option.text("--to", "NUMBER",
+            "Who gets the SMS-SUBMIT: up to 20 digits, with \"+\" or without.");
 
     private static final Option<String> OUTPUT =
             Option.text("-o --output", "FILE", "Write to a file that is not there yet.");
@@ -161,10 +154,8 @@ final class Encode extends Job {
 
     private void encode(String name, ProvisioningEncoder encoder) throws EncodingException {
         if (isRaw() && isOneOfSeveral()) {
-            fail(
-                    Console.FAILED,
-                    name,
-                    "is one of several, which only --hex, --base64 and --sms can write");
+            String reason = "is one of several, which only --hex, --base64 and --sms can write";
+            fail(Console.FAILED, name, reason);
             return;
         }
         byte[] message = has(BODY) ? encoder.body() : encoder.push();

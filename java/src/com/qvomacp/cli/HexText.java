@@ -18,7 +18,10 @@ final class HexText {
         /** Counted from 1. */
         final int line;
 
-        /** Hexadecimal digits; an odd number of them when a line breaks within a byte. */
+        /**
+         * Hexadecimal digits; an odd number of them when a line breaks within a byte. Null for
+         * numbers that are no bytes.
+         */
         final String digits;
 
         /** Whether it stands for itself, and is not to be joined with others. */
@@ -27,20 +30,17 @@ final class HexText {
         /** Whether it is user data with its header, by what the text says. */
         final boolean isUserData;
 
-        /** Whether it follows the piece before it on the next line. */
-        final boolean follows;
-
-        Piece(int line, String digits, boolean isWhole, boolean isUserData, boolean follows) {
+        Piece(int line, String digits, boolean isWhole, boolean isUserData) {
             this.line = line;
             this.digits = digits;
             this.isWhole = isWhole;
             this.isUserData = isUserData;
-            this.follows = follows;
+        }
+
+        boolean follows(Piece other) {
+            return !isWhole && !other.isWhole && line == other.line + 1;
         }
     }
-
-    /** A line of numbers that are no bytes. */
-    private static final Piece NUMBERS = new Piece(0, "", false, false, false);
 
     private static final String BYTE_ORDER_MARK = "\uFEFF";
 
@@ -74,54 +74,51 @@ final class HexText {
         return c < ' ' && !Character.isWhitespace(c) || c == 0x7F;
     }
 
-    /** The pieces of a text, in their order; null when there are numbers that are no bytes. */
+    /** The pieces of a text, in their order. */
     static List<Piece> pieces(String text) {
         List<String> lines = Arrays.asList(text.split("\r\n|[\r\n\f]", -1));
         List<Piece> pieces = new ArrayList<>();
         HexDump.Repeats repeats = new HexDump.Repeats();
-        int last = -2;
-        for (int i = 0; i < lines.size(); ) {
+        for (int i = 0; i < lines.size(); ++i) {
             CellDump cells = CellDump.at(lines, i);
             boolean areCells = cells != null && cells.bytes != null;
             HexDump dump = areCells ? null : HexDump.at(lines, i, repeats);
-            if (areCells || dump != null) {
-                String digits = digits(areCells ? cells.bytes : dump.bytes);
-                pieces.add(new Piece(i + 1, digits, true, false, false));
-                i = areCells ? cells.next : dump.next;
-                continue;
+            Piece piece = piece(lines.get(i).trim(), i + 1);
+            if (dump != null) {
+                piece = new Piece(i + 1, digits(dump.bytes), true, false);
+                i = dump.next - 1;
+            } else if (cells != null) {
+                piece = new Piece(i + 1, areCells ? digits(cells.bytes) : null, true, false);
+                i = cells.next - 1;
             }
-            if (cells != null) {
-                return null;
-            }
-            Piece piece = piece(lines.get(i).trim(), i, last == i - 1);
-            if (piece == NUMBERS) {
-                return null;
-            }
-            if (piece != null) {
+            boolean isMore = piece != null && piece.digits == null && areNumbers(pieces);
+            if (piece != null && !isMore) {
                 pieces.add(piece);
-                last = i;
             }
-            ++i;
         }
         return pieces;
     }
 
-    private static Piece piece(String line, int index, boolean follows) {
+    /** Whether the last of the pieces are numbers. */
+    private static boolean areNumbers(List<Piece> pieces) {
+        return !pieces.isEmpty() && pieces.get(pieces.size() - 1).digits == null;
+    }
+
+    private static Piece piece(String line, int number) {
         if (line.isEmpty() || isOfModem(line)) {
             return null;
         }
-        Piece form = gatewayForm(line, index);
+        Piece form = gatewayForm(line, number);
         if (form != null) {
             return form;
         }
-        if (line.contains("\\x")) {
-            return new Piece(index + 1, digits(escaped(line)), false, false, follows);
+        boolean isLiteral = line.contains("\\x");
+        String digits = isLiteral ? digits(escaped(line)) : behindLabel(line);
+        if (digits == null) {
+            return null;
         }
-        String digits = behindLabel(line);
-        if (digits != null && areNumbers(line)) {
-            return NUMBERS;
-        }
-        return digits == null ? null : new Piece(index + 1, digits, false, false, follows);
+        boolean areBytes = isLiteral || !areNumbers(line);
+        return new Piece(number, areBytes ? digits : null, !areBytes, false);
     }
 
     /** Whether a modem or its user says something about messages, and not one of them. */
@@ -241,7 +238,7 @@ final class HexText {
     }
 
     /** What a gateway is asked to send: {@code udh=%06%05...&text=%01%06...}. */
-    private static Piece gatewayForm(String line, int index) {
+    private static Piece gatewayForm(String line, int number) {
         byte[] header = member(line, "udh");
         byte[] data = null;
         for (String name : new String[] {"text", "data", "message", "msg", "ud", "binary"}) {
@@ -253,7 +250,7 @@ final class HexText {
         }
         data = isForm ? data : percentDecoded(line);
         String digits = (header == null ? "" : digits(header)) + (data == null ? "" : digits(data));
-        return new Piece(index + 1, digits, true, header != null, false);
+        return new Piece(number, digits, true, header != null);
     }
 
     /** A member of a form; null when the line has none of that name. */

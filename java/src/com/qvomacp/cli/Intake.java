@@ -69,9 +69,7 @@ final class Intake {
         boolean isMarkup = text.trim().startsWith("<");
         List<HexText.Piece> pieces =
                 isMarkup ? Collections.<HexText.Piece>emptyList() : HexText.pieces(text);
-        if (pieces == null) {
-            held.add(Held.unknown(name, content, NO_MESSAGE + OTHER_NUMBERS));
-        } else if (pieces.isEmpty()) {
+        if (pieces.isEmpty()) {
             held.add(Held.unknown(name, content, NO_MESSAGE + likeness(content)));
         } else {
             takePieces(Place.in(name), pieces, held);
@@ -125,6 +123,10 @@ final class Intake {
     }
 
     private void takeDigits(Place place, String digits, boolean isUserData, List<Held> held) {
+        if (digits == null) {
+            held.add(Held.error(place.toString(), NO_MESSAGE + OTHER_NUMBERS));
+            return;
+        }
         if (digits.length() % 2 != 0) {
             String odd = HEXADECIMAL + " with an odd number of digits, " + digits.length();
             held.add(Held.error(place.toString(), NO_MESSAGE + odd));
@@ -143,24 +145,23 @@ final class Intake {
 
         static List<Run> of(List<HexText.Piece> pieces) {
             List<Run> runs = new ArrayList<>();
-            List<HexText.Piece> run = new ArrayList<>();
-            for (HexText.Piece piece : pieces) {
-                if (!run.isEmpty() && (!piece.follows || piece.isWhole)) {
-                    runs.add(new Run(run));
-                    run = new ArrayList<>();
+            int from = 0;
+            for (int i = 1; i <= pieces.size(); ++i) {
+                if (i == pieces.size() || !pieces.get(i).follows(pieces.get(i - 1))) {
+                    runs.add(new Run(pieces.subList(from, i)));
+                    from = i;
                 }
-                run.add(piece);
             }
-            runs.add(new Run(run));
             return runs;
         }
 
+        /** All their digits; null when there are numbers among them. */
         String digits() {
-            if (pieces.size() == 1) {
-                return pieces.get(0).digits;
-            }
             StringBuilder digits = new StringBuilder();
             for (HexText.Piece piece : pieces) {
+                if (piece.digits == null) {
+                    return null;
+                }
                 digits.append(piece.digits);
             }
             return digits.toString();
@@ -177,7 +178,7 @@ final class Intake {
 
         boolean isJoinedMessage(Intake intake) {
             String digits = digits();
-            return digits.length() % 2 == 0 && intake.isMessage(HexText.bytes(digits));
+            return digits != null && digits.length() % 2 == 0 && intake.isMessage(HexText.bytes(digits));
         }
 
         boolean isMessage(Intake intake) {

@@ -1,6 +1,8 @@
 package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.ProvisioningException;
+import com.qvomacp.eng.omacp.PushHeader;
 import java.io.IOException;
 import java.util.ArrayList;
 import java.util.Arrays;
@@ -10,26 +12,16 @@ import java.util.List;
 abstract class Job {
     private static final int DEFAULT_LIMIT = 64 << 10;
 
-    private static final Option<String> LIMIT =
-            Option.text(
-                    "--limit",
-                    "BYTES",
-                    "Read no more than so many bytes of a file; K and M may stand behind the number"
-                            + " (by itself 64K).");
+    private static final Option<String> LIMIT = Option.text("--limit", "BYTES",
+            "Read no more than so many bytes of a file; K and M may stand behind the number (by"
+                    + " itself 64K).");
 
-    private static final Option<Form> AS =
-            Option.constant(
-                    "--as",
-                    "FORM",
-                    Form.values(),
-                    "What the messages are, where it does not show by itself: push, body, sms (an"
-                            + " SMS-DELIVER) or ud (the user data of an SMS).");
+    private static final Option<Form> AS = Option.constant("--as", "FORM", Form.values(),
+            "What the messages are, where it does not show by itself: push, body, sms (an"
+                    + " SMS-DELIVER) or ud (the user data of an SMS).");
 
     private static final Option<Terminal.Color> COLOR =
-            Option.constant(
-                    "--color",
-                    "WHEN",
-                    Terminal.Color.values(),
+            Option.constant("--color", "WHEN", Terminal.Color.values(),
                     "Use colours: auto (on a terminal, unless NO_COLOR is set), always, never.");
 
     Arguments arguments;
@@ -179,14 +171,23 @@ abstract class Job {
         }
     }
 
+    /** The push header of a message; where it cannot be read, null, and that is said. */
+    PushHeader header(Held held) {
+        try {
+            return PushHeader.parse(held.bytes);
+        } catch (ProvisioningException none) {
+            explain(Reading.of(held, limit()));
+            failed(held.name, none.getMessage());
+            return null;
+        }
+    }
+
     /** Says why a document cannot be encoded, or not be written as XML. */
     void refuse(String name, EncodingException e) {
         if (e.line() > 0) {
             String expected = e.expected().isEmpty() ? "" : ", expected ";
-            fail(
-                    Console.REFUSED,
-                    name + ':' + e.line() + ':' + e.column(),
-                    e.getMessage() + expected + String.join(", ", e.expected()));
+            String place = name + ':' + e.line() + ':' + e.column();
+            fail(Console.REFUSED, place, e.getMessage() + expected + String.join(", ", e.expected()));
         } else if (e.path() != null) {
             fail(Console.REFUSED, name, e.getMessage() + ", in " + e.path());
         } else {

@@ -41,13 +41,11 @@ public final class Main {
     public static void main(String[] arguments) {
         // Nobody types a message.
         boolean helpless = arguments.length == 0 && Terminal.isTerminal(0);
-        System.exit(
-                run(
-                        new FileInputStream(FileDescriptor.in),
-                        new FileOutputStream(FileDescriptor.out),
-                        new FileOutputStream(FileDescriptor.err),
-                        Terminal.ofProcess(System.getenv()),
-                        helpless ? new String[] {"--help"} : arguments));
+        InputStream in = new FileInputStream(FileDescriptor.in);
+        OutputStream out = new FileOutputStream(FileDescriptor.out);
+        OutputStream err = new FileOutputStream(FileDescriptor.err);
+        Terminal terminal = Terminal.ofProcess(System.getenv());
+        System.exit(run(in, out, err, terminal, helpless ? new String[] {"--help"} : arguments));
     }
 
     /**
@@ -55,17 +53,13 @@ public final class Main {
      *
      * @return the exit status: 0 all is well, 1 refused, 2 could not be tried
      */
-    static int run(
-            InputStream in,
-            OutputStream out,
-            OutputStream err,
-            Terminal terminal,
+    static int run(InputStream in, OutputStream out, OutputStream err, Terminal terminal,
             String... arguments) {
         Console console = new Console(in, out, err, terminal);
         try {
             run(console, arguments);
             console.out.flush();
-        } catch (Output.ClosedError closed) {
+        } catch (Console.ClosedError closed) {
             console.raise(Console.FAILED);
             if (!closed.isBrokenPipe()) {
                 console.err.println("omacp: the output cannot be written");
@@ -81,11 +75,8 @@ public final class Main {
         boolean isNamed = command(first) != null;
         String name = isNamed ? first : COMMANDS[0];
         Job job = command(name);
-        Arguments plain =
-                first.equals(Usage.COMPLETION)
-                        ? null
-                        : Arguments.plain(job.options(), arguments, isNamed ? 1 : 0);
-        if (plain == null) {
+        Arguments plain = Arguments.plain(job.options(), arguments, isNamed ? 1 : 0);
+        if (plain == null || first.equals(Usage.COMPLETION)) {
             Usage.run(console, arguments);
         } else {
             run(console, name, job, plain);

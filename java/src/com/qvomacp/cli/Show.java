@@ -3,7 +3,6 @@ package com.qvomacp.cli;
 import com.qvomacp.eng.omacp.EncodeOptions;
 import com.qvomacp.eng.omacp.EncodingException;
 import com.qvomacp.eng.omacp.ProvisioningEncoder;
-import com.qvomacp.eng.omacp.ProvisioningException;
 import com.qvomacp.eng.omacp.PushHeader;
 import java.util.Collections;
 import java.util.List;
@@ -31,11 +30,9 @@ final class Show extends JsonJob {
     private static final Option<Boolean> BYTES =
             Option.flag("--bytes", "List every byte with what it means.");
 
-    private static final Option<Boolean> ANSWERS =
-            Option.flag(
-                    "--answers",
-                    "Ask the native library as well, and mark where it answers otherwise than the"
-                            + " message says.");
+    private static final Option<Boolean> ANSWERS = Option.flag("--answers",
+            "Ask the native library as well, and mark where it answers otherwise than the message"
+                    + " says.");
 
     private static final Option<Boolean> XML =
             Option.flag("--xml", "Print the document as XML, from which encode makes it.");
@@ -119,13 +116,8 @@ final class Show extends JsonJob {
             fail(Console.REFUSED, held.name, "has no push header");
             return;
         }
-        PushHeader read;
-        try {
-            read = PushHeader.parse(held.bytes);
-        } catch (ProvisioningException refused) {
-            console.raise(Console.REFUSED);
-            complain(Refusal.of(held, refused, 0).write(startOf(held.name), errPalette()));
-            failed(held.name, refused.getMessage());
+        PushHeader read = header(held);
+        if (read == null) {
             return;
         }
         int bodyLength = held.bytes.length - read.length();
@@ -155,7 +147,7 @@ final class Show extends JsonJob {
             text.document(reading.document);
         }
         if (has(ANSWERS)) {
-            answers(reading, new AnswerText(console.out, outPalette()));
+            text.answers(compared(reading));
         }
     }
 
@@ -163,9 +155,10 @@ final class Show extends JsonJob {
         beginObject(reading.held.name);
         int depth = writer.depth();
         try {
-            new MessageJson(writer).message(reading);
+            MessageJson json = new MessageJson(writer);
+            json.message(reading);
             if (has(ANSWERS)) {
-                answers(reading, new AnswerJson(writer));
+                json.answers(compared(reading));
             }
         } finally {
             writer.endTo(depth);
@@ -174,13 +167,13 @@ final class Show extends JsonJob {
     }
 
     /** Asks the library; where it cannot be loaded, that is said. */
-    private void answers(Reading reading, Comparison.Listener listener) {
+    private Comparison compared(Reading reading) {
         try {
-            Comparison.of(reading, listener);
+            return new Comparison(reading);
         } catch (UnsatisfiedLinkError missing) {
             console.raise(Console.FAILED);
             complain(startOf(reading.held.name) + Visible.of(missing.getMessage()) + "\n");
-            listener.unanswered("the library cannot be loaded");
+            return new Comparison("the library cannot be loaded");
         }
     }
 

@@ -19,7 +19,7 @@ import java.util.Locale;
  */
 final class TextWriter {
     static final int INDENT = 2;
-    private static final int HEADER_COLUMN = 16;
+    static final int HEADER_COLUMN = 16;
 
     /** Deeper items are indented no further. */
     static final int DEEPEST = 16;
@@ -150,6 +150,44 @@ final class TextWriter {
             int more = deviations.size() - DEVIATIONS;
             out.append("- and " + more + " more, which --json lists\n");
         }
+    }
+
+    /** Writes what the library answers, with a mark in front of what the message belies. */
+    void answers(Comparison comparison) {
+        boolean isAnswered = comparison.unanswered == null;
+        String title = "The native library answers" + (isAnswered ? "" : " nothing");
+        out.append('\n').append(palette.bold(title));
+        if (isAnswered) {
+            out.append(" (! otherwise than the message says, - not at all):\n");
+            answers(comparison.answers, 0, 0);
+        } else {
+            out.append(": " + comparison.unanswered + ".\n");
+        }
+    }
+
+    private void answers(List<Answer> answers, int depth, int column) {
+        for (Answer answer : answers) {
+            boolean isParameter = answer.children == null;
+            boolean isOtherwise = isParameter && answer.isAnswered && !answer.isSame();
+            String name = answer.name == null ? (isParameter ? "(no NAME)" : "(no TYPE)") : answer.name;
+            out.append(depth == 0 && !isParameter ? "\n" : "");
+            out.append(isOtherwise ? palette.error("!") : answer.isAnswered ? " " : palette.error("-"));
+            out.append(' ');
+            line(depth * INDENT, column, name, isParameter ? shown(answer) : null);
+            if (!isParameter) {
+                answers(answer.children, depth + 1, answer.column);
+            }
+        }
+    }
+
+    private static String shown(Answer answer) {
+        if (!answer.isAnswered) {
+            return shown(answer.said);
+        }
+        String shown = answer.value == null ? "(none)" : Visible.value(answer.value);
+        String says = answer.said == null ? "gives no value" : "says " + Visible.quoted(answer.said);
+        String instead = answer.isSaid ? "the message " + says : "the message does not say it";
+        return answer.isSame() ? shown : shown + "  (" + instead + ")";
     }
 
     /** Writes a name, and in its column the value as it is shown; null for none. */

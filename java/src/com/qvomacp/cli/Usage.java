@@ -49,13 +49,9 @@ final class Usage {
 
     static CommandLine program() {
         CommandLine program = new CommandLine(new Usage());
-        program.getCommandSpec().addOption(help());
-        program.getCommandSpec()
-                .addOption(
-                        OptionSpec.builder("-V", "--version")
-                                .versionHelp(true)
-                                .description("Show the version and exit.")
-                                .build());
+        OptionSpec.Builder version = OptionSpec.builder("-V", "--version").versionHelp(true);
+        version.description("Show the version and exit.");
+        program.getCommandSpec().addOption(help()).addOption(version.build());
         for (String name : Main.COMMANDS) {
             program.addSubcommand(command(Main.command(name)));
         }
@@ -101,10 +97,8 @@ final class Usage {
     }
 
     private static OptionSpec help() {
-        return OptionSpec.builder("-h", "--help")
-                .usageHelp(true)
-                .description("Show this help and exit.")
-                .build();
+        OptionSpec.Builder help = OptionSpec.builder("-h", "--help").usageHelp(true);
+        return help.description("Show this help and exit.").build();
     }
 
     /** Does what any command line asks for. */
