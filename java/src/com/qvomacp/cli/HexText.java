@@ -18,7 +18,10 @@ final class HexText {
         /** Counted from 1. */
         final int line;
 
-        /** Hexadecimal digits; an odd number of them when a line breaks within a byte. */
+        /**
+         * Hexadecimal digits; an odd number of them when a line breaks within a byte. Null for
+         * numbers that are no bytes.
+         */
         final String digits;
 
         /** Whether it stands for itself, and is not to be joined with others. */
@@ -38,9 +41,6 @@ final class HexText {
             return !isWhole && !other.isWhole && line == other.line + 1;
         }
     }
-
-    /** A line of numbers that are no bytes. */
-    private static final Piece NUMBERS = new Piece(0, "", false, false);
 
     private static final String BYTE_ORDER_MARK = "\uFEFF";
 
@@ -74,7 +74,7 @@ final class HexText {
         return c < ' ' && !Character.isWhitespace(c) || c == 0x7F;
     }
 
-    /** The pieces of a text, in their order; null when there are numbers that are no bytes. */
+    /** The pieces of a text, in their order. */
     static List<Piece> pieces(String text) {
         List<String> lines = Arrays.asList(text.split("\r\n|[\r\n\f]", -1));
         List<Piece> pieces = new ArrayList<>();
@@ -83,21 +83,25 @@ final class HexText {
             CellDump cells = CellDump.at(lines, i);
             boolean areCells = cells != null && cells.bytes != null;
             HexDump dump = areCells ? null : HexDump.at(lines, i, repeats);
-            Piece piece = null;
-            if (areCells || dump != null) {
-                piece = new Piece(i + 1, digits(areCells ? cells.bytes : dump.bytes), true, false);
-                i = (areCells ? cells.next : dump.next) - 1;
-            } else {
-                piece = cells != null ? NUMBERS : piece(lines.get(i).trim(), i + 1);
+            Piece piece = piece(lines.get(i).trim(), i + 1);
+            if (dump != null) {
+                piece = new Piece(i + 1, digits(dump.bytes), true, false);
+                i = dump.next - 1;
+            } else if (cells != null) {
+                piece = new Piece(i + 1, areCells ? digits(cells.bytes) : null, true, false);
+                i = cells.next - 1;
             }
-            if (piece == NUMBERS) {
-                return null;
-            }
-            if (piece != null) {
+            boolean isMore = piece != null && piece.digits == null && areNumbers(pieces);
+            if (piece != null && !isMore) {
                 pieces.add(piece);
             }
         }
         return pieces;
+    }
+
+    /** Whether the last of the pieces are numbers. */
+    private static boolean areNumbers(List<Piece> pieces) {
+        return !pieces.isEmpty() && pieces.get(pieces.size() - 1).digits == null;
     }
 
     private static Piece piece(String line, int number) {
@@ -113,7 +117,8 @@ final class HexText {
         if (digits == null) {
             return null;
         }
-        return !isLiteral && areNumbers(line) ? NUMBERS : new Piece(number, digits, false, false);
+        boolean areBytes = isLiteral || !areNumbers(line);
+        return new Piece(number, areBytes ? digits : null, !areBytes, false);
     }
 
     /** Whether a modem or its user says something about messages, and not one of them. */

@@ -69,9 +69,7 @@ final class Intake {
         boolean isMarkup = text.trim().startsWith("<");
         List<HexText.Piece> pieces =
                 isMarkup ? Collections.<HexText.Piece>emptyList() : HexText.pieces(text);
-        if (pieces == null) {
-            held.add(Held.unknown(name, content, NO_MESSAGE + OTHER_NUMBERS));
-        } else if (pieces.isEmpty()) {
+        if (pieces.isEmpty()) {
             held.add(Held.unknown(name, content, NO_MESSAGE + likeness(content)));
         } else {
             takePieces(Place.in(name), pieces, held);
@@ -125,6 +123,10 @@ final class Intake {
     }
 
     private void takeDigits(Place place, String digits, boolean isUserData, List<Held> held) {
+        if (digits == null) {
+            held.add(Held.error(place.toString(), NO_MESSAGE + OTHER_NUMBERS));
+            return;
+        }
         if (digits.length() % 2 != 0) {
             String odd = HEXADECIMAL + " with an odd number of digits, " + digits.length();
             held.add(Held.error(place.toString(), NO_MESSAGE + odd));
@@ -153,9 +155,13 @@ final class Intake {
             return runs;
         }
 
+        /** All their digits; null when there are numbers among them. */
         String digits() {
             StringBuilder digits = new StringBuilder();
             for (HexText.Piece piece : pieces) {
+                if (piece.digits == null) {
+                    return null;
+                }
                 digits.append(piece.digits);
             }
             return digits.toString();
@@ -172,7 +178,7 @@ final class Intake {
 
         boolean isJoinedMessage(Intake intake) {
             String digits = digits();
-            return digits.length() % 2 == 0 && intake.isMessage(HexText.bytes(digits));
+            return digits != null && digits.length() % 2 == 0 && intake.isMessage(HexText.bytes(digits));
         }
 
         boolean isMessage(Intake intake) {

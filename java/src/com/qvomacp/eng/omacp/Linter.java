@@ -141,6 +141,8 @@ final class Linter {
                 && header.securityMethod() != SecurityMethod.USERPINMAC) {
             linter.add(Rule.NO_MAC, null, "the push has no MAC", null);
         }
+        // First, for they may be many, and are let go of.
+        linter.deviations(document.deviations());
         List<Parameter> references = new ArrayList<>();
         Walk walk = new Walk(document.root());
         for (Item item; (item = walk.next()) != null; ) {
@@ -153,7 +155,6 @@ final class Linter {
         for (Parameter reference : references) {
             linter.reference(reference);
         }
-        linter.deviations(document.deviations());
         linter.verdict(document, verdict);
         Collections.sort(linter.findings, BY_OFFSET);
         return Collections.unmodifiableList(linter.findings);

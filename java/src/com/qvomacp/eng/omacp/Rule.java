@@ -92,7 +92,7 @@ public enum Rule {
     /** What the rows have in common. */
     private static final class Text {
         static final String CONTENT = "OMA-WAP-TS-ProvCont, ";
-        static final String LIBRARY = "no OMA document: the rule is the library's own";
+        static final String LIBRARY = "the library's own rules, which no OMA document has";
     }
 
     private final Severity severity;

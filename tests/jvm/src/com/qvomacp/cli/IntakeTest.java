@@ -594,12 +594,15 @@ class IntakeTest {
                         + "0000019\n",
                 "0000000 03713603001 20044333055 10131641222 06016240461\n"
                         + "0000020 10214643105 15000630065\n0000030\n",
-                "   1   6  47  31  45 182 145 128 146  67  55  65  49  65  57  48\n  69  70  51\n",
+                "   1   6  47  31  45 182 145 128 146  67  55  65  49  65  57  48\n  69 170   1   6 128\n",
                 "  1537  7983 46637 32913 17298 16695 16689 12345\n 17989 16947 12341\n",
                 "[1, 6, 47, 31, 45, -74, -111, -128]\n"
             })
     void namesADumpOfAnythingElseThanBytes(String dump) {
         assertRefused("numbers or a dump, and not bytes as", takeText(dump));
+        List<Held> held = takeText(dump + "\npush: " + Sms.hex(PUSH) + "\n");
+        assertEquals(2, held.size());
+        assertPush(held.subList(1, 2));
     }
 
     @Test
