@@ -1,6 +1,7 @@
 // The parameters of the characteristics that are named by text: ROAMING, WI-FI, Vodafone VoWiFi.
 #include "named_parm_suite.h"
 #include "parm_suite.h"
+#include "qvsParm.h"
 
 using namespace parms;
 
@@ -178,6 +179,27 @@ TEST_F(WifiParm, TakesSeveralNamesInOneElement)
     Reading<Wifi> run(parm(join({{0x05}, ssid, opaque("home"), {0x05}, priority, opaque("1")})));
     EXPECT_EQ(run.read(), 0U);
     EXPECT_EQ(run.left(), 0U);
+    EXPECT_STREQ(run.record->pszNetSsid, "home");
+    EXPECT_STREQ(run.record->pszPriority, "1");
+}
+
+TEST_F(WifiParm, EndsAtANameOrAValueThatPassesTheLimitOfAllTexts)
+{
+    for (const size_t left : {11U, 10U, 7U, 6U}) {
+        Reading<Wifi> run(named("NETSSID", "home"));
+        qvs::DecodeState state = {.textLeft = left};
+        EXPECT_EQ(qvs::readParms(run.decoder, &state, run.record, qvs::kWifiParms.table),
+                  left < 11 ? 4111U : 0U);
+        EXPECT_EQ(state.textLimit, left < 11);
+    }
+}
+
+TEST_F(WifiParm, ReadsTheElementsThatFollowInADecode)
+{
+    Reading<Wifi> run(join({named("NETSSID", "home"), named("PRIORITY", "1"), {0x47, 0x01}}));
+    qvs::DecodeState state;
+    EXPECT_EQ(qvs::readParms(run.decoder, &state, run.record, qvs::kWifiParms.table), 0U);
+    EXPECT_EQ(run.left(), 2U) << "an element of another shape is left";
     EXPECT_STREQ(run.record->pszNetSsid, "home");
     EXPECT_STREQ(run.record->pszPriority, "1");
 }

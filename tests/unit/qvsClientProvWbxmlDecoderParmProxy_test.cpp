@@ -5,6 +5,7 @@
 #include "parm_suite.h"
 
 #include <algorithm>
+#include <optional>
 
 using namespace parms;
 
@@ -247,6 +248,23 @@ TEST_F(PxPhysicalParm, TakesADomainThatFoundNoMemoryForOneThatCannotBeRead)
                             failed);
               }),
               1);
+}
+
+TEST_F(PxPhysicalParm, FailsBehindAReferenceWithoutMemoryForItsText)
+{
+    for (const bool traced : {false, true}) {
+        Reading<PxPhysical> run(parm(Bytes{0x20, 0x06, 0x83, 0x00}));
+        run.decoder->pStringTable = static_cast<char *>(records::blank(1));
+        std::optional<Traces> traces;
+        if (traced) {
+            traces.emplace();
+        }
+        blocks::failAt = 0;
+        EXPECT_EQ(run.read(), 4103U);
+        blocks::reset();
+        EXPECT_EQ(run.left(), 1U) << "the END stays";
+        EXPECT_EQ(run.record->pszPxAddr, nullptr);
+    }
 }
 
 TEST_F(PxPhysicalParm, EndsAtADomainThatPassesTheLimitOfAllTexts)

@@ -697,6 +697,15 @@ TEST_F(TextLimit, EndsTheDecodeWith4111BeyondBothItsBounds)
     }
 }
 
+TEST_F(TextLimit, IsASize)
+{
+    Decoder decoder({0x01});
+    const uint32_t size = decoder->ptBuffer->nSize;
+    decoder->ptBuffer->nSize = 100'000'000;
+    EXPECT_EQ(qvs::wholeDecode(decoder).textLeft, std::min<uint64_t>(10'000'000'000, SIZE_MAX));
+    decoder->ptBuffer->nSize = size;
+}
+
 TEST_F(TextLimit, CountsTheTextThatALaterPairContinues)
 {
     // Each pair adds one byte and copies all the ones before it.

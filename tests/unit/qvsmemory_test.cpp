@@ -218,6 +218,9 @@ TEST_F(Memory, EveryAllocatorGivesNullWithoutMemory)
     refused([text] { return qvsMemReAlloc_debug(text, 3, kFile, 1); });
     EXPECT_STREQ(text, "abc") << "the old block is still there";
     qvsMemFree_debug(text);
+    const auto large = [] { return qvsMemAllocSetZero_debug(4096, kFile, 1); };
+    refused(large);
+    EXPECT_EQ(reportOf([&] { refused(large); }), "");
 }
 
 TEST_F(Memory, NothingIsTrackedBeforeTheStart)

@@ -132,10 +132,8 @@ qvsResult create(qvsArena *arena, qvsList **list, void *item, qvsListNode **last
     }
     *made = {};
     if (item) {
-        if (qvsResult result = addLast(arena, made, item, last)) {
-            if (!arena) {
-                qvsMemFree_debug(made);
-            }
+        if (qvsResult result = addLast(nullptr, made, item, last)) {
+            qvsMemFree_debug(made);
             return result;
         }
     }
