@@ -28,12 +28,6 @@ final class Views {
         }
         for (AccessPoint point : message.accessPoints()) {
             count += 1 + point.authentications().size() + point.validities().size();
-            for (Wlan wlan : point.wlans()) {
-                count += 1 + wlan.secondarySsids().size() + wlan.wepKeys().size();
-                for (Eap eap : wlan.eaps()) {
-                    count += 1 + eap.certificates().size();
-                }
-            }
         }
         for (Application application : message.applications()) {
             count +=

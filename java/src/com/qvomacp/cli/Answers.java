@@ -16,21 +16,8 @@ import java.util.Arrays;
 import java.util.function.IntConsumer;
 import java.util.function.IntFunction;
 
-/** Has a message parsed by the native library, and tells what its 87 natives answer. */
+/** Has a message parsed by the native library, and asks its 87 natives; nothing is kept of it. */
 final class Answers {
-    /** Hears what is answered, a characteristic after the other; nothing is kept. */
-    interface Listener {
-        void begin(String type);
-
-        /** An element of an array; the value is null when the parameter has none. */
-        void single(String name, String value);
-
-        /** A parameter that may be answered several times. */
-        void listed(String name, String value);
-
-        void end();
-    }
-
     /** A push header that says no more than that a body follows. */
     private static final byte[] BARE_HEADER = {0x01, 0x06, 0x01, (byte) 0xB6};
 
@@ -73,10 +60,10 @@ final class Answers {
     private final XCPCtxWifi wifis = new XCPCtxWifi();
     private final XCPCtxVoWifi voWifis = new XCPCtxVoWifi();
 
-    private final Listener listener;
+    private final Comparison comparison;
 
-    private Answers(Listener listener) {
-        this.listener = listener;
+    private Answers(Comparison comparison) {
+        this.comparison = comparison;
     }
 
     /**
@@ -85,9 +72,9 @@ final class Answers {
      * @return false when the library refuses the message, and so answers nothing
      * @throws UnsatisfiedLinkError when the library cannot be loaded
      */
-    static boolean ask(Held held, Listener listener) {
+    static boolean ask(Held held, Comparison comparison) {
         NativeLibrary.load();
-        return new Answers(listener).ask(held);
+        return new Answers(comparison).ask(held);
     }
 
     private boolean ask(Held held) {
@@ -100,6 +87,7 @@ final class Answers {
                 header();
             }
             characteristics();
+            comparison.rest();
             return true;
         } finally {
             parser.qvomacp_parser_del();
@@ -113,21 +101,21 @@ final class Answers {
     }
 
     private void header() {
-        listener.begin(Comparison.HEADER);
-        listener.single("Content type", "" + parser.qvomacp_GetParserContentType());
-        listener.single("Header length", "" + parser.qvomacp_GetParserHeaderLen());
-        listener.single("Body length", "" + parser.qvomacp_GetParserBodyLen());
+        comparison.begin(Comparison.HEADER);
+        comparison.fact("Content type", "" + parser.qvomacp_GetParserContentType());
+        comparison.fact("Header length", "" + parser.qvomacp_GetParserHeaderLen());
+        comparison.fact("Body length", "" + parser.qvomacp_GetParserBodyLen());
         int sec = parser.qvomacp_GetParserSEC();
         if (sec != 0) {
             int method = sec & 0x7F;
             String[] methods = METHODS.split(" ");
-            listener.single("SEC", method < methods.length ? methods[method] : "UNKNOWN");
+            comparison.fact("SEC", method < methods.length ? methods[method] : "UNKNOWN");
         }
         byte[] mac = parser.qvomacp_GetParserMAC();
         if (mac.length > 0) {
-            listener.single("MAC", new String(mac, StandardCharsets.ISO_8859_1));
+            comparison.fact("MAC", new String(mac, StandardCharsets.ISO_8859_1));
         }
-        listener.end();
+        comparison.end();
     }
 
     private void characteristics() {
@@ -135,7 +123,7 @@ final class Answers {
         each("NAPDEF", napDefs.qvomacp_GetPxNapDefCount(), this::napDef);
         each("BOOTSTRAP", bootstraps.qvomacp_GetPxBootstrapCount(), this::bootstrap);
         String id = identity.qvomacp_GetPxClientIdentityData();
-        each("CLIENTIDENTITY", id == null ? 0 : 1, only -> listener.single("CLIENT-ID", id));
+        each("CLIENTIDENTITY", id == null ? 0 : 1, only -> comparison.single("CLIENT-ID", id));
         each("VENDORCONFIG", vendorConfigs.qvomacp_GetPxVenderConfigCount(), this::vendorConfig);
         each("APPLICATION", applications.qvomacp_GetPxApplicationCount(), this::application);
         each("ACCESS", accesses.qvomacp_GetPxCtxAccessCount(), this::access);
@@ -148,22 +136,22 @@ final class Answers {
     /** Tells the characteristics of one kind; indexes count from 1. */
     private void each(String type, int count, IntConsumer tell) {
         for (int i = 1; i <= count; ++i) {
-            listener.begin(type);
+            comparison.begin(type);
             tell.accept(i);
-            listener.end();
+            comparison.end();
         }
     }
 
     /** Tells a parameter that may occur several times; indexes count from 1. */
     private void list(String name, int count, IntFunction<String> valueAt) {
         for (int i = 1; i <= count; ++i) {
-            listener.listed(name, valueAt.apply(i));
+            comparison.listed(name, valueAt.apply(i));
         }
     }
 
     private void single(String name, String value) {
         if (value != null) {
-            listener.single(name, value);
+            comparison.single(name, value);
         }
     }
 
@@ -238,7 +226,7 @@ final class Answers {
         String[] values = vendorConfigs.qvomacp_GetPxVenderConfigData(v);
         single("NAME", values[0]);
         if (values[1] != null) {
-            listener.single(values[1], values[2]);
+            comparison.single(values[1], values[2]);
         }
     }
 

@@ -3,9 +3,9 @@ package com.qvomacp.cli;
 import com.qvomacp.eng.omacp.EncodeOption;
 import java.io.IOException;
 import java.nio.charset.StandardCharsets;
+import java.util.ArrayList;
+import java.util.List;
 import java.util.Locale;
-import picocli.CommandLine;
-import picocli.CommandLine.Model.OptionSpec;
 
 /**
  * Options of the command line that are those of encoding. A secret may also stand in a file or in the
@@ -15,42 +15,32 @@ final class Choices {
     private static final String FILE = "-file";
     private static final String ENVIRONMENT = "-env";
 
+    /** What encoding takes, and what a check of a MAC takes of it. */
+    static final List<Option<String>> ALL = new ArrayList<>();
+
+    static final List<Option<String>> SECRETS = new ArrayList<>();
+
+    static {
+        for (EncodeOption option : EncodeOption.values()) {
+            String name = "--" + option.optionName();
+            String label = option.choices().isEmpty() ? option.optionName() : "how";
+            List<Option<String>> ways = new ArrayList<>();
+            ways.add(Option.text(name, label.toUpperCase(Locale.ROOT), described(option), option.choices()));
+            if (option.isSecret()) {
+                ways.add(Option.text(name + FILE, "FILE", "Read " + name + " from a file, or \"-\"."));
+                ways.add(Option.text(name + ENVIRONMENT, "NAME", "Take " + name + " from the environment."));
+                SECRETS.addAll(ways);
+            }
+            ALL.addAll(ways);
+        }
+    }
+
     private final Job job;
     private boolean isInputTaken;
 
     Choices(Job job) {
         this.job = job;
         this.isInputTaken = job.readsStandardInput();
-    }
-
-    /** A command with the options that it takes: secrets alone, unless it encodes. */
-    static CommandLine command(Job job) {
-        CommandLine command = new CommandLine(job);
-        for (EncodeOption option : EncodeOption.values()) {
-            String name = option.optionName();
-            if (option.isSecret() || job instanceof Encode) {
-                String label = option.choices().isEmpty() ? name : "how";
-                add(command, option, "", label, described(option));
-            }
-            if (option.isSecret()) {
-                add(command, option, FILE, "file", "Read --" + name + " from a file, or \"-\".");
-                add(command, option, ENVIRONMENT, "name", "Take --" + name + " from the environment.");
-            }
-        }
-        return command;
-    }
-
-    private static void add(
-            CommandLine command, EncodeOption option, String way, String label, String text) {
-        OptionSpec.Builder spec =
-                OptionSpec.builder("--" + option.optionName() + way)
-                        .paramLabel(label.toUpperCase(Locale.ROOT))
-                        .type(String.class)
-                        .description(text);
-        if (!option.choices().isEmpty()) {
-            spec.completionCandidates(option.choices());
-        }
-        command.getCommandSpec().addOption(spec.build());
     }
 
     private static String described(EncodeOption option) {
@@ -67,10 +57,19 @@ final class Choices {
     /** The value that the command line states for an option, or says where it stands; or null. */
     String value(EncodeOption option) {
         String name = "--" + option.optionName();
-        String value = job.spec.findOption(name).getValue();
+        String value = stated(name);
         return option.isSecret()
                 ? one(name, value, one(name, ofFile(name + FILE), ofEnvironment(name + ENVIRONMENT)))
                 : value;
+    }
+
+    private String stated(String name) {
+        for (Option<String> option : ALL) {
+            if (option.isNamed(name)) {
+                return job.value(option);
+            }
+        }
+        throw new AssertionError(name);
     }
 
     private static String one(String name, String first, String second) {
@@ -81,7 +80,7 @@ final class Choices {
     }
 
     private String ofEnvironment(String name) {
-        String variable = job.spec.findOption(name).getValue();
+        String variable = stated(name);
         String value = variable == null ? null : System.getenv(variable);
         if (variable != null && value == null) {
             throw new UsageException(name + " names no variable: " + variable);
@@ -90,7 +89,7 @@ final class Choices {
     }
 
     private String ofFile(String name) {
-        String file = job.spec.findOption(name).getValue();
+        String file = stated(name);
         if (file == null) {
             return null;
         }

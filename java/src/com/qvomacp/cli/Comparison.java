@@ -6,6 +6,7 @@ import com.qvomacp.eng.omacp.Parameter;
 import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.SecurityMethod;
 import java.util.ArrayDeque;
+import java.util.ArrayList;
 import java.util.Collections;
 import java.util.Deque;
 import java.util.HashMap;
@@ -19,42 +20,20 @@ import java.util.Objects;
  * Holds what the native library answers against what the message says. The characteristics of a type
  * that stand in the same one are compared by their order, and so are the parameters of a name.
  */
-final class Comparison implements Answers.Listener {
+final class Comparison {
     /** In place of a type, for what is answered of the push header. */
     static final String HEADER = "push header";
 
-    /** How an answer stands to the message. */
-    enum Agreement {
-        SAME,
-        OTHERWISE,
-        NOT_SAID
-    }
-
-    /** Hears what is answered, compared. */
-    interface Listener {
-        /** The items of the characteristic in the message; empty when it is not there. */
-        void begin(String type, List<Item> said);
-
-        /** Of a parameter; {@code said} is what the message says where that is something else. */
-        void answered(String name, String value, Agreement agreement, String said);
-
-        /** A parameter of the message, or a characteristic of it, that is not answered. */
-        void notAnswered(String name, String value);
-
-        void notAnswered(String type);
-
-        void end();
-
-        /** Told in place of anything else. */
-        void unanswered(String why);
-    }
+    private static final List<Item> NOTHING = Collections.emptyList();
 
     /** A characteristic that is being answered, and what of the message is left of it. */
     private static final class Level {
+        final List<Answer> answers;
         final Map<String, Deque<Parameter>> parameters = new LinkedHashMap<>();
         final Map<String, Deque<Characteristic>> characteristics = new LinkedHashMap<>();
 
-        Level(List<Item> said) {
+        Level(List<Answer> answers, List<Item> said) {
+            this.answers = answers;
             for (Item item : said) {
                 if (item instanceof Parameter) {
                     add(parameters, ((Parameter) item).name(), (Parameter) item);
@@ -68,58 +47,29 @@ final class Comparison implements Answers.Listener {
             map.computeIfAbsent(key, first -> new ArrayDeque<>()).add(item);
         }
 
-        Characteristic next(String type) {
-            Deque<Characteristic> left = characteristics.get(type);
-            return left == null ? null : left.poll();
-        }
-
-        /** The next parameter of a name, or the first one that has the value. */
-        Parameter next(String name, String value, boolean anywhere) {
-            Deque<Parameter> left = parameters.get(name);
-            if (left == null) {
-                return null;
-            }
-            if (anywhere) {
-                for (Iterator<Parameter> each = left.iterator(); each.hasNext(); ) {
-                    Parameter parameter = each.next();
-                    if (Objects.equals(parameter.value(), value)) {
-                        each.remove();
-                        return parameter;
-                    }
-                }
-            }
-            return left.poll();
+        private static <T> Deque<T> left(Map<String, Deque<T>> map, String key) {
+            Deque<T> left = map.get(key);
+            return left == null ? new ArrayDeque<>() : left;
         }
     }
 
-    private final Listener listener;
-    private final Map<String, String> header;
+    /** What is answered; empty when nothing is. */
+    final List<Answer> answers = new ArrayList<>();
+
+    /** Why nothing is answered; null when something is. */
+    final String unanswered;
+
+    /** What the natives should answer of the push header. */
+    private final Map<String, String> facts = new HashMap<>();
+
     private final Deque<Level> open = new ArrayDeque<>();
-    private boolean inHeader;
-
-    private Comparison(Reading reading, Listener listener) {
-        this.listener = listener;
-        this.header = factsOf(reading);
-        open.push(new Level(reading.document.children()));
-    }
 
     /**
      * Asks the library and compares.
      *
      * @throws UnsatisfiedLinkError when the library cannot be loaded
      */
-    static void of(Reading reading, Listener listener) {
-        Comparison comparison = new Comparison(reading, listener);
-        if (Answers.ask(reading.held, comparison)) {
-            comparison.rest();
-        } else {
-            listener.unanswered("it refuses the message");
-        }
-    }
-
-    /** What the natives should answer of the push header. */
-    private static Map<String, String> factsOf(Reading reading) {
-        Map<String, String> facts = new HashMap<>();
+    Comparison(Reading reading) {
         PushHeader header = reading.header;
         if (header != null) {
             facts.put("Content type", "" + header.contentType().code());
@@ -129,60 +79,69 @@ final class Comparison implements Answers.Listener {
             facts.put("SEC", method == SecurityMethod.NONE ? null : method.name());
             facts.put("MAC", header.mac());
         }
-        return facts;
+        boolean isRead = reading.document != null;
+        open.push(new Level(answers, isRead ? reading.document.children() : NOTHING));
+        unanswered = Answers.ask(reading.held, this) ? null : "it refuses the message";
     }
 
-    @Override
-    public void begin(String type) {
-        inHeader = type.equals(HEADER);
-        Characteristic said = inHeader ? null : open.peek().next(type);
-        List<Item> items = said == null ? Collections.<Item>emptyList() : said.children();
-        open.push(new Level(items));
-        listener.begin(type, items);
+    /** Says why nothing is answered. */
+    Comparison(String unanswered) {
+        this.unanswered = unanswered;
     }
 
-    @Override
-    public void single(String name, String value) {
-        if (inHeader) {
-            compare(name, value, header.get(name) != null, header.get(name));
-        } else {
-            compare(name, value, open.peek().next(name, value, true));
-        }
+    void begin(String type) {
+        boolean isHeader = type.equals(HEADER);
+        Characteristic said = isHeader ? null : Level.left(open.peek().characteristics, type).poll();
+        List<Item> items = said == null ? NOTHING : said.children();
+        int column = isHeader ? TextWriter.HEADER_COLUMN : TextWriter.column(items);
+        Answer answer = Answer.characteristic(type, column, true);
+        open.peek().answers.add(answer);
+        open.push(new Level(answer.children, items));
     }
 
-    @Override
-    public void listed(String name, String value) {
-        compare(name, value, open.peek().next(name, value, false));
+    /** An answer of the push header. */
+    void fact(String name, String value) {
+        String said = facts.get(name);
+        add(Answer.parameter(name, value, said != null, said));
     }
 
-    private void compare(String name, String value, Parameter said) {
-        compare(name, value, said != null, said == null ? null : said.value());
+    private void add(Answer answer) {
+        open.peek().answers.add(answer);
     }
 
-    private void compare(String name, String value, boolean isSaid, String said) {
-        Agreement ofSaid = Objects.equals(value, said) ? Agreement.SAME : Agreement.OTHERWISE;
-        listener.answered(name, value, isSaid ? ofSaid : Agreement.NOT_SAID, said);
-    }
-
-    @Override
-    public void end() {
-        rest();
-        open.pop();
-        listener.end();
-        inHeader = false;
-    }
-
-    /** Tells what the message says and nobody has answered. */
-    private void rest() {
-        Level level = open.peek();
-        for (Deque<Parameter> left : level.parameters.values()) {
-            for (Parameter parameter : left) {
-                listener.notAnswered(parameter.name(), parameter.value());
+    /** An element of an array: the first parameter of the name that has the value, or the next. */
+    void single(String name, String value) {
+        for (Iterator<Parameter> left = Level.left(open.peek().parameters, name).iterator(); left.hasNext(); ) {
+            if (Objects.equals(left.next().value(), value)) {
+                left.remove();
+                add(Answer.parameter(name, value, true, value));
+                return;
             }
         }
-        for (Deque<Characteristic> left : level.characteristics.values()) {
+        listed(name, value);
+    }
+
+    /** A parameter that may be answered several times. */
+    void listed(String name, String value) {
+        Parameter said = Level.left(open.peek().parameters, name).poll();
+        add(Answer.parameter(name, value, said != null, said == null ? null : said.value()));
+    }
+
+    void end() {
+        rest();
+        open.pop();
+    }
+
+    /** Adds what the message says and nobody has answered. */
+    void rest() {
+        for (Deque<Parameter> left : open.peek().parameters.values()) {
+            for (Parameter parameter : left) {
+                add(Answer.missing(parameter.name(), parameter.value()));
+            }
+        }
+        for (Deque<Characteristic> left : open.peek().characteristics.values()) {
             for (Characteristic characteristic : left) {
-                listener.notAnswered(characteristic.type());
+                add(Answer.characteristic(characteristic.type(), 0, false));
             }
         }
     }

@@ -1,6 +1,8 @@
 package com.qvomacp.cli;
 
 import java.io.BufferedWriter;
+import java.io.FilterOutputStream;
+import java.io.IOException;
 import java.io.InputStream;
 import java.io.OutputStream;
 import java.io.OutputStreamWriter;
@@ -12,6 +14,45 @@ final class Console {
     static final int DONE = 0;
     static final int REFUSED = 1;
     static final int FAILED = 2;
+
+    /** Thrown out of whatever writes what cannot be written. */
+    static final class ClosedError extends RuntimeException {
+        private static final long serialVersionUID = 1L;
+
+        private ClosedError(IOException cause) {
+            super(cause);
+        }
+
+        /** Whether whoever reads has seen enough, which is no news to him. */
+        boolean isBrokenPipe() {
+            return "Broken pipe".equals(getCause().getMessage());
+        }
+    }
+
+    /** Ends the work when it cannot be written; a {@link PrintWriter} would only remember. */
+    private static final class Output extends FilterOutputStream {
+        Output(OutputStream out) {
+            super(out);
+        }
+
+        @Override
+        public void write(byte[] bytes, int from, int count) {
+            try {
+                out.write(bytes, from, count);
+            } catch (IOException failed) {
+                throw new ClosedError(failed);
+            }
+        }
+
+        @Override
+        public void flush() {
+            try {
+                out.flush();
+            } catch (IOException failed) {
+                throw new ClosedError(failed);
+            }
+        }
+    }
 
     final InputStream in;
     final PrintWriter out;

@@ -8,10 +8,10 @@ import java.io.ByteArrayOutputStream;
 import java.io.IOException;
 import java.nio.charset.StandardCharsets;
 import java.util.Base64;
+import java.util.Collections;
 import java.util.List;
 import java.util.Locale;
 import picocli.CommandLine.Command;
-import picocli.CommandLine.Option;
 
 /** Makes messages of documents in XML, or of messages. */
 @Command(
@@ -22,10 +22,6 @@ import picocli.CommandLine.Option;
             "instruction."
         },
         customSynopsis = "omacp encode [-h] [OPTION...] [FILE...]",
-        sortOptions = false,
-        parameterListHeading = "%n",
-        optionListHeading = "%nOptions:%n",
-        exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
             "0:everything was written, and the library takes it",
             "1:a document or message is refused, or the library refuses what was written",
@@ -40,62 +36,61 @@ final class Encode extends Job {
         SUBMIT
     }
 
-    @Option(names = "--body", description = "Write the body alone.")
-    private boolean body;
+    private static final Option<Boolean> BODY = Option.flag("--body", "Write the body alone.");
 
-    @Option(names = "--hex", description = "Write a line of hexadecimal digits.")
-    private boolean hex;
+    private static final Option<Boolean> HEX =
+            Option.flag("--hex", "Write a line of hexadecimal digits.");
 
-    @Option(names = "--base64", description = "Write a line of base64.")
-    private boolean base64;
+    private static final Option<Boolean> BASE64 =
+            Option.flag("--base64", "Write a line of base64.");
 
-    @Option(
-            names = "--sms",
-            paramLabel = "FORM",
-            description =
-                    "Write the parts of an SMS, each a line of hexadecimal digits: ud (user data) or"
-                            + " submit (an SMS-SUBMIT).")
-    private Sms sms;
+    private static final Option<Sms> SMS = Option.constant("--sms", "FORM", Sms.values(),
+            "Write the parts of an SMS, each a line of hexadecimal digits: ud (user data) or submit"
+                    + " (an SMS-SUBMIT).");
 
-    @Option(
-            names = "--to",
-            paramLabel = "NUMBER",
-            description = "Who gets the SMS-SUBMIT: up to 20 digits, with \"+\" or without.")
-    private String to;
+    private static final Option<String> TO = Option.text("--to", "NUMBER",
+            "Who gets the SMS-SUBMIT: up to 20 digits, with \"+\" or without.");
 
-    @Option(
-            names = {"-o", "--output"},
-            paramLabel = "FILE",
-            description = "Write to a file that is not there yet.")
+    private static final Option<String> OUTPUT =
+            Option.text("-o --output", "FILE", "Write to a file that is not there yet.");
+
+    private static final Option<Boolean> FORCE = Option.flag("--force", "Overwrite the file.");
+
+    private EncodeOptions encoding = EncodeOptions.NONE;
+
+    /** The file that is written; null for standard output. */
     private String output;
 
-    @Option(names = "--force", description = "Overwrite the file.")
-    private boolean force;
-
-    private EncodeOptions options = EncodeOptions.NONE;
     private final ByteArrayOutputStream written = new ByteArrayOutputStream();
 
     @Override
+    List<Option<?>> options() {
+        List<Option<?>> options = super.options();
+        Collections.addAll(options, BODY, HEX, BASE64, SMS, TO, OUTPUT, FORCE);
+        options.addAll(Choices.ALL);
+        return options;
+    }
+
+    @Override
     void begin() {
-        int forms = (hex ? 1 : 0) + (base64 ? 1 : 0) + (sms != null ? 1 : 0);
-        if (forms > 1 || sms != null && body) {
+        int forms = (has(HEX) ? 1 : 0) + (has(BASE64) ? 1 : 0) + (has(SMS) ? 1 : 0);
+        if (forms > 1 || has(SMS) && has(BODY)) {
             throw new UsageException("--hex, --base64 and --sms go not together, nor --sms with --body");
         }
-        if (sms == Sms.SUBMIT ? to == null || !to.matches("\\+?[0-9]{1,20}") : to != null) {
+        String to = value(TO);
+        if (value(SMS) == Sms.SUBMIT ? to == null || !to.matches("\\+?[0-9]{1,20}") : to != null) {
             throw new UsageException("--sms=submit, and nothing else, needs --to with 1 to 20 digits");
         }
-        if (output == null || output.equals(Input.STANDARD_INPUT)) {
-            output = null;
-            if (isRaw() && console.terminal.isScreen) {
-                throw new UsageException(
-                        "bytes are not for a terminal: --hex, --base64, --sms or --output is needed");
-            }
+        output = Input.STANDARD_INPUT.equals(value(OUTPUT)) ? null : value(OUTPUT);
+        if (output == null && isRaw() && console.terminal.isScreen) {
+            throw new UsageException(
+                    "bytes are not for a terminal: --hex, --base64, --sms or --output is needed");
         }
         Choices choices = new Choices(this);
         for (EncodeOption option : EncodeOption.values()) {
             String value = choices.value(option);
             try {
-                options = value == null ? options : options.with(option, value);
+                encoding = value == null ? encoding : encoding.with(option, value);
             } catch (IllegalArgumentException wrong) {
                 throw new UsageException("--" + wrong.getMessage());
             }
@@ -103,7 +98,7 @@ final class Encode extends Job {
     }
 
     private boolean isRaw() {
-        return !hex && !base64 && sms == null;
+        return !has(HEX) && !has(BASE64) && !has(SMS);
     }
 
     @Override
@@ -112,7 +107,7 @@ final class Encode extends Job {
             return false;
         }
         try {
-            encode(name, ProvisioningEncoder.ofXml(content, options));
+            encode(name, ProvisioningEncoder.ofXml(content, encoding));
         } catch (EncodingException refused) {
             refuse(name, refused);
         }
@@ -120,7 +115,7 @@ final class Encode extends Job {
     }
 
     /** Whether it begins with a tag, in UTF-8 or UTF-16, and not with that of a push. */
-    private static boolean isXml(byte[] content) {
+    static boolean isXml(byte[] content) {
         int at = 0;
         while (at < content.length
                 && "\u00EF\u00BB\u00BF\u00FE\u00FF\0 \t\r\n".indexOf(content[at] & 0xFF) >= 0) {
@@ -136,24 +131,36 @@ final class Encode extends Job {
             explain(reading);
             return;
         }
+        warn(reading);
         try {
-            encode(held.name, ProvisioningEncoder.of(reading.message, options));
+            encode(held.name, ProvisioningEncoder.of(reading.message, encoding));
         } catch (EncodingException refused) {
             refuse(held.name, refused);
         }
     }
 
+    /** Says that what is written is not all that the message was, when it is not what it should be. */
+    private void warn(Reading reading) {
+        int deviations = reading.document.deviations().size();
+        String places = deviations == 1 ? "1 place" : deviations + " places";
+        String departs = deviations == 0 ? "" : "departs from the format in " + places;
+        String refused = reading.isAccepted() ? "" : "is refused by the library";
+        String and = departs.isEmpty() || refused.isEmpty() ? "" : " and ";
+        if (!(departs + refused).isEmpty()) {
+            String note = "note: what is read " + departs + and + refused + "; only what it sets is encoded";
+            complain(startOf(reading.held.name) + note + "\n");
+        }
+    }
+
     private void encode(String name, ProvisioningEncoder encoder) throws EncodingException {
         if (isRaw() && isOneOfSeveral()) {
-            fail(
-                    Console.FAILED,
-                    name,
-                    "is one of several, which only --hex, --base64 and --sms can write");
+            String reason = "is one of several, which only --hex, --base64 and --sms can write";
+            fail(Console.FAILED, name, reason);
             return;
         }
-        byte[] message = body ? encoder.body() : encoder.push();
-        List<byte[]> parts = sms == null ? null : ShortMessageWriter.userData(message);
-        if (sms != null && parts == null) {
+        byte[] message = has(BODY) ? encoder.body() : encoder.push();
+        List<byte[]> parts = !has(SMS) ? null : ShortMessageWriter.userData(message);
+        if (has(SMS) && parts == null) {
             fail(Console.FAILED, name, "is too long for an SMS");
             return;
         }
@@ -161,7 +168,7 @@ final class Encode extends Job {
         if (USERPINMAC.equals(encoder.options().value(EncodeOption.SEC))) {
             tell(name, encoder.digitsToTell());
         }
-        Reading reading = Reading.of(Held.message(name, message, !body), message.length);
+        Reading reading = Reading.of(Held.message(name, message, !has(BODY)), message.length);
         if (reading.isAccepted()) {
             complain(startOf(name) + "the library takes it\n");
         }
@@ -176,13 +183,13 @@ final class Encode extends Job {
     private void write(byte[] message, List<byte[]> parts) {
         if (isRaw()) {
             written.write(message, 0, message.length);
-        } else if (hex) {
+        } else if (has(HEX)) {
             line(digits(message));
-        } else if (base64) {
+        } else if (has(BASE64)) {
             line(Base64.getEncoder().encodeToString(message));
         } else {
             for (byte[] part : parts) {
-                line(digits(sms == Sms.UD ? part : ShortMessageWriter.submit(to, part)));
+                line(digits(value(SMS) == Sms.UD ? part : ShortMessageWriter.submit(value(TO), part)));
             }
         }
     }
@@ -206,7 +213,7 @@ final class Encode extends Job {
             return;
         }
         try {
-            Input.write(output, written.toByteArray(), force);
+            Input.write(output, written.toByteArray(), has(FORCE));
         } catch (IOException unwritable) {
             fail(Console.FAILED, output, unwritable.getMessage());
         }

@@ -1,5 +1,7 @@
 package com.qvomacp.cli;
 
+import com.qvomacp.eng.omacp.ProvisioningException;
+import com.qvomacp.eng.omacp.PushHeader;
 import java.util.Collections;
 import java.util.List;
 
@@ -50,5 +52,14 @@ final class Held {
     /** A remark that belongs to no message. */
     static Held note(String name, String sentence) {
         return new Held(name, null, false, null, Collections.singletonList(sentence));
+    }
+
+    /** What the push header says, whatever stands behind it; null when there is none. */
+    PushHeader header() {
+        try {
+            return isPush ? PushHeader.parse(bytes) : null;
+        } catch (ProvisioningException none) {
+            return null;
+        }
     }
 }

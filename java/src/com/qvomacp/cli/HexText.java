@@ -1,7 +1,6 @@
 package com.qvomacp.cli;
 
 import java.io.ByteArrayOutputStream;
-import java.nio.charset.Charset;
 import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
 import java.util.Arrays;
@@ -19,7 +18,10 @@ final class HexText {
         /** Counted from 1. */
         final int line;
 
-        /** Hexadecimal digits; an odd number of them when a line breaks within a byte. */
+        /**
+         * Hexadecimal digits; an odd number of them when a line breaks within a byte. Null for
+         * numbers that are no bytes.
+         */
         final String digits;
 
         /** Whether it stands for itself, and is not to be joined with others. */
@@ -28,15 +30,15 @@ final class HexText {
         /** Whether it is user data with its header, by what the text says. */
         final boolean isUserData;
 
-        /** Whether it follows the piece before it on the next line. */
-        final boolean follows;
-
-        Piece(int line, String digits, boolean isWhole, boolean isUserData, boolean follows) {
+        Piece(int line, String digits, boolean isWhole, boolean isUserData) {
             this.line = line;
             this.digits = digits;
             this.isWhole = isWhole;
             this.isUserData = isUserData;
-            this.follows = follows;
+        }
+
+        boolean follows(Piece other) {
+            return !isWhole && !other.isWhole && line == other.line + 1;
         }
     }
 
@@ -53,15 +55,23 @@ final class HexText {
     /** The content as text when it can be one, without a byte order mark; null otherwise. */
     static String text(byte[] content) {
         boolean isWide = content.length > 1 && (content[0] & 0xFF) + (content[1] & 0xFF) == 0x1FD;
-        Charset charset = isWide ? StandardCharsets.UTF_16 : StandardCharsets.UTF_8;
-        String text = new String(content, charset);
-        for (int i = 0; i < text.length(); ++i) {
-            char c = text.charAt(i);
-            if (c < ' ' && !Character.isWhitespace(c) || c == '\u007F') {
+        // Most messages need not be decoded to see that they are no text.
+        for (int i = 0; i < content.length && !isWide; ++i) {
+            if (content[i] >= 0 && isControl(content[i])) {
+                return null;
+            }
+        }
+        String text = new String(content, isWide ? StandardCharsets.UTF_16 : StandardCharsets.UTF_8);
+        for (int i = 0; i < text.length() && isWide; ++i) {
+            if (isControl(text.charAt(i))) {
                 return null;
             }
         }
         return text.startsWith(BYTE_ORDER_MARK) ? text.substring(1) : text;
+    }
+
+    private static boolean isControl(int c) {
+        return c < ' ' && !Character.isWhitespace(c) || c == 0x7F;
     }
 
     /** The pieces of a text, in their order. */
@@ -69,37 +79,46 @@ final class HexText {
         List<String> lines = Arrays.asList(text.split("\r\n|[\r\n\f]", -1));
         List<Piece> pieces = new ArrayList<>();
         HexDump.Repeats repeats = new HexDump.Repeats();
-        int last = -2;
-        for (int i = 0; i < lines.size(); ) {
-            HexDump dump = HexDump.at(lines, i, repeats);
+        for (int i = 0; i < lines.size(); ++i) {
+            CellDump cells = CellDump.at(lines, i);
+            boolean areCells = cells != null && cells.bytes != null;
+            HexDump dump = areCells ? null : HexDump.at(lines, i, repeats);
+            Piece piece = piece(lines.get(i).trim(), i + 1);
             if (dump != null) {
-                pieces.add(new Piece(i + 1, digits(dump.bytes), true, false, false));
-                i = dump.next;
-                continue;
+                piece = new Piece(i + 1, digits(dump.bytes), true, false);
+                i = dump.next - 1;
+            } else if (cells != null) {
+                piece = new Piece(i + 1, areCells ? digits(cells.bytes) : null, true, false);
+                i = cells.next - 1;
             }
-            Piece piece = piece(lines.get(i).trim(), i, last == i - 1);
-            if (piece != null) {
+            boolean isMore = piece != null && piece.digits == null && areNumbers(pieces);
+            if (piece != null && !isMore) {
                 pieces.add(piece);
-                last = i;
             }
-            ++i;
         }
         return pieces;
     }
 
-    private static Piece piece(String line, int index, boolean follows) {
+    /** Whether the last of the pieces are numbers. */
+    private static boolean areNumbers(List<Piece> pieces) {
+        return !pieces.isEmpty() && pieces.get(pieces.size() - 1).digits == null;
+    }
+
+    private static Piece piece(String line, int number) {
         if (line.isEmpty() || isOfModem(line)) {
             return null;
         }
-        Piece form = gatewayForm(line, index);
+        Piece form = gatewayForm(line, number);
         if (form != null) {
             return form;
         }
-        if (line.contains("\\x")) {
-            return new Piece(index + 1, digits(escaped(line)), false, false, follows);
+        boolean isLiteral = line.contains("\\x");
+        String digits = isLiteral ? digits(escaped(line)) : behindLabel(line);
+        if (digits == null) {
+            return null;
         }
-        String digits = behindLabel(line);
-        return digits == null ? null : new Piece(index + 1, digits, false, false, follows);
+        boolean areBytes = isLiteral || !areNumbers(line);
+        return new Piece(number, areBytes ? digits : null, !areBytes, false);
     }
 
     /** Whether a modem or its user says something about messages, and not one of them. */
@@ -136,6 +155,23 @@ final class HexText {
         String digits = digitsOf(line.substring(from));
         int fewest = hasLabel ? FEWEST_BEHIND_LABEL : 1;
         return digits != null && digits.length() >= fewest ? digits : null;
+    }
+
+    /** Whether a line ends with groups of odd numbers of digits, as no bytes do. */
+    private static boolean areNumbers(String line) {
+        int odd = 0;
+        int digits = 0;
+        for (int at = line.length() - 1; at >= 0 && isDigitOrAround(line, at) && odd < 3; --at) {
+            digits = isDigit(line, at) ? digits + 1 : 0;
+            boolean isBegin = digits > 0 && (at == 0 || !isDigit(line, at - 1));
+            boolean hasPrefix = isX(line, at - 1) || isX(line, at + digits);
+            odd += isBegin && digits % 2 != 0 && !hasPrefix ? 1 : 0;
+        }
+        return odd > 2;
+    }
+
+    private static boolean isX(String line, int at) {
+        return at >= 0 && at < line.length() && (line.charAt(at) | 0x20) == 'x';
     }
 
     private static boolean isDigitOrAround(String line, int at) {
@@ -202,7 +238,7 @@ final class HexText {
     }
 
     /** What a gateway is asked to send: {@code udh=%06%05...&text=%01%06...}. */
-    private static Piece gatewayForm(String line, int index) {
+    private static Piece gatewayForm(String line, int number) {
         byte[] header = member(line, "udh");
         byte[] data = null;
         for (String name : new String[] {"text", "data", "message", "msg", "ud", "binary"}) {
@@ -214,7 +250,7 @@ final class HexText {
         }
         data = isForm ? data : percentDecoded(line);
         String digits = (header == null ? "" : digits(header)) + (data == null ? "" : digits(data));
-        return new Piece(index + 1, digits, true, header != null, false);
+        return new Piece(number, digits, true, header != null);
     }
 
     /** A member of a form; null when the line has none of that name. */

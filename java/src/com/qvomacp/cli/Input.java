@@ -1,6 +1,8 @@
 package com.qvomacp.cli;
 
 import java.io.ByteArrayOutputStream;
+import java.io.FileInputStream;
+import java.io.FileNotFoundException;
 import java.io.IOException;
 import java.io.InputStream;
 import java.nio.file.AccessDeniedException;
@@ -9,7 +11,6 @@ import java.nio.file.Files;
 import java.nio.file.InvalidPathException;
 import java.nio.file.NoSuchFileException;
 import java.nio.file.OpenOption;
-import java.nio.file.Path;
 import java.nio.file.Paths;
 import java.nio.file.StandardOpenOption;
 
@@ -20,6 +21,8 @@ final class Input {
     private static final OpenOption[] ONLY_NEW = {
         StandardOpenOption.CREATE_NEW, StandardOpenOption.WRITE
     };
+
+    private static final OpenOption[] ANY = {};
 
     private Input() {}
 
@@ -33,17 +36,30 @@ final class Input {
      * @throws IOException with a sentence for people
      */
     static byte[] read(String file, InputStream standardInput, int limit) throws IOException {
+        byte[] content;
         try {
             if (file.equals(STANDARD_INPUT)) {
-                return read(standardInput, limit);
+                content = read(standardInput, limit);
+            } else {
+                try (InputStream in = open(file)) {
+                    content = read(in, limit);
+                }
             }
-            try (InputStream in = Files.newInputStream(Paths.get(file))) {
-                return read(in, limit);
-            }
-        } catch (TooLongException tooLong) {
-            throw tooLong;
         } catch (IOException | InvalidPathException unreadable) {
             throw new IOException(reason(unreadable, "cannot be read: "), unreadable);
+        }
+        if (content == null) {
+            throw new IOException("is longer than " + limit + " bytes; --limit has more of them read");
+        }
+        return content;
+    }
+
+    /** Opens a file in the way that costs least; where that fails, in the way that tells why. */
+    private static InputStream open(String file) throws IOException {
+        try {
+            return new FileInputStream(file);
+        } catch (FileNotFoundException unopened) {
+            return Files.newInputStream(Paths.get(file));
         }
     }
 
@@ -54,12 +70,7 @@ final class Input {
      */
     static void write(String file, byte[] content, boolean mayBeThere) throws IOException {
         try {
-            Path path = Paths.get(file);
-            if (mayBeThere) {
-                Files.write(path, content);
-            } else {
-                Files.write(path, content, ONLY_NEW);
-            }
+            Files.write(Paths.get(file), content, mayBeThere ? ANY : ONLY_NEW);
         } catch (FileAlreadyExistsException there) {
             throw new IOException("is there already; --force overwrites it", there);
         } catch (IOException | InvalidPathException unwritable) {
@@ -67,20 +78,13 @@ final class Input {
         }
     }
 
-    private static final class TooLongException extends IOException {
-        private static final long serialVersionUID = 1L;
-
-        TooLongException(int limit) {
-            super("is longer than " + limit + " bytes; --limit has more of them read");
-        }
-    }
-
+    /** All bytes; null when there are more than the limit. */
     private static byte[] read(InputStream in, int limit) throws IOException {
         ByteArrayOutputStream bytes = new ByteArrayOutputStream();
         byte[] block = new byte[8192];
         for (int n = in.read(block); n >= 0; n = in.read(block)) {
             if (n > limit - bytes.size()) {
-                throw new TooLongException(limit);
+                return null;
             }
             bytes.write(block, 0, n);
         }

@@ -18,6 +18,8 @@ final class Intake {
     private static final String NO_MESSAGE = "no message: this is ";
     private static final String UNKNOWN = "nothing that is known";
     private static final String HEXADECIMAL = "hexadecimal text";
+    private static final String OTHER_NUMBERS =
+            "numbers or a dump, and not bytes as hexadecimal or octal digits, bits or characters";
 
     private static final int PUSH = 0x06;
     private static final int LAST_WBXML_VERSION = 0x03;
@@ -121,6 +123,10 @@ final class Intake {
     }
 
     private void takeDigits(Place place, String digits, boolean isUserData, List<Held> held) {
+        if (digits == null) {
+            held.add(Held.error(place.toString(), NO_MESSAGE + OTHER_NUMBERS));
+            return;
+        }
         if (digits.length() % 2 != 0) {
             String odd = HEXADECIMAL + " with an odd number of digits, " + digits.length();
             held.add(Held.error(place.toString(), NO_MESSAGE + odd));
@@ -139,24 +145,23 @@ final class Intake {
 
         static List<Run> of(List<HexText.Piece> pieces) {
             List<Run> runs = new ArrayList<>();
-            List<HexText.Piece> run = new ArrayList<>();
-            for (HexText.Piece piece : pieces) {
-                if (!run.isEmpty() && (!piece.follows || piece.isWhole)) {
-                    runs.add(new Run(run));
-                    run = new ArrayList<>();
+            int from = 0;
+            for (int i = 1; i <= pieces.size(); ++i) {
+                if (i == pieces.size() || !pieces.get(i).follows(pieces.get(i - 1))) {
+                    runs.add(new Run(pieces.subList(from, i)));
+                    from = i;
                 }
-                run.add(piece);
             }
-            runs.add(new Run(run));
             return runs;
         }
 
+        /** All their digits; null when there are numbers among them. */
         String digits() {
-            if (pieces.size() == 1) {
-                return pieces.get(0).digits;
-            }
             StringBuilder digits = new StringBuilder();
             for (HexText.Piece piece : pieces) {
+                if (piece.digits == null) {
+                    return null;
+                }
                 digits.append(piece.digits);
             }
             return digits.toString();
@@ -173,7 +178,7 @@ final class Intake {
 
         boolean isJoinedMessage(Intake intake) {
             String digits = digits();
-            return digits.length() % 2 == 0 && intake.isMessage(HexText.bytes(digits));
+            return digits != null && digits.length() % 2 == 0 && intake.isMessage(HexText.bytes(digits));
         }
 
         boolean isMessage(Intake intake) {
@@ -184,92 +189,64 @@ final class Intake {
     /** Whether a line is a message, for certain and not just the beginning of one. */
     private boolean isMessageAlone(String digits) {
         byte[] bytes = HexText.bytes(digits);
-        boolean isPush = isKnownPush(bytes) && hasDocument(bytes);
+        PushHeader header = header(bytes);
+        boolean isPush = isKnownPush(bytes, header) && isDocument(bytes, header.length());
         return digits.length() % 2 == 0
-                && (isShortMessage(bytes) || isPush || isDocument(bytes, 0));
+                && (isPush || isDocument(bytes, 0) || shortMessage(bytes, header, form) != null);
     }
 
     private boolean isMessage(byte[] bytes) {
-        return isShortMessage(bytes) || header(bytes) != null || isDocument(bytes, 0);
+        PushHeader header = header(bytes);
+        return header != null || isDocument(bytes, 0) || shortMessage(bytes, null, form) != null;
     }
 
-    private boolean isShortMessage(byte[] bytes) {
-        try {
-            return shortMessage(bytes, form) != null;
-        } catch (ShortMessage.OtherException other) {
-            return true;
-        }
-    }
-
-    /** The short message that bytes are by a form or, without one, by their lengths; or null. */
-    private static ShortMessage shortMessage(byte[] bytes, Form form)
-            throws ShortMessage.OtherException {
+    /** The short message that bytes are by their form or, without one, by their lengths; or null. */
+    private ShortMessage shortMessage(byte[] bytes, PushHeader header, Form form) {
         ShortMessage message = null;
-        ShortMessage.OtherException other = null;
         if (form == null || form == Form.SMS) {
-            try {
-                message = ShortMessage.withCentre(bytes);
-            } catch (ShortMessage.OtherException e) {
-                other = e;
-            }
-            try {
-                message = message != null ? message : ShortMessage.withoutCentre(bytes, 0);
-            } catch (ShortMessage.OtherException e) {
-                other = other != null ? other : e;
+            message = ShortMessage.withCentre(bytes);
+            if (message == null || message.other != null) {
+                ShortMessage bare = ShortMessage.withoutCentre(bytes, 0);
+                message = message == null || bare != null && bare.other == null ? bare : message;
             }
         }
-        boolean mayBeUserData = form == Form.UD || form == null && !isKnownPush(bytes);
-        if (message == null && mayBeUserData) {
-            message = ShortMessage.ofUserData(bytes);
+        boolean isSure = message != null && message.other == null;
+        if (!isSure && (form == Form.UD || form == null && !isKnownPush(bytes, header))) {
+            ShortMessage userData = ShortMessage.ofUserData(bytes);
+            message = userData != null ? userData : message;
         }
-        if (message == null && other != null && (form != null || header(bytes) == null)) {
-            throw other;
-        }
-        return message;
+        boolean isPush = message != null && message.other != null && form == null && header != null;
+        return isPush ? null : message;
     }
 
     private void take(Place place, byte[] bytes, Form form, List<Held> held) {
         String name = place.toString();
-        try {
-            ShortMessage message = shortMessage(bytes, form);
-            if (message != null) {
-                takeShortMessage(place, message, held);
-                return;
-            }
-        } catch (ShortMessage.OtherException other) {
-            held.add(Held.error(name, NO_MESSAGE + other.getMessage()));
-            return;
-        }
-        if (form == Form.SMS || form == Form.UD) {
-            String what = form == Form.SMS ? "no SMS-DELIVER" : "no user data of an SMS";
-            held.add(Held.error(name, what + ": its lengths do not come out"));
-            return;
-        }
-        if (form != null) {
-            held.add(Held.message(name, bytes, form == Form.PUSH));
-            return;
-        }
+        PushHeader header = header(bytes);
+        ShortMessage message = shortMessage(bytes, header, form);
         boolean isPush = isPush(bytes);
         boolean isBody = bytes.length > 0 && bytes[0] >= 0 && bytes[0] <= LAST_WBXML_VERSION;
-        if (header(bytes) == null && !isDocument(bytes, 0) && !isPush && !isBody) {
-            held.add(Held.unknown(name, bytes, NO_MESSAGE + likeness(bytes)));
-        } else {
+        if (message != null) {
+            takeShortMessage(place, message, held);
+        } else if (form == Form.SMS || form == Form.UD) {
+            String what = form == Form.SMS ? "no SMS-DELIVER" : "no user data of an SMS";
+            held.add(Held.error(name, what + ": its lengths do not come out"));
+        } else if (form != null) {
+            held.add(Held.message(name, bytes, form == Form.PUSH));
+        } else if (isPush || isBody) {
             held.add(Held.message(name, bytes, isPush));
+        } else {
+            held.add(Held.unknown(name, bytes, NO_MESSAGE + likeness(bytes)));
         }
     }
 
     private void takeShortMessage(Place place, ShortMessage message, List<Held> held) {
         String fault = message.fault();
-        Held whole =
-                fault == null
-                        ? parts.take(place, message)
-                        : Held.error(place.toString(), NO_MESSAGE + fault);
+        Held whole = fault == null ? parts.take(place, message) : Held.error(place.toString(), NO_MESSAGE + fault);
         if (whole == null) {
             return;
         }
         boolean isOther = whole.bytes != null && !message.hasPort() && header(whole.bytes) == null;
-        held.add(
-                isOther ? Held.error(whole.name, NO_MESSAGE + "an SMS without a port") : whole);
+        held.add(isOther ? Held.error(whole.name, NO_MESSAGE + "an SMS without a port") : whole);
     }
 
     /** Whether the second byte is that of a push. */
@@ -278,19 +255,15 @@ final class Intake {
     }
 
     private static PushHeader header(byte[] bytes) {
-        if (!isPush(bytes)) {
-            return null;
-        }
         try {
-            return PushHeader.parse(bytes);
+            return isPush(bytes) ? PushHeader.parse(bytes) : null;
         } catch (ProvisioningException none) {
             return null;
         }
     }
 
     /** Whether it is a push of a type that is pushed to the decoder, or of a document. */
-    private static boolean isKnownPush(byte[] bytes) {
-        PushHeader header = header(bytes);
+    private static boolean isKnownPush(byte[] bytes, PushHeader header) {
         if (header == null) {
             return false;
         }
@@ -299,12 +272,7 @@ final class Intake {
                 return true;
             }
         }
-        return header.contentType().mediaType().indexOf('/') >= 0 && hasDocument(bytes);
-    }
-
-    private static boolean hasDocument(byte[] push) {
-        PushHeader header = header(push);
-        return header != null && isDocument(push, header.length());
+        return header.contentType().mediaType().indexOf('/') >= 0 && isDocument(bytes, header.length());
     }
 
     /** Whether WBXML begins at a place: version, document type, character set and string table. */

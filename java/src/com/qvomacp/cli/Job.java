@@ -1,61 +1,46 @@
 package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.ProvisioningException;
+import com.qvomacp.eng.omacp.PushHeader;
 import java.io.IOException;
 import java.util.ArrayList;
+import java.util.Arrays;
 import java.util.List;
-import picocli.CommandLine.Model.CommandSpec;
-import picocli.CommandLine.Option;
-import picocli.CommandLine.Parameters;
-import picocli.CommandLine.Spec;
 
 /** A command that does the same to each of its files. */
 abstract class Job {
     private static final int DEFAULT_LIMIT = 64 << 10;
 
-    @Option(
-            names = "--limit",
-            paramLabel = "BYTES",
-            description =
-                    "Read no more than so many bytes of a file; K and M may stand behind the number"
-                            + " (by itself 64K).")
-    private String limit;
+    private static final Option<String> LIMIT = Option.text("--limit", "BYTES",
+            "Read no more than so many bytes of a file; K and M may stand behind the number (by"
+                    + " itself 64K).");
 
-    @Option(
-            names = "--as",
-            paramLabel = "FORM",
-            description =
-                    "What the messages are, where it does not show by itself: push, body, sms (an"
-                            + " SMS-DELIVER) or ud (the user data of an SMS).")
-    private Form form;
+    private static final Option<Form> AS = Option.constant("--as", "FORM", Form.values(),
+            "What the messages are, where it does not show by itself: push, body, sms (an"
+                    + " SMS-DELIVER) or ud (the user data of an SMS).");
 
-    @Option(
-            names = "--color",
-            paramLabel = "WHEN",
-            defaultValue = "auto",
-            description =
-                    "Use colours: auto (on a terminal, unless NO_COLOR is set), always, never.")
-    private Terminal.Color color;
+    private static final Option<Terminal.Color> COLOR =
+            Option.constant("--color", "WHEN", Terminal.Color.values(),
+                    "Use colours: auto (on a terminal, unless NO_COLOR is set), always, never.");
 
-    @Option(
-            names = {"-h", "--help"},
-            usageHelp = true,
-            description = "Show this help and exit.")
-    private boolean help;
-
-    @Parameters(
-            arity = "0..*",
-            paramLabel = "FILE",
-            description =
-                    "What holds messages: pushes, WBXML bodies alone, or parts of SMS; their bytes,"
-                            + " or hexadecimal or base64 text, also in a log or a dump. Standard"
-                            + " input when it is \"-\" or there is none.")
-    private List<String> files = new ArrayList<>();
-
-    @Spec CommandSpec spec;
+    Arguments arguments;
     Console console;
     private int bytesRead;
     private boolean isOneOfSeveral;
+
+    /** The options that it takes, in the order of its help. */
+    List<Option<?>> options() {
+        return new ArrayList<>(Arrays.asList(LIMIT, AS, COLOR));
+    }
+
+    boolean has(Option<?> option) {
+        return arguments.has(option);
+    }
+
+    <T> T value(Option<T> option) {
+        return arguments.value(option);
+    }
 
     /** Does it to one message. */
     abstract void run(Held held);
@@ -77,14 +62,16 @@ abstract class Job {
     /** Called behind the last file. */
     void end() {}
 
-    final void run(Console to) {
+    final void run(Console to, Arguments given) {
         console = to;
-        bytesRead = limit == null ? DEFAULT_LIMIT : bytes(limit);
-        begin();
+        arguments = given;
+        bytesRead = has(LIMIT) ? bytes(value(LIMIT)) : DEFAULT_LIMIT;
+        List<String> files = given.files;
         if (files.isEmpty()) {
             files.add(Input.STANDARD_INPUT);
         }
-        Intake intake = new Intake(form);
+        begin();
+        Intake intake = new Intake(value(AS));
         isOneOfSeveral = files.size() > 1;
         for (int i = 0; i < files.size(); ++i) {
             run(files.get(i), intake, i == files.size() - 1);
@@ -99,7 +86,7 @@ abstract class Job {
             List<Held> messages = new ArrayList<>();
             try {
                 byte[] content = Input.read(file, console.in, bytesRead);
-                if (form != null || !takes(name, content)) {
+                if (has(AS) || !takes(name, content)) {
                     messages.addAll(intake.take(name, content));
                 }
             } catch (IOException unreadable) {
@@ -131,10 +118,10 @@ abstract class Job {
     }
 
     private static int bytes(String number) {
-        int unit = "KM".indexOf(number.charAt(number.length() - 1));
+        int unit = number.endsWith("K") ? 1 : number.endsWith("M") ? 2 : 0;
         try {
-            String digits = unit < 0 ? number : number.substring(0, number.length() - 1);
-            long bytes = Math.multiplyExact(Long.parseLong(digits), 1L << 10 * (unit + 1));
+            String digits = unit == 0 ? number : number.substring(0, number.length() - 1);
+            long bytes = Math.multiplyExact(Long.parseLong(digits), 1L << 10 * unit);
             if (bytes > 0 && bytes <= Integer.MAX_VALUE / 2) {
                 return (int) bytes;
             }
@@ -155,15 +142,15 @@ abstract class Job {
     }
 
     boolean readsStandardInput() {
-        return files.isEmpty() || files.contains(Input.STANDARD_INPUT);
+        return arguments.files.contains(Input.STANDARD_INPUT);
     }
 
     Palette outPalette() {
-        return console.terminal.out(color);
+        return console.terminal.out(value(COLOR));
     }
 
     Palette errPalette() {
-        return console.terminal.err(color);
+        return console.terminal.err(value(COLOR));
     }
 
     /** How a line begins that says something about a file where errors go. */
@@ -184,14 +171,23 @@ abstract class Job {
         }
     }
 
+    /** The push header of a message; where it cannot be read, null, and that is said. */
+    PushHeader header(Held held) {
+        try {
+            return PushHeader.parse(held.bytes);
+        } catch (ProvisioningException none) {
+            explain(Reading.of(held, limit()));
+            failed(held.name, none.getMessage());
+            return null;
+        }
+    }
+
     /** Says why a document cannot be encoded, or not be written as XML. */
     void refuse(String name, EncodingException e) {
         if (e.line() > 0) {
             String expected = e.expected().isEmpty() ? "" : ", expected ";
-            fail(
-                    Console.REFUSED,
-                    name + ':' + e.line() + ':' + e.column(),
-                    e.getMessage() + expected + String.join(", ", e.expected()));
+            String place = name + ':' + e.line() + ':' + e.column();
+            fail(Console.REFUSED, place, e.getMessage() + expected + String.join(", ", e.expected()));
         } else if (e.path() != null) {
             fail(Console.REFUSED, name, e.getMessage() + ", in " + e.path());
         } else {

@@ -1,24 +1,32 @@
 package com.qvomacp.cli;
 
-import picocli.CommandLine.Option;
+import java.util.Collections;
+import java.util.List;
 
 /** A job whose results can be JSON: an object for each message. */
 abstract class JsonJob extends Job {
-    @Option(names = "--json", description = "Print JSON: an object, or an array for several files.")
-    private boolean json;
+    private static final Option<Boolean> JSON =
+            Option.flag("--json", "Print JSON: an object, or an array for several files.");
 
-    @Option(names = "--json-lines", description = "Print JSON: an object on a line for each file.")
-    private boolean jsonLines;
+    private static final Option<Boolean> JSON_LINES =
+            Option.flag("--json-lines", "Print JSON: an object on a line for each file.");
 
     JsonWriter writer;
     private boolean inObject;
 
     @Override
+    List<Option<?>> options() {
+        List<Option<?>> options = super.options();
+        Collections.addAll(options, JSON, JSON_LINES);
+        return options;
+    }
+
+    @Override
     void begin() {
-        if (json && jsonLines) {
+        if (has(JSON) && has(JSON_LINES)) {
             throw new UsageException("--json-lines goes not with --json");
         }
-        writer = new JsonWriter(console.out, jsonLines);
+        writer = new JsonWriter(console.out, has(JSON_LINES));
     }
 
     @Override
@@ -30,11 +38,11 @@ abstract class JsonJob extends Job {
     }
 
     private boolean isInArray() {
-        return json && isOneOfSeveral();
+        return has(JSON) && isOneOfSeveral();
     }
 
     final boolean isJson() {
-        return json || jsonLines;
+        return has(JSON) || has(JSON_LINES);
     }
 
     final void beginObject(String name) {

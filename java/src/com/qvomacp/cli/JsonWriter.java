@@ -74,7 +74,7 @@ final class JsonWriter {
     /** Ends what has been begun since there were so many objects and arrays open. */
     void endTo(int depth) {
         if (isNamed) {
-            nothing();
+            text(null);
         }
         while (open.length() > depth) {
             end();
@@ -83,8 +83,7 @@ final class JsonWriter {
 
     JsonWriter name(String name) {
         next();
-        string(name);
-        out.append(": ");
+        out.append(Visible.json(name)).append(": ");
         isNamed = true;
         return this;
     }
@@ -94,7 +93,9 @@ final class JsonWriter {
     }
 
     JsonWriter member(String name, long value) {
-        return name(name).number(value);
+        name(name).next();
+        out.print(value);
+        return this;
     }
 
     JsonWriter member(String name, boolean value) {
@@ -104,28 +105,13 @@ final class JsonWriter {
     }
 
     JsonWriter nullMember(String name) {
-        return name(name).nothing();
+        return name(name).text(null);
     }
 
     /** A string, or null. */
     JsonWriter text(String text) {
-        if (text == null) {
-            return nothing();
-        }
         next();
-        string(text);
-        return this;
-    }
-
-    private JsonWriter number(long number) {
-        next();
-        out.print(number);
-        return this;
-    }
-
-    private JsonWriter nothing() {
-        next();
-        out.append("null");
+        out.append(text == null ? "null" : Visible.json(text));
         return this;
     }
 
@@ -168,40 +154,6 @@ final class JsonWriter {
     private void indent() {
         for (int i = Math.min(open.length(), DEEPEST); i > 0; --i) {
             out.append(INDENT);
-        }
-    }
-
-    private void string(String text) {
-        StringBuilder escaped = new StringBuilder();
-        out.append('"');
-        int written = 0;
-        for (int i = 0; i < text.length(); ) {
-            int codePoint = text.codePointAt(i);
-            int next = i + Character.charCount(codePoint);
-            boolean isQuoted = codePoint == '"' || codePoint == '\\';
-            if (isQuoted || !Visible.isVisible(codePoint)) {
-                out.write(text, written, i - written);
-                escaped.setLength(0);
-                if (isQuoted) {
-                    escaped.append('\\').append((char) codePoint);
-                } else {
-                    escape(escaped, codePoint, text, i, next);
-                }
-                out.append(escaped);
-                written = next;
-            }
-            i = next;
-        }
-        out.write(text, written, text.length() - written);
-        out.append('"');
-    }
-
-    private static void escape(StringBuilder to, int codePoint, String text, int from, int end) {
-        int known = "\n\r\t".indexOf(codePoint);
-        if (known >= 0) {
-            to.append('\\').append("nrt".charAt(known));
-        } else {
-            Visible.escape(to, text, from, end);
         }
     }
 }

@@ -2,12 +2,19 @@ package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.ByteVisitor;
 import com.qvomacp.eng.omacp.Deviation;
-import com.qvomacp.eng.omacp.Item;
+import com.qvomacp.eng.omacp.ProvisioningDocument;
+import com.qvomacp.eng.omacp.ProvisioningException;
+import com.qvomacp.eng.omacp.ProvisioningException.Reason;
+import com.qvomacp.eng.omacp.ReadOptions;
 import com.qvomacp.eng.omacp.Verdict;
 import java.io.PrintWriter;
+import java.util.ArrayList;
+import java.util.Arrays;
 import java.util.Collections;
+import java.util.HashMap;
 import java.util.Iterator;
 import java.util.List;
+import java.util.Map;
 
 /**
  * Writes every byte of a message with what it means: its offset in the message and in the body, the
@@ -47,11 +54,15 @@ final class Listing implements ByteVisitor {
 
     private int depth;
 
-    /** What is still to be said, besides the meanings: the first of each, null behind the last. */
-    private Iterator<Item> otherwise = Collections.emptyIterator();
+    /** What the library reads otherwise: where, and what; and how much of it has been said. */
+    private int[] otherwiseAt = {};
 
+    private final List<String> otherwise = new ArrayList<>();
+    private int saidOtherwise;
+
+    /** The departures from the format that are still to be said; null behind the last. */
     private Iterator<Deviation> deviations = Collections.emptyIterator();
-    private Item nextOtherwise;
+
     private Deviation nextDeviation;
 
     /** Where the library stops, counted from {@link #start}; -1 where it does not. */
@@ -83,28 +94,49 @@ final class Listing implements ByteVisitor {
         listing.start = reading.bodyAt();
         listing.isBody = reading.header != null || !reading.held.isPush;
         listing.told = 0;
+        boolean isTooMuch =
+                reading.failure != null && reading.failure.reason() == Reason.TEXT_TOO_LONG;
+        if (isRefused && !verdict.isHeaderRefused() && (isTooMuch || reading.document != null)) {
+            listing.stopsAt(verdict);
+        }
         if (reading.document != null) {
-            if (!verdict.isHeaderRefused()) {
-                if (isRefused) {
-                    listing.stopsAt(verdict);
-                }
-                listing.otherwise = verdict.readOtherwise().iterator();
-            }
+            listing.compare(verdict);
             listing.deviations = reading.document.deviations().iterator();
-            listing.nextOtherwise();
             listing.nextDeviation();
             reading.document.describe(listing);
+        } else if (isTooMuch) {
+            listing.describe();
         }
         listing.end(reading.held.bytes.length - listing.start);
+    }
+
+    /** Describes a body with too much text for a document, up to where it is too much. */
+    private void describe() {
+        byte[] body = Arrays.copyOfRange(message, start, message.length);
+        try {
+            ProvisioningDocument.describe(
+                    body, ReadOptions.DEFAULT.withInputLimit(body.length), this);
+        } catch (ProvisioningException tooMuch) {
+            // What is left is told as not read.
+        }
+    }
+
+    private void compare(Verdict verdict) {
+        Map<String, String> once = new HashMap<>();
+        verdict.describeOtherwise(
+                (offset, length, depth, meaning) -> {
+                    if (otherwise.size() == otherwiseAt.length) {
+                        otherwiseAt = Arrays.copyOf(otherwiseAt, 2 * otherwise.size() + 1);
+                    }
+                    otherwiseAt[otherwise.size()] = offset;
+                    once.putIfAbsent(meaning, meaning);
+                    otherwise.add(once.get(meaning));
+                });
     }
 
     private void stopsAt(Verdict verdict) {
         stop = verdict.offset();
         stopReason = "the library refuses: " + verdict.reason();
-    }
-
-    private void nextOtherwise() {
-        nextOtherwise = otherwise.hasNext() ? otherwise.next() : null;
     }
 
     private void nextDeviation() {
@@ -122,16 +154,15 @@ final class Listing implements ByteVisitor {
     @Override
     public void visit(int offset, int length, int nesting, String meaning) {
         depth = nesting;
-        while (nextOtherwise != null && nextOtherwise.offset() <= offset) {
-            row(offset, 0, "the library reads this otherwise");
-            nextOtherwise();
-        }
         while (nextDeviation != null && nextDeviation.offset() < offset + length) {
             row(offset, 0, "departs from the format: " + nextDeviation.sentence());
             nextDeviation();
         }
         row(offset, length, meaning);
         told = offset + length;
+        while (saidOtherwise < otherwise.size() && otherwiseAt[saidOtherwise] < told) {
+            row(offset, 0, otherwise.get(saidOtherwise++));
+        }
         if (stop >= 0 && stop < told) {
             refused();
         }

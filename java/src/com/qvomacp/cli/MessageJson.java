@@ -88,7 +88,13 @@ final class MessageJson {
         json.member("charset", document.charset());
         json.member("charsetName", document.charsetName());
         json.member("version", document.version());
-        json.name("children").beginArray();
+        items("children", document.children());
+        json.end();
+    }
+
+    /** Writes items as a member, with everything in them. */
+    void items(String member, List<Item> items) {
+        json.name(member).beginArray();
         new Walk() {
             @Override
             void enter(Item item, int depth) {
@@ -111,8 +117,8 @@ final class MessageJson {
                 }
                 json.end();
             }
-        }.through(document.children());
-        json.end().end();
+        }.through(items);
+        json.end();
     }
 
     /** Whether others stand in an item, or have their place there. */
@@ -181,5 +187,43 @@ final class MessageJson {
             json.end();
         }
         json.end().end();
+    }
+
+    /**
+     * Writes what the library answers as the member {@code answers}: null with {@code unanswered}
+     * beside it, or an array of characteristics with {@code type} and {@code children}. A parameter
+     * has {@code name}, {@code value} and {@code same}, and {@code said} where the message says
+     * something else; what is not answered has {@code answered} false.
+     */
+    void answers(Comparison comparison) {
+        if (comparison.unanswered != null) {
+            json.nullMember("answers").member("unanswered", comparison.unanswered);
+        } else {
+            json.name("answers").beginArray();
+            answers(comparison.answers);
+            json.end();
+        }
+    }
+
+    private void answers(List<Answer> answers) {
+        for (Answer answer : answers) {
+            if (answer.children != null && answer.isAnswered) {
+                json.beginObject().member("type", answer.name).name("children").beginArray();
+                answers(answer.children);
+                json.end().end();
+                continue;
+            }
+            json.beginFlatObject().member(answer.children == null ? "name" : "type", answer.name);
+            if (answer.isAnswered) {
+                json.member("value", answer.value).member("same", answer.isSame());
+            }
+            if (answer.children == null && answer.isSaid && !answer.isSame()) {
+                json.member("said", answer.said);
+            }
+            if (!answer.isAnswered) {
+                json.member("answered", false);
+            }
+            json.end();
+        }
     }
 }

@@ -32,10 +32,13 @@ final class Place {
         return line == NO_LINE ? input : input + ", line " + line;
     }
 
-    /** Several places for people: each input once, with its lines. */
-    static String names(Iterable<Place> places) {
+    /** Several places for people: each input once, with its lines; null is none. */
+    static String names(Place... places) {
         Map<String, List<Integer>> lines = new LinkedHashMap<>();
         for (Place place : places) {
+            if (place == null) {
+                continue;
+            }
             List<Integer> known = lines.computeIfAbsent(place.input, input -> new ArrayList<>());
             if (place.line != NO_LINE && !known.contains(place.line)) {
                 known.add(place.line);

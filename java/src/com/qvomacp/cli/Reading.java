@@ -25,18 +25,15 @@ final class Reading {
     /** Why the message cannot be read; null when it can. */
     final ProvisioningException failure;
 
-    private Reading(
-            Held held,
-            PushHeader header,
-            ProvisioningMessage message,
-            Verdict verdict,
-            ProvisioningException failure) {
+    private Reading(Held held, ProvisioningMessage message, ProvisioningException failure) {
         this.held = held;
-        this.header = header;
         this.message = message;
-        this.document = message == null ? null : message.document();
-        this.verdict = verdict;
         this.failure = failure;
+        boolean isRead = message != null;
+        this.document = isRead ? message.document() : null;
+        this.header = isRead ? message.header() : held.header();
+        Verdict ofBytes = isRead ? null : held.isPush ? Verdict.ofPush(held.bytes) : Verdict.ofBody(held.bytes);
+        this.verdict = isRead ? message.verdict() : ofBytes;
     }
 
     static Reading of(Held held, int limit) {
@@ -46,20 +43,9 @@ final class Reading {
                     held.isPush
                             ? ProvisioningMessage.parsePush(held.bytes, options)
                             : ProvisioningMessage.parseBody(held.bytes, options);
-            return new Reading(held, message.header(), message, message.verdict(), null);
+            return new Reading(held, message, null);
         } catch (ProvisioningException failure) {
-            Verdict verdict =
-                    held.isPush ? Verdict.ofPush(held.bytes) : Verdict.ofBody(held.bytes);
-            return new Reading(held, headerOf(held), null, verdict, failure);
-        }
-    }
-
-    /** Reads the push header alone, whatever stands behind it. */
-    static PushHeader headerOf(Held held) {
-        try {
-            return held.isPush ? PushHeader.parse(held.bytes) : null;
-        } catch (ProvisioningException none) {
-            return null;
+            return new Reading(held, null, failure);
         }
     }
 
@@ -75,15 +61,10 @@ final class Reading {
 
     /** The exit status that the message stands for. */
     int status() {
-        if (failure != null) {
-            switch (failure.reason()) {
-                case INPUT_TOO_LONG:
-                case TEXT_TOO_LONG:
-                    return Console.FAILED;
-                default:
-                    return Console.REFUSED;
-            }
-        }
-        return verdict.isAccepted() ? Console.DONE : Console.REFUSED;
+        boolean isTooLong =
+                failure != null
+                        && (failure.reason() == ProvisioningException.Reason.INPUT_TOO_LONG
+                                || failure.reason() == ProvisioningException.Reason.TEXT_TOO_LONG);
+        return isTooLong ? Console.FAILED : isAccepted() ? Console.DONE : Console.REFUSED;
     }
 }

@@ -25,55 +25,28 @@ final class Refusal {
     private final String path;
     private final List<String> expected;
 
-    private Refusal(
-            Held held,
-            String sentence,
-            String code,
-            boolean isHeader,
-            int bodyAt,
-            int offset,
-            String path,
-            List<String> expected) {
-        this.held = held;
-        this.sentence = sentence;
-        this.code = code;
-        this.bodyOffset = isHeader ? -1 : offset;
-        this.offset = isHeader ? offset : bodyAt + offset;
-        this.path = isHeader ? "push header" : path;
-        this.expected = expected;
+    private Refusal(Reading reading) {
+        ProvisioningException failure = reading.failure;
+        Verdict verdict = reading.verdict;
+        boolean isBoth = failure != null && verdict.offset() == failure.offset() && !verdict.isHeaderRefused();
+        boolean isLibrarys = failure == null || isBoth;
+        boolean isHeader =
+                isLibrarys
+                        ? verdict.isHeaderRefused()
+                        : failure.reason() == ProvisioningException.Reason.NO_PUSH_HEADER;
+        int place = isLibrarys ? verdict.offset() : failure.offset();
+        held = reading.held;
+        sentence = failure == null ? verdict.reason() : failure.getMessage();
+        code = isLibrarys && verdict.code() != 0 ? verdict.code() + " " + verdict.codeName() : null;
+        bodyOffset = isHeader ? -1 : place;
+        offset = isHeader ? place : reading.bodyAt() + place;
+        path = isHeader ? "push header" : isLibrarys ? verdict.path() : failure.path();
+        expected = isLibrarys ? verdict.expected() : failure.expected();
     }
 
     /** Why a message is refused that cannot be read, or is not taken by the library. */
     static Refusal of(Reading reading) {
-        ProvisioningException failure = reading.failure;
-        Verdict verdict = reading.verdict;
-        boolean isBoth = failure != null && verdict.offset() == failure.offset()
-                && !verdict.isHeaderRefused();
-        if (failure != null && !isBoth) {
-            return of(reading.held, failure, reading.bodyAt());
-        }
-        return new Refusal(
-                reading.held,
-                isBoth ? failure.getMessage() : verdict.reason(),
-                verdict.code() == 0 ? null : verdict.code() + " " + verdict.codeName(),
-                verdict.isHeaderRefused(),
-                reading.bodyAt(),
-                verdict.offset(),
-                verdict.path(),
-                verdict.expected());
-    }
-
-    /** Why a message cannot be read. */
-    static Refusal of(Held held, ProvisioningException failure, int bodyAt) {
-        return new Refusal(
-                held,
-                failure.getMessage(),
-                null,
-                failure.reason() == ProvisioningException.Reason.NO_PUSH_HEADER,
-                bodyAt,
-                failure.offset(),
-                failure.path(),
-                failure.expected());
+        return new Refusal(reading);
     }
 
     /** Writes it behind {@code start}, such as the name of the file. */

@@ -4,19 +4,10 @@ import java.util.Arrays;
 import java.util.Locale;
 
 /**
- * A short message that carries data to a port, by 3GPP TS 23.040: an SMS-DELIVER, or user data with
- * its header alone. It is one only when all its lengths come out exactly.
+ * A short message by 3GPP TS 23.040: an SMS-DELIVER, or user data with its header alone. It is one
+ * only when all its lengths come out exactly.
  */
 final class ShortMessage {
-    /** Says that the bytes are a short message, and why it carries no push. */
-    static final class OtherException extends Exception {
-        private static final long serialVersionUID = 1L;
-
-        OtherException(String sentence) {
-            super(sentence);
-        }
-    }
-
     private static final int LONGEST_CENTRE = 12;
     private static final int LONGEST_ADDRESS = 20;
     private static final int TYPE = 0x03;
@@ -30,7 +21,9 @@ final class ShortMessage {
     private static final int KIND = 0xF0;
     private static final String DIGITS = "0123456789*#abc";
 
-    private static final int[] PUSH_PORTS = {2948, 2949};
+    private static final String SEVEN_BIT = "7-bit text";
+    private static final String[] ALPHABETS = {SEVEN_BIT, "8-bit data", "UCS-2 text", SEVEN_BIT};
+
     private static final int NO_PORT = -1;
 
     static final int CONCATENATED_8 = 0x00;
@@ -41,8 +34,11 @@ final class ShortMessage {
     /** The number or name of the sender; empty for user data alone. */
     final String sender;
 
-    /** What comes behind the header. */
+    /** What comes behind the header; empty where {@link #other} says why it is of no use. */
     final byte[] data;
+
+    /** Why it carries no data to a port, whichever; null when it does. */
+    final String other;
 
     private int port = NO_PORT;
     private int senderPort = NO_PORT;
@@ -54,9 +50,10 @@ final class ShortMessage {
     private int total = 1;
     private int number = 1;
 
-    private ShortMessage(String sender, byte[] data) {
+    private ShortMessage(String sender, byte[] data, String other) {
         this.sender = sender;
         this.data = data;
+        this.other = other;
     }
 
     /** Bytes from a place on; -1 behind the last. */
@@ -65,14 +62,14 @@ final class ShortMessage {
     }
 
     /** Reads an SMS with the address of the service centre in front; null when it is none. */
-    static ShortMessage withCentre(byte[] bytes) throws OtherException {
+    static ShortMessage withCentre(byte[] bytes) {
         int centre = at(bytes, 0);
         boolean isAddress = centre > 1 && centre <= LONGEST_CENTRE && at(bytes, 1) >= 0x80;
         return centre == 0 || isAddress ? withoutCentre(bytes, centre + 1) : null;
     }
 
     /** Reads an SMS from its first octet on; null when it is none. */
-    static ShortMessage withoutCentre(byte[] bytes, int from) throws OtherException {
+    static ShortMessage withoutCentre(byte[] bytes, int from) {
         int first = at(bytes, from);
         boolean isSubmit = (first & TYPE) == SUBMIT;
         if (first < 0 || (first & TYPE) > SUBMIT) {
@@ -84,21 +81,32 @@ final class ShortMessage {
         if (digits < 0 || digits > LONGEST_ADDRESS || kind < 0x80) {
             return null;
         }
-        int coding = address + 2 + (digits + 1) / 2 + 1;
-        int lengthAt = coding + 1 + (isSubmit ? validity(first) : TIME_STAMP);
+        int codingAt = address + 2 + (digits + 1) / 2 + 1;
+        int lengthAt = codingAt + 1 + (isSubmit ? validity(first) : TIME_STAMP);
         int length = at(bytes, lengthAt);
-        Alphabet alphabet = Alphabet.of(at(bytes, coding));
-        if (length < 0 || alphabet.octets(length) != bytes.length - lengthAt - 1) {
+        int coding = at(bytes, codingAt);
+        String alphabet = alphabet(coding);
+        int octets = alphabet.equals(SEVEN_BIT) ? (7 * length + 7) / 8 : length;
+        if (length < 0 || octets != bytes.length - lengthAt - 1) {
             return null;
         }
-        requireData(isSubmit, alphabet, at(bytes, coding), (first & HAS_HEADER) != 0);
-        String sender = address(bytes, address + 2, digits, kind);
-        ShortMessage message = userData(bytes, lengthAt + 1, sender);
-        if (message == null) {
-            throw new OtherException(
-                    "an SMS whose user data header does not end where its length says");
+        String other = null;
+        if (isSubmit) {
+            other = "an SMS-SUBMIT, which is on its way from a handset; one that is received is an SMS-DELIVER";
+        } else if (coding != 0x04 && (coding & 0xFC) != 0xF4) {
+            String why = "an SMS with %s (coding scheme %02X), and not with data for a port (04, F4 to F7)";
+            other = String.format(Locale.ROOT, why, alphabet, coding);
+        } else if ((first & HAS_HEADER) == 0) {
+            other = "an SMS without a user data header, and so without a port";
+        } else {
+            String sender = address(bytes, address + 2, digits, kind);
+            ShortMessage message = userData(bytes, lengthAt + 1, sender);
+            if (message != null) {
+                return message;
+            }
+            other = "an SMS whose user data header does not end where its length says";
         }
-        return message;
+        return new ShortMessage("", new byte[0], other);
     }
 
     private static int validity(int first) {
@@ -106,21 +114,15 @@ final class ShortMessage {
         return format == 0 ? 0 : format == RELATIVE_VALIDITY ? 1 : TIME_STAMP;
     }
 
-    private static void requireData(
-            boolean isSubmit, Alphabet alphabet, int coding, boolean hasHeader)
-            throws OtherException {
-        if (isSubmit) {
-            throw new OtherException(
-                    "an SMS-SUBMIT, which is on its way from a handset; one that is received is an"
-                            + " SMS-DELIVER");
+    /** What user data is written in, by its coding scheme. */
+    private static String alphabet(int coding) {
+        if (coding >> 4 == 0xF) {
+            return ALPHABETS[coding >> 2 & 0x01];
         }
-        if (alphabet != Alphabet.DATA) {
-            String why = "an SMS with %s (coding scheme %02X), and not with data";
-            throw new OtherException(String.format(Locale.ROOT, why, alphabet.name, coding));
+        if (coding >= 0x80) {
+            return ALPHABETS[coding >> 4 == 0xE ? 2 : 0];
         }
-        if (!hasHeader) {
-            throw new OtherException("an SMS without a user data header, and so without a port");
-        }
+        return (coding & 0x20) != 0 ? "compressed text" : ALPHABETS[coding >> 2 & 0x03];
     }
 
     /** Reads user data from the length of its header on; null when it is none. */
@@ -134,8 +136,8 @@ final class ShortMessage {
         if (at(bytes, from) < 0 || end > bytes.length) {
             return null;
         }
-        ShortMessage message =
-                new ShortMessage(sender, Arrays.copyOfRange(bytes, end, bytes.length));
+        byte[] data = Arrays.copyOfRange(bytes, end, bytes.length);
+        ShortMessage message = new ShortMessage(sender, data, null);
         int element = from + 1;
         while (element < end) {
             int next = element + 1 < end ? element + 2 + at(bytes, element + 1) : end + 1;
@@ -188,17 +190,15 @@ final class ShortMessage {
         return text.toString();
     }
 
-    /** Says why the message carries no push, by its port or its place among the parts; or null. */
+    /** Why it carries no push: by what it is, its place among the parts, or its port; or null. */
     String fault() {
+        if (other != null) {
+            return other;
+        }
         if (number == 0 || total == 0 || number > total) {
             return "the SMS says that it is part " + number + " of " + total;
         }
-        for (int known : PUSH_PORTS) {
-            if (port == known) {
-                return null;
-            }
-        }
-        return port == NO_PORT
+        return port == NO_PORT || port == 2948 || port == 2949
                 ? null
                 : "an SMS for port " + port + ", and not for pushes (2948, 2949)";
     }
@@ -225,40 +225,8 @@ final class ShortMessage {
     }
 
     /** For people. */
-    String description() {
+    @Override
+    public String toString() {
         return "the SMS with reference " + reference + (sender.isEmpty() ? "" : " from " + sender);
-    }
-
-    /** What the user data is written in, by the coding scheme. */
-    private enum Alphabet {
-        SEVEN_BIT("7-bit text"),
-        DATA("data"),
-        UCS_2("UCS-2 text"),
-        COMPRESSED("compressed text");
-
-        final String name;
-
-        Alphabet(String name) {
-            this.name = name;
-        }
-
-        static Alphabet of(int coding) {
-            if (coding >> 4 == 0xF) {
-                return (coding & 0x04) == 0 ? SEVEN_BIT : DATA;
-            }
-            if (coding >= 0x80) {
-                return coding >> 4 == 0xE ? UCS_2 : SEVEN_BIT;
-            }
-            if ((coding & 0x20) != 0) {
-                return COMPRESSED;
-            }
-            Alphabet[] byBits = {SEVEN_BIT, DATA, UCS_2, SEVEN_BIT};
-            return byBits[coding >> 2 & 0x03];
-        }
-
-        /** How many octets so many characters or octets of user data are. */
-        int octets(int length) {
-            return this == SEVEN_BIT ? (7 * length + 7) / 8 : length;
-        }
     }
 }

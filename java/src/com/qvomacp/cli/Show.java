@@ -3,24 +3,20 @@ package com.qvomacp.cli;
 import com.qvomacp.eng.omacp.EncodeOptions;
 import com.qvomacp.eng.omacp.EncodingException;
 import com.qvomacp.eng.omacp.ProvisioningEncoder;
-import com.qvomacp.eng.omacp.ProvisioningException;
 import com.qvomacp.eng.omacp.PushHeader;
+import java.util.Collections;
+import java.util.List;
 import picocli.CommandLine.Command;
-import picocli.CommandLine.Option;
 
 /** Shows what messages say. */
 @Command(
         name = "show",
         description = "Show what messages set.",
-        sortOptions = false,
-        parameterListHeading = "%n",
-        optionListHeading = "%nOptions:%n",
         footerHeading = "%n",
         footer = {
             "A message that the native library refuses is shown all the same, and the refusal is"
                     + " explained."
         },
-        exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
             "0:every message was shown",
             "1:a message is refused",
@@ -28,33 +24,37 @@ import picocli.CommandLine.Option;
                     + " or the library that is asked cannot be loaded"
         })
 final class Show extends JsonJob {
-    @Option(names = "--header", description = "Show the push header alone, whatever the body is.")
-    private boolean header;
+    private static final Option<Boolean> HEADER =
+            Option.flag("--header", "Show the push header alone, whatever the body is.");
 
-    @Option(names = "--bytes", description = "List every byte with what it means.")
-    private boolean bytes;
+    private static final Option<Boolean> BYTES =
+            Option.flag("--bytes", "List every byte with what it means.");
 
-    @Option(
-            names = "--answers",
-            description =
-                    "Ask the native library as well, and mark where it answers otherwise than the"
-                            + " message says.")
-    private boolean answers;
+    private static final Option<Boolean> ANSWERS = Option.flag("--answers",
+            "Ask the native library as well, and mark where it answers otherwise than the message"
+                    + " says.");
 
-    @Option(names = "--xml", description = "Print the document as XML, from which encode makes it.")
-    private boolean xml;
+    private static final Option<Boolean> XML =
+            Option.flag("--xml", "Print the document as XML, from which encode makes it.");
 
     private int shown;
 
     @Override
+    List<Option<?>> options() {
+        List<Option<?>> options = super.options();
+        Collections.addAll(options, HEADER, BYTES, ANSWERS, XML);
+        return options;
+    }
+
+    @Override
     void begin() {
-        if (bytes && (isJson() || header || answers)) {
+        if (has(BYTES) && (isJson() || has(HEADER) || has(ANSWERS))) {
             throw new UsageException("--bytes goes with none of --json, --header and --answers");
         }
-        if (xml && (bytes || isJson() || header || answers)) {
+        if (has(XML) && (has(BYTES) || isJson() || has(HEADER) || has(ANSWERS))) {
             throw new UsageException("--xml goes with no other form, nor with --answers");
         }
-        if (answers && header) {
+        if (has(ANSWERS) && has(HEADER)) {
             throw new UsageException("--answers goes not with --header");
         }
         super.begin();
@@ -62,12 +62,12 @@ final class Show extends JsonJob {
 
     @Override
     void run(Held held) {
-        if (header) {
+        if (has(HEADER)) {
             showHeader(held);
             return;
         }
         Reading reading = Reading.of(held, limit());
-        if (bytes) {
+        if (has(BYTES)) {
             console.raise(reading.status());
             list(reading);
             if (!reading.isAccepted()) {
@@ -77,7 +77,7 @@ final class Show extends JsonJob {
             explain(reading);
             json(reading);
         } else {
-            if (xml) {
+            if (has(XML)) {
                 xml(reading);
             } else {
                 text(reading);
@@ -106,7 +106,7 @@ final class Show extends JsonJob {
 
     @Override
     void unknown(Held held) {
-        if (bytes && held.bytes != null) {
+        if (has(BYTES) && held.bytes != null) {
             list(Reading.of(held, limit()));
         }
     }
@@ -116,13 +116,8 @@ final class Show extends JsonJob {
             fail(Console.REFUSED, held.name, "has no push header");
             return;
         }
-        PushHeader read;
-        try {
-            read = PushHeader.parse(held.bytes);
-        } catch (ProvisioningException refused) {
-            console.raise(Console.REFUSED);
-            complain(Refusal.of(held, refused, 0).write(startOf(held.name), errPalette()));
-            failed(held.name, refused.getMessage());
+        PushHeader read = header(held);
+        if (read == null) {
             return;
         }
         int bodyLength = held.bytes.length - read.length();
@@ -151,8 +146,8 @@ final class Show extends JsonJob {
         if (reading.document != null) {
             text.document(reading.document);
         }
-        if (answers) {
-            answers(reading, new AnswerText(console.out, outPalette()));
+        if (has(ANSWERS)) {
+            text.answers(compared(reading));
         }
     }
 
@@ -160,9 +155,10 @@ final class Show extends JsonJob {
         beginObject(reading.held.name);
         int depth = writer.depth();
         try {
-            new MessageJson(writer).message(reading);
-            if (answers) {
-                answers(reading, new AnswerJson(writer));
+            MessageJson json = new MessageJson(writer);
+            json.message(reading);
+            if (has(ANSWERS)) {
+                json.answers(compared(reading));
             }
         } finally {
             writer.endTo(depth);
@@ -171,13 +167,13 @@ final class Show extends JsonJob {
     }
 
     /** Asks the library; where it cannot be loaded, that is said. */
-    private void answers(Reading reading, Comparison.Listener listener) {
+    private Comparison compared(Reading reading) {
         try {
-            Comparison.of(reading, listener);
+            return new Comparison(reading);
         } catch (UnsatisfiedLinkError missing) {
             console.raise(Console.FAILED);
             complain(startOf(reading.held.name) + Visible.of(missing.getMessage()) + "\n");
-            listener.unanswered("the library cannot be loaded");
+            return new Comparison("the library cannot be loaded");
         }
     }
 

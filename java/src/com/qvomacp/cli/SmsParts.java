@@ -9,18 +9,16 @@ import java.util.Map;
 
 /** Puts pushes together from the parts that short messages carry, in whichever order they come. */
 final class SmsParts {
-    /** The parts of one push. */
+    /** The parts of one push, and where each comes from. */
     private static final class Push {
-        final ShortMessage any;
-        final byte[][] parts;
+        final ShortMessage[] parts;
         final Place[] places;
         final List<String> notes = new ArrayList<>();
         boolean isFinished;
 
-        Push(ShortMessage first) {
-            any = first;
-            parts = new byte[first.total()][];
-            places = new Place[first.total()];
+        Push(int total) {
+            parts = new ShortMessage[total];
+            places = new Place[total];
         }
 
         List<Integer> missing() {
@@ -33,15 +31,12 @@ final class SmsParts {
             return missing;
         }
 
-        /** Where the parts come from, in their order. */
-        String name() {
-            List<Place> known = new ArrayList<>();
-            for (Place place : places) {
-                if (place != null) {
-                    known.add(place);
-                }
+        byte[] bytes() {
+            ByteArrayOutputStream bytes = new ByteArrayOutputStream();
+            for (ShortMessage part : parts) {
+                bytes.write(part.data, 0, part.data.length);
             }
-            return Place.names(known);
+            return bytes.toByteArray();
         }
     }
 
@@ -52,36 +47,32 @@ final class SmsParts {
         if (!message.isPart()) {
             return Held.message(place.toString(), message.data, true);
         }
-        Push push = pushes.computeIfAbsent(message.key(), key -> new Push(message));
+        Push push = pushes.computeIfAbsent(message.key(), key -> new Push(message.total()));
         int index = message.number() - 1;
-        String part = "part " + message.number() + " of " + message.description();
         if (push.parts[index] != null) {
-            return again(push, place, message, part);
+            return again(push, index, place, message);
         }
-        push.parts[index] = message.data;
+        push.parts[index] = message;
         push.places[index] = place;
         if (push.isFinished || !push.missing().isEmpty()) {
             return null;
         }
         push.isFinished = true;
-        ByteArrayOutputStream whole = new ByteArrayOutputStream();
-        for (byte[] bytes : push.parts) {
-            whole.write(bytes, 0, bytes.length);
-        }
-        return Held.push(push.name(), whole.toByteArray(), push.notes);
+        return Held.push(Place.names(push.places), push.bytes(), push.notes);
     }
 
-    private static Held again(Push push, Place place, ShortMessage message, String part) {
-        String name = place.toString();
-        String where = ": in " + push.places[message.number() - 1] + " and in " + name;
-        if (!Arrays.equals(push.parts[message.number() - 1], message.data)) {
+    private static Held again(Push push, int index, Place place, ShortMessage message) {
+        boolean isSame = Arrays.equals(push.parts[index].data, message.data);
+        String what = "part " + message.number() + " of " + message + " is there twice";
+        String where = ": in " + push.places[index] + " and in " + place;
+        if (!isSame) {
             push.isFinished = true;
-            return Held.error(name, part + " is there twice with different bytes" + where);
+            return Held.error(place.toString(), what + " with different bytes" + where);
         }
         if (push.isFinished) {
-            return Held.note(name, part + " is there twice" + where);
+            return Held.note(place.toString(), what + where);
         }
-        push.notes.add(part + " is there twice" + where);
+        push.notes.add(what + where);
         return null;
     }
 
@@ -90,13 +81,17 @@ final class SmsParts {
         List<Held> errors = new ArrayList<>();
         for (Push push : pushes.values()) {
             List<Integer> missing = push.missing();
-            if (!push.isFinished && !missing.isEmpty()) {
-                boolean isOne = missing.size() == 1;
-                String which = (isOne ? "part " : "parts ") + Place.listed(missing);
-                String of = " of " + push.parts.length + " of " + push.any.description();
-                String sentence = which + of + (isOne ? " is" : " are") + " missing";
-                errors.add(Held.error(push.name(), sentence));
+            if (push.isFinished || missing.isEmpty()) {
+                continue;
             }
+            ShortMessage any = null;
+            for (ShortMessage part : push.parts) {
+                any = part != null ? part : any;
+            }
+            boolean isOne = missing.size() == 1;
+            String which = (isOne ? "part " : "parts ") + Place.listed(missing);
+            String sentence = which + " of " + push.parts.length + " of " + any;
+            errors.add(Held.error(Place.names(push.places), sentence + (isOne ? " is missing" : " are missing")));
         }
         return errors;
     }

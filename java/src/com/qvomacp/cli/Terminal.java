@@ -17,15 +17,15 @@ final class Terminal {
         never
     }
 
-    private final boolean out;
-    private final boolean err;
+    private final boolean hasColorOut;
+    private final boolean hasColorErr;
 
     /** Whether the output is for people's eyes, in colours or without. */
     final boolean isScreen;
 
-    Terminal(boolean out, boolean err, boolean isScreen) {
-        this.out = out;
-        this.err = err;
+    Terminal(boolean hasColorOut, boolean hasColorErr, boolean isScreen) {
+        this.hasColorOut = hasColorOut;
+        this.hasColorErr = hasColorErr;
         this.isScreen = isScreen;
     }
 
@@ -41,16 +41,17 @@ final class Terminal {
                 && !environment.getOrDefault("TERM", "dumb").equals("dumb");
     }
 
-    Palette out(Color color) {
-        return palette(color, out);
+    /** The colours of standard output; the wish may be null. */
+    Palette out(Color wish) {
+        return palette(wish, hasColorOut);
     }
 
-    Palette err(Color color) {
-        return palette(color, err);
+    Palette err(Color wish) {
+        return palette(wish, hasColorErr);
     }
 
-    private static Palette palette(Color color, boolean terminal) {
-        boolean on = color == Color.always || color == Color.auto && terminal;
+    private static Palette palette(Color wish, boolean byItself) {
+        boolean on = wish == Color.always || wish != Color.never && byItself;
         return on ? Palette.COLORS : Palette.NONE;
     }
 

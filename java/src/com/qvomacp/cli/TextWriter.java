@@ -10,7 +10,6 @@ import com.qvomacp.eng.omacp.Parameter;
 import com.qvomacp.eng.omacp.ProvisioningDocument;
 import com.qvomacp.eng.omacp.PushHeader;
 import java.io.PrintWriter;
-import java.util.Collections;
 import java.util.List;
 import java.util.Locale;
 
@@ -20,10 +19,10 @@ import java.util.Locale;
  */
 final class TextWriter {
     static final int INDENT = 2;
-    private static final int HEADER_COLUMN = 16;
+    static final int HEADER_COLUMN = 16;
 
     /** Deeper items are indented no further. */
-    private static final int DEEPEST = 16;
+    static final int DEEPEST = 16;
 
     /** A wider name has its value two columns behind it. */
     private static final int WIDEST = 32;
@@ -83,14 +82,9 @@ final class TextWriter {
                 if (item instanceof Parameter) {
                     parameter((Parameter) item, indent * INDENT, columns[indent]);
                 } else {
-                    spaces(indent * INDENT);
-                    if (isCharacteristic) {
-                        String type = ((Characteristic) item).type();
-                        out.append(type == null ? palette.error("(no TYPE)") : Visible.of(type));
-                    } else {
-                        out.append(palette.error(describe((Other) item)));
-                    }
-                    out.append('\n');
+                    String type = isCharacteristic ? ((Characteristic) item).type() : null;
+                    String none = isCharacteristic ? "(no TYPE)" : describe((Other) item);
+                    row(indent * INDENT, type == null ? palette.error(none) : Visible.of(type), 0, null);
                 }
                 if (!item.children().isEmpty()) {
                     columns[Math.min(depth + 1, DEEPEST)] = column(item.children());
@@ -117,14 +111,11 @@ final class TextWriter {
         if (parameter.name() != null) {
             line(indent, column, parameter.name(), shown(parameter.value()));
         } else {
-            spaces(indent);
-            out.append(palette.error("(no NAME)"));
-            out.append(parameter.value() == null ? "" : "  " + Visible.value(parameter.value()));
-            out.append('\n');
+            row(indent, palette.error("(no NAME)"), INDENT, shown(parameter.value()));
         }
     }
 
-    private static String describe(Other other) {
+    static String describe(Other other) {
         boolean isTrailing = other.kind() == Other.Kind.TRAILING;
         StringBuilder text = new StringBuilder("(");
         text.append(isTrailing ? other.length() + " bytes behind the document" : nameOf(other.kind()));
@@ -161,23 +152,63 @@ final class TextWriter {
         }
     }
 
+    /** Writes what the library answers, with a mark in front of what the message belies. */
+    void answers(Comparison comparison) {
+        boolean isAnswered = comparison.unanswered == null;
+        String title = "The native library answers" + (isAnswered ? "" : " nothing");
+        out.append('\n').append(palette.bold(title));
+        if (isAnswered) {
+            out.append(" (! otherwise than the message says, - not at all):\n");
+            answers(comparison.answers, 0, 0);
+        } else {
+            out.append(": " + comparison.unanswered + ".\n");
+        }
+    }
+
+    private void answers(List<Answer> answers, int depth, int column) {
+        for (Answer answer : answers) {
+            boolean isParameter = answer.children == null;
+            boolean isOtherwise = isParameter && answer.isAnswered && !answer.isSame();
+            String name = answer.name == null ? (isParameter ? "(no NAME)" : "(no TYPE)") : answer.name;
+            out.append(depth == 0 && !isParameter ? "\n" : "");
+            out.append(isOtherwise ? palette.error("!") : answer.isAnswered ? " " : palette.error("-"));
+            out.append(' ');
+            line(depth * INDENT, column, name, isParameter ? shown(answer) : null);
+            if (!isParameter) {
+                answers(answer.children, depth + 1, answer.column);
+            }
+        }
+    }
+
+    private static String shown(Answer answer) {
+        if (!answer.isAnswered) {
+            return shown(answer.said);
+        }
+        String shown = answer.value == null ? "(none)" : Visible.value(answer.value);
+        String says = answer.said == null ? "gives no value" : "says " + Visible.quoted(answer.said);
+        String instead = answer.isSaid ? "the message " + says : "the message does not say it";
+        return answer.isSame() ? shown : shown + "  (" + instead + ")";
+    }
+
     /** Writes a name, and in its column the value as it is shown; null for none. */
     void line(int indent, int column, String name, String shown) {
         String shownName = Visible.of(name);
-        spaces(indent);
-        out.append(shownName);
+        int gap = shown == null ? 0 : Math.max(column - Visible.columns(shownName), INDENT);
+        row(indent, shownName, gap, shown);
+    }
+
+    private void row(int indent, String name, int gap, String shown) {
+        StringBuilder row = new StringBuilder(Lines.WIDTH);
+        Listing.pad(row, "", indent);
+        row.append(name);
         if (shown != null) {
-            spaces(Math.max(column - Visible.columns(shownName), INDENT));
-            out.append(shown);
+            Listing.pad(row, "", gap);
+            row.append(shown);
         }
-        out.append('\n');
+        out.append(row.append('\n'));
     }
 
     private static String shown(String value) {
         return value == null ? null : Visible.value(value);
-    }
-
-    private void spaces(int count) {
-        out.append(String.join("", Collections.nCopies(count, " ")));
     }
 }

@@ -2,23 +2,18 @@ package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.EncodeOption;
 import com.qvomacp.eng.omacp.MacResult;
-import com.qvomacp.eng.omacp.ProvisioningException;
 import com.qvomacp.eng.omacp.ProvisioningMac;
 import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.SecurityMethod;
 import java.util.Arrays;
+import java.util.List;
 import picocli.CommandLine.Command;
-import picocli.CommandLine.Option;
 
 /** Checks the MAC of messages. */
 @Command(
         name = "verify",
         description = "Check the MAC of messages, by the security method that each of them states.",
         customSynopsis = "omacp verify [-h] [OPTION...] [FILE...]",
-        sortOptions = false,
-        parameterListHeading = "%n",
-        optionListHeading = "%nOptions:%n",
-        exitCodeListHeading = "%nExit status:%n",
         exitCodeList = {
             "0:every MAC is right",
             "1:a MAC is not right or not there, or a message has no push header",
@@ -28,14 +23,22 @@ import picocli.CommandLine.Option;
 final class Verify extends JsonJob {
     private static final int MAC_DIGITS = 40;
 
-    @Option(names = "--show-mac", description = "Tell the MAC that the message should have.")
-    private boolean showMac;
+    private static final Option<Boolean> SHOW_MAC =
+            Option.flag("--show-mac", "Tell the MAC that the message should have.");
 
     private String pin;
     private String imsi;
 
     /** In place of PIN and IMSI; null to make it of them. */
     private byte[] key;
+
+    @Override
+    List<Option<?>> options() {
+        List<Option<?>> options = super.options();
+        options.add(SHOW_MAC);
+        options.addAll(Choices.SECRETS);
+        return options;
+    }
 
     @Override
     void begin() {
@@ -57,18 +60,13 @@ final class Verify extends JsonJob {
 
     @Override
     void run(Held held) {
-        PushHeader header = null;
-        try {
-            header = held.isPush ? PushHeader.parse(held.bytes) : null;
-        } catch (ProvisioningException none) {
-            console.raise(Console.REFUSED);
-            complain(Refusal.of(held, none, 0).write(startOf(held.name), errPalette()));
-            failed(held.name, none.getMessage());
-            return;
-        }
-        if (header == null) {
+        if (!held.isPush) {
             String reason = "it has no push header, and so no MAC";
             say(held, SecurityMethod.NONE, MacResult.NO_MAC, reason, null);
+            return;
+        }
+        PushHeader header = header(held);
+        if (header == null) {
             return;
         }
         SecurityMethod method = header.securityMethod();
@@ -77,13 +75,15 @@ final class Verify extends JsonJob {
                 key == null
                         ? ProvisioningMac.verify(method, header.mac(), body, pin, imsi)
                         : ProvisioningMac.verify(method, header.mac(), body, key);
-        String computed =
-                key == null
-                        ? ProvisioningMac.compute(method, body, pin, imsi)
-                        : ProvisioningMac.compute(key, body);
-        String reason =
-                result == MacResult.RIGHT ? null : reasonFor(result, header, held.bytes);
-        say(held, method, result, reason, showMac ? computed : null);
+        String computed = null;
+        if (has(SHOW_MAC)) {
+            computed =
+                    key == null
+                            ? ProvisioningMac.compute(method, body, pin, imsi)
+                            : ProvisioningMac.compute(key, body);
+        }
+        String reason = result == MacResult.RIGHT ? null : reasonFor(result, header, held.bytes);
+        say(held, method, result, reason, computed);
     }
 
     /** What cannot be tried is not the message's fault. */
@@ -91,38 +91,31 @@ final class Verify extends JsonJob {
         boolean isUnusable =
                 result == MacResult.UNUSABLE_PIN && pin != null
                         || result == MacResult.UNUSABLE_IMSI && imsi != null;
-        return isUnusable ? Console.FAILED : Console.REFUSED;
+        return result == MacResult.RIGHT ? Console.DONE : isUnusable ? Console.FAILED : Console.REFUSED;
     }
 
     private String reasonFor(MacResult result, PushHeader header, byte[] message) {
         SecurityMethod method = header.securityMethod();
+        String needs = method + " needs ";
         switch (result) {
             case WRONG:
                 return "the MAC is wrong (" + method + ")";
             case NO_METHOD:
-                return method == SecurityMethod.NONE
-                        ? "the message states no security method"
-                        : "the message states a security method that is not known";
+                boolean isNone = method == SecurityMethod.NONE;
+                return "the message states " + (isNone ? "no security method" : "a security method that is not known");
             case NO_MAC:
                 int at = digitsAt(message, header.length());
-                return "no MAC was found ("
-                        + method
-                        + (at < 0 ? ")" : "), but what may be one stands at message offset " + at);
+                String where = at < 0 ? "" : ", but what may be one stands at message offset " + at;
+                return "no MAC was found (" + method + ")" + where;
             case UNUSABLE_PIN:
-                return pin == null ? needs(method) : "the PIN cannot be one for " + method;
+                boolean needsBoth = method == SecurityMethod.USERNETWPIN;
+                return pin == null
+                        ? needs + (needsBoth ? "--imsi and --pin" : "--pin")
+                        : "the PIN cannot be one for " + method;
             default:
-                return imsi == null ? needs(method) : "the IMSI is no number of 1 to 15 digits";
-        }
-    }
-
-    private static String needs(SecurityMethod method) {
-        switch (method) {
-            case NETWPIN:
-                return method + " needs --imsi";
-            case USERNETWPIN:
-                return method + " needs --imsi and --pin";
-            default:
-                return method + " needs --pin";
+                return imsi == null
+                        ? needs + (method == SecurityMethod.NETWPIN ? "--imsi" : "--imsi and --pin")
+                        : "the IMSI is no number of 1 to 15 digits";
         }
     }
 
@@ -141,13 +134,12 @@ final class Verify extends JsonJob {
     /** Says what came of a message; the reason is null when the MAC is right. */
     private void say(
             Held held, SecurityMethod method, MacResult result, String reason, String computed) {
-        boolean isRight = reason == null;
-        console.raise(isRight ? Console.DONE : statusOf(result));
+        console.raise(statusOf(result));
         if (isJson()) {
             beginObject(held.name);
-            writer.member("verified", isRight).member("result", result.name());
+            writer.member("verified", reason == null).member("result", result.name());
             writer.member("method", method.name());
-            if (!isRight) {
+            if (reason != null) {
                 writer.member("reason", reason);
             }
             if (computed != null) {
@@ -156,12 +148,9 @@ final class Verify extends JsonJob {
             endObject();
             return;
         }
-        console.out.println(
-                Visible.of(held.name)
-                        + ": "
-                        + (isRight
-                                ? "verified (" + method + ")"
-                                : outPalette().error("NOT VERIFIED") + ": " + reason)
-                        + (computed == null ? "" : ", computed " + computed));
+        String not = outPalette().error("NOT VERIFIED") + ": " + reason;
+        String found = reason == null ? "verified (" + method + ")" : not;
+        String told = computed == null ? "" : ", computed " + computed;
+        console.out.println(Visible.of(held.name) + ": " + found + told);
     }
 }

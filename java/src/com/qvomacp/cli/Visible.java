@@ -2,7 +2,11 @@ package com.qvomacp.cli;
 
 /** Texts of a stranger as a terminal may have them. */
 final class Visible {
-    private static final String DIGITS = "0123456789abcdef";
+    /** Characters that take two columns: the first and the last of each range. */
+    private static final int[] WIDE = {
+        0x1100, 0x115F, 0x2E80, 0xA4CF, 0xAC00, 0xD7A3, 0xF900, 0xFAFF, 0xFE30, 0xFE6F,
+        0xFF00, 0xFF60, 0xFFE0, 0xFFE6, 0x1F300, 0x1FAFF, 0x20000, 0x3FFFD
+    };
 
     private Visible() {}
 
@@ -11,12 +15,17 @@ final class Visible {
      * obeys control characters, and with each backslash doubled, so that no text looks like a code.
      */
     static String of(String text) {
-        return escaped(text, '\\');
+        return escaped(text, "\\", "\\");
     }
 
     /** The text in quotes, in which a quote has a backslash in front. */
     static String quoted(String text) {
-        return '"' + escaped(of(text), '"') + '"';
+        return '"' + escaped(text, "\\\"", "\\\"") + '"';
+    }
+
+    /** The text as a string of JSON, in which line breaks and tabs have the codes that people know. */
+    static String json(String text) {
+        return '"' + escaped(text, "\\\"\n\r\t", "\\\"nrt") + '"';
     }
 
     /** A value as it is shown in a line of its own: in quotes where its ends could not be seen. */
@@ -30,45 +39,43 @@ final class Visible {
     }
 
     private static boolean isBlank(char c) {
-        return Character.isWhitespace(c) || Character.isSpaceChar(c);
+        boolean mayBe = c <= ' ' || c >= 0x7F;
+        return mayBe && (Character.isWhitespace(c) || Character.isSpaceChar(c));
     }
 
-    private static String escaped(String text, char escapedToo) {
-        int from = 0;
-        while (from < text.length() && isPlain(text.charAt(from), escapedToo)) {
-            ++from;
+    /** The text with a letter behind a backslash for some characters, and codes for what cannot be seen. */
+    private static String escaped(String text, String special, String letters) {
+        int next = 0;
+        while (next < text.length() && isPlain(text.charAt(next), special)) {
+            ++next;
         }
-        if (from == text.length()) {
+        if (next == text.length()) {
             return text;
         }
-        StringBuilder visible = new StringBuilder(text.length() + 16).append(text, 0, from);
-        for (int i = from; i < text.length(); ) {
+        StringBuilder visible = new StringBuilder(text.length() + 16).append(text, 0, next);
+        for (int i = next; i < text.length(); i = next) {
             int codePoint = text.codePointAt(i);
-            int next = i + Character.charCount(codePoint);
-            if (codePoint == escapedToo) {
-                visible.append('\\');
-            }
-            if (isVisible(codePoint)) {
+            int letter = special.indexOf(codePoint);
+            next = i + Character.charCount(codePoint);
+            if (letter >= 0) {
+                visible.append('\\').append(letters.charAt(letter));
+            } else if (isVisible(codePoint)) {
                 visible.append(text, i, next);
             } else {
                 escape(visible, text, i, next);
             }
-            i = next;
         }
         return visible.toString();
     }
 
-    private static boolean isPlain(char c, char escapedToo) {
-        return c >= ' ' && c < 0x7F && c != escapedToo;
+    private static boolean isPlain(char c, String special) {
+        return c >= ' ' && c < 0x7F && special.indexOf(c) < 0;
     }
 
     /** Appends characters as JSON and Java write their codes. */
-    static void escape(StringBuilder to, CharSequence text, int from, int end) {
+    private static void escape(StringBuilder to, String text, int from, int end) {
         for (int i = from; i < end; ++i) {
-            to.append("\\u");
-            for (int shift = 12; shift >= 0; shift -= 4) {
-                to.append(DIGITS.charAt(text.charAt(i) >> shift & 0xF));
-            }
+            to.append("\\u").append(Integer.toHexString(0x10000 | text.charAt(i)), 1, 5);
         }
     }
 
@@ -89,16 +96,12 @@ final class Visible {
     }
 
     static boolean isWide(int codePoint) {
-        return codePoint >= 0x1100
-                && (codePoint <= 0x115F
-                        || codePoint >= 0x2E80 && codePoint <= 0xA4CF
-                        || codePoint >= 0xAC00 && codePoint <= 0xD7A3
-                        || codePoint >= 0xF900 && codePoint <= 0xFAFF
-                        || codePoint >= 0xFE30 && codePoint <= 0xFE6F
-                        || codePoint >= 0xFF00 && codePoint <= 0xFF60
-                        || codePoint >= 0xFFE0 && codePoint <= 0xFFE6
-                        || codePoint >= 0x1F300 && codePoint <= 0x1FAFF
-                        || codePoint >= 0x20000 && codePoint <= 0x3FFFD);
+        for (int i = 0; i < WIDE.length && codePoint >= WIDE[i]; i += 2) {
+            if (codePoint <= WIDE[i + 1]) {
+                return true;
+            }
+        }
+        return false;
     }
 
     /** False for what a terminal or a reader of text obeys, and for half a character. */

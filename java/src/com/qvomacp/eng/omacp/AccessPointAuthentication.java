@@ -35,9 +35,4 @@ public final class AccessPointAuthentication extends TypedCharacteristic {
     public List<String> entities() {
         return values("AUTH-ENTITY");
     }
-
-    /** {@return SPI: the security parameter index of Mobile IP} */
-    public String securityParameterIndex() {
-        return value("SPI");
-    }
 }

@@ -74,41 +74,6 @@ public final class Application extends TypedCharacteristic {
         return has("INTERNET");
     }
 
-    /** {@return the value of INTERNET} */
-    public String internet() {
-        return value("INTERNET");
-    }
-
-    /** {@return FROM: the sender that the application uses} */
-    public String from() {
-        return value("FROM");
-    }
-
-    /** {@return XCAP_AUID_DCS: the first of the XCAP application identifiers} */
-    public String xcapAuidDcs() {
-        return value("XCAP_AUID_DCS");
-    }
-
-    /** {@return XCAP_AUID_PMS: the second of the XCAP application identifiers} */
-    public String xcapAuidPms() {
-        return value("XCAP_AUID_PMS");
-    }
-
-    /** {@return XCAP_AUID_CDMS: the third of the XCAP application identifiers} */
-    public String xcapAuidCdms() {
-        return value("XCAP_AUID_CDMS");
-    }
-
-    /** {@return XCAP_IMEI_HEADER: the XCAP header for the identity of the device} */
-    public String xcapImeiHeader() {
-        return value("XCAP_IMEI_HEADER");
-    }
-
-    /** {@return XCAP_TID_HEADER: the XCAP header for the identity of the transaction} */
-    public String xcapTidHeader() {
-        return value("XCAP_TID_HEADER");
-    }
-
     /** {@return every APPADDR: the addresses of the service that have ports or a type} */
     public List<ApplicationAddress> addresses() {
         return views(ApplicationAddress.class, "APPADDR");

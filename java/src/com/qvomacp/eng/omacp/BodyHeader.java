@@ -2,8 +2,6 @@ package com.qvomacp.eng.omacp;
 
 /** What stands before the elements of a body: version, document type, character set, string table. */
 final class BodyHeader {
-    static final int PROVISIONING = 0x0B;
-
     private static final int UNKNOWN = 1;
     private static final String PROVISIONING_TEXT = "//DTD PROV ";
     private static final int FIRST_VERSION = 0x00;

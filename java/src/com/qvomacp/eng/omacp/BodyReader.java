@@ -1,5 +1,7 @@
 package com.qvomacp.eng.omacp;
 
+import com.qvomacp.eng.omacp.Deviation.Kind;
+import com.qvomacp.eng.omacp.ProvisioningException.Reason;
 import java.util.Arrays;
 import java.util.HashMap;
 import java.util.Locale;
@@ -116,9 +118,9 @@ final class BodyReader {
         }
         int end = cursor.at();
         if (depth > 0) {
-            reading.deviation(end, Deviation.Kind.END_MISSING);
+            reading.deviation(end, Kind.END_MISSING);
         } else if (!rootEnded) {
-            reading.deviation(end, Deviation.Kind.NO_ROOT);
+            reading.deviation(end, Kind.NO_ROOT);
         }
         for (; depth > 0; --depth) {
             reading.end(end, end);
@@ -127,19 +129,19 @@ final class BodyReader {
 
     private void deviationsOfHeader() {
         if (!header.isVersionKnown()) {
-            reading.deviation(0, Deviation.Kind.VERSION);
+            reading.deviation(0, Kind.VERSION);
         }
         if (!header.isStated()) {
-            reading.deviation(header.identifierAt, Deviation.Kind.DOCUMENT_TYPE);
+            reading.deviation(header.identifierAt, Kind.DOCUMENT_TYPE);
         }
         if (charset.name() == null && charset.number() != CharacterSet.NOT_STATED) {
-            reading.deviation(header.charsetAt, Deviation.Kind.CHARSET);
+            reading.deviation(header.charsetAt, Kind.CHARSET);
         }
     }
 
     private void trailing(int from) {
         cursor.skip(cursor.left());
-        reading.deviation(from, Deviation.Kind.TRAILING);
+        reading.deviation(from, Kind.TRAILING);
         reading.trailing(from, cursor.at());
     }
 
@@ -176,7 +178,7 @@ final class BodyReader {
     private boolean plainParm(int from) throws ProvisioningException {
         CodePage page = attributes;
         int name = cursor.peek();
-        if (page == null || name < 0 || name >= FIRST_VALUE || cursor.peek(1) != VALUE) {
+        if (name < 0 || name >= FIRST_VALUE || cursor.peek(1) != VALUE) {
             return false;
         }
         if (page.attribute(name) != Attribute.NAME || page.begin(name) == null || PIECES[name]) {
@@ -207,18 +209,18 @@ final class BodyReader {
     }
 
     private Element elementOf(int from, int token) {
-        Element found = elements == null ? null : elements.element(token);
-        if (found == null && elementPage != 0) {
-            found = CodePage.of(0).element(token);
-            if (found != null) {
-                reading.deviation(from, Deviation.Kind.OTHER_PAGE);
-            }
-        }
+        Element found = elements.element(token);
         if (found == null) {
-            reading.deviation(from, Deviation.Kind.UNKNOWN_TOKEN);
-            return Element.OTHER;
+            found = CodePage.of(0).element(token);
+            notOnPage(from, found);
         }
-        return found;
+        return found == null ? Element.OTHER : found;
+    }
+
+    /** Tells of a token that the code page in force does not have, and what page 0 has for it. */
+    private void notOnPage(int from, Object ofFirstPage) {
+        boolean isFound = ofFirstPage != null;
+        reading.deviation(from, isFound ? Kind.OTHER_PAGE : Kind.UNKNOWN_TOKEN);
     }
 
     private void instruction(int from) throws ProvisioningException {
@@ -239,7 +241,7 @@ final class BodyReader {
     private int switchPage(int from, boolean ofAttributes, int before) {
         int page = cursor.take();
         if (page < 0) {
-            reading.deviation(from, Deviation.Kind.CUT_OFF);
+            reading.deviation(from, Kind.CUT_OFF);
             page = before;
         }
         reading.page(from, cursor.at(), ofAttributes, page);
@@ -282,7 +284,7 @@ final class BodyReader {
      * to the string table, which it can only be where there is a table.
      */
     private boolean isOfPage(int token) {
-        if (attributePage == 0 || attributes == null) {
+        if (attributePage == 0) {
             return false;
         }
         if (token < FIRST_VALUE) {
@@ -296,26 +298,20 @@ final class BodyReader {
         if (token == LITERAL) {
             String name = literal(from);
             Attribute attribute = Attribute.of(name);
-            reading.attribute(
-                    from,
-                    cursor.at(),
-                    attribute,
-                    attribute == Attribute.OTHER ? name : null,
-                    null);
+            name = attribute == Attribute.OTHER ? name : null;
+            reading.attribute(from, cursor.at(), attribute, name, null);
             pieces = 0;
             return;
         }
         if (PIECES[token]) {
-            reading.deviation(from, Deviation.Kind.OTHER_MEANING);
+            reading.deviation(from, Kind.OTHER_MEANING);
         }
         CodePage page = attributes;
-        Attribute attribute = page == null ? null : page.attribute(token);
-        if (attribute == null && attributePage != 0) {
+        Attribute attribute = page.attribute(token);
+        if (attribute == null) {
             page = CodePage.of(0);
             attribute = page.attribute(token);
-            if (attribute != null) {
-                reading.deviation(from, Deviation.Kind.OTHER_PAGE);
-            }
+            notOnPage(from, attribute);
         }
         if (attribute != null) {
             String value = page.begin(token);
@@ -323,7 +319,6 @@ final class BodyReader {
             pieces = value == null ? 0 : 1;
             return;
         }
-        reading.deviation(from, Deviation.Kind.UNKNOWN_TOKEN);
         String name = unknown(attributePage, token);
         if (element.name != null) {
             // Nearly all tokens say what a parm or characteristic is, so this one may do so too.
@@ -337,19 +332,14 @@ final class BodyReader {
 
     private void value(int from, int token) throws ProvisioningException {
         if (PIECES[token]) {
-            reading.deviation(from, Deviation.Kind.OTHER_MEANING);
+            reading.deviation(from, Kind.OTHER_MEANING);
         }
-        String value = attributes == null ? null : attributes.value(token);
-        if (value == null && attributePage != 0) {
-            value = CodePage.of(0).value(token);
-            if (value != null) {
-                reading.deviation(from, Deviation.Kind.OTHER_PAGE);
-            }
-        }
+        String value = attributes.value(token);
         if (value == null) {
-            reading.deviation(from, Deviation.Kind.UNKNOWN_TOKEN);
-            value = unknown(attributePage, token);
+            value = CodePage.of(0).value(token);
+            notOnPage(from, value);
         }
+        value = value == null ? unknown(attributePage, token) : value;
         if (pieces > 0) {
             charge(from, value.length());
         }
@@ -388,7 +378,7 @@ final class BodyReader {
         int end = start + cursor.left();
         zero = charset.zero(body, start, end);
         if (zero == end) {
-            reading.deviation(from, Deviation.Kind.CUT_OFF);
+            reading.deviation(from, Kind.CUT_OFF);
         }
         cursor.skip(zero - start + charset.unit());
         return decode(from, start, zero);
@@ -414,7 +404,7 @@ final class BodyReader {
         long length = integer(from);
         int start = cursor.at();
         if (length > cursor.left()) {
-            reading.deviation(from, Deviation.Kind.CUT_OFF);
+            reading.deviation(from, Kind.CUT_OFF);
         }
         cursor.skip((int) Math.max(0, Math.min(length, cursor.left())));
         return decode(from, start, cursor.at());
@@ -424,7 +414,7 @@ final class BodyReader {
         charge(from, end - start);
         String text = charset.decode(body, start, end);
         if (text.indexOf(CharacterSet.REPLACEMENT) >= 0) {
-            reading.deviation(from, Deviation.Kind.BAD_TEXT);
+            reading.deviation(from, Kind.BAD_TEXT);
         }
         return text;
     }
@@ -437,14 +427,14 @@ final class BodyReader {
         }
         if (point > Character.MAX_CODE_POINT
                 || point >= Character.MIN_SURROGATE && point <= Character.MAX_SURROGATE) {
-            reading.deviation(from, Deviation.Kind.NO_CHARACTER);
+            reading.deviation(from, Kind.NO_CHARACTER);
             return String.valueOf(CharacterSet.REPLACEMENT);
         }
         return new String(Character.toChars((int) point));
     }
 
     private String extension(int from, int token) throws ProvisioningException {
-        reading.deviation(from, Deviation.Kind.EXTENSION);
+        reading.deviation(from, Kind.EXTENSION);
         if (token <= EXT_I_2) {
             return inline(from);
         }
@@ -461,11 +451,14 @@ final class BodyReader {
     private long integer(int from) {
         long value = cursor.integer();
         if (value == Cursor.NO_INTEGER) {
-            reading.deviation(
-                    from,
-                    cursor.left() == 0 ? Deviation.Kind.CUT_OFF : Deviation.Kind.NUMBER);
+            notReadable(from, Kind.NUMBER);
         }
         return value;
+    }
+
+    /** Tells of an integer that is cut off, or of another kind. */
+    private void notReadable(int from, Kind kind) {
+        reading.deviation(from, cursor.left() == 0 ? Kind.CUT_OFF : kind);
     }
 
     private String literal(int from) throws ProvisioningException {
@@ -476,12 +469,12 @@ final class BodyReader {
     private String reference(int from, String otherwise) throws ProvisioningException {
         long index = cursor.integer();
         int length = header.elementsAt - header.tableAt;
-        if (index == Cursor.NO_INTEGER || index >= length) {
-            reading.deviation(
-                    from,
-                    index == Cursor.NO_INTEGER && cursor.left() == 0
-                            ? Deviation.Kind.CUT_OFF
-                            : Deviation.Kind.REFERENCE);
+        if (index == Cursor.NO_INTEGER) {
+            notReadable(from, Kind.REFERENCE);
+            return otherwise;
+        }
+        if (index >= length) {
+            reading.deviation(from, Kind.REFERENCE);
             return otherwise;
         }
         if (tableTexts == null) {
@@ -503,10 +496,8 @@ final class BodyReader {
     private void charge(int from, int length) throws ProvisioningException {
         textLength += length;
         if (textLength > textLimit || textLength < 0) {
-            throw new ProvisioningException(
-                    ProvisioningException.Reason.TEXT_TOO_LONG,
-                    from,
-                    "the texts of the document are more than " + textLimit + " bytes");
+            String text = "the texts of the document are more than " + textLimit + " bytes";
+            throw new ProvisioningException(Reason.TEXT_TOO_LONG, from, text);
         }
     }
 

@@ -120,15 +120,23 @@ final class BodyWriter extends DocumentSource.Steps {
     /** One without children is written as one with content, too. */
     @Override
     void characteristic(String type) throws EncodingException {
-        out.write(CHARACTERISTIC);
-        start(tokens.type(type, page), TYPE, type);
-        out.write(END);
+        out.write(type == null ? CHARACTERISTIC ^ ATTRIBUTES : CHARACTERISTIC);
+        if (type != null) {
+            start(tokens.type(type, page), TYPE, type);
+            out.write(END);
+        }
     }
 
     @Override
     void parameter(String name, String value) throws EncodingException {
+        if (name == null && value == null) {
+            out.write(PARM ^ ATTRIBUTES);
+            return;
+        }
         out.write(PARM);
-        start(tokens.name(name, page), NAME, name);
+        if (name != null) {
+            start(tokens.name(name, page), NAME, name);
+        }
         if (value != null) {
             out.write(VALUE);
             String rest = tokens.writeValue(innermost(), name, value, page, out);

@@ -10,52 +10,22 @@ final class CharacterSet {
     static final char REPLACEMENT = '\uFFFD';
 
     private static final int UTF_8_NUMBER = 106;
-    private static final int ISO_8859_1_NUMBER = 4;
 
     static final CharacterSet UTF_8 = new CharacterSet(UTF_8_NUMBER, "UTF-8", null, 1, true);
 
-    /** The number, the name, and the name that Java has for it. */
-    private static final Object[][] ROWS = {
-        {3, "US-ASCII", "US-ASCII"},
-        {ISO_8859_1_NUMBER, "ISO-8859-1", "ISO-8859-1"},
-        {5, "ISO-8859-2", "ISO-8859-2"},
-        {6, "ISO-8859-3", "ISO-8859-3"},
-        {7, "ISO-8859-4", "ISO-8859-4"},
-        {8, "ISO-8859-5", "ISO-8859-5"},
-        {9, "ISO-8859-6", "ISO-8859-6"},
-        {10, "ISO-8859-7", "ISO-8859-7"},
-        {11, "ISO-8859-8", "ISO-8859-8"},
-        {12, "ISO-8859-9", "ISO-8859-9"},
-        {13, "ISO-8859-10", "ISO-8859-10"},
-        {17, "Shift_JIS", "Shift_JIS"},
-        {18, "EUC-JP", "EUC-JP"},
-        {38, "EUC-KR", "EUC-KR"},
-        {39, "ISO-2022-JP", "ISO-2022-JP"},
-        {109, "ISO-8859-13", "ISO-8859-13"},
-        {110, "ISO-8859-14", "ISO-8859-14"},
-        {111, "ISO-8859-15", "ISO-8859-15"},
-        {112, "ISO-8859-16", "ISO-8859-16"},
-        {113, "GBK", "GBK"},
-        {114, "GB18030", "GB18030"},
-        {1000, "ISO-10646-UCS-2", "UTF-16"},
-        {1013, "UTF-16BE", "UTF-16BE"},
-        {1014, "UTF-16LE", "UTF-16LE"},
-        {1015, "UTF-16", "UTF-16"},
-        {2025, "GB2312", "GB2312"},
-        {2026, "Big5", "Big5"},
-        {2084, "KOI8-R", "KOI8-R"},
-        {2088, "KOI8-U", "KOI8-U"},
-        {2250, "windows-1250", "windows-1250"},
-        {2251, "windows-1251", "windows-1251"},
-        {2252, "windows-1252", "windows-1252"},
-        {2253, "windows-1253", "windows-1253"},
-        {2254, "windows-1254", "windows-1254"},
-        {2255, "windows-1255", "windows-1255"},
-        {2256, "windows-1256", "windows-1256"},
-        {2257, "windows-1257", "windows-1257"},
-        {2258, "windows-1258", "windows-1258"},
-        {2259, "TIS-620", "TIS-620"},
-    };
+    private static final String UCS_2 = "ISO-10646-UCS-2";
+
+    /** The numbers and the names. Java has the same names, but none of UCS-2. */
+    private static final String[] ROWS =
+            ("3 US-ASCII 4 ISO-8859-1 5 ISO-8859-2 6 ISO-8859-3 7 ISO-8859-4 8 ISO-8859-5 "
+                            + "9 ISO-8859-6 10 ISO-8859-7 11 ISO-8859-8 12 ISO-8859-9 13 ISO-8859-10 "
+                            + "17 Shift_JIS 18 EUC-JP 38 EUC-KR 39 ISO-2022-JP 109 ISO-8859-13 "
+                            + "110 ISO-8859-14 111 ISO-8859-15 112 ISO-8859-16 113 GBK 114 GB18030 "
+                            + "1000 ISO-10646-UCS-2 1013 UTF-16BE 1014 UTF-16LE 1015 UTF-16 2025 GB2312 "
+                            + "2026 Big5 2084 KOI8-R 2088 KOI8-U 2250 windows-1250 2251 windows-1251 "
+                            + "2252 windows-1252 2253 windows-1253 2254 windows-1254 2255 windows-1255 "
+                            + "2256 windows-1256 2257 windows-1257 2258 windows-1258 2259 TIS-620")
+                    .split(" ");
 
     private final long number;
     private final String name;
@@ -88,16 +58,14 @@ final class CharacterSet {
         if (number == NOT_STATED) {
             return new CharacterSet(number, null, null, 1, true);
         }
-        for (Object[] row : ROWS) {
-            if ((Integer) row[0] == number) {
-                String java = (String) row[2];
-                boolean wide = java.startsWith("UTF-16");
-                return new CharacterSet(
-                        number,
-                        (String) row[1],
-                        charset(java),
-                        wide ? 2 : 1,
-                        !wide && !java.startsWith("ISO-2022"));
+        String digits = Long.toString(number);
+        for (int i = 0; i < ROWS.length; i += 2) {
+            if (ROWS[i].equals(digits)) {
+                String name = ROWS[i + 1];
+                String java = name.equals(UCS_2) ? "UTF-16" : name;
+                int unit = java.startsWith("UTF-16") ? 2 : 1;
+                boolean ascii = unit == 1 && !java.startsWith("ISO-2022");
+                return new CharacterSet(number, name, charset(java), unit, ascii);
             }
         }
         return new CharacterSet(number, null, StandardCharsets.ISO_8859_1, 1, true);
@@ -116,9 +84,9 @@ final class CharacterSet {
         if (name.equalsIgnoreCase(UTF_8.name)) {
             return UTF_8_NUMBER;
         }
-        for (Object[] row : ROWS) {
-            if (name.equalsIgnoreCase((String) row[1])) {
-                return (Integer) row[0];
+        for (int i = 0; i < ROWS.length; i += 2) {
+            if (name.equalsIgnoreCase(ROWS[i + 1])) {
+                return Integer.parseInt(ROWS[i]);
             }
         }
         return NOT_STATED;

@@ -35,25 +35,19 @@ public final class Characteristic extends Item {
         return type;
     }
 
-    /** {@return how the type is written: how; {@code null} without a type} */
+    /** {@return how the type is written; {@code null} without a type} */
     public Writing typeWriting() {
         return Writing.of(typeWriting);
     }
 
     /** {@return the parameters directly in it, in the order of the message; not modifiable} */
     public List<Parameter> parameters() {
-        List<Parameter> parameters = new ArrayList<>();
-        for (Item child : inside()) {
-            if (child instanceof Parameter) {
-                parameters.add((Parameter) child);
-            }
-        }
-        return Collections.unmodifiableList(parameters);
+        return children(Parameter.class, null);
     }
 
     /** {@return the characteristics directly in it, in the order of the message; not modifiable} */
     public List<Characteristic> characteristics() {
-        return in(this);
+        return children(Characteristic.class, null);
     }
 
     /**
@@ -62,7 +56,7 @@ public final class Characteristic extends Item {
      * @param type what TYPE is, in exactly this case
      */
     public List<Characteristic> characteristics(String type) {
-        return in(this, type);
+        return children(Characteristic.class, Objects.requireNonNull(type));
     }
 
     /**
@@ -95,35 +89,17 @@ public final class Characteristic extends Item {
      */
     public List<String> values(String name) {
         List<String> values = new ArrayList<>();
-        for (Item child : inside()) {
-            if (child instanceof Parameter) {
-                Parameter parameter = (Parameter) child;
-                if (parameter.value() != null && name.equals(parameter.name())) {
-                    values.add(parameter.value());
-                }
+        for (Parameter parameter : children(Parameter.class, Objects.requireNonNull(name))) {
+            if (parameter.value() != null) {
+                values.add(parameter.value());
             }
         }
         return Collections.unmodifiableList(values);
     }
 
-    static List<Characteristic> in(Item item) {
-        List<Characteristic> characteristics = new ArrayList<>();
-        for (Item child : item.inside()) {
-            if (child instanceof Characteristic) {
-                characteristics.add((Characteristic) child);
-            }
-        }
-        return Collections.unmodifiableList(characteristics);
-    }
-
-    static List<Characteristic> in(Item item, String type) {
-        List<Characteristic> characteristics = new ArrayList<>();
-        for (Item child : item.inside()) {
-            if (child instanceof Characteristic && type.equals(((Characteristic) child).type)) {
-                characteristics.add((Characteristic) child);
-            }
-        }
-        return Collections.unmodifiableList(characteristics);
+    @Override
+    String called() {
+        return type;
     }
 
     @Override

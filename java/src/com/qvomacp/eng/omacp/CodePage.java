@@ -13,6 +13,8 @@ final class CodePage {
     private final String[] begins = new String[FIRST_VALUE];
     private final String[] values = new String[0x100 - FIRST_VALUE];
 
+    private static final CodePage NONE = new CodePage();
+
     /** The pages that the format has. */
     private static final CodePage[] PAGES = {
         new CodePage()
@@ -23,89 +25,63 @@ final class CodePage {
                 .attribute(0x06, Attribute.VALUE)
                 .attribute(0x45, Attribute.VERSION)
                 .attribute(0x50, Attribute.TYPE)
-                .starts(
-                        Attribute.VERSION,
-                        0x46, "1.0")
-                .starts(
-                        Attribute.NAME,
-                        0x07, "NAME", 0x08, "NAP-ADDRESS", 0x09, "NAP-ADDRTYPE", 0x0A, "CALLTYPE",
-                        0x0B, "VALIDUNTIL", 0x0C, "AUTHTYPE", 0x0D, "AUTHNAME", 0x0E, "AUTHSECRET",
-                        0x0F, "LINGER", 0x10, "BEARER", 0x11, "NAPID", 0x12, "COUNTRY",
-                        0x13, "NETWORK", 0x14, "INTERNET", 0x15, "PROXY-ID",
-                        0x16, "PROXY-PROVIDER-ID", 0x17, "DOMAIN", 0x18, "PROVURL",
-                        0x19, "PXAUTH-TYPE", 0x1A, "PXAUTH-ID", 0x1B, "PXAUTH-PW",
-                        0x1C, "STARTPAGE", 0x1D, "BASAUTH-ID", 0x1E, "BASAUTH-PW",
-                        0x1F, "PUSHENABLED", 0x20, "PXADDR", 0x21, "PXADDRTYPE", 0x22, "TO-NAPID",
-                        0x23, "PORTNBR", 0x24, "SERVICE", 0x25, "LINKSPEED", 0x26, "DNLINKSPEED",
-                        0x27, "LOCAL-ADDR", 0x28, "LOCAL-ADDRTYPE", 0x29, "CONTEXT-ALLOW",
-                        0x2A, "TRUST", 0x2B, "MASTER", 0x2C, "SID", 0x2D, "SOC",
-                        0x2E, "WSP-VERSION", 0x2F, "PHYSICAL-PROXY-ID", 0x30, "CLIENT-ID",
-                        0x31, "DELIVERY-ERR-SDU", 0x32, "DELIVERY-ORDER", 0x33, "TRAFFIC-CLASS",
-                        0x34, "MAX-SDU-SIZE", 0x35, "MAX-BITRATE-UPLINK",
-                        0x36, "MAX-BITRATE-DNLINK", 0x37, "RESIDUAL-BER", 0x38, "SDU-ERROR-RATIO",
-                        0x39, "TRAFFIC-HANDL-PRIO", 0x3A, "TRANSFER-DELAY",
-                        0x3B, "GUARANTEED-BITRATE-UPLINK", 0x3C, "GUARANTEED-BITRATE-DNLINK",
-                        0x3D, "PXADDR-FQDN", 0x3E, "PROXY-PW", 0x3F, "PPGAUTH-TYPE",
-                        0x47, "PULLENABLED", 0x48, "DNS-ADDR", 0x49, "MAX-NUM-RETRY",
-                        0x4A, "FIRST-RETRY-TIMEOUT", 0x4B, "REREG-THRESHOLD", 0x4C, "T-BIT",
-                        0x4E, "AUTH-ENTITY", 0x4F, "SPI")
-                .starts(
-                        Attribute.TYPE,
-                        0x51, "PXLOGICAL", 0x52, "PXPHYSICAL", 0x53, "PORT", 0x54, "VALIDITY",
-                        0x55, "NAPDEF", 0x56, "BOOTSTRAP", 0x57, "VENDORCONFIG",
-                        0x58, "CLIENTIDENTITY", 0x59, "PXAUTHINFO", 0x5A, "NAPAUTHINFO",
-                        0x5B, "ACCESS", 0x5C, "BEARERINFO", 0x5D, "DNS-ADDRINFO")
+                .starts(Attribute.VERSION, "46 1.0")
+                .starts(Attribute.NAME,
+                        "07 NAME 08 NAP-ADDRESS 09 NAP-ADDRTYPE 0A CALLTYPE 0B VALIDUNTIL"
+                        + " 0C AUTHTYPE 0D AUTHNAME 0E AUTHSECRET 0F LINGER 10 BEARER 11 NAPID"
+                        + " 12 COUNTRY 13 NETWORK 14 INTERNET 15 PROXY-ID 16 PROXY-PROVIDER-ID"
+                        + " 17 DOMAIN 18 PROVURL 19 PXAUTH-TYPE 1A PXAUTH-ID 1B PXAUTH-PW"
+                        + " 1C STARTPAGE 1D BASAUTH-ID 1E BASAUTH-PW 1F PUSHENABLED 20 PXADDR"
+                        + " 21 PXADDRTYPE 22 TO-NAPID 23 PORTNBR 24 SERVICE 25 LINKSPEED"
+                        + " 26 DNLINKSPEED 27 LOCAL-ADDR 28 LOCAL-ADDRTYPE 29 CONTEXT-ALLOW 2A TRUST"
+                        + " 2B MASTER 2C SID 2D SOC 2E WSP-VERSION 2F PHYSICAL-PROXY-ID 30 CLIENT-ID"
+                        + " 31 DELIVERY-ERR-SDU 32 DELIVERY-ORDER 33 TRAFFIC-CLASS 34 MAX-SDU-SIZE"
+                        + " 35 MAX-BITRATE-UPLINK 36 MAX-BITRATE-DNLINK 37 RESIDUAL-BER"
+                        + " 38 SDU-ERROR-RATIO 39 TRAFFIC-HANDL-PRIO 3A TRANSFER-DELAY"
+                        + " 3B GUARANTEED-BITRATE-UPLINK 3C GUARANTEED-BITRATE-DNLINK 3D PXADDR-FQDN"
+                        + " 3E PROXY-PW 3F PPGAUTH-TYPE 47 PULLENABLED 48 DNS-ADDR 49 MAX-NUM-RETRY"
+                        + " 4A FIRST-RETRY-TIMEOUT 4B REREG-THRESHOLD 4C T-BIT 4E AUTH-ENTITY 4F SPI")
+                .starts(Attribute.TYPE,
+                        "51 PXLOGICAL 52 PXPHYSICAL 53 PORT 54 VALIDITY 55 NAPDEF 56 BOOTSTRAP"
+                        + " 57 VENDORCONFIG 58 CLIENTIDENTITY 59 PXAUTHINFO 5A NAPAUTHINFO 5B ACCESS"
+                        + " 5C BEARERINFO 5D DNS-ADDRINFO")
                 .values(
-                        0x85, "IPV4", 0x86, "IPV6", 0x87, "E164", 0x88, "ALPHA", 0x89, "APN",
-                        0x8A, "SCODE", 0x8B, "TETRA-ITSI", 0x8C, "MAN", 0x90, "ANALOG-MODEM",
-                        0x91, "V.120", 0x92, "V.110", 0x93, "X.31", 0x94, "BIT-TRANSPARENT",
-                        0x95, "DIRECT-ASYNCHRONOUS-DATA-SERVICE", 0x9A, "PAP", 0x9B, "CHAP",
-                        0x9C, "HTTP-BASIC", 0x9D, "HTTP-DIGEST", 0x9E, "WTLS-SS", 0x9F, "MD5",
-                        0xA2, "GSM-USSD", 0xA3, "GSM-SMS", 0xA4, "ANSI-136-GUTS",
-                        0xA5, "IS-95-CDMA-SMS", 0xA6, "IS-95-CDMA-CSD", 0xA7, "IS-95-CDMA-PACKET",
-                        0xA8, "ANSI-136-CSD", 0xA9, "ANSI-136-GPRS", 0xAA, "GSM-CSD",
-                        0xAB, "GSM-GPRS", 0xAC, "AMPS-CDPD", 0xAD, "PDC-CSD", 0xAE, "PDC-PACKET",
-                        0xAF, "IDEN-SMS", 0xB0, "IDEN-CSD", 0xB1, "IDEN-PACKET",
-                        0xB2, "FLEX/REFLEX", 0xB3, "PHS-SMS", 0xB4, "PHS-CSD", 0xB5, "TETRA-SDS",
-                        0xB6, "TETRA-PACKET", 0xB7, "ANSI-136-GHOST", 0xB8, "MOBITEX-MPAK",
-                        0xB9, "CDMA2000-1X-SIMPLE-IP", 0xBA, "CDMA2000-1X-MOBILE-IP",
-                        0xBB, "3G-GSM", 0xBC, "WLAN", 0xC5, "AUTOBAUDING", 0xCA, "CL-WSP",
-                        0xCB, "CO-WSP", 0xCC, "CL-SEC-WSP", 0xCD, "CO-SEC-WSP", 0xCE, "CL-SEC-WTA",
-                        0xCF, "CO-SEC-WTA", 0xD0, "OTA-HTTP-TO", 0xD1, "OTA-HTTP-TLS-TO",
-                        0xD2, "OTA-HTTP-PO", 0xD3, "OTA-HTTP-TLS-PO", 0xE0, "AAA", 0xE1, "HA"),
+                        "85 IPV4 86 IPV6 87 E164 88 ALPHA 89 APN 8A SCODE 8B TETRA-ITSI 8C MAN"
+                        + " 90 ANALOG-MODEM 91 V.120 92 V.110 93 X.31 94 BIT-TRANSPARENT"
+                        + " 95 DIRECT-ASYNCHRONOUS-DATA-SERVICE 9A PAP 9B CHAP 9C HTTP-BASIC"
+                        + " 9D HTTP-DIGEST 9E WTLS-SS 9F MD5 A2 GSM-USSD A3 GSM-SMS A4 ANSI-136-GUTS"
+                        + " A5 IS-95-CDMA-SMS A6 IS-95-CDMA-CSD A7 IS-95-CDMA-PACKET A8 ANSI-136-CSD"
+                        + " A9 ANSI-136-GPRS AA GSM-CSD AB GSM-GPRS AC AMPS-CDPD AD PDC-CSD"
+                        + " AE PDC-PACKET AF IDEN-SMS B0 IDEN-CSD B1 IDEN-PACKET B2 FLEX/REFLEX"
+                        + " B3 PHS-SMS B4 PHS-CSD B5 TETRA-SDS B6 TETRA-PACKET B7 ANSI-136-GHOST"
+                        + " B8 MOBITEX-MPAK B9 CDMA2000-1X-SIMPLE-IP BA CDMA2000-1X-MOBILE-IP"
+                        + " BB 3G-GSM BC WLAN C5 AUTOBAUDING CA CL-WSP CB CO-WSP CC CL-SEC-WSP"
+                        + " CD CO-SEC-WSP CE CL-SEC-WTA CF CO-SEC-WTA D0 OTA-HTTP-TO"
+                        + " D1 OTA-HTTP-TLS-TO D2 OTA-HTTP-PO D3 OTA-HTTP-TLS-PO E0 AAA E1 HA"),
         new CodePage()
                 .element(0x06, Element.CHARACTERISTIC)
                 .element(0x07, Element.PARM)
                 .attribute(0x05, Attribute.NAME)
                 .attribute(0x06, Attribute.VALUE)
                 .attribute(0x50, Attribute.TYPE)
-                .starts(
-                        Attribute.NAME,
-                        0x07, "NAME", 0x14, "INTERNET", 0x1C, "STARTPAGE", 0x22, "TO-NAPID",
-                        0x23, "PORTNBR", 0x24, "SERVICE", 0x2E, "AACCEPT", 0x2F, "AAUTHDATA",
-                        0x30, "AAUTHLEVEL", 0x31, "AAUTHNAME", 0x32, "AAUTHSECRET",
-                        0x33, "AAUTHTYPE", 0x34, "ADDR", 0x35, "ADDRTYPE", 0x36, "APPID",
-                        0x37, "APROTOCOL", 0x38, "PROVIDER-ID", 0x39, "TO-PROXY", 0x3A, "URI",
-                        0x3B, "RULE", 0x3C, "APPREF", 0x3D, "TO-APPREF", 0x3E, "PRI-SSID",
-                        0x3F, "PRI-U-SSID", 0x40, "PRI-H-SSID", 0x41, "S-SSID", 0x42, "S-U-SSID",
-                        0x43, "NETMODE", 0x44, "SECMODE", 0x45, "EAPTYPE", 0x46, "USERNAME",
-                        0x47, "PASSWORD", 0x48, "REALM", 0x49, "USE-PSEUD", 0x4C, "VER-SER-REALM",
-                        0x4D, "CLIENT-AUTH", 0x4E, "SES-VAL-TIME", 0x4F, "CIP-SUIT",
-                        0x60, "PEAP-V0", 0x61, "PEAP-V1", 0x62, "PEAP-V2", 0x63, "ISS-NAME",
-                        0x64, "SUB-NAME", 0x65, "CERT-TYPE", 0x66, "SER-NUM", 0x67, "SUB-KEY-ID",
-                        0x68, "THUMBPRINT", 0x69, "WPA-PRES-KEY-ASC", 0x6A, "WPA-PRES-KEY-HEX",
-                        0x6B, "WEPKEYIND", 0x6C, "WEPAUTHMODE", 0x6D, "LENGTH", 0x6E, "INDEX",
-                        0x6F, "DATA", 0x70, "WLANHAND", 0x71, "EDIT-SET", 0x72, "VIEW-SET",
-                        0x73, "FORW-SET")
-                .starts(
-                        Attribute.TYPE,
-                        0x53, "PORT", 0x55, "APPLICATION", 0x56, "APPADDR", 0x57, "APPAUTH",
-                        0x58, "CLIENTIDENTITY", 0x59, "RESOURCE", 0x5A, "WLAN", 0x5B, "SEC-SSID",
-                        0x5C, "EAP", 0x5D, "CERT", 0x5E, "WEPKEY")
+                .starts(Attribute.NAME,
+                        "07 NAME 14 INTERNET 1C STARTPAGE 22 TO-NAPID 23 PORTNBR 24 SERVICE"
+                        + " 2E AACCEPT 2F AAUTHDATA 30 AAUTHLEVEL 31 AAUTHNAME 32 AAUTHSECRET"
+                        + " 33 AAUTHTYPE 34 ADDR 35 ADDRTYPE 36 APPID 37 APROTOCOL 38 PROVIDER-ID"
+                        + " 39 TO-PROXY 3A URI 3B RULE 3C APPREF 3D TO-APPREF 3E PRI-SSID"
+                        + " 3F PRI-U-SSID 40 PRI-H-SSID 41 S-SSID 42 S-U-SSID 43 NETMODE 44 SECMODE"
+                        + " 45 EAPTYPE 46 USERNAME 47 PASSWORD 48 REALM 49 USE-PSEUD"
+                        + " 4C VER-SER-REALM 4D CLIENT-AUTH 4E SES-VAL-TIME 4F CIP-SUIT 60 PEAP-V0"
+                        + " 61 PEAP-V1 62 PEAP-V2 63 ISS-NAME 64 SUB-NAME 65 CERT-TYPE 66 SER-NUM"
+                        + " 67 SUB-KEY-ID 68 THUMBPRINT 69 WPA-PRES-KEY-ASC 6A WPA-PRES-KEY-HEX"
+                        + " 6B WEPKEYIND 6C WEPAUTHMODE 6D LENGTH 6E INDEX 6F DATA 70 WLANHAND"
+                        + " 71 EDIT-SET 72 VIEW-SET 73 FORW-SET")
+                .starts(Attribute.TYPE,
+                        "53 PORT 55 APPLICATION 56 APPADDR 57 APPAUTH 58 CLIENTIDENTITY"
+                        + " 59 RESOURCE 5A WLAN 5B SEC-SSID 5C EAP 5D CERT 5E WEPKEY")
                 .values(
-                        0x80, ",", 0x81, "HTTP-", 0x82, "BASIC", 0x83, "DIGEST", 0x86, "IPV6",
-                        0x87, "E164", 0x88, "ALPHA", 0x8D, "APPSRV", 0x8E, "OBEX", 0x90, ",",
-                        0x91, "HTTP-", 0x92, "BASIC", 0x93, "DIGEST")
+                        "80 , 81 HTTP- 82 BASIC 83 DIGEST 86 IPV6 87 E164 88 ALPHA 8D APPSRV"
+                        + " 8E OBEX 90 , 91 HTTP- 92 BASIC 93 DIGEST")
     };
 
     private CodePage() {}
@@ -120,17 +96,22 @@ final class CodePage {
         return this;
     }
 
-    private CodePage starts(Attribute attribute, Object... rows) {
-        for (int i = 0; i < rows.length; i += 2) {
-            put(attributes, (Integer) rows[i], attribute);
-            put(begins, (Integer) rows[i], (String) rows[i + 1]);
+    /** Rows of a token in hexadecimal and what the value of its attribute begins with. */
+    private CodePage starts(Attribute attribute, String rows) {
+        String[] words = rows.split(" ");
+        for (int i = 0; i < words.length; i += 2) {
+            int token = Integer.parseInt(words[i], 16);
+            put(attributes, token, attribute);
+            put(begins, token, words[i + 1]);
         }
         return this;
     }
 
-    private CodePage values(Object... rows) {
-        for (int i = 0; i < rows.length; i += 2) {
-            put(values, (Integer) rows[i] - FIRST_VALUE, (String) rows[i + 1]);
+    /** Rows of a token in hexadecimal and the part of a value for which it stands. */
+    private CodePage values(String rows) {
+        String[] words = rows.split(" ");
+        for (int i = 0; i < words.length; i += 2) {
+            put(values, Integer.parseInt(words[i], 16) - FIRST_VALUE, words[i + 1]);
         }
         return this;
     }
@@ -142,9 +123,9 @@ final class CodePage {
         table[place] = entry;
     }
 
-    /** A page, or {@code null} for one that the format does not have. */
+    /** A page; an empty one for a number that the format does not have. */
     static CodePage of(int page) {
-        return page < PAGES.length ? PAGES[page] : null;
+        return page < PAGES.length ? PAGES[page] : NONE;
     }
 
     /** What a token without its bits for attributes and content stands for, or {@code null}. */

@@ -46,8 +46,8 @@ public final class ContentType {
     }
 
     /**
-     * {@return the number that WSP assigns to the media type: the number, such as 54; -1 when the
-     * media type is given as text and has none}
+     * {@return the number that WSP assigns to the media type, such as 54; -1 for a text that has
+     * none}
      */
     public int code() {
         return code;

@@ -1,16 +1,15 @@
 package com.qvomacp.eng.omacp;
 
-import java.util.Arrays;
+import java.util.ArrayDeque;
+import java.util.Deque;
 import java.util.Locale;
 
 /** Tells a {@link ByteVisitor} what each byte of a body means. Nothing of it is kept. */
 final class Describer implements Reading {
     private final ByteVisitor visitor;
 
-    /** The names of the elements that have not ended, of the outermost first. */
-    private String[] open = new String[16];
-
-    private int depth;
+    /** The names of the elements that have not ended, of the innermost first. */
+    private final Deque<String> open = new ArrayDeque<>();
 
     Describer(ByteVisitor visitor) {
         this.visitor = visitor;
@@ -39,10 +38,7 @@ final class Describer implements Reading {
     public void element(int from, int to, Element element, String name, boolean attributes) {
         String called = element == Element.INSTRUCTION ? "instruction" : name;
         visit(from, to, called);
-        if (depth == open.length) {
-            open = Arrays.copyOf(open, 2 * depth);
-        }
-        open[depth++] = called;
+        open.push(called);
     }
 
     @Override
@@ -63,10 +59,7 @@ final class Describer implements Reading {
 
     @Override
     public void end(int from, int to) {
-        --depth;
-        if (to > from) {
-            visit(from, to, "END of " + open[depth]);
-        }
+        visit(from, to, "END of " + open.pop());
     }
 
     @Override
@@ -86,7 +79,7 @@ final class Describer implements Reading {
 
     private void visit(int from, int to, String meaning) {
         if (to > from) {
-            visitor.visit(from, to - from, depth, meaning);
+            visitor.visit(from, to - from, open.size(), meaning);
         }
     }
 }

@@ -36,7 +36,6 @@ public final class Deviation {
         BAD_TEXT("the text holds bytes that its character set has no character for"),
         NUMBER("the number is larger than 32 bits"),
         REFERENCE("the reference leads out of the string table"),
-        OPEN_TABLE_TEXT("the text in the string table has no end"),
         CUT_OFF("the body ends within this"),
         END_MISSING("the body ends without the END of the element"),
         TRAILING("these bytes stand behind the end of the document");
@@ -68,6 +67,11 @@ public final class Deviation {
         return kind;
     }
 
+    /** The item that it is in. */
+    Item item() {
+        return item;
+    }
+
     /** {@return where it is: bytes from the start of the body, counted from 0} */
     public int offset() {
         return offset;
@@ -79,7 +83,7 @@ public final class Deviation {
      * element, counted from 1; never {@code null}}
      */
     public String path() {
-        return ItemPath.of(item);
+        return item.path();
     }
 
     /** {@return what it is: a sentence without a full stop, without any value of the message} */

@@ -18,10 +18,10 @@ final class DocumentSource {
             open.add(new Level("wap-provisioningdoc"));
         }
 
-        /** A characteristic begins. */
+        /** A characteristic begins; the type is null for none, as may be in XML that is looked at. */
         abstract void characteristic(String type) throws EncodingException;
 
-        /** A parameter; the value is null for none. */
+        /** A parameter; the value is null for none, and the name where a type may be. */
         abstract void parameter(String name, String value) throws EncodingException;
 
         /** The characteristic that began last, of those that have not ended, ends. */
@@ -49,7 +49,7 @@ final class DocumentSource {
 
         private void begin(String type) {
             Level outer = open.get(open.size() - 1);
-            Level inner = new Level(type);
+            Level inner = new Level(type == null ? Element.CHARACTERISTIC.text : type);
             Integer before = outer.counts.get(type);
             inner.ordinal = before == null ? 1 : before + 1;
             outer.counts.put(type, inner.ordinal);
@@ -90,6 +90,9 @@ final class DocumentSource {
 
     /** A type for each characteristic, name and value for each parameter. */
     private final List<String> texts = new ArrayList<>();
+
+    /** Line and column of each tag that begins, that of the document first; empty without XML. */
+    final List<int[]> places = new ArrayList<>();
 
     DocumentSource(String version) {
         this.version = version;

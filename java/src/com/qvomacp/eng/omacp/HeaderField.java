@@ -25,9 +25,8 @@ public final class HeaderField {
     }
 
     /**
-     * {@return the name: the name, such as {@code charset}, as the standard writes it when it is
-     * sent as a number, as the message writes it when it is sent as text; a printable one for a
-     * number that stands for none}
+     * {@return the name, such as {@code charset}, as the standard writes it when it is sent as a
+     * number, and as the message does when it is sent as text; a printable one for any other number}
      */
     public String name() {
         return name;
@@ -36,7 +35,7 @@ public final class HeaderField {
     /**
      * {@return the value: a number in decimal digits or by the name that it stands for, a date in
      * UTC as ISO 8601 writes it, a text without the quotes of its form, and anything else in
-     * hexadecimal digits: the value as text; {@code null} when there is none}
+     * hexadecimal digits; {@code null} when there is none}
      */
     public String value() {
         return value;

@@ -1,5 +1,6 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.ArrayList;
 import java.util.Arrays;
 import java.util.Collections;
 import java.util.List;
@@ -17,6 +18,7 @@ import java.util.List;
  */
 public abstract class Item {
     static final Item[] NONE = {};
+    private static final int LONGEST_PATH = 8;
 
     private final int offset;
     private final int end;
@@ -53,6 +55,20 @@ public abstract class Item {
         return Collections.unmodifiableList(Arrays.asList(children));
     }
 
+    /** Those of a kind that stand in the item: all of them, or those of a type or name. */
+    final <T extends Item> List<T> children(Class<T> kind, String called) {
+        List<T> found = new ArrayList<>();
+        for (Item child : children) {
+            if (kind.isInstance(child) && (called == null || called.equals(child.called()))) {
+                found.add(kind.cast(child));
+            }
+        }
+        return Collections.unmodifiableList(found);
+    }
+
+    /** Its type or name; {@code null} for none. */
+    abstract String called();
+
     /** What stands in the item, not to be changed. */
     final Item[] inside() {
         return children;
@@ -61,6 +77,22 @@ public abstract class Item {
     /** The item that this one stands in; {@code null} for the document element. */
     final Item parent() {
         return parent;
+    }
+
+    /** The path, such as {@code wap-provisioningdoc / NAPDEF 1 / BEARER}; the innermost eight. */
+    final String path() {
+        Item[] told = new Item[LONGEST_PATH];
+        int first = LONGEST_PATH;
+        Item outer = this;
+        for (; outer != null && first > 0; outer = outer.parent) {
+            told[--first] = outer;
+        }
+        StringBuilder path = new StringBuilder(outer == null ? "" : "...");
+        for (int i = first; i < LONGEST_PATH; ++i) {
+            path.append(path.length() == 0 ? "" : " / ");
+            told[i].step(path);
+        }
+        return path.toString();
     }
 
     /** Adds what the item is called in a path. */

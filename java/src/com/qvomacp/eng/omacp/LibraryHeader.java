@@ -42,10 +42,6 @@ final class LibraryHeader {
         this.refusal = refusal;
     }
 
-    boolean isTaken() {
-        return refusal == null;
-    }
-
     /** Reads the header of a push. */
     static LibraryHeader of(byte[] push) {
         Refusal refusal = refusal(push);
@@ -83,7 +79,7 @@ final class LibraryHeader {
     private static int behindContentType(byte[] push, int at) {
         for (String type : MEDIA_TYPES) {
             int end = at + type.length();
-            if (end < push.length && push[end] == 0 && isText(push, at, type)) {
+            if (end < push.length && push[end] == 0 && text(push, at, type.length()).equals(type)) {
                 return end + 1;
             }
         }
@@ -98,15 +94,6 @@ final class LibraryHeader {
             }
         }
         return false;
-    }
-
-    private static boolean isText(byte[] push, int at, String text) {
-        for (int i = 0; i < text.length(); ++i) {
-            if (push[at + i] != text.charAt(i)) {
-                return false;
-            }
-        }
-        return true;
     }
 
     private static Refusal unknownContentType(byte[] push, int at) {
@@ -158,18 +145,15 @@ final class LibraryHeader {
             return at + 1;
         }
         int behind = NAME_LENGTH + 1;
-        boolean isNamed =
-                left > behind
-                        && new String(push, at, NAME_LENGTH, StandardCharsets.US_ASCII)
-                                .equalsIgnoreCase(name);
+        boolean isNamed = left > behind && text(push, at, NAME_LENGTH).equalsIgnoreCase(name);
         return isNamed ? at + behind : -1;
     }
 
+    private static String text(byte[] push, int at, int length) {
+        return new String(push, at, length, StandardCharsets.ISO_8859_1);
+    }
+
     private static int endOfText(byte[] push, int at) {
-        int end = at;
-        while (end < push.length && push[end] != 0) {
-            ++end;
-        }
-        return end;
+        return CharacterSet.UTF_8.zero(push, at, push.length);
     }
 }

@@ -193,6 +193,19 @@ enum LibraryKind {
         return names;
     }
 
+    /** For people: the names that are known. */
+    List<String> expectedNames() {
+        List<String> expected = new ArrayList<>();
+        if (names == null) {
+            expected.add("a name");
+        } else {
+            for (String name : names) {
+                expected.add("NAME=\"" + name + '"');
+            }
+        }
+        return expected;
+    }
+
     /** For people: the parameters, with their tokens. */
     List<String> expectedParms() {
         List<String> expected = new ArrayList<>();

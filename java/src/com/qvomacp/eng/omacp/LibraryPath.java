@@ -34,7 +34,7 @@ final class LibraryPath extends LibraryTrace {
 
     /** Counts a characteristic that stands in front of one of those around, of the same type. */
     @Override
-    void characteristic(LibraryWalk walk, int depth, int start, LibraryKind kind) {
+    void type(LibraryWalk walk, int depth, int start, LibraryKind kind) {
         if (depth < numbers.length
                 && start < ended.starts[depth]
                 && (depth == 0 || start > ended.starts[depth - 1])

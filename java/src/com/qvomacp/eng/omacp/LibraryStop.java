@@ -6,15 +6,6 @@ import java.util.List;
 
 /** Ends the walk over a body that the native library refuses. */
 final class LibraryStop extends Exception {
-    /** The library's result codes. */
-    static final int FAILED = 1;
-
-    static final int BAD_ARGUMENT = 2;
-    static final int UNKNOWN_ELEMENT = 4101;
-    static final int NO_DATA = 4103;
-    static final int WRONG_DOCUMENT_TYPE = 4107;
-    static final int NO_MEMORY = 4111;
-
     static final String SWITCH_PAGE = "SWITCH_PAGE (0x00)";
     static final String END = "END (0x01)";
     static final String STR_I = "STR_I (0x03)";
@@ -30,10 +21,46 @@ final class LibraryStop extends Exception {
     private static final String IN_A_VALUE = "within a value";
     private static final String NOT_IN_STRING = "cannot stand in a value that begins with a string";
 
+    /** The library's result codes. */
+    enum Result {
+        OK(0, "QVS_OK"),
+        FAILED(1, "QVS_ERROR_FAILED"),
+        BAD_ARGUMENT(2, "QVS_ERROR_BAD_ARGUMENT"),
+        UNKNOWN_ELEMENT(4101, "QVS_ERROR_WBXML_UNKNOWN_ELEMENT"),
+        NO_DATA(4103, "QVS_ERROR_WBXML_NO_DATA"),
+        DOCUMENT_TYPE(4107, "QVS_ERROR_WBXML_DOCUMENT_TYPE"),
+        NO_MEMORY(4111, "QVS_ERROR_NO_MEMORY");
+
+        final int code;
+        final String codeName;
+
+        Result(int code, String codeName) {
+            this.code = code;
+            this.codeName = codeName;
+        }
+    }
+
     /** Why the walk ends. */
     enum Cause {
-        EMPTY_BODY, DOCUMENT_TYPE, ENDED, MISPLACED, NO_SUCH_PAGE, NO_SUCH_STRING, OPAQUE_TOO_LONG,
-        OPAQUE_WITHOUT_LENGTH, EMPTY_NAME, UNKNOWN_NAME, TOO_MUCH_TEXT
+        EMPTY_BODY(Result.BAD_ARGUMENT),
+        DOCUMENT_TYPE(Result.DOCUMENT_TYPE),
+        ENDED(Result.NO_DATA),
+        ENDED_IN_SWITCH(Result.UNKNOWN_ELEMENT),
+        MISPLACED(Result.UNKNOWN_ELEMENT),
+        MISPLACED_IN_VALUE(Result.NO_DATA),
+        NO_SUCH_PAGE(Result.UNKNOWN_ELEMENT),
+        NO_SUCH_STRING(Result.NO_DATA),
+        OPAQUE_TOO_LONG(Result.NO_DATA),
+        OPAQUE_WITHOUT_LENGTH(Result.NO_DATA),
+        EMPTY_NAME(Result.FAILED),
+        UNKNOWN_NAME(Result.UNKNOWN_ELEMENT),
+        TOO_MUCH_TEXT(Result.NO_MEMORY);
+
+        final Result result;
+
+        Cause(Result result) {
+            this.result = result;
+        }
     }
 
     /** Where in the grammar it ends, which says what would have been taken. */
@@ -82,18 +109,14 @@ final class LibraryStop extends Exception {
 
     private static final long serialVersionUID = 1L;
 
-    /** The library's result code. */
-    final int code;
-
     final transient Cause cause;
     final transient Place place;
 
     /** Where that begins which is refused. */
     final int offset;
 
-    LibraryStop(int code, Cause cause, Place place, int offset) {
+    LibraryStop(Cause cause, Place place, int offset) {
         super(cause.name(), null, false, false);
-        this.code = code;
         this.cause = cause;
         this.place = place;
         this.offset = offset;

@@ -93,8 +93,11 @@ abstract class LibraryText {
     int skippedStart;
     int skippedEnd;
 
-    LibraryText(byte[] data) {
+    final LibraryTrace trace;
+
+    LibraryText(byte[] data, LibraryTrace trace) {
         this.data = data;
+        this.trace = trace;
         this.size = data.length;
         this.textLimit = Math.max(TEXT_ALWAYS, TEXT_PER_BYTE * size);
     }
@@ -111,14 +114,12 @@ abstract class LibraryText {
     // ---- Stops
 
     static LibraryStop misplaced(Place place, int offset) {
-        return new LibraryStop(LibraryStop.UNKNOWN_ELEMENT, Cause.MISPLACED, place, offset);
+        return new LibraryStop(Cause.MISPLACED, place, offset);
     }
 
     /** A text that could not be read, or be kept. */
     private LibraryStop unreadable(Cause cause, Place place, int offset) {
-        return limited
-                ? new LibraryStop(LibraryStop.NO_MEMORY, Cause.TOO_MUCH_TEXT, place, offset)
-                : new LibraryStop(LibraryStop.NO_DATA, cause, place, offset);
+        return new LibraryStop(limited ? Cause.TOO_MUCH_TEXT : cause, place, offset);
     }
 
     final void checkLimit(Place place, int offset) throws LibraryStop {
@@ -131,7 +132,7 @@ abstract class LibraryText {
 
     final int peek(Place place) throws LibraryStop {
         if (at >= size) {
-            throw new LibraryStop(LibraryStop.NO_DATA, Cause.ENDED, place, size);
+            throw new LibraryStop(Cause.ENDED, place, size);
         }
         return data[at] & 0xFF;
     }
@@ -200,6 +201,7 @@ abstract class LibraryText {
         skipped = what;
         skippedStart = start;
         skippedEnd = at;
+        trace.skipped(what, start, at);
     }
 
     // ---- Texts
@@ -319,7 +321,7 @@ abstract class LibraryText {
             } else if (token == STR_T) {
                 tableReference(start);
             } else if (!joinToken(token)) {
-                throw unreadable(Cause.MISPLACED, Place.IN_VALUE, start);
+                throw unreadable(Cause.MISPLACED_IN_VALUE, Place.IN_VALUE, start);
             }
             if (at >= size) {
                 throw unreadable(Cause.ENDED, Place.IN_VALUE, size);
@@ -419,7 +421,9 @@ abstract class LibraryText {
         int start = at;
         newText();
         inlineString(place, start);
-        if (data[start] != STR_I) {
+        if (data[start] == STR_I) {
+            trace.skipped("as a text", start, at);
+        } else {
             skipped("all up to a zero byte, as one text", start);
         }
     }

@@ -1,21 +1,15 @@
 package com.qvomacp.eng.omacp;
 
-/** Hears of the elements that a {@link LibraryWalk} reads, in the order of the body. */
+/** Hears what a {@link LibraryWalk} reads, in the order of the body. */
 class LibraryTrace {
     /** Hears nothing. */
     static final LibraryTrace NONE = new LibraryTrace();
 
-    /**
-     * The attributes of a characteristic have been read.
-     *
-     * @param depth how many characteristics it stands in
-     * @param start where it begins
-     * @param kind null when its type is none that the library knows
-     */
-    void characteristic(LibraryWalk walk, int depth, int start, LibraryKind kind) {}
+    /** A characteristic or a parm begins. */
+    void begin(int start, boolean isParm) {}
 
-    /** A parm begins. */
-    void parm(int start) {}
+    /** The type of the characteristic that began last, {@code depth} others around it, was read. */
+    void type(LibraryWalk walk, int depth, int start, LibraryKind kind) {}
 
     /** The name of a parameter has been read. */
     void name(LibraryWalk walk) {}
@@ -25,4 +19,7 @@ class LibraryTrace {
 
     /** The innermost characteristic or parm is over. */
     void end(int end) {}
+
+    /** Some bytes have been read to no effect. */
+    void skipped(String what, int start, int end) {}
 }

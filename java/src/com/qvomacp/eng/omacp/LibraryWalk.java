@@ -30,13 +30,14 @@ final class LibraryWalk extends LibraryText {
 
     private static final byte[] COMMA = {','};
 
-    private final LibraryTrace trace;
-
     /** Whether there is a list of characteristics, be it empty, which a document needs. */
     boolean hasList;
 
     /** 0 also when it could not be read. */
     long publicId;
+
+    /** Where the length of the string table begins; 0 when the header was not read that far. */
+    int tableLengthAt;
 
     /** Where the elements begin; 0 as long as the header is read. */
     int elementsAt;
@@ -60,14 +61,13 @@ final class LibraryWalk extends LibraryText {
     private long continuedLength;
 
     LibraryWalk(byte[] data, LibraryTrace trace) {
-        super(data);
-        this.trace = trace;
+        super(data, trace);
     }
 
     /** Walks over the body. */
     void run() throws LibraryStop {
         if (size == 0) {
-            throw new LibraryStop(LibraryStop.BAD_ARGUMENT, Cause.EMPTY_BODY, Place.DOCUMENT, 0);
+            throw new LibraryStop(Cause.EMPTY_BODY, Place.DOCUMENT, 0);
         }
         header();
         elementsAt = at;
@@ -98,12 +98,15 @@ final class LibraryWalk extends LibraryText {
         ++at;
         unreadItem = unreadHeaderItem();
         if (publicId != PROVISIONING && (publicId != 0 || !isTypeInTable())) {
-            throw new LibraryStop(
-                    LibraryStop.WRONG_DOCUMENT_TYPE,
-                    Cause.DOCUMENT_TYPE,
-                    Place.DOCUMENT,
-                    Math.min(1, size));
+            boolean isEnd = unreadItem != null && at >= size;
+            int offset = isEnd ? size : isTypeText() ? tableAt : 1;
+            throw new LibraryStop(Cause.DOCUMENT_TYPE, Place.DOCUMENT, offset);
         }
+    }
+
+    /** Whether the type has to be the text that the string table begins with. */
+    boolean isTypeText() {
+        return publicId == 0 && unreadItem == null;
     }
 
     /** Reads the header behind the version, up to the item that cannot be read. */
@@ -119,6 +122,7 @@ final class LibraryWalk extends LibraryText {
         if (integer() < 0) {
             return "character set";
         }
+        tableLengthAt = at;
         tableLength = integer();
         if (tableLength < 0 || tableLength > LONGEST_TABLE) {
             return "string table's length";
@@ -248,9 +252,10 @@ final class LibraryWalk extends LibraryText {
     private boolean enter() throws LibraryStop {
         int start = at;
         int tag = element(TAG_CHARACTERISTIC, Place.NEXT_CHARACTERISTIC);
+        trace.begin(start, false);
         if ((tag & HAS_CONTENT) == 0) {
             nameLength = -1;
-            trace.characteristic(this, depth, start, null);
+            trace.type(this, depth, start, null);
             trace.end(at);
             return false;
         }
@@ -266,7 +271,7 @@ final class LibraryWalk extends LibraryText {
         isTyped = true;
         kinds[depth - 1] = kind;
         continuedLength = -1;
-        trace.characteristic(this, depth - 1, start, kind);
+        trace.type(this, depth - 1, start, kind);
         return true;
     }
 
@@ -284,8 +289,8 @@ final class LibraryWalk extends LibraryText {
                 nameLength = -1;
                 int start = at;
                 if (!switchPage()) {
-                    Cause cause = isSwitchWhole ? Cause.NO_SUCH_PAGE : Cause.ENDED;
-                    throw new LibraryStop(LibraryStop.UNKNOWN_ELEMENT, cause, Place.TYPE, start);
+                    Cause cause = isSwitchWhole ? Cause.NO_SUCH_PAGE : Cause.ENDED_IN_SWITCH;
+                    throw new LibraryStop(cause, Place.TYPE, start);
                 }
             } else if (token == LibraryKind.TYPE_AS_TEXT) {
                 ++at;
@@ -330,7 +335,7 @@ final class LibraryWalk extends LibraryText {
         inParm = true;
         parmToken = -1;
         element(TAG_PARM, Place.IN_CHARACTERISTIC);
-        trace.parm(start);
+        trace.begin(start, true);
         for (; ; ) {
             int token = peek(Place.PARM);
             while (token == SWITCH_PAGE) {
@@ -474,13 +479,12 @@ final class LibraryWalk extends LibraryText {
         parmToken = NAME_AS_TEXT;
         readName();
         if (nameLength <= 0 && !kind.takesEmptyName()) {
-            throw new LibraryStop(LibraryStop.FAILED, Cause.EMPTY_NAME, Place.PARM, start);
+            throw new LibraryStop(Cause.EMPTY_NAME, Place.PARM, start);
         }
         trace.name(this);
         if (peek(Place.BEHIND_NAME) == VALUE) {
             if (!kind.takesName(name, keptLength())) {
-                throw new LibraryStop(
-                        LibraryStop.UNKNOWN_ELEMENT, Cause.UNKNOWN_NAME, Place.PARM, at);
+                throw new LibraryStop(Cause.UNKNOWN_NAME, Place.PARM, at);
             }
             newText();
             value();

@@ -52,7 +52,7 @@ public final class Other extends Item {
         this.textWriting = Writing.code(textWriting);
     }
 
-    /** {@return what it is: the kind, never {@code null}} */
+    /** {@return what it is; never {@code null}} */
     public Kind kind() {
         return Kind.ALL[kind];
     }
@@ -70,9 +70,14 @@ public final class Other extends Item {
         return text;
     }
 
-    /** {@return how the text is written: how; {@code null} without a text} */
+    /** {@return how the text is written; {@code null} without a text} */
     public Writing textWriting() {
         return Writing.of(textWriting);
+    }
+
+    @Override
+    String called() {
+        return name;
     }
 
     @Override

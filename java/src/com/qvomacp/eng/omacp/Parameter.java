@@ -43,14 +43,19 @@ public final class Parameter extends Item {
         return value;
     }
 
-    /** {@return how the name is written: how; {@code null} without a name} */
+    /** {@return how the name is written; {@code null} without a name} */
     public Writing nameWriting() {
         return Writing.of(nameWriting);
     }
 
-    /** {@return how the value is written: how; {@code null} without a value} */
+    /** {@return how the value is written; {@code null} without a value} */
     public Writing valueWriting() {
         return Writing.of(valueWriting);
+    }
+
+    @Override
+    String called() {
+        return name;
     }
 
     @Override

@@ -15,15 +15,7 @@ final class Printable {
 
     /** Adds the text to a line, with control characters written as U+0000, and cut when it is long. */
     static void append(StringBuilder line, String text) {
-        append(line, text, LONGEST);
-    }
-
-    static String quoted(String text) {
-        return '"' + of(text) + '"';
-    }
-
-    private static void append(StringBuilder line, String text, int longest) {
-        int end = Math.min(text.length(), longest);
+        int end = Math.min(text.length(), LONGEST);
         for (int i = 0; i < end; ++i) {
             char c = text.charAt(i);
             if (isShown(c)) {
@@ -38,6 +30,10 @@ final class Printable {
         if (end < text.length()) {
             line.append("...");
         }
+    }
+
+    static String quoted(String text) {
+        return '"' + of(text) + '"';
     }
 
     /** Whether a character shows itself, and neither breaks a line nor changes its direction. */

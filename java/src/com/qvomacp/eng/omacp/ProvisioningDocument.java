@@ -112,7 +112,7 @@ public final class ProvisioningDocument {
 
     /** {@return the characteristics directly in the document element; as {@link #children}} */
     public List<Characteristic> characteristics() {
-        return Characteristic.in(root);
+        return root.children(Characteristic.class, null);
     }
 
     /**
@@ -120,7 +120,7 @@ public final class ProvisioningDocument {
      * @param type what TYPE is, in exactly this case
      */
     public List<Characteristic> characteristics(String type) {
-        return Characteristic.in(root, type);
+        return root.children(Characteristic.class, Objects.requireNonNull(type));
     }
 
     /**
@@ -136,7 +136,7 @@ public final class ProvisioningDocument {
      * @param item an item of this document
      */
     public String path(Item item) {
-        return ItemPath.of(item);
+        return item.path();
     }
 
     /** {@return where the body departs from the format, in its order; not modifiable} */
@@ -153,7 +153,16 @@ public final class ProvisioningDocument {
 
     /** {@return whether the native library takes the body, worked out at each call} */
     public Verdict verdict() {
-        return LibraryRules.verdictOnBody(body, this);
+        return Verdict.onBody(body, this);
+    }
+
+    /**
+     * Looks for what is wrong with the document, worked out at each call.
+     *
+     * @return what each {@link Rule} finds, in the order of the body; not modifiable
+     */
+    public List<Finding> lint() {
+        return Linter.lint(null, this, verdict());
     }
 
     /**
@@ -168,9 +177,31 @@ public final class ProvisioningDocument {
         read(describer);
     }
 
+    /**
+     * Tells what each byte of a body means, as {@link #describe(ByteVisitor)}, as far as it can be
+     * read. Nothing is kept of a document that is too much for {@link #parse}.
+     *
+     * @param body a WBXML body, not to be changed meanwhile
+     * @param options the limits
+     * @param visitor who is told
+     * @throws ProvisioningException as {@link #parse}, once what stands before has been told
+     */
+    public static void describe(byte[] body, ReadOptions options, ByteVisitor visitor)
+            throws ProvisioningException {
+        ProvisioningException.checkInput(body.length, options);
+        BodyHeader header = new BodyHeader(body);
+        Describer describer = new Describer(visitor);
+        describer.header(body, header);
+        new BodyReader(body, header, options.textLimit(), describer).read();
+    }
+
     /** The body, not to be changed. */
     byte[] bytes() {
         return body;
+    }
+
+    BodyHeader header() {
+        return header;
     }
 
     /** The document element. */

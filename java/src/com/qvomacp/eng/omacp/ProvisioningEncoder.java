@@ -1,7 +1,10 @@
 package com.qvomacp.eng.omacp;
 
 import java.util.ArrayList;
+import java.util.Collections;
+import java.util.IdentityHashMap;
 import java.util.List;
+import java.util.Map;
 
 /**
  * A document that can be encoded as a body, as a whole push, and as XML: one that was read, or a
@@ -34,8 +37,41 @@ public final class ProvisioningEncoder {
      */
     public static ProvisioningEncoder ofXml(byte[] xml, EncodeOptions options)
             throws EncodingException {
-        XmlReader.Result result = XmlReader.read(xml);
+        XmlReader.Result result = XmlReader.read(xml, false);
         return new ProvisioningEncoder(result.source, options.orElse(result.options));
+    }
+
+    /**
+     * Looks for what is wrong with a document in XML, and with the body that is encoded of it. A
+     * characteristic without type and a parm without name are findings here.
+     *
+     * @param xml the bytes of the document, as {@link #ofXml} takes them
+     * @return what each {@link Rule} finds, with line and column, in the order of the document; not
+     *     modifiable
+     * @throws EncodingException when the bytes are no wap-provisioningdoc, with line and column
+     */
+    public static List<Finding> lint(byte[] xml) throws EncodingException {
+        XmlReader.Result result = XmlReader.read(xml, true);
+        byte[] body = BodyWriter.write(result.source, result.options);
+        ProvisioningDocument document;
+        try {
+            document = ProvisioningDocument.of(body, ReadOptions.DEFAULT
+                    .withInputLimit(body.length).withTextLimit(Integer.MAX_VALUE));
+        } catch (ProvisioningException e) {
+            throw new AssertionError(e);
+        }
+        // The items stand in the body in the order of their tags.
+        Map<Item, int[]> places = new IdentityHashMap<>();
+        Walk items = new Walk(document.root());
+        for (int[] place : result.source.places) {
+            places.put(items.next(), place);
+        }
+        List<Finding> findings = new ArrayList<>();
+        for (Finding finding : document.lint()) {
+            int[] place = places.get(finding.item());
+            findings.add(finding.at(place[0], place[1]));
+        }
+        return Collections.unmodifiableList(findings);
     }
 
     /**
@@ -150,7 +186,7 @@ public final class ProvisioningEncoder {
                 source.parameter(((Parameter) item).name(), ((Parameter) item).value());
             } else {
                 throw EncodingException.in(
-                        ItemPath.of(item), "what stands here is no element of the document type");
+                        item.path(), "what stands here is no element of the document type");
             }
         }
     }

@@ -97,20 +97,14 @@ public final class ProvisioningMac {
         if (!isKnown(method) || unusable(method, pin, imsi) != null) {
             return null;
         }
-        switch (method) {
-            case NETWPIN:
-                return compute(imsiKey(imsi), body);
-            case USERPIN:
-                return compute(utf8(pin), body);
-            case USERNETWPIN:
-                byte[] network = imsiKey(imsi);
-                byte[] user = utf8(pin);
-                byte[] key = Arrays.copyOf(network, network.length + user.length);
-                System.arraycopy(user, 0, key, network.length, user.length);
-                return compute(key, body);
-            default:
-                return told(firstHalf(pin), body);
+        if (method == SecurityMethod.USERPINMAC) {
+            return told(firstHalf(pin), body);
         }
+        byte[] network = isOfNetwork(method) ? imsiKey(imsi) : new byte[0];
+        byte[] user = method == SecurityMethod.NETWPIN ? new byte[0] : utf8(pin);
+        byte[] key = Arrays.copyOf(network, network.length + user.length);
+        System.arraycopy(user, 0, key, network.length, user.length);
+        return compute(key, body);
     }
 
     /**
@@ -151,14 +145,16 @@ public final class ProvisioningMac {
 
     /** What the method needs and has not, or null. */
     private static MacResult unusable(SecurityMethod method, String pin, String imsi) {
-        boolean isOfNetwork =
-                method == SecurityMethod.NETWPIN || method == SecurityMethod.USERNETWPIN;
-        if (isOfNetwork && !isDigits(imsi, 1, LONGEST_IMSI)) {
+        if (isOfNetwork(method) && !isDigits(imsi, 1, LONGEST_IMSI)) {
             return MacResult.UNUSABLE_IMSI;
         }
         return method == SecurityMethod.NETWPIN || isPin(method, pin)
                 ? null
                 : MacResult.UNUSABLE_PIN;
+    }
+
+    private static boolean isOfNetwork(SecurityMethod method) {
+        return method == SecurityMethod.NETWPIN || method == SecurityMethod.USERNETWPIN;
     }
 
     private static boolean isPin(SecurityMethod method, String pin) {

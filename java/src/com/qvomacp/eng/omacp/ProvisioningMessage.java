@@ -1,5 +1,6 @@
 package com.qvomacp.eng.omacp;
 
+import java.io.ByteArrayOutputStream;
 import java.util.Arrays;
 import java.util.List;
 
@@ -148,36 +149,32 @@ public final class ProvisioningMessage {
         if (header == null) {
             return document.verdict();
         }
-        byte[] head = header.bytes();
+        boolean isAlone = header.transactionIdentifier() == PushHeader.NO_TRANSACTION;
+        byte[] head = isAlone ? push(header.bytes()) : header.bytes();
         byte[] body = document.bytes();
-        int front = header.transactionIdentifier() == PushHeader.NO_TRANSACTION ? front(head) : 0;
-        int bodyAt = front + head.length;
-        byte[] push = new byte[bodyAt + body.length];
-        if (front > 0) {
-            push[1] = PUSH;
-            putLength(push, front, head.length);
-        }
-        System.arraycopy(head, 0, push, front, head.length);
-        System.arraycopy(body, 0, push, bodyAt, body.length);
-        return LibraryRules.verdictOnPush(push, bodyAt, document);
+        byte[] push = Arrays.copyOf(head, head.length + body.length);
+        System.arraycopy(body, 0, push, head.length, body.length);
+        return Verdict.onPush(push, head.length, document);
     }
 
-    /** How many bytes stand in front of headers: identifier, type, and length, 7 bits a byte. */
-    private static int front(byte[] headers) {
-        int front = 3;
-        for (int rest = headers.length >>> 7; rest != 0; rest >>>= 7) {
-            ++front;
-        }
-        return front;
+    /**
+     * Looks for what is wrong with the message, worked out at each call.
+     *
+     * @return what each {@link Rule} finds, first in the push header, then in the order of the
+     *     body; not modifiable
+     */
+    public List<Finding> lint() {
+        return Linter.lint(header, document, verdict());
     }
 
-    /** Writes a length up to an offset, the high bit set in all bytes but the last. */
-    private static void putLength(byte[] push, int end, int length) {
-        int rest = length;
-        for (int at = end - 1; at > 1; --at) {
-            push[at] = (byte) (rest & 0x7F | (at < end - 1 ? 0x80 : 0));
-            rest >>>= 7;
-        }
+    /** Headers as they stand in a push. */
+    private static byte[] push(byte[] headers) {
+        ByteArrayOutputStream push = new ByteArrayOutputStream();
+        push.write(0);
+        push.write(PUSH);
+        BodyWriter.integer(headers.length, push);
+        push.write(headers, 0, headers.length);
+        return push.toByteArray();
     }
 
     /**
@@ -279,7 +276,6 @@ public final class ProvisioningMessage {
                 && document.equals(that.document);
     }
 
-    /** {@return a number that fits {@link #equals}: the same number for equal messages} */
     @Override
     public int hashCode() {
         return 31 * (header == null ? 0 : header.hashCode()) + document.hashCode();

@@ -54,34 +54,14 @@ public final class Proxy extends TypedCharacteristic {
         return has("TRUST");
     }
 
-    /** {@return the value of TRUST, which by the standard has none} */
-    public String trust() {
-        return value("TRUST");
-    }
-
     /** {@return whether MASTER stands here: by the standard, it leads its navigation domain} */
     public boolean hasMaster() {
         return has("MASTER");
     }
 
-    /** {@return the value of MASTER, which by the standard has none} */
-    public String master() {
-        return value("MASTER");
-    }
-
     /** {@return STARTPAGE: the address of the page to begin with} */
     public String startPage() {
         return value("STARTPAGE");
-    }
-
-    /** {@return BASAUTH-ID: the name of the user for the page to begin with} */
-    public String basicAuthenticationId() {
-        return value("BASAUTH-ID");
-    }
-
-    /** {@return BASAUTH-PW: the password for the page to begin with} */
-    public String basicAuthenticationPassword() {
-        return value("BASAUTH-PW");
     }
 
     /** {@return WSP-VERSION: the version of WSP that the proxy speaks} */

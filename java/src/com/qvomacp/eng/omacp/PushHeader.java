@@ -106,13 +106,13 @@ public final class PushHeader {
         return bytes.length;
     }
 
-    /** {@return the content type with its parameters: the content type, never {@code null}} */
+    /** {@return the content type with its parameters; never {@code null}} */
     public ContentType contentType() {
         return contentType;
     }
 
     /**
-     * {@return the security method: the method that SEC states; {@link SecurityMethod#NONE} without
+     * {@return the security method that SEC states; {@link SecurityMethod#NONE} without
      * SEC, {@link SecurityMethod#UNKNOWN} for a SEC that states none of them; never {@code null}}
      */
     public SecurityMethod securityMethod() {

@@ -1,45 +1,71 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.ArrayDeque;
 import java.util.ArrayList;
-import java.util.Arrays;
+import java.util.Deque;
 import java.util.List;
 import java.util.Objects;
 
-/** Compares the elements that the native library's walk reads with the items of the tree. */
+/** Compares what the native library's walk reads with the items of the tree. */
 final class ReadOtherwise extends LibraryTrace {
     private static final int OPEN = -1;
-    private static final int NO_PARM = -1;
+    private static final int END_MASK = 0x3F;
 
-    /** The elements in the order in which they begin. */
-    private int count;
+    private enum Kind { CHARACTERISTIC, PARM, SKIPPED }
 
-    private int[] starts = new int[64];
-    private int[] ends = new int[64];
+    /** What the walk reads. */
+    private static final class Part {
+        final Kind kind;
+        final int start;
+        int end = OPEN;
 
-    /** What a characteristic or parameter is called; null for what the library does not know. */
-    private String[] names = new String[64];
+        /** What it is called; null for what the library does not know. */
+        String name;
 
-    /** How many pairs of name and value a parm has; -1 for a characteristic. */
-    private int[] pairs = new int[64];
+        /** How many pairs of name and value a parm has. */
+        int pairs;
 
-    /** The end of a parm's value; 0 without one. */
-    private int[] valueEnds = new int[64];
+        /** The end of a parm's value; 0 without one. */
+        int valueEnd;
 
-    /** The elements whose ends have not been read. */
-    private int[] open = new int[16];
+        Part(Kind kind, int start) {
+            this.kind = kind;
+            this.start = start;
+        }
+    }
 
-    private int depth;
+    private final byte[] body;
+    private final ProvisioningDocument document;
 
-    private ReadOtherwise() {}
+    /** Where the document begins in what the library takes for the body. */
+    private final int shift;
+
+    private final ByteVisitor visitor;
+
+    /** In the order in which they begin. */
+    private final List<Part> parts = new ArrayList<>();
+
+    /** Those whose ends have not been read, the innermost first. */
+    private final Deque<Part> open = new ArrayDeque<>();
+
+    private ReadOtherwise(
+            byte[] body, ProvisioningDocument document, int shift, ByteVisitor visitor) {
+        this.body = body;
+        this.document = document;
+        this.shift = shift;
+        this.visitor = visitor;
+    }
 
     /**
-     * Lists the items of a document that the walk skips or reads as something else.
+     * Lists the items of a document that the walk skips or reads as something else, and tells what
+     * it reads instead.
      *
      * @param body what the library takes for the body
      * @param shift where the document begins in it
      */
-    static List<Item> of(byte[] body, ProvisioningDocument document, int shift) {
-        ReadOtherwise read = new ReadOtherwise();
+    static List<Item> of(
+            byte[] body, ProvisioningDocument document, int shift, ByteVisitor visitor) {
+        ReadOtherwise read = new ReadOtherwise(body, document, shift, visitor);
         LibraryWalk walk = new LibraryWalk(body, read);
         int end;
         try {
@@ -47,96 +73,164 @@ final class ReadOtherwise extends LibraryTrace {
             end = walk.at;
         } catch (LibraryStop stop) {
             end = stop.offset;
-            if (walk.depth > 0 && !walk.isTyped) {
-                read.begin(walk.starts[walk.depth - 1], null, false);
+        }
+        read.compareHeaders(walk);
+        return read.compareItems(walk.elementsAt, end);
+    }
+
+    private void tell(int start, int end, String reading) {
+        int from = Math.max(start - shift, 0);
+        visitor.visit(from, Math.max(end - shift - from, 1), 0, "the library " + reading);
+    }
+
+    private void compareHeaders(LibraryWalk walk) {
+        BodyHeader header = document.header();
+        if (shift != 0) {
+            tell(shift, shift, Refusal.shifted(shift));
+        } else if (walk.unreadItem != null) {
+            tell(header.identifierAt, walk.at, "cannot read the " + walk.unreadItem);
+        } else if (walk.elementsAt != header.elementsAt) {
+            String length = "reads " + walk.tableLength + " as the length of the string table";
+            tell(header.charsetAt, walk.tableLengthAt, "reads a character set");
+            tell(walk.tableLengthAt, walk.tableAt, length);
+        }
+    }
+
+    /** Compares from where the walk's elements begin up to where it ends. */
+    private List<Item> compareItems(int from, int end) {
+        List<Item> otherwise = new ArrayList<>();
+        int told = from;
+        int next = 0;
+        Walk items = new Walk(document.root());
+        items.next();
+        for (Item item; (item = items.next()) != null && item.offset() + shift < end; ) {
+            int start = item.offset() + shift;
+            for (; next < parts.size() && isBefore(parts.get(next), start); ++next) {
+                told = tellAlone(parts.get(next), told);
+            }
+            int itemEnd = start + item.length();
+            if (next == parts.size() || parts.get(next).start > start) {
+                otherwise.add(item);
+                if (start >= told) {
+                    tell(start, itemEnd, "reads no element here");
+                }
+                continue;
+            }
+            Part part = parts.get(next++);
+            String reading = reading(part, item, itemEnd);
+            if (reading != null) {
+                otherwise.add(item);
+                tell(start, part.end, reading);
             }
         }
-        List<Item> otherwise = new ArrayList<>();
-        int next = 0;
-        for (Item top : document.children()) {
-            Walk items = new Walk(top);
-            for (Item item; (item = items.next()) != null; ) {
-                int start = item.offset() + shift;
-                if (start >= end) {
-                    return otherwise;
-                }
-                while (next < read.count && read.starts[next] < start) {
-                    ++next;
-                }
-                boolean isThere = next < read.count && read.starts[next] == start;
-                if (!isThere || !read.isAlike(next, item, start + item.length())) {
-                    otherwise.add(item);
-                }
-            }
+        for (; next < parts.size(); ++next) {
+            told = tellAlone(parts.get(next), told);
         }
         return otherwise;
     }
 
-    private boolean isAlike(int element, Item item, int end) {
-        boolean isOpen = ends[element] == OPEN;
-        if (!isOpen && ends[element] != end) {
-            return false;
-        }
-        if (item instanceof Characteristic) {
-            // One that is open and of no known type is where the library refuses the message.
-            return pairs[element] == NO_PARM
-                    && (isOpen && names[element] == null
-                            || Objects.equals(names[element], ((Characteristic) item).type()));
-        }
-        if (!(item instanceof Parameter) || pairs[element] == NO_PARM) {
-            return false;
-        }
-        Parameter parameter = (Parameter) item;
-        return isOpen
-                || pairs[element] == 1
-                        && Objects.equals(names[element], parameter.name())
-                        && valueEnds[element] == (parameter.value() == null ? 0 : end - 1);
+    private static boolean isBefore(Part part, int start) {
+        return part.start < start || part.start == start && part.kind == Kind.SKIPPED;
     }
 
-    private void begin(int start, String name, boolean isParm) {
-        if (count == starts.length) {
-            starts = Arrays.copyOf(starts, 2 * count);
-            ends = Arrays.copyOf(ends, 2 * count);
-            names = Arrays.copyOf(names, 2 * count);
-            pairs = Arrays.copyOf(pairs, 2 * count);
-            valueEnds = Arrays.copyOf(valueEnds, 2 * count);
+    /** Tells of what no item stands for, and up to where no more is to be told. */
+    private int tellAlone(Part part, int told) {
+        if (part.kind != Kind.SKIPPED) {
+            tell(part.start, part.end, reads(part));
+            return told;
         }
-        if (depth == open.length) {
-            open = Arrays.copyOf(open, 2 * depth);
+        String bytes = Refusal.bytes(part.end - part.start);
+        tell(part.start, part.end, "skips " + bytes + " from here on, " + part.name);
+        return Math.max(told, part.end);
+    }
+
+    private static String reads(Part part) {
+        String what = part.kind == Kind.CHARACTERISTIC ? "a characteristic" : "a parm";
+        boolean isNamed = part.name != null && !part.name.isEmpty();
+        return "reads " + what + (isNamed ? " " + Printable.of(part.name) : "");
+    }
+
+    /** What the library makes of the bytes of an item; null for the same. */
+    private String reading(Part part, Item item, int end) {
+        boolean isCharacteristic = part.kind == Kind.CHARACTERISTIC;
+        boolean isOpen = part.end == OPEN;
+        if (!(isCharacteristic ? item instanceof Characteristic : item instanceof Parameter)) {
+            return reads(part);
         }
-        open[depth++] = count;
-        starts[count] = start;
-        ends[count] = OPEN;
-        names[count] = name;
-        pairs[count] = isParm ? 0 : NO_PARM;
-        valueEnds[count++] = 0;
+        // One that is open and of no known type is where the library refuses the message.
+        if (isCharacteristic
+                && !Objects.equals(part.name, item.called())
+                && !(isOpen && part.name == null)) {
+            return part.name == null ? "knows no such TYPE" : reads(part);
+        }
+        if (isOpen) {
+            return null;
+        }
+        if (part.end != end) {
+            boolean isNext = part.end == end + 1 && (body[end] & END_MASK) == BodyReader.END;
+            String by = Refusal.bytes(Math.abs(part.end - end));
+            String ends = "ends this " + by + (part.end < end ? " earlier" : " later");
+            return isNext ? "takes the next END for its own" : ends;
+        }
+        return isCharacteristic ? null : reading(part, (Parameter) item, end);
+    }
+
+    private static String reading(Part parm, Parameter parameter, int end) {
+        if (parm.pairs != 1) {
+            return parm.pairs == 0 ? "reads no NAME" : "joins " + parm.pairs + " parameters";
+        }
+        if (!Objects.equals(parm.name, parameter.name())) {
+            return reads(parm);
+        }
+        if (parm.valueEnd == (parameter.value() == null ? 0 : end - 1)) {
+            return null;
+        }
+        return parm.valueEnd == 0 ? "reads no value" : "ends the value before the END";
+    }
+
+    private Part add(Kind kind, int start) {
+        Part part = new Part(kind, start);
+        parts.add(part);
+        return part;
     }
 
     @Override
-    void characteristic(LibraryWalk walk, int depth, int start, LibraryKind kind) {
-        begin(start, kind == null ? null : kind.type, false);
+    void begin(int start, boolean isParm) {
+        open.push(add(isParm ? Kind.PARM : Kind.CHARACTERISTIC, start));
     }
 
     @Override
-    void parm(int start) {
-        begin(start, null, true);
+    void type(LibraryWalk walk, int outer, int start, LibraryKind kind) {
+        open.peek().name = kind == null ? null : kind.type;
     }
 
     @Override
     void name(LibraryWalk walk) {
-        int parm = count - 1;
-        if (pairs[parm]++ == 0) {
-            names[parm] = walk.parmName();
+        if (open.peek().pairs++ == 0) {
+            open.peek().name = walk.parmName();
         }
     }
 
     @Override
     void value(int end) {
-        valueEnds[count - 1] = end;
+        open.peek().valueEnd = end;
     }
 
     @Override
     void end(int end) {
-        ends[open[--depth]] = end;
+        open.pop().end = end;
+    }
+
+    /** What was skipped within it is part of it. */
+    @Override
+    void skipped(String what, int start, int end) {
+        for (int last = parts.size() - 1;
+                last >= 0 && parts.get(last).kind == Kind.SKIPPED && parts.get(last).start >= start;
+                --last) {
+            parts.remove(last);
+        }
+        Part part = add(Kind.SKIPPED, start);
+        part.name = what;
+        part.end = end;
     }
 }

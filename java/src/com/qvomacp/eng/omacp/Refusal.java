@@ -39,13 +39,7 @@ final class Refusal {
     static Refusal of(LibraryWalk walk, LibraryStop stop) {
         Words words = new Words(walk, stop);
         String found = words.found();
-        int offset = stop.offset;
-        if (stop.cause == Cause.DOCUMENT_TYPE && walk.unreadItem != null && walk.at >= walk.size) {
-            offset = walk.size;
-        } else if (stop.cause == Cause.DOCUMENT_TYPE && words.isTypeInTable()) {
-            offset = walk.tableAt;
-        }
-        return of(walk, offset, found, words.expected(), words.reason(found));
+        return of(walk, stop.offset, found, words.expected(), words.reason(found));
     }
 
     /** Of a body that can be decoded and holds no characteristic at all. */
@@ -83,9 +77,13 @@ final class Refusal {
 
     /** The same of a body that is not the message's, which begins so many bytes behind it. */
     Refusal ofShiftedBody(int shift) {
-        String where = "; the library takes the body to begin " + bytes(Math.abs(shift));
-        where += shift < 0 ? " later" : " earlier";
-        return new Refusal(offset, path, found, expected, reason + where);
+        String why = reason + "; the library " + shifted(shift);
+        return new Refusal(offset, path, found, expected, why);
+    }
+
+    static String shifted(int shift) {
+        String where = shift < 0 ? " later" : " earlier";
+        return "takes the body to begin " + bytes(Math.abs(shift)) + where;
     }
 
     static String bytes(long count) {
@@ -106,24 +104,13 @@ final class Refusal {
         private static final int LITERAL = 0x04;
         private static final int FIRST_VALUE = 0x80;
 
-        /** The tokens that WBXML itself gives a meaning; null for the others. */
-        private static final String[] GLOBAL = new String[256];
-
-        static {
-            String[] names = {"SWITCH_PAGE", "END", "ENTITY", "STR_I", "LITERAL"};
-            System.arraycopy(names, 0, GLOBAL, 0, names.length);
-            for (int i = 0; i < 3; ++i) {
-                GLOBAL[0x40 + i] = "EXT_I_" + i;
-                GLOBAL[0x80 + i] = "EXT_T_" + i;
-                GLOBAL[0xC0 + i] = "EXT_" + i;
-            }
-            GLOBAL[0x43] = "PI";
-            GLOBAL[0x44] = "LITERAL_C";
-            GLOBAL[0x83] = "STR_T";
-            GLOBAL[0x84] = "LITERAL_A";
-            GLOBAL[0xC3] = "OPAQUE";
-            GLOBAL[0xC4] = "LITERAL_AC";
-        }
+        /** The tokens that WBXML itself gives a meaning. */
+        private static final String[] GLOBAL = {
+            "SWITCH_PAGE", "END", "ENTITY", "STR_I", "LITERAL",
+            "EXT_I_0", "EXT_I_1", "EXT_I_2", "PI", "LITERAL_C",
+            "EXT_T_0", "EXT_T_1", "EXT_T_2", "STR_T", "LITERAL_A",
+            "EXT_0", "EXT_1", "EXT_2", "OPAQUE", "LITERAL_AC",
+        };
 
         private final LibraryWalk walk;
 
@@ -147,11 +134,6 @@ final class Refusal {
             return stop.place == Place.NEXT_CHARACTERISTIC && isText
                     ? Place.BEHIND_TEXT
                     : stop.place;
-        }
-
-        /** Whether the body begins with its table, where its type has to be. */
-        boolean isTypeInTable() {
-            return walk.publicId == 0 && walk.unreadItem == null;
         }
 
         // ---- What stands there
@@ -186,7 +168,7 @@ final class Refusal {
         }
 
         private String documentType() {
-            if (isTypeInTable()) {
+            if (walk.isTypeText()) {
                 return quoted(walk.data, walk.tableAt, walk.endOfTableText(walk.tableAt));
             }
             if (walk.publicId != 0) {
@@ -197,25 +179,15 @@ final class Refusal {
 
         /** The token of an element. */
         String elementAt(int offset) {
-            int token = walk.data[offset] & 0xFF;
-            Element element = CodePage.of(0).element(token & LibraryText.TAG_MASK);
-            if (GLOBAL[token] != null) {
-                return global(offset);
-            }
-            return element == null
-                    ? "element " + hex(token)
-                    : LibraryKind.withToken(element.text, token);
+            Element element = CodePage.of(0).element(walk.data[offset] & LibraryText.TAG_MASK);
+            return withToken(offset, element == null ? null : element.text, "element ");
         }
 
         /** The token of an attribute or of a value. */
         private String attributeAt(int offset) {
             int token = walk.data[offset] & 0xFF;
-            if (GLOBAL[token] != null) {
-                return global(offset);
-            }
             String name = nameOf(CodePage.of(walk.page), token);
-            name = name != null ? name : nameOf(CodePage.of(0), token);
-            return name == null ? hex(token) : LibraryKind.withToken(name, token);
+            return withToken(offset, name != null ? name : nameOf(CodePage.of(0), token), "");
         }
 
         private static String nameOf(CodePage page, int token) {
@@ -230,11 +202,15 @@ final class Refusal {
             return value == null ? attribute.name() : attribute.name() + "=" + value;
         }
 
-        /** A token of WBXML itself; a literal one with the name that it refers to. */
-        private String global(int offset) {
+        /** The name of a token, that of WBXML first; a literal one with what it refers to. */
+        private String withToken(int offset, String ofPage, String unknown) {
             int token = walk.data[offset] & 0xFF;
-            String name = GLOBAL[token];
-            if ((token & LibraryText.TAG_MASK) == LITERAL && walk.unreadItem == null) {
+            int low = token & LibraryText.TAG_MASK;
+            if (low > LITERAL) {
+                return ofPage == null ? unknown + hex(token) : LibraryKind.withToken(ofPage, token);
+            }
+            String name = GLOBAL[(token >> 6) * (LITERAL + 1) + low];
+            if (low == LITERAL && walk.unreadItem == null) {
                 long index = new Cursor(walk.data, offset + 1, walk.size).integer();
                 if (index >= 0 && index < walk.tablePresent) {
                     int start = walk.tableAt + (int) index;
@@ -266,24 +242,13 @@ final class Refusal {
                     return Collections.singletonList("at most " + bytes(walk.size - walk.at));
                 case EMPTY_NAME:
                 case UNKNOWN_NAME:
-                    return names();
+                    return kind.expectedNames();
                 case TOO_MUCH_TEXT:
                 case OPAQUE_WITHOUT_LENGTH:
                     return Collections.emptyList();
                 default:
                     return expectedThere();
             }
-        }
-
-        private List<String> names() {
-            if (kind.names() == null) {
-                return Collections.singletonList("a name");
-            }
-            List<String> names = new ArrayList<>();
-            for (String name : kind.names()) {
-                names.add("NAME=\"" + name + '"');
-            }
-            return names;
         }
 
         private List<String> expectedThere() {
@@ -313,21 +278,23 @@ final class Refusal {
         // ---- Why
 
         String reason(String found) {
+            boolean isAtEnd = walk.at >= walk.size;
             switch (stop.cause) {
                 case EMPTY_BODY:
                     return "the body is empty";
                 case DOCUMENT_TYPE:
                     return wrongType();
                 case ENDED:
+                case ENDED_IN_SWITCH:
                     return ended();
                 case NO_SUCH_PAGE:
                     return "there is no code page " + wantedPage();
                 case NO_SUCH_STRING:
-                    return walk.at >= walk.size && walk.data[walk.size - 1] < 0
+                    return isAtEnd && walk.data[walk.size - 1] < 0
                             ? "the body ends within a reference to the string table"
                             : "there is no such string in the string table";
                 case OPAQUE_WITHOUT_LENGTH:
-                    return walk.at >= walk.size
+                    return isAtEnd
                             ? "the body ends within the length of opaque data"
                             : "the length of the opaque data has no end";
                 case OPAQUE_TOO_LONG:
@@ -339,7 +306,7 @@ final class Refusal {
                 case TOO_MUCH_TEXT:
                     return "the body is decoded to too much text";
                 default:
-                    return found + " " + place().refused + characteristic();
+                    return found + " " + place().refused + characteristic(false);
             }
         }
 
@@ -378,12 +345,11 @@ final class Refusal {
                 String where = walk.isSwitchWhole ? "behind" : "within";
                 return "the body ends " + where + " a SWITCH_PAGE";
             }
-            return "the body ends " + stop.place.where + characteristic();
+            return "the body ends " + stop.place.where + characteristic(true);
         }
 
         /** Names the characteristic where the words of a place end with it. */
-        private String characteristic() {
-            boolean isEnd = stop.cause == Cause.ENDED;
+        private String characteristic(boolean isEnd) {
             if (stop.place == Place.PARM) {
                 return isEnd ? "" : " " + kind.type;
             }

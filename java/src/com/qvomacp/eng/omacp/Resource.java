@@ -53,9 +53,4 @@ public final class Resource extends TypedCharacteristic {
     public boolean hasStartPage() {
         return has("STARTPAGE");
     }
-
-    /** {@return the value of STARTPAGE, which by the standard has none} */
-    public String startPage() {
-        return value("STARTPAGE");
-    }
 }

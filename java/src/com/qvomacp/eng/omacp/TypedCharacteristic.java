@@ -5,19 +5,19 @@ import java.util.Collections;
 import java.util.List;
 
 /**
- * A characteristic of a kind that is known, with an accessor for each parameter of its kind. It is
- * a view of the tree and holds nothing of its own: what it has no accessor for is within reach by
- * {@link #characteristic}.
+ * A characteristic of a kind that is known, with accessors for what messages set in it. It is a view
+ * of the tree and holds nothing of its own: what it has no accessor for is within reach by {@link
+ * #value}, {@link #values}, {@link #has} and {@link #characteristic}.
  *
  * <p>An accessor for one value answers that of the first parameter of its name, {@code null} when
- * there is none and when it has no value; whether there is one, with or without a value, is told by
- * those that begin with {@code has}. One for several answers all, in the order of the message, in a
- * list that cannot be modified and is empty when there is none. What stands in inner
- * characteristics is theirs.
+ * there is none and when it has no value. Those that begin with {@code has} are of flags, which by
+ * the standard have no value. One for several answers all, in the order of the message, in a list
+ * that cannot be modified and is empty when there is none. What stands in inner characteristics is
+ * theirs.
  *
  * <pre>{@code
  * for (AccessPoint accessPoint : message.accessPoints()) {
- *     System.out.println(accessPoint.name() + ": " + accessPoint.characteristic().parameters());
+ *     System.out.println(accessPoint.name() + ": " + accessPoint.value("TRAFFIC-CLASS"));
  * }
  * }</pre>
  */
@@ -43,21 +43,16 @@ public abstract class TypedCharacteristic {
             case "APPAUTH": return new ApplicationAuthentication(in);
             case "BOOTSTRAP": return new Bootstrap(in);
             case "CLIENTIDENTITY": return new ClientIdentity(in);
-            case "EAP": return new Eap(in);
-            case "CERT": return new EapCertificate(in);
             case "PXPHYSICAL": return new PhysicalProxy(in);
             case "PORT": return new Port(in);
             case "PXLOGICAL": return new Proxy(in);
             case "PXAUTHINFO": return new ProxyAuthentication(in);
             case "RESOURCE": return new Resource(in);
             case "ROAMING": return new Roaming(in);
-            case "SEC-SSID": return new SecondarySsid(in);
             case "VALIDITY": return new Validity(in);
             case "VENDORCONFIG": return new VendorConfiguration(in);
             case "Vodafone VoWiFi": return new VoWifi(in);
-            case "WEPKEY": return new WepKey(in);
             case "WI-FI": return new Wifi(in);
-            case "WLAN": return new Wlan(in);
             default: throw new AssertionError(type);
         }
     }
@@ -82,15 +77,27 @@ public abstract class TypedCharacteristic {
         return characteristic;
     }
 
-    final boolean has(String name) {
+    /**
+     * {@return whether a parameter of a name stands here, with or without a value}
+     * @param name what NAME is, in exactly this case
+     */
+    public final boolean has(String name) {
         return characteristic.parameter(name) != null;
     }
 
-    final String value(String name) {
+    /**
+     * {@return the value of the first parameter of a name; {@code null} for none, and without a value}
+     * @param name what NAME is, in exactly this case
+     */
+    public final String value(String name) {
         return characteristic.value(name);
     }
 
-    final List<String> values(String name) {
+    /**
+     * {@return the values of all parameters of a name that have one; not modifiable}
+     * @param name what NAME is, in exactly this case
+     */
+    public final List<String> values(String name) {
         return characteristic.values(name);
     }
 
@@ -109,7 +116,6 @@ public abstract class TypedCharacteristic {
                 && ((TypedCharacteristic) other).characteristic.equals(characteristic);
     }
 
-    /** {@return a number that fits {@link #equals}: the same number for equal objects} */
     @Override
     public final int hashCode() {
         return characteristic.hashCode();

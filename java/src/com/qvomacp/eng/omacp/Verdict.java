@@ -1,5 +1,6 @@
 package com.qvomacp.eng.omacp;
 
+import com.qvomacp.eng.omacp.LibraryStop.Result;
 import java.util.Arrays;
 import java.util.Collections;
 import java.util.List;
@@ -20,7 +21,7 @@ public final class Verdict {
     /** Null when the library refuses the header. */
     private final byte[] body;
 
-    private final int code;
+    private final Result result;
     private final int bytesRead;
 
     /** Null when the message is accepted. */
@@ -32,19 +33,65 @@ public final class Verdict {
     /** Where the document begins in what the library takes for the body. */
     private final int shift;
 
-    Verdict(
-            byte[] body,
-            int code,
-            int bytesRead,
-            Refusal refusal,
-            ProvisioningDocument document,
-            int shift) {
-        this.body = body;
-        this.code = code;
-        this.bytesRead = bytesRead;
+    /** On a push whose header is refused. */
+    private Verdict(Refusal refusal) {
+        this.body = null;
+        this.result = Result.OK;
+        this.bytesRead = 0;
         this.refusal = refusal;
+        this.document = null;
+        this.shift = 0;
+    }
+
+    private Verdict(byte[] body, ProvisioningDocument document, int shift) {
+        LibraryWalk walk = new LibraryWalk(body, LibraryTrace.NONE);
+        Refusal refusal = null;
+        Result result = Result.OK;
+        try {
+            walk.run();
+            if (!walk.hasList) {
+                refusal = Refusal.ofEmpty(walk);
+            }
+        } catch (LibraryStop stop) {
+            result = stop.cause.result;
+            refusal = Refusal.of(walk, stop);
+        }
+        this.body = body;
+        this.result = result;
+        this.bytesRead = walk.at;
+        this.refusal = refusal == null || shift == 0 ? refusal : refusal.ofShiftedBody(shift);
         this.document = document;
         this.shift = shift;
+    }
+
+    /**
+     * On a body.
+     *
+     * @param body the body, which is not copied
+     * @param document what it says; null when it could not be read
+     */
+    static Verdict onBody(byte[] body, ProvisioningDocument document) {
+        return new Verdict(body, document, 0);
+    }
+
+    /**
+     * On a push.
+     *
+     * @param push the push, which is not copied
+     * @param bodyAt where the body of the document begins in it
+     * @param document what the body says; null when it could not be read
+     */
+    static Verdict onPush(byte[] push, int bodyAt, ProvisioningDocument document) {
+        LibraryHeader header = LibraryHeader.of(push);
+        if (header.refusal != null) {
+            return new Verdict(header.refusal);
+        }
+        if (header.bodyAt == bodyAt && document != null) {
+            return document.verdict();
+        }
+        // The library reads the length of the headers from one byte, whatever its form.
+        byte[] body = Arrays.copyOfRange(push, header.bodyAt, push.length);
+        return new Verdict(body, document, bodyAt - header.bodyAt);
     }
 
     /**
@@ -55,7 +102,7 @@ public final class Verdict {
      * @return the verdict, which knows of no item that is read otherwise; never {@code null}
      */
     public static Verdict ofPush(byte[] push) {
-        return LibraryRules.verdictOnPush(push, 0, null);
+        return onPush(push, 0, null);
     }
 
     /**
@@ -66,7 +113,7 @@ public final class Verdict {
      * @return the verdict, which knows of no item that is read otherwise; never {@code null}
      */
     public static Verdict ofBody(byte[] body) {
-        return LibraryRules.verdictOnBody(body.clone(), null);
+        return onBody(body.clone(), null);
     }
 
     /** {@return whether the library takes the message} */
@@ -84,29 +131,12 @@ public final class Verdict {
      * decode, with a document or without, and when the header is refused}
      */
     public int code() {
-        return code;
+        return result.code;
     }
 
     /** {@return the name of the result code, such as {@code QVS_ERROR_WBXML_UNKNOWN_ELEMENT}} */
     public String codeName() {
-        switch (code) {
-            case 0:
-                return "QVS_OK";
-            case LibraryStop.FAILED:
-                return "QVS_ERROR_FAILED";
-            case LibraryStop.BAD_ARGUMENT:
-                return "QVS_ERROR_BAD_ARGUMENT";
-            case LibraryStop.UNKNOWN_ELEMENT:
-                return "QVS_ERROR_WBXML_UNKNOWN_ELEMENT";
-            case LibraryStop.NO_DATA:
-                return "QVS_ERROR_WBXML_NO_DATA";
-            case LibraryStop.WRONG_DOCUMENT_TYPE:
-                return "QVS_ERROR_WBXML_DOCUMENT_TYPE";
-            case LibraryStop.NO_MEMORY:
-                return "QVS_ERROR_NO_MEMORY";
-            default:
-                throw new AssertionError(code);
-        }
+        return result.codeName;
     }
 
     /** {@return how much of the body the decoder has read when it ends: bytes} */
@@ -150,9 +180,21 @@ public final class Verdict {
      * where it ends, in the order of the document; not modifiable}
      */
     public List<Item> readOtherwise() {
+        return describeOtherwise((offset, length, depth, meaning) -> {});
+    }
+
+    /**
+     * Tells what the library reads where it reads otherwise, in the order of the body. What it skips
+     * is told once, for all items in it.
+     *
+     * @param visitor hears the offset in the body, how many bytes the library takes, and a few words,
+     *     such as {@code the library reads no value}
+     * @return {@link #readOtherwise}
+     */
+    public List<Item> describeOtherwise(ByteVisitor visitor) {
         return body == null || document == null
                 ? Collections.<Item>emptyList()
-                : Collections.unmodifiableList(ReadOtherwise.of(body, document, shift));
+                : Collections.unmodifiableList(ReadOtherwise.of(body, document, shift, visitor));
     }
 
     @Override
@@ -161,20 +203,16 @@ public final class Verdict {
             return false;
         }
         Verdict that = (Verdict) other;
-        return code == that.code
-                && bytesRead == that.bytesRead
-                && offset() == that.offset()
-                && Objects.equals(path(), that.path())
-                && Objects.equals(found(), that.found())
-                && Objects.equals(reason(), that.reason())
-                && expected().equals(that.expected())
+        // All of it follows from the body, or from the header.
+        return Arrays.equals(body, that.body)
                 && shift == that.shift
-                && Arrays.equals(body, that.body);
+                && offset() == that.offset()
+                && Objects.equals(reason(), that.reason());
     }
 
     @Override
     public int hashCode() {
-        return 31 * (31 * (31 * code + bytesRead) + offset()) + Objects.hashCode(reason());
+        return 31 * (31 * bytesRead + offset()) + Objects.hashCode(reason());
     }
 
     /** {@return code, place and reason of a refusal, in a line for a log} */
@@ -183,7 +221,7 @@ public final class Verdict {
         if (isAccepted()) {
             return "accepted";
         }
-        String result = body == null ? "" : ", " + code + " " + codeName();
+        String result = body == null ? "" : ", " + code() + " " + codeName();
         String where = path() == null ? "" : ", " + path();
         return "refused: " + reason() + result + ", offset " + offset() + where;
     }

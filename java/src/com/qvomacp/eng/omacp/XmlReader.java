@@ -28,11 +28,16 @@ final class XmlReader {
     };
 
     private final XmlText text;
+
+    /** Whether a characteristic may lack its type, and a parm its name. */
+    private final boolean isLenient;
+
     private EncodeOptions options = EncodeOptions.NONE;
     private DocumentSource source;
 
-    private XmlReader(XmlText text) {
+    private XmlReader(XmlText text, boolean isLenient) {
         this.text = text;
+        this.isLenient = isLenient;
     }
 
     /** A document, and the options that its instruction states. */
@@ -46,8 +51,8 @@ final class XmlReader {
         }
     }
 
-    static Result read(byte[] bytes) throws EncodingException {
-        XmlReader reader = new XmlReader(XmlText.of(bytes));
+    static Result read(byte[] bytes, boolean isLenient) throws EncodingException {
+        XmlReader reader = new XmlReader(XmlText.of(bytes), isLenient);
         reader.document();
         return new Result(reader.source, reader.options);
     }
@@ -174,6 +179,7 @@ final class XmlReader {
         Tag root = tag();
         root.require(ROOT);
         source = new DocumentSource(root.only(VERSION, null).get(VERSION));
+        source.places.add(root.place());
         if (!root.isEmpty) {
             content();
         }
@@ -193,9 +199,10 @@ final class XmlReader {
                 continue;
             }
             Tag tag = tag();
+            source.places.add(tag.place());
             if (tag.name.equals(PARM)) {
                 Map<String, String> attributes = tag.only(NAME, VALUE);
-                tag.need(attributes, NAME);
+                need(tag, NAME);
                 source.parameter(attributes.get(NAME), attributes.get(VALUE));
                 if (!tag.isEmpty) {
                     between(PARM);
@@ -205,13 +212,19 @@ final class XmlReader {
             }
             tag.require(CHARACTERISTIC);
             Map<String, String> attributes = tag.only(TYPE, null);
-            tag.need(attributes, TYPE);
+            need(tag, TYPE);
             source.characteristic(attributes.get(TYPE));
             if (tag.isEmpty) {
                 source.end();
             } else {
                 ++open;
             }
+        }
+    }
+
+    private void need(Tag tag, String needed) throws EncodingException {
+        if (!isLenient && !tag.attributes.containsKey(needed)) {
+            throw tag.error("<" + tag.name + "> without " + needed, needed);
         }
     }
 
@@ -324,10 +337,8 @@ final class XmlReader {
             return attributes;
         }
 
-        void need(Map<String, String> given, String needed) throws EncodingException {
-            if (!given.containsKey(needed)) {
-                throw error("<" + name + "> without " + needed, needed);
-            }
+        int[] place() {
+            return new int[] {line, column};
         }
     }
 

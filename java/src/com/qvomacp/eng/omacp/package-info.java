@@ -5,14 +5,16 @@
  * <h2>The message and its tree</h2>
  *
  * <p>{@link com.qvomacp.eng.omacp.ProvisioningMessage} has the characteristics of a message by their
- * kinds, such as {@link com.qvomacp.eng.omacp.AccessPoint}, with an accessor for each parameter of the
- * kind: the first one of its name, or a list where there may be several. They are views: {@link
+ * kinds, such as {@link com.qvomacp.eng.omacp.AccessPoint}, with accessors for what messages set in
+ * them: the first parameter of its name, or a list where there may be several; any other parameter is
+ * told by its name. They are views: {@link
  * com.qvomacp.eng.omacp.ProvisioningDocument} is the tree that they look at, with everything that was
  * read. Types and names are compared exactly as OMA writes them.
  *
  * <p>Nothing here runs the native library. What it makes of a message, which is not everywhere what the
  * message says, is a {@link com.qvomacp.eng.omacp.Verdict}; its answers come from the classes of {@link
- * com.qvomacp.eng.parser}.
+ * com.qvomacp.eng.parser}. What is wrong with a message, by rules with names, is a list of {@link
+ * com.qvomacp.eng.omacp.Finding}.
  *
  * <h2>Absent values</h2>
  *

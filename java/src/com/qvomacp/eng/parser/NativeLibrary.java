@@ -2,9 +2,9 @@ package com.qvomacp.eng.parser;
 
 import java.io.IOException;
 import java.io.InputStream;
-import java.io.OutputStream;
 import java.nio.file.Files;
 import java.nio.file.Path;
+import java.nio.file.Paths;
 import java.util.Locale;
 
 /**
@@ -24,6 +24,12 @@ public final class NativeLibrary {
     /** The system property with the path of the library's file: {@value}. */
     public static final String PATH_PROPERTY = "com.qvomacp.library";
 
+    /**
+     * The system property with the folder to unpack the copy to: {@value}. Without it, that is the one
+     * for temporary files. It needs room for the library, and the right to run what is in it.
+     */
+    public static final String FOLDER_PROPERTY = "com.qvomacp.library.folder";
+
     private static final String NAME = "omacp";
 
     private static boolean loaded;
@@ -34,7 +40,8 @@ public final class NativeLibrary {
     /**
      * Makes sure that the library is loaded. It is the file that {@link #PATH_PROPERTY} names; without
      * that property it is looked for in {@code java.library.path} (on Android, in the application),
-     * and else it is the copy beside these classes for the platform that runs.
+     * and else it is the copy beside these classes for the platform that runs, which is unpacked for
+     * as long as loading it takes ({@link #FOLDER_PROPERTY} says where).
      *
      * <p>The first call decides: where it fails, every later one does, with the same cause. A class
      * loader that is not the first to load a file needs a file of its own, such as the copy.
@@ -87,6 +94,10 @@ public final class NativeLibrary {
             case "amd64":
             case "x86_64":
                 return "x86_64";
+            case "arm64":
+                return "aarch64";
+            case "arm":
+                return "armhf";
             default:
                 return architecture.toLowerCase(Locale.ROOT);
         }
@@ -110,15 +121,17 @@ public final class NativeLibrary {
                 if (in == null) {
                     throw error(why + "there is no " + resource + " beside its classes", first);
                 }
-                Path file = Files.createTempFile("lib" + NAME, ".so");
+                // Nobody else may put anything into a folder that is made here.
+                Path folder = newFolder(System.getProperty(FOLDER_PROPERTY));
+                Path file = folder.resolve("lib" + NAME + ".so");
                 try {
-                    fill(file, in);
+                    Files.copy(in, file);
                     load(file, why + "the copy " + resource + " cannot be loaded: ");
                 } finally {
-                    delete(file);
+                    delete(folder, file);
                 }
             } catch (IOException e) {
-                throw error(why + "the copy " + resource + " cannot be unpacked: " + e, e);
+                throw unusable(why + "the copy " + resource + " cannot be unpacked: " + e, e);
             }
         }
 
@@ -126,25 +139,28 @@ public final class NativeLibrary {
             try {
                 System.load(file.toString());
             } catch (UnsatisfiedLinkError e) {
-                throw error(why + e.getMessage(), e);
+                throw unusable(why + e.getMessage(), e);
             }
         }
 
-        /** Writes a file that is there already, with the rights for its owner alone. */
-        private static void fill(Path file, InputStream in) throws IOException {
-            try (OutputStream out = Files.newOutputStream(file)) {
-                byte[] bytes = new byte[1 << 13];
-                for (int count = in.read(bytes); count >= 0; count = in.read(bytes)) {
-                    out.write(bytes, 0, count);
-                }
-            }
+        private static Path newFolder(String parent) throws IOException {
+            return parent == null
+                    ? Files.createTempDirectory(NAME)
+                    : Files.createTempDirectory(Paths.get(parent).toAbsolutePath(), NAME);
         }
 
-        /** Deletes the file, which a loaded library no longer needs, now or when the VM ends. */
-        private static void delete(Path file) {
+        private static UnsatisfiedLinkError unusable(String text, Throwable cause) {
+            return error(text + " (another folder for it is named by " + FOLDER_PROPERTY + ")", cause);
+        }
+
+        /** Deletes the copy, which a loaded library no longer needs, now or when the VM ends. */
+        private static void delete(Path folder, Path file) {
             try {
                 Files.deleteIfExists(file);
+                Files.delete(folder);
             } catch (IOException e) {
+                // What is named last goes first.
+                folder.toFile().deleteOnExit();
                 file.toFile().deleteOnExit();
             }
         }

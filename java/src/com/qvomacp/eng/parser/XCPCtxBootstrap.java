@@ -11,42 +11,24 @@ package com.qvomacp.eng.parser;
  * }</pre>
  */
 public class XCPCtxBootstrap {
-    /** Makes an object to call the natives on; it holds no state. */
-    public XCPCtxBootstrap() {}
-
     /** {@return the number of the BOOTSTRAP of the message} */
     public native int qvomacp_GetPxBootstrapCount();
 
-    /**
-     * {@return the number of PROXY-ID values of a BOOTSTRAP}
-     * @param bootstrap BOOTSTRAP, from 1
-     */
+    /** {@return the number of PROXY-ID values of a BOOTSTRAP} */
     public native int qvomacp_GetPxProxyIdCount(int bootstrap);
 
-    /**
-     * {@return one PROXY-ID of a BOOTSTRAP: its text, or {@code null}}
-     * @param bootstrap BOOTSTRAP, from 1
-     * @param proxyId PROXY-ID of that BOOTSTRAP, from 1
-     */
+    /** {@return one PROXY-ID of a BOOTSTRAP: its text, or {@code null}} */
     public native String qvomacp_GetPxProxyIdData(int bootstrap, int proxyId);
 
-    /**
-     * {@return the number of NETWORK values of a BOOTSTRAP}
-     * @param bootstrap BOOTSTRAP, from 1
-     */
+    /** {@return the number of NETWORK values of a BOOTSTRAP} */
     public native int qvomacp_GetPxNetworkCount(int bootstrap);
 
-    /**
-     * {@return one NETWORK of a BOOTSTRAP: its text, or {@code null}}
-     * @param bootstrap BOOTSTRAP, from 1
-     * @param network NETWORK of that BOOTSTRAP, from 1
-     */
+    /** {@return one NETWORK of a BOOTSTRAP: its text, or {@code null}} */
     public native String qvomacp_GetPxNetworkData(int bootstrap, int network);
 
     /**
      * {@return the parameters of a BOOTSTRAP in 5 elements: 0 NAME, 1 COUNTRY, 2 PROVURL, 3
      * CONTEXT-ALLOW, 4 always {@code null}; or {@code null}}
-     * @param bootstrap BOOTSTRAP, from 1
      */
     public native String[] qvomacp_GetBootstrapData(int bootstrap);
 }

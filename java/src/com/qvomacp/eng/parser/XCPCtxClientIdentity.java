@@ -9,9 +9,6 @@ package com.qvomacp.eng.parser;
  * }</pre>
  */
 public class XCPCtxClientIdentity {
-    /** Makes an object to call the natives on; it holds no state. */
-    public XCPCtxClientIdentity() {}
-
     /**
      * {@return the CLIENT-ID of the CLIENTIDENTITY: its text; {@code null} when there is no
      * CLIENTIDENTITY or it sets no CLIENT-ID}

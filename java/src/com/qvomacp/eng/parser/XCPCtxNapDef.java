@@ -15,26 +15,16 @@ package com.qvomacp.eng.parser;
  * }</pre>
  */
 public class XCPCtxNapDef {
-    /** Makes an object to call the natives on; it holds no state. */
-    public XCPCtxNapDef() {}
-
     /**
-     * {@return the number of the NAPDEF of the message, from the one on that
-     * {@link #qvomacp_SetPxNapDefIndex} has made the first}
+     * {@return the number of the NAPDEF of the message, from the one on that {@link
+     * #qvomacp_SetPxNapDefIndex} has made the first}
      */
     public native int qvomacp_GetPxNapDefCount();
 
-    /**
-     * {@return the number of DNS-ADDR values of an access point}
-     * @param napDef NAPDEF, from 1
-     */
+    /** {@return the number of DNS-ADDR values of an access point} */
     public native int qvomacp_GetPxDnsAddrCount(int napDef);
 
-    /**
-     * {@return one DNS-ADDR of an access point: its text, or {@code null}}
-     * @param napDef NAPDEF, from 1
-     * @param address DNS-ADDR of that access point, from 1
-     */
+    /** {@return one DNS-ADDR of an access point: its text, or {@code null}} */
     public native String qvomacp_GetPxDnsAddrData(int napDef, int address);
 
     /**
@@ -44,8 +34,6 @@ public class XCPCtxNapDef {
      * the next parse: every native of this class counts from the new first one, so that a second
      * call with 2 moves on by one more. An index that finds nothing (0 and negative ones too)
      * leaves no access point at all.
-     *
-     * @param napDef NAPDEF, from 1, counted from the present first one
      */
     public native void qvomacp_SetPxNapDefIndex(int napDef);
 
@@ -54,7 +42,6 @@ public class XCPCtxNapDef {
      *
      * <p>Unlike its siblings, an index of 0 or below answers for the first access point.
      *
-     * @param napDef NAPDEF, from 1
      * @return their number
      */
     public native int qvomacp_GetPxBearerCount(int napDef);
@@ -66,16 +53,11 @@ public class XCPCtxNapDef {
      * {@code GSM-GPRS}, or {@code Unkown Bearer} for a token that is none. A bearer that the
      * message gives as text answers not that text but the NAP-ADDRESS of the access point.
      *
-     * @param napDef NAPDEF, from 1
-     * @param bearer BEARER of that access point, from 1
      * @return the name, or {@code null}
      */
     public native String qvomacp_GetPxBearerData(int napDef, int bearer);
 
-    /**
-     * {@return the number of NAPAUTHINFO of an access point}
-     * @param napDef NAPDEF, from 1
-     */
+    /** {@return the number of NAPAUTHINFO of an access point} */
     public native int qvomacp_GetPxNapAuthInfoCount(int napDef);
 
     /**
@@ -85,39 +67,23 @@ public class XCPCtxNapDef {
      * {@code WTLS-SS} and {@code MD5}, and {@code NONE} for any other value that the message gives:
      * for the token of WTLS-SS too, which the library holds under a name with an underscore.
      *
-     * @param napDef NAPDEF, from 1
-     * @param authInfo NAPAUTHINFO of that access point, from 1
      * @return 5 elements: 0 AUTHTYPE as a name, 1 AUTHNAME, 2 AUTHSECRET, 3 reserved (no parameter
      *     fills it), 4 always {@code null}; or {@code null}
      */
     public native String[] qvomacp_GetPxNapAuthInfoData(int napDef, int authInfo);
 
-    /**
-     * {@return the number of AUTH-ENTITY values of a NAPAUTHINFO}
-     * @param napDef NAPDEF, from 1
-     * @param authInfo NAPAUTHINFO of that access point, from 1
-     */
+    /** {@return the number of AUTH-ENTITY values of a NAPAUTHINFO} */
     public native int qvomacp_GetPxNapAuthEntityCount(int napDef, int authInfo);
 
-    /**
-     * {@return one AUTH-ENTITY of a NAPAUTHINFO: its text, or {@code null}}
-     * @param napDef NAPDEF, from 1
-     * @param authInfo NAPAUTHINFO of that access point, from 1
-     * @param entity AUTH-ENTITY of that NAPAUTHINFO, from 1
-     */
+    /** {@return one AUTH-ENTITY of a NAPAUTHINFO: its text, or {@code null}} */
     public native String qvomacp_GetPxAuthInfopAuthEntityData(int napDef, int authInfo, int entity);
 
-    /**
-     * {@return the number of VALIDITY of an access point}
-     * @param napDef NAPDEF, from 1
-     */
+    /** {@return the number of VALIDITY of an access point} */
     public native int qvomacp_GetPxNapValidityCount(int napDef);
 
     /**
-     * {@return one VALIDITY of an access point in 6 elements: 0 COUNTRY, 1 NETWORK, 2 SID, 3 SOC, 4
-     * VALIDUNTIL, 5 always {@code null}; or {@code null}}
-     * @param napDef NAPDEF, from 1
-     * @param validity VALIDITY of that access point, from 1
+     * {@return one VALIDITY of an access point in 6 elements: 0 COUNTRY, 1 NETWORK, 2 SID, 3 SOC,
+     * 4 VALIDUNTIL, 5 always {@code null}; or {@code null}}
      */
     public native String[] qvomacp_GetPxValidityData(int napDef, int validity);
 
@@ -145,7 +111,6 @@ public class XCPCtxNapDef {
      * REREG-THRESHOLD, 26 (25) T-BIT, 27 (26) INIT, which is the text {@code empty} when the
      * message has it without a value and {@code null} otherwise.
      *
-     * @param napDef NAPDEF, from 1
      * @return 29 elements, or {@code null}
      */
     public native String[] qvomacp_GetPxNapDefData(int napDef);

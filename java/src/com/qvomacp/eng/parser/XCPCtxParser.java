@@ -15,9 +15,6 @@ package com.qvomacp.eng.parser;
  * }</pre>
  */
 public class XCPCtxParser {
-    /** Makes an object to call the natives on; it holds no state. */
-    public XCPCtxParser() {}
-
     /**
      * Parses a pushed message: its push header and, unless only the header is wanted, its body.
      *
@@ -40,11 +37,11 @@ public class XCPCtxParser {
     public native void qvomacp_parser_del();
 
     /**
-     * {@return the content type of the push, as its well-known number: 54
-     * {@code application/vnd.wap.connectivity-wbxml}, 53
-     * {@code application/vnd.wap.connectivity-xml}, 68 {@code application/vnd.syncml.notification},
-     * 78 {@code application/vnd.syncml.ds.notification}, 66
-     * {@code application/vnd.syncml.dm+wbxml}; -1 without a parsed header}
+     * {@return the content type of the push, as its well-known number: 54 {@code
+     * application/vnd.wap.connectivity-wbxml}, 53 {@code application/vnd.wap.connectivity-xml}, 68
+     * {@code application/vnd.syncml.notification}, 78 {@code
+     * application/vnd.syncml.ds.notification}, 66 {@code application/vnd.syncml.dm+wbxml}; -1
+     * without a parsed header}
      */
     public native int qvomacp_GetParserContentType();
 

@@ -11,9 +11,6 @@ package com.qvomacp.eng.parser;
  * }</pre>
  */
 public class XCPCtxVendorConfig {
-    /** Makes an object to call the natives on; it holds no state. */
-    public XCPCtxVendorConfig() {}
-
     /** {@return the number of the VENDORCONFIG of the message} */
     public native int qvomacp_GetPxVenderConfigCount();
 
@@ -24,7 +21,6 @@ public class XCPCtxVendorConfig {
      * and its value is element 2. When the last one has no value, element 2 is that of the one
      * before.
      *
-     * @param vendorConfig VENDORCONFIG, from 1
      * @return 4 elements: 0 NAME, 1 the name of the vendor's parameter, 2 its value, 3 always
      *     {@code null}; or {@code null}
      */

@@ -11,16 +11,12 @@ package com.qvomacp.eng.parser;
  * }</pre>
  */
 public class XCPCtxVoWifi {
-    /** Makes an object to call the natives on; it holds no state. */
-    public XCPCtxVoWifi() {}
-
     /** {@return the number of the voice-over-Wi-Fi characteristics of the message} */
     public native int qvomacp_GetPxVoWifiCount();
 
     /**
-     * {@return the parameter of a voice-over-Wi-Fi characteristic in 2 elements: 0
-     * {@code ePDG FQDN}, 1 always {@code null}; or {@code null}}
-     * @param voWifi the characteristic, from 1
+     * {@return the parameter of a voice-over-Wi-Fi characteristic in 2 elements: 0 {@code ePDG
+     * FQDN}, 1 always {@code null}; or {@code null}}
      */
     public native String[] qvomacp_GetPxVoWifiData(int voWifi);
 }

@@ -11,9 +11,6 @@ package com.qvomacp.eng.parser;
  * }</pre>
  */
 public class XCPCtxWifi {
-    /** Makes an object to call the natives on; it holds no state. */
-    public XCPCtxWifi() {}
-
     /** {@return the number of the WI-FI of the message} */
     public native int qvomacp_GetPxWifiCount();
 
@@ -21,7 +18,6 @@ public class XCPCtxWifi {
      * {@return the parameters of a WI-FI in 13 elements: 0 NETSSID, 1 SECMODE, 2 EAPMETHOD, 3
      * EAPTYPE, 4 USERNAME, 5 ANONUSERNAME, 6 PASSWORD, 7 CACERT, 8 USERCERT, 9 PHASE1, 10
      * AUTHALGORITHM, 11 PRIORITY, 12 always {@code null}; or {@code null}}
-     * @param wifi WI-FI, from 1
      */
     public native String[] qvomacp_GetPxWifiData(int wifi);
 }

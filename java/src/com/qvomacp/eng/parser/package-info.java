@@ -23,7 +23,8 @@
  * <h2>Rules that all queries share</h2>
  *
  * <ul>
- *   <li>Every index counts from 1, in the order of the message. An index of 0, a negative one and
+ *   <li>An argument has the name of what it counts, within the record that those before it choose.
+ *       Every index counts from 1, in the order of the message. An index of 0, a negative one and
  *       one beyond the last record or value find nothing.
  *   <li>A count answers 0 when the record that it asks about is not there.
  *   <li>A single text is {@code null} when it is not there.

@@ -179,7 +179,7 @@ class AnswersTest extends Natives {
                 !       SERVICE  CO-WSP  (the message says "hp-SERVICE")
                 !   INIT                 empty  (the message gives no value)
                 !     AUTHTYPE     NONE  (the message says "na-AUTHTYPE")
-                -   NAP-ADDRTYPE  n-NAP-ADDRTYPE
+                -   NAP-ADDRTYPE         n-NAP-ADDRTYPE
                 !   RULE  x-RULE  (the message does not say it)
                 !   APPID  x-APPID  (the message does not say it)
                 !   PORTNBR  x-PORTNBR  (the message does not say it)
@@ -202,6 +202,17 @@ class AnswersTest extends Natives {
         String nothing = "\nThe native library answers nothing: it refuses the message.\n";
         assertTrue(program.output().endsWith(nothing), program.output());
         program = Program.run(body, "--answers", "--json-lines");
+        assertEquals("it refuses the message", program.json().get("unanswered"));
+    }
+
+    @Test
+    void areNoneWhereNothingCanBeRead() {
+        byte[] push = HexFormat.of().parseHex("010601b6" + "09090909");
+        Program program = Program.run(push, "--answers");
+        assertEquals(1, program.status());
+        String nothing = "\nThe native library answers nothing: it refuses the message.\n";
+        assertTrue(program.output().endsWith(nothing), program.output());
+        program = Program.run(push, "--answers", "--json");
         assertEquals("it refuses the message", program.json().get("unanswered"));
     }
 

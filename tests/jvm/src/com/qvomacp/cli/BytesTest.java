@@ -98,6 +98,10 @@ class BytesTest {
                     case "characteristics" -> new byte[] {(byte) 0xC6, 0x55, 1};
                     case "unknown tokens" -> new byte[] {(byte) 0x87, (byte) 0x99, 1};
                     case "page switches" -> new byte[] {0, 1};
+                    case "types unknown to the library" ->
+                            new byte[] {(byte) 0xC6, 0x50, 3, 'a', 0, 1, 1};
+                    case "names of another page" ->
+                            new byte[] {(byte) 0xC6, 0x5B, 1, (byte) 0x87, 0x36, 1, 1};
                     default -> new byte[] {3, 'a', 0};
                 };
         while (body.size() + piece.length <= MIB) {
@@ -141,6 +145,8 @@ class BytesTest {
                 "characteristics",
                 "unknown tokens",
                 "page switches",
+                "types unknown to the library",
+                "names of another page",
                 "texts"
             })
     void listsAMegabyteOfAnything(String family) throws Exception {

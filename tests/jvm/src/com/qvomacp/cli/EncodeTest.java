@@ -342,6 +342,29 @@ class EncodeTest {
     }
 
     @Test
+    void notesThatTheMessageWhichItReadsIsDamaged() throws Exception {
+        for (String[] each :
+                new String[][] {
+                    {"030B6A0045C65501873606036100010101", ""},
+                    {"030B7F0045C65501873606036100010101", "departs from the format in 1 place"},
+                    {"030B6A0045C65501873006010101", "is refused by the library"},
+                    {
+                        "030B7F0045C655018736060361000101",
+                        "departs from the format in 2 places and is refused by the library"
+                    }
+                }) {
+            encode(each[0].getBytes(StandardCharsets.UTF_8), "--hex", "--body");
+            String note =
+                    "omacp: standard input: note: what is read " + each[1] + "; only what it sets is encoded";
+            String takes = "omacp: standard input: " + TAKES;
+            assertEquals(each[1].isEmpty() ? takes.strip() : note, errors.lines().findFirst().get());
+            boolean isWrittenToo = each[1].startsWith("is");
+            assertEquals(isWrittenToo ? 1 : 0, status);
+            assertEquals(isWrittenToo, !errors.endsWith(takes), errors);
+        }
+    }
+
+    @Test
     void saysThatTheLibraryRefusesWhatWasWritten() {
         encode(xml("<parm name=\"NAPID\" value=\"N\"/><parm name=\"CLIENT-ID\" value=\"x\"/>"), "--tokens=oma");
         assertEquals(1, status, errors);

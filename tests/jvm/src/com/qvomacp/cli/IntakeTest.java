@@ -166,13 +166,17 @@ class IntakeTest {
     }
 
     @ParameterizedTest
-    @ValueSource(strings = {"04", "05", "06", "07", "14", "15", "F4", "F5", "F6", "F7"})
-    void takesEightBitDataOfEveryClass(String coding) {
+    @ValueSource(strings = {"04", "F4", "F5", "F6", "F7"})
+    void takesEightBitData(String coding) {
         assertPush(take(new Sms().coding(coding).deliver(oneSms())));
     }
 
     @ParameterizedTest
-    @CsvSource({"00, 7-bit text", "F0, 7-bit text", "08, UCS-2 text", "24, compressed text"})
+    @CsvSource({
+        "00, 7-bit text", "F0, 7-bit text", "F3, 7-bit text", "C0, 7-bit text", "0C, 7-bit text",
+        "08, UCS-2 text", "E0, UCS-2 text", "24, compressed text", "05, 8-bit data", "06, 8-bit data",
+        "07, 8-bit data", "14, 8-bit data", "15, 8-bit data", "44, 8-bit data", "FC, 8-bit data"
+    })
     void namesOtherCodings(String coding, String name) {
         byte[] data = oneSms();
         boolean isSeptets = name.startsWith("7");
@@ -412,7 +416,29 @@ class IntakeTest {
         assertPush(takeText(Base64.getEncoder().encodeToString(new Sms().deliver(oneSms()))));
     }
 
+    /** A cell of a dump of characters. */
+    private static String cell(byte b) {
+        int escape = "\0\u0007\b\t\n\u000b\f\r".indexOf(b);
+        String shown = b > ' ' - 1 && b < 0x7F ? "" + (char) b : String.format("%03o", b);
+        return String.format(" %3s", escape < 0 ? shown : "\\" + "0abtnvfr".charAt(escape));
+    }
+
+    private static String bits(byte[] bytes) {
+        StringBuilder text = new StringBuilder();
+        for (int at = 0; at < bytes.length; at += 6) {
+            text.append(String.format("%08x:", at));
+            for (int i = at; i < Math.min(at + 6, bytes.length); ++i) {
+                text.append(' ').append(Integer.toBinaryString(0x100 | bytes[i] & 0xFF).substring(1));
+            }
+            text.append(" ".repeat(Math.max(0, at + 6 - bytes.length) * 9)).append("  ......\n");
+        }
+        return text.toString();
+    }
+
     private static String dump(byte[] bytes, String style) {
+        if (style.equals("xxd -b")) {
+            return bits(bytes);
+        }
         StringBuilder text = new StringBuilder();
         for (int at = 0; at < bytes.length; at += 16) {
             int count = Math.min(16, bytes.length - at);
@@ -463,6 +489,16 @@ class IntakeTest {
                     }
                     text.append('\n');
                     break;
+                case "od -c":
+                case "od -An -c":
+                case "hexdump -c":
+                    String format = style.equals("od -c") ? "%07o" : "%07x";
+                    text.append(style.equals("od -An -c") ? "" : String.format(format, at));
+                    for (int i = 0; i < count; ++i) {
+                        text.append(cell(bytes[from + i]));
+                    }
+                    text.append(style.equals("hexdump -c") ? "    ".repeat(16 - count) : "").append('\n');
+                    break;
                 case "od -b":
                     text.append(String.format("%07o", at));
                     for (int i = 0; i < count; ++i) {
@@ -497,7 +533,10 @@ class IntakeTest {
             case "hexdump -C":
                 return "%08x%n";
             case "hexdump":
+            case "hexdump -c":
                 return "%07x%n";
+            case "od -An -c":
+                return "";
             case "od -A x -t x1":
             case "od -A x -t x1z":
                 return "%06x%n";
@@ -512,7 +551,8 @@ class IntakeTest {
     @ValueSource(
             strings = {
                 "hexdump -C", "xxd", "od -t x1", "od -A x -t x1", "od -A d -t x1",
-                "od -A x -t x1z", "hexdump", "od -x", "od", "od -b", "packets"
+                "od -A x -t x1z", "hexdump", "od -x", "od", "od -b", "packets", "od -c", "od -An -c",
+                "hexdump -c", "xxd -b"
             })
     void readsDumpsWithOffsetsAndCharacters(String style) {
         assertPush(takeText(dump(PUSH, style)));
@@ -523,6 +563,46 @@ class IntakeTest {
             byte[] cut = Arrays.copyOf(PUSH, length);
             assertMessage(cut, true, takeText(dump(cut, style)));
         }
+    }
+
+    @Test
+    void readsCharactersOfEveryKindInADump() {
+        byte[] push = PUSH.clone();
+        for (int value = 0; value < 256; ++value) {
+            push[30] = (byte) value;
+            for (String style : List.of("od -c", "od -An -c", "hexdump -c", "xxd -b")) {
+                assertMessage(push, true, takeText(dump(push, style)));
+            }
+        }
+    }
+
+    @ParameterizedTest
+    @ValueSource(
+            strings = {
+                // od -a, od -d, od -t u1, od -t x1c, hexdump -d, od -t o4; od -t u1 and -d without offsets
+                "0000000   S ack   /  us   -   6 dc1 soh dc2   C   7   A   1   A   9   0\n"
+                        + "0000020   E   F   3   B   5   0   3   6   D\n0000031\n",
+                "0000000  1619  7983 13869   401 17298 16695 16689 12345\n"
+                        + "0000020 17989 16947 12341 13872 00068\n0000031\n",
+                "0000000   1   6  47  31  45 182 145 128 146  67  55  65  49  65  57  48\n"
+                        + "0000020  69  70  51  66  53  48  51  54  68\n0000031\n",
+                "0000000  01  06  2f  1f  2d  b6  91  80  92  43  37  41  31  41  39  30\n"
+                        + "        001 006   /  us   - 266 221 200 222   C   7   A   1   A   9   0\n"
+                        + "0000020  45  46  33\n          E   F   3\n0000023\n",
+                "0000000   01537   07983   46637   32913   17298   16695   16689   12345\n"
+                        + "0000010   17989   16947   12341   13872   00068                        \n"
+                        + "0000019\n",
+                "0000000 03713603001 20044333055 10131641222 06016240461\n"
+                        + "0000020 10214643105 15000630065\n0000030\n",
+                "   1   6  47  31  45 182 145 128 146  67  55  65  49  65  57  48\n  69 170   1   6 128\n",
+                "  1537  7983 46637 32913 17298 16695 16689 12345\n 17989 16947 12341\n",
+                "[1, 6, 47, 31, 45, -74, -111, -128]\n"
+            })
+    void namesADumpOfAnythingElseThanBytes(String dump) {
+        assertRefused("numbers or a dump, and not bytes as", takeText(dump));
+        List<Held> held = takeText(dump + "\npush: " + Sms.hex(PUSH) + "\n");
+        assertEquals(2, held.size());
+        assertPush(held.subList(1, 2));
     }
 
     @Test

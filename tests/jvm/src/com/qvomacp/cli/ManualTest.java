@@ -1,13 +1,18 @@
 package com.qvomacp.cli;
 
 import static org.junit.jupiter.api.Assertions.assertEquals;
+import static org.junit.jupiter.api.Assertions.assertFalse;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
+import com.qvomacp.eng.omacp.Rule;
 import java.io.ByteArrayInputStream;
 import java.io.ByteArrayOutputStream;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.Path;
+import java.util.EnumMap;
+import java.util.Locale;
+import java.util.Map;
 import java.util.Set;
 import java.util.TreeSet;
 import java.util.concurrent.TimeUnit;
@@ -26,7 +31,7 @@ class ManualTest {
 
     private static Set<String> options() {
         Set<String> options = new TreeSet<>();
-        CommandLine program = Main.program();
+        CommandLine program = Usage.program();
         for (OptionSpec option : program.getCommandSpec().options()) {
             options.addAll(Set.of(option.names()));
         }
@@ -65,7 +70,7 @@ class ManualTest {
     @Test
     void theManualHasTheCommands() throws Exception {
         assertEquals(
-                new TreeSet<>(Main.program().getSubcommands().keySet()),
+                new TreeSet<>(Usage.program().getSubcommands().keySet()),
                 found("\n\\.TP\n\\.B (\\w+)\n", section("COMMANDS")));
     }
 
@@ -73,12 +78,28 @@ class ManualTest {
     void theManualHasTheExitStatuses() throws Exception {
         assertEquals(
                 new TreeSet<>(
-                        Main.program()
+                        Usage.program()
                                 .getCommandSpec()
                                 .usageMessage()
                                 .exitCodeList()
                                 .keySet()),
                 found("\n\\.TP\n\\.B (\\d)\n", section("\"EXIT STATUS\"")));
+    }
+
+    @Test
+    void theManualHasTheRulesByTheirSeverity() throws Exception {
+        Map<Rule.Severity, Set<String>> rules = new EnumMap<>(Rule.Severity.class);
+        for (Rule rule : Rule.values()) {
+            rules.computeIfAbsent(rule.severity(), severity -> new TreeSet<>()).add(rule.ruleName());
+        }
+        Map<Rule.Severity, Set<String>> told = new EnumMap<>(Rule.Severity.class);
+        for (Rule.Severity severity : Rule.Severity.values()) {
+            String[] paragraphs = section("RULES").toLowerCase(Locale.ROOT).split("\n\\.pp\n");
+            String bold = String.join(" ", found("(?m)^\\.br? (.*)$", paragraphs[severity.ordinal()]));
+            told.put(severity, found("(?<![\\w-])([a-z]+(?:-[a-z]+)*)", bold));
+            told.get(severity).remove("and");
+        }
+        assertEquals(rules, told);
     }
 
     @Test
@@ -95,17 +116,22 @@ class ManualTest {
         String script = out.toString(StandardCharsets.UTF_8);
         assertTrue(found("(?<![\\w-])(--?[a-zA-Z][a-zA-Z0-9-]*)", script).containsAll(options()), script);
         Path file = Files.writeString(directory.resolve("completion"), script);
-        String ask =
-                "source "
-                        + file
-                        + " && COMP_WORDS=(omacp show --by) COMP_CWORD=2"
-                        + " && _complete_omacp && echo \"${COMPREPLY[@]}\"";
+        assertEquals("--bytes\n", completed(file, "COMP_WORDS=(omacp show --by) COMP_CWORD=2"));
+        // Without a command, show is meant.
+        assertEquals("--bytes\n", completed(file, "COMP_WORDS=(omacp --by) COMP_CWORD=1"));
+        assertEquals("push\n", completed(file, "COMP_WORDS=(omacp --as pu) COMP_CWORD=2"));
+        assertFalse(script.contains("compopt +o default"), "files are completed, too");
+        assertEquals("verify\n", completed(file, "COMP_WORDS=(omacp ver) COMP_CWORD=1"));
+    }
+
+    private static String completed(Path script, String line) throws Exception {
+        String ask = "source " + script + " && " + line + " && _complete_omacp && echo \"${COMPREPLY[@]}\"";
         Process bash =
                 new ProcessBuilder("bash", "--norc", "-c", ask)
                         .redirectError(ProcessBuilder.Redirect.DISCARD)
                         .start();
         String answer = new String(bash.getInputStream().readAllBytes(), StandardCharsets.UTF_8);
         assertTrue(bash.waitFor(10, TimeUnit.SECONDS));
-        assertEquals("--bytes\n", answer);
+        return answer;
     }
 }

@@ -26,6 +26,8 @@ import java.util.Map;
 import java.util.regex.Pattern;
 import org.junit.jupiter.api.Test;
 import org.junit.jupiter.api.io.TempDir;
+import org.junit.jupiter.params.ParameterizedTest;
+import org.junit.jupiter.params.provider.CsvSource;
 
 /** What the program shows of bytes, of several files, of bodies alone and of refused messages. */
 class ShowTest {
@@ -133,12 +135,42 @@ class ShowTest {
         assertTrue(words.contains("03 78 00 \"x\", inline"), output);
     }
 
+    @ParameterizedTest
+    @CsvSource({
+        "030b6a0045 06 01, characteristic the library takes the next END for its own 0006",
+        "030b6a05 6162636400 45 8301 c65501 871106037800 01 01 01, '000A 83 01 \"bcd\", table the"
+                + " library skips 11 bytes from here on, all up to a zero byte, as one text 000C'",
+        "000b00 45 c65501 871106037800 01 01 01, string table: 0 bytes the library reads a character"
+                + " set 0003 45 wap-provisioningdoc the library reads 69 as the length of the string"
+                + " table 0004",
+        "030b6a0045 030a00 c65501 01 01, 'inline the library skips 3 bytes from here on, as a text'",
+        "030b6a0045 c65b01 873606037700 01 01 01, 0008 87 parm the library reads a parm APPID 0009",
+        "030b6a0045 c6500341505053000101 01, characteristic the library knows no such TYPE 0006",
+        "030b6a0045 c65501 8711068001 01 01 01, 0008 87 parm the library ends this 1 byte earlier 0009",
+    })
+    void tellsInTheListingWhatTheLibraryReadsOtherwise(String hex, String told) {
+        run(HexFormat.of().parseHex(hex.replace(" ", "")), "--bytes");
+        String words = output.replaceAll("\\s+", " ");
+        assertTrue(words.contains(told), output);
+        assertTrue(output.lines().allMatch(line -> Visible.columns(line) <= 80), output);
+    }
+
     @Test
-    void marksInTheListingWhatTheLibraryReadsOtherwise() {
-        byte[] body = HexFormat.of().parseHex("030b6a05616263640045830" + "1c65501871106037800010101");
-        assertEquals(1, run(body, "--bytes"));
-        assertTrue(output.contains("the library reads this otherwise\n"), output);
-        assertTrue(output.contains("TYPE = \"NAPDEF\""), output);
+    void listsADocumentWithTooMuchTextUpToWhereItIsTooMuch() {
+        ByteArrayOutputStream body = new ByteArrayOutputStream();
+        body.writeBytes(HexFormat.of().parseHex("030b6a81e848"));
+        body.writeBytes("x".repeat(29768).getBytes());
+        body.writeBytes(HexFormat.of().parseHex("45c65501"));
+        for (int i = 0; i < 300; ++i) {
+            body.writeBytes(HexFormat.of().parseHex("871106830001"));
+        }
+        body.writeBytes(HexFormat.of().parseHex("0101"));
+        assertEquals(2, run(body.toByteArray(), "--bytes"));
+        assertTrue(output.contains("NAME = \"NAPID\"\n"), output);
+        assertTrue(output.contains("table: 29768 bytes"), output);
+        int limit = 8 << 20;
+        assertEquals(limit / 29768 + 1, output.split("VALUE\n", -1).length - 1);
+        assertTrue(output.contains(" not read\n"), output);
     }
 
     @Test

@@ -93,19 +93,13 @@ class ExamplesTest {
 
     /** A document with a characteristic of each kind that the examples look into. */
     private static byte[] push() {
-        Document.Element wlan =
-                Document.characteristic(
-                        "WLAN",
-                        Document.characteristic("SEC-SSID"),
-                        Document.characteristic("EAP", Document.characteristic("CERT")),
-                        Document.characteristic("WEPKEY"));
         Document.Element authentication = Document.characteristic("NAPAUTHINFO");
         Document.Element validity = Document.characteristic("VALIDITY");
         return Push.secured(
                 Push.SEC_USERPIN,
                 "00",
                 Document.document(
-                        Document.characteristic("NAPDEF", authentication, validity, wlan),
+                        Document.characteristic("NAPDEF", authentication, validity),
                         Document.characteristic(
                                 "PXLOGICAL",
                                 Document.characteristic("PXAUTHINFO"),

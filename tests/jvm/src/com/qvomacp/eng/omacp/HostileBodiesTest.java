@@ -156,7 +156,7 @@ class HostileBodiesTest {
 
     /** Requires that items stand in order, inside of what they stand in. */
     private static void requireOrder(ProvisioningDocument document) {
-        Item root = document.itemAt(0);
+        Item root = document.root();
         Walk walk = new Walk(root);
         for (Item item; (item = walk.next()) != null; ) {
             int at = item.offset();

@@ -17,6 +17,7 @@ import com.qvomacp.support.Push;
 import java.io.ByteArrayOutputStream;
 import java.nio.file.Files;
 import java.nio.file.Path;
+import java.util.ArrayList;
 import java.util.Arrays;
 import java.util.Collections;
 import java.util.HexFormat;
@@ -39,7 +40,7 @@ class VerdictTest {
         } catch (ProvisioningException unreadable) {
             // The verdict is on bytes that nobody else can read, too.
         }
-        return LibraryRules.verdictOnBody(body, document);
+        return Verdict.onBody(body, document);
     }
 
     private static Verdict of(String hex) {
@@ -51,7 +52,7 @@ class VerdictTest {
     }
 
     private static Verdict ofPush(byte[] push) {
-        return LibraryRules.verdictOnPush(push, push.length, null);
+        return Verdict.onPush(push, push.length, null);
     }
 
     private static void assertRefused(Verdict verdict, int code, int offset, String reason) {
@@ -310,6 +311,39 @@ class VerdictTest {
         assertEquals(List.of(), verdict.readOtherwise());
     }
 
+    @Test
+    void tellsWhatIsReadInTheOrderOfTheBody() throws Exception {
+        Random random = new Random(12);
+        byte[] push = Files.readAllBytes(Path.of("samples", "everything.push"));
+        int compared = 0;
+        for (int i = 0; i < 5000; ++i) {
+            byte[] body = Arrays.copyOfRange(push, 3 + push[2], push.length);
+            for (int n = 1 + i % 3; n > 0; --n) {
+                body[random.nextInt(body.length)] = (byte) random.nextInt(256);
+            }
+            Verdict verdict;
+            try {
+                verdict = ProvisioningDocument.parse(body).verdict();
+            } catch (ProvisioningException noDocument) {
+                continue;
+            }
+            List<Integer> offsets = new ArrayList<>();
+            List<Item> otherwise =
+                    verdict.describeOtherwise(
+                            (offset, length, depth, meaning) -> {
+                                assertTrue(length > 0 && offset + length <= body.length + 1);
+                                assertTrue(meaning.startsWith("the library "), meaning);
+                                assertFalse(meaning.contains("null"), meaning);
+                                offsets.add(offset);
+                            });
+            assertEquals(verdict.readOtherwise(), otherwise);
+            assertEquals(offsets.stream().sorted().toList(), offsets);
+            compared += otherwise.isEmpty() ? 0 : 1;
+            assertTrue(otherwise.isEmpty() || !offsets.isEmpty(), HexFormat.of().formatHex(body));
+        }
+        assertTrue(compared > 300, compared + " are read otherwise");
+    }
+
     // ---- Limits
 
     @Test
@@ -324,7 +358,7 @@ class VerdictTest {
             body.writeBytes(HexFormat.of().parseHex("8300"));
         }
         body.writeBytes(HexFormat.of().parseHex("01010101"));
-        Verdict verdict = LibraryRules.verdictOnBody(body.toByteArray(), null);
+        Verdict verdict = Verdict.onBody(body.toByteArray(), null);
         assertRefused(verdict, 4111, 60291, "the body is decoded to too much text");
         assertEquals("QVS_ERROR_NO_MEMORY", verdict.codeName());
         assertEquals("wap-provisioningdoc / NAPDEF 1 / NAME", verdict.path());
@@ -345,7 +379,7 @@ class VerdictTest {
         Thread thread =
                 new Thread(
                         null,
-                        () -> verdict[0] = LibraryRules.verdictOnBody(body, null),
+                        () -> verdict[0] = Verdict.onBody(body, null),
                         "small stack",
                         SMALL_STACK);
         thread.start();
@@ -425,7 +459,7 @@ class VerdictTest {
         ProvisioningDocument document = ProvisioningDocument.parse(body);
         assertEquals(
                 document.verdict(),
-                LibraryRules.verdictOnPush(Push.push(body), 4, document));
+                Verdict.onPush(Push.push(body), 4, document));
     }
 
     /** A length of more than 127 takes two bytes, of which the library reads one. */
@@ -437,7 +471,7 @@ class VerdictTest {
         byte[] body = document(characteristic("PORT"));
         push.writeBytes(body);
         Verdict verdict =
-                LibraryRules.verdictOnPush(
+                Verdict.onPush(
                         push.toByteArray(), 4 + 0xB6, ProvisioningDocument.parse(body));
         assertFalse(verdict.isAccepted());
         assertTrue(

@@ -207,6 +207,12 @@ class NativeLibraryTest {
                     NativeLibrary.resource("Linux", x86_64));
         }
         assertEquals(
+                "/com/qvomacp/eng/native/linux-armhf/libomacp.so",
+                NativeLibrary.resource("Linux", "arm"));
+        assertEquals(
+                "/com/qvomacp/eng/native/linux-aarch64/libomacp.so",
+                NativeLibrary.resource("Linux", "arm64"));
+        assertEquals(
                 "/com/qvomacp/eng/native/macosx-aarch64/libomacp.so",
                 NativeLibrary.resource("Mac OS X", "aarch64"));
     }
@@ -219,6 +225,20 @@ class NativeLibraryTest {
     @Test
     void comesFromTheCopyWithoutALibraryPath() throws Exception {
         assertEquals(parsedBy(1), runWithoutPath(classes(Files.readAllBytes(library()))));
+    }
+
+    @Test
+    void unpacksTheCopyIntoTheFolderOfTheProperty() throws Exception {
+        Path folder = Files.createDirectory(directory.resolve("to unpack"));
+        String property = NativeLibrary.FOLDER_PROPERTY + "=" + folder;
+        byte[] copy = Files.readAllBytes(library());
+        assertEquals(parsedBy(1), runWithoutPath(property, classes(copy)));
+        // Only an empty folder can be deleted.
+        Files.delete(folder);
+        String failure = failure(runWithoutPath(property, classes(copy)));
+        assertTrue(failure.contains("cannot be unpacked: "), failure);
+        assertTrue(failure.contains(folder.toString()), failure);
+        assertTrue(failure.endsWith("named by " + NativeLibrary.FOLDER_PROPERTY + ")"), failure);
     }
 
     @Test
@@ -271,6 +291,7 @@ class NativeLibraryTest {
         String failure = failure(List.of(output.split("\n")));
         assertTrue(
                 failure.contains("; and the copy " + resource() + " cannot be loaded: "), failure);
+        assertTrue(failure.endsWith("named by " + NativeLibrary.FOLDER_PROPERTY + ")"), failure);
     }
 
     @ParameterizedTest

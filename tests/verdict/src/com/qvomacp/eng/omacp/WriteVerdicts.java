@@ -102,13 +102,13 @@ final class WriteVerdicts {
     }
 
     private void body(byte[] body) throws IOException {
-        Verdict verdict = LibraryRules.verdictOnBody(body, null);
+        Verdict verdict = Verdict.onBody(body, null);
         write('B', body, verdict.isAccepted(), verdict.code(), verdict.bytesRead());
     }
 
     private void header(byte[] push) throws IOException {
         LibraryHeader header = LibraryHeader.of(push);
-        write('H', push, header.isTaken(), 0, header.bodyAt);
+        write('H', push, header.refusal == null, 0, header.bodyAt);
     }
 
     private void write(char kind, byte[] bytes, boolean taken, int code, int read)

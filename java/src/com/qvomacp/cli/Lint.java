@@ -1,0 +1,136 @@
+package com.qvomacp.cli;
+
+import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.Finding;
+import com.qvomacp.eng.omacp.ProvisioningEncoder;
+import com.qvomacp.eng.omacp.Rule;
+import com.qvomacp.eng.omacp.Rule.Severity;
+import java.util.EnumSet;
+import java.util.List;
+import java.util.Locale;
+import java.util.Set;
+import picocli.CommandLine.Command;
+
+/** Tells what is wrong with messages. */
+@Command(
+        name = "lint",
+        description = {
+            "Tell what is wrong with messages, and what would be right.",
+            "A FILE may hold a document in XML, too."
+        },
+        customSynopsis = "omacp lint [-h] [OPTION...] [FILE...]",
+        exitCodeList = {
+            "0:no error was found and, with --strict, no warning",
+            "1:an error was found or, with --strict, a warning",
+            "2:wrong usage, a message or document cannot be read, the output cannot be written"
+        })
+final class Lint extends MessageJob {
+    private static final Option<String> NO =
+            Option.texts(
+                    "--no --disable",
+                    "RULE",
+                    "Leave out a rule, or several with commas between their names.");
+
+    private static final Option<Boolean> STRICT =
+            Option.flag("--strict", "End with 1 for warnings, too.");
+
+    private final Set<Rule> left = EnumSet.allOf(Rule.class);
+
+    @Override
+    List<Option<?>> options() {
+        List<Option<?>> options = super.options();
+        options.add(NO);
+        options.add(STRICT);
+        return options;
+    }
+
+    @Override
+    void begin() {
+        for (String name : has(NO) ? value(NO).split(",") : new String[0]) {
+            Rule rule = Rule.named(name);
+            if (rule == null) {
+                throw new UsageException("--no is given what is no rule: " + name);
+            }
+            left.remove(rule);
+        }
+        super.begin();
+    }
+
+    @Override
+    void runXml(String name, byte[] xml) throws EncodingException {
+        tell(name, ProvisioningEncoder.lint(xml));
+    }
+
+    @Override
+    void run(Reading reading) {
+        tell(reading.held.name, reading.message.lint());
+    }
+
+    private void tell(String name, List<Finding> findings) {
+        if (isJson()) {
+            beginObject(name);
+            writer.name("findings").beginArray();
+        }
+        for (Finding finding : findings) {
+            if (left.contains(finding.rule())) {
+                Severity severity = finding.rule().severity();
+                boolean counts = severity == Severity.ERROR || has(STRICT) && severity == Severity.WARNING;
+                console.raise(counts ? Console.REFUSED : Console.DONE);
+                if (isJson()) {
+                    json(finding);
+                } else {
+                    text(name, finding);
+                }
+            }
+        }
+        if (isJson()) {
+            writer.end();
+            endObject();
+        }
+    }
+
+    private static String severity(Finding finding) {
+        return finding.rule().severity().name().toLowerCase(Locale.ROOT);
+    }
+
+    private void text(String name, Finding finding) {
+        StringBuilder place = new StringBuilder(Visible.of(name));
+        if (finding.line() > 0) {
+            place.append(':').append(finding.line()).append(':').append(finding.column());
+        } else if (finding.offset() >= 0) {
+            place.append(':').append(finding.offset());
+        }
+        String severity = severity(finding) + ":";
+        String rule = " [" + finding.rule().ruleName() + "]";
+        String text = place + ": " + severity + " " + Visible.of(finding.sentence()) + rule;
+        List<String> lines = Lines.of(text, Lines.WIDTH - TextWriter.INDENT);
+        boolean isError = finding.rule().severity() == Severity.ERROR;
+        String painted = isError ? outPalette().error(severity) : outPalette().bold(severity);
+        console.out.println(lines.get(0).replaceFirst("(?<=: )" + severity, painted));
+        indented(lines.subList(1, lines.size()));
+        String told = "in " + finding.path() + "; right: " + finding.remedy();
+        told += "; see " + finding.rule().reference();
+        indented(Lines.of(Visible.of(told), Lines.WIDTH - TextWriter.INDENT));
+    }
+
+    private void indented(List<String> lines) {
+        for (String line : lines) {
+            console.out.append("  ").println(line);
+        }
+    }
+
+    private void json(Finding finding) {
+        writer.beginObject();
+        writer.member("rule", finding.rule().ruleName()).member("severity", severity(finding));
+        writer.member("path", finding.path());
+        if (finding.line() > 0) {
+            writer.member("line", finding.line()).member("column", finding.column());
+        } else if (finding.offset() >= 0) {
+            writer.member("offset", finding.offset());
+        } else {
+            writer.nullMember("offset");
+        }
+        writer.member("sentence", finding.sentence()).member("remedy", finding.remedy());
+        writer.member("reference", finding.rule().reference()).end();
+    }
+}

@@ -1,0 +1,48 @@
+package com.qvomacp.cli;
+
+import com.qvomacp.eng.omacp.EncodeOptions;
+import com.qvomacp.eng.omacp.EncodingException;
+import com.qvomacp.eng.omacp.ProvisioningEncoder;
+
+/** A job that takes documents in XML as well, and for which what cannot be read is a failure. */
+abstract class MessageJob extends JsonJob {
+    /** Does it to one message that was read. */
+    abstract void run(Reading reading);
+
+    /** Does it to one document in XML: to what is encoded of it. */
+    void runXml(String name, byte[] xml) throws EncodingException {
+        byte[] body = ProvisioningEncoder.ofXml(xml, EncodeOptions.NONE).body();
+        run(Reading.of(Held.message(name, body, false), body.length));
+    }
+
+    @Override
+    final boolean takes(String name, byte[] content) {
+        if (!Encode.isXml(content)) {
+            return false;
+        }
+        try {
+            runXml(name, content);
+        } catch (EncodingException unreadable) {
+            refuse(name, unreadable);
+        }
+        return true;
+    }
+
+    @Override
+    final void run(Held held) {
+        Reading reading = Reading.of(held, limit());
+        if (reading.message != null) {
+            run(reading);
+            return;
+        }
+        console.raise(Console.FAILED);
+        explain(reading);
+        failed(held.name, reading.failure.getMessage());
+    }
+
+    /** What is refused elsewhere is here what cannot be read. */
+    @Override
+    final void fail(int status, String name, String reason) {
+        super.fail(Console.FAILED, name, reason);
+    }
+}
