@@ -1,5 +1,9 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Arrays;
+import java.util.Collections;
+import java.util.List;
+
 /**
  * The vocabulary of one code page, for elements and for attributes: a row is a token with what it
  * stands for, as the OMA's tables have it. A document switches the page of its elements and that of
@@ -121,6 +125,11 @@ final class CodePage {
             throw new AssertionError("two rows for one token");
         }
         table[place] = entry;
+    }
+
+    /** The pages that the format has. */
+    static List<CodePage> all() {
+        return Collections.unmodifiableList(Arrays.asList(PAGES));
     }
 
     /** A page; an empty one for a number that the format does not have. */

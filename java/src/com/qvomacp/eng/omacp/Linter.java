@@ -98,10 +98,10 @@ final class Linter {
         for (String other : others) {
             known.put(upper(other), other);
         }
-        for (int page = 0; CodePage.of(page) != null; ++page) {
+        for (CodePage page : CodePage.all()) {
             for (int token = 0; token < 0x80; ++token) {
-                String begin = CodePage.of(page).begin(token);
-                if (begin != null && CodePage.of(page).attribute(token) == attribute) {
+                String begin = page.begin(token);
+                if (begin != null && page.attribute(token) == attribute) {
                     known.put(begin, begin);
                 }
             }
