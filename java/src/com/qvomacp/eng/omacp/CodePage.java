@@ -100,13 +100,16 @@ final class CodePage {
         return this;
     }
 
-    /** Rows of a token in hexadecimal and what the value of its attribute begins with. */
+    /**
+     * Rows of a token in hexadecimal and what the value of its attribute begins with. A name is the
+     * literal of the same text, so that it takes one look to find it equal.
+     */
     private CodePage starts(Attribute attribute, String rows) {
         String[] words = rows.split(" ");
         for (int i = 0; i < words.length; i += 2) {
             int token = Integer.parseInt(words[i], 16);
             put(attributes, token, attribute);
-            put(begins, token, words[i + 1]);
+            put(begins, token, words[i + 1].intern());
         }
         return this;
     }
@@ -115,7 +118,7 @@ final class CodePage {
     private CodePage values(String rows) {
         String[] words = rows.split(" ");
         for (int i = 0; i < words.length; i += 2) {
-            put(values, Integer.parseInt(words[i], 16) - FIRST_VALUE, words[i + 1]);
+            put(values, Integer.parseInt(words[i], 16) - FIRST_VALUE, words[i + 1].intern());
         }
         return this;
     }
