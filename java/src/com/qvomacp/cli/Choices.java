@@ -40,7 +40,7 @@ final class Choices {
 
     Choices(Job job) {
         this.job = job;
-        this.isInputTaken = job.readsStandardInput();
+        this.isInputTaken = job.arguments.files.contains(Input.STANDARD_INPUT);
     }
 
     private static String described(EncodeOption option) {
@@ -99,7 +99,7 @@ final class Choices {
         }
         isInputTaken |= isInput;
         try {
-            byte[] content = Input.read(file, job.console.in, job.limit());
+            byte[] content = Input.read(file, job.console.in, job.limit);
             return new String(content, StandardCharsets.UTF_8).replaceFirst("\r?\n$", "");
         } catch (IOException unreadable) {
             throw new UsageException(

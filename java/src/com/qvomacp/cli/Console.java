@@ -7,6 +7,7 @@ import java.io.InputStream;
 import java.io.OutputStream;
 import java.io.OutputStreamWriter;
 import java.io.PrintWriter;
+import java.io.UncheckedIOException;
 import java.nio.charset.StandardCharsets;
 
 /** What the program reads and writes, and the status that it ends with. */
@@ -14,20 +15,6 @@ final class Console {
     static final int DONE = 0;
     static final int REFUSED = 1;
     static final int FAILED = 2;
-
-    /** Thrown out of whatever writes what cannot be written. */
-    static final class ClosedError extends RuntimeException {
-        private static final long serialVersionUID = 1L;
-
-        private ClosedError(IOException cause) {
-            super(cause);
-        }
-
-        /** Whether whoever reads has seen enough, which is no news to him. */
-        boolean isBrokenPipe() {
-            return "Broken pipe".equals(getCause().getMessage());
-        }
-    }
 
     /** Ends the work when it cannot be written; a {@link PrintWriter} would only remember. */
     private static final class Output extends FilterOutputStream {
@@ -40,7 +27,7 @@ final class Console {
             try {
                 out.write(bytes, from, count);
             } catch (IOException failed) {
-                throw new ClosedError(failed);
+                throw new UncheckedIOException(failed);
             }
         }
 
@@ -49,7 +36,7 @@ final class Console {
             try {
                 out.flush();
             } catch (IOException failed) {
-                throw new ClosedError(failed);
+                throw new UncheckedIOException(failed);
             }
         }
     }
@@ -59,6 +46,8 @@ final class Console {
     private final Output bytes;
     final PrintWriter err;
     final Terminal terminal;
+
+    /** The worst of all files. */
     private int status = DONE;
 
     Console(InputStream in, OutputStream out, OutputStream err, Terminal terminal) {
@@ -92,7 +81,6 @@ final class Console {
         return status;
     }
 
-    /** The status is the worst of all files. */
     void raise(int raised) {
         status = Math.max(status, raised);
     }

@@ -102,31 +102,14 @@ final class Encode extends Job {
     }
 
     @Override
-    boolean takes(String name, byte[] content) {
-        if (!isXml(content)) {
-            return false;
-        }
-        try {
-            encode(name, ProvisioningEncoder.ofXml(content, encoding));
-        } catch (EncodingException refused) {
-            refuse(name, refused);
-        }
+    boolean runXml(String name, byte[] xml) throws EncodingException {
+        encode(name, ProvisioningEncoder.ofXml(xml, encoding));
         return true;
-    }
-
-    /** Whether it begins with a tag, in UTF-8 or UTF-16, and not with that of a push. */
-    static boolean isXml(byte[] content) {
-        int at = 0;
-        while (at < content.length
-                && "\u00EF\u00BB\u00BF\u00FE\u00FF\0 \t\r\n".indexOf(content[at] & 0xFF) >= 0) {
-            ++at;
-        }
-        return at < content.length && content[at] == '<' && (at > 0 || !Intake.isPush(content));
     }
 
     @Override
     void run(Held held) {
-        Reading reading = Reading.of(held, limit());
+        Reading reading = Reading.of(held, limit);
         if (reading.message == null) {
             explain(reading);
             return;
@@ -153,7 +136,7 @@ final class Encode extends Job {
     }
 
     private void encode(String name, ProvisioningEncoder encoder) throws EncodingException {
-        if (isRaw() && isOneOfSeveral()) {
+        if (isRaw() && isOneOfSeveral) {
             String reason = "is one of several, which only --hex, --base64 and --sms can write";
             fail(Console.FAILED, name, reason);
             return;

@@ -24,7 +24,7 @@ final class Held {
     /** What is worth a remark, each a sentence without a full stop. */
     final List<String> notes;
 
-    private Held(String name, byte[] bytes, boolean isPush, String error, List<String> notes) {
+    Held(String name, byte[] bytes, boolean isPush, String error, List<String> notes) {
         this.name = name;
         this.bytes = bytes;
         this.isPush = isPush;
@@ -32,20 +32,12 @@ final class Held {
         this.notes = notes;
     }
 
-    static Held push(String name, byte[] push, List<String> notes) {
-        return new Held(name, push, true, null, notes);
-    }
-
     static Held message(String name, byte[] bytes, boolean isPush) {
         return new Held(name, bytes, isPush, null, NONE);
     }
 
-    static Held error(String name, String sentence) {
-        return new Held(name, null, false, sentence, NONE);
-    }
-
-    /** Bytes that are no message. */
-    static Held unknown(String name, byte[] bytes, String sentence) {
+    /** No message; the bytes are null where there are none of all. */
+    static Held error(String name, byte[] bytes, String sentence) {
         return new Held(name, bytes, true, sentence, NONE);
     }
 
@@ -56,8 +48,12 @@ final class Held {
 
     /** What the push header says, whatever stands behind it; null when there is none. */
     PushHeader header() {
+        return isPush ? header(bytes) : null;
+    }
+
+    static PushHeader header(byte[] bytes) {
         try {
-            return isPush ? PushHeader.parse(bytes) : null;
+            return Intake.isPush(bytes) ? PushHeader.parse(bytes) : null;
         } catch (ProvisioningException none) {
             return null;
         }

@@ -1,9 +1,11 @@
 package com.qvomacp.cli;
 
+import com.qvomacp.cli.HexText.Piece;
 import com.qvomacp.eng.omacp.ForeignBytes;
-import com.qvomacp.eng.omacp.ProvisioningException;
 import com.qvomacp.eng.omacp.PushHeader;
+import java.nio.ByteBuffer;
 import java.util.ArrayList;
+import java.util.Arrays;
 import java.util.Collections;
 import java.util.List;
 
@@ -25,12 +27,15 @@ final class Intake {
     private static final int LAST_WBXML_VERSION = 0x03;
     private static final int LAST_CHARSET = 3000;
     private static final int LAST_DOCUMENT_TYPE = 0x1FFF;
-    private static final int[] KNOWN_TYPES = {0x35, 0x36, 0x42, 0x44, 0x4E};
+    private static final List<Integer> KNOWN_TYPES = Arrays.asList(0x35, 0x36, 0x42, 0x44, 0x4E);
 
     /** What the user says that the bytes are; null to find out. */
     private final Form form;
 
     private final SmsParts parts = new SmsParts();
+
+    /** What is known with the input that is being taken. */
+    private List<Held> held;
 
     Intake(Form form) {
         this.form = form;
@@ -43,12 +48,12 @@ final class Intake {
      *     parts of which others are still to come
      */
     List<Held> take(String name, byte[] content) {
-        List<Held> held = new ArrayList<>();
+        held = new ArrayList<>();
         String text = HexText.text(content);
         if (text == null) {
-            take(Place.in(name), content, form, held);
+            take(new Place(name), content, form);
         } else {
-            takeText(name, content, text, held);
+            takeText(name, content, text);
         }
         return held;
     }
@@ -59,34 +64,24 @@ final class Intake {
     }
 
     /** A text is what its digits stand for, or base64; anything else is called what it is. */
-    private void takeText(String name, byte[] content, String text, List<Held> held) {
+    private void takeText(String name, byte[] content, String text) {
         byte[] base64 = HexText.base64(text);
-        boolean isMessage = base64 != null && isMessage(base64);
-        if (isMessage) {
-            take(Place.in(name), base64, form, held);
+        if (base64 != null && isMessage(base64)) {
+            take(new Place(name), base64, form);
             return;
         }
         boolean isMarkup = text.trim().startsWith("<");
-        List<HexText.Piece> pieces =
-                isMarkup ? Collections.<HexText.Piece>emptyList() : HexText.pieces(text);
-        if (pieces.isEmpty()) {
-            held.add(Held.unknown(name, content, NO_MESSAGE + likeness(content)));
-        } else {
-            takePieces(Place.in(name), pieces, held);
-            nameWhole(name, content, held);
-        }
-    }
-
-    /** Calls the whole text what it is when digits have been read out of it that are nothing. */
-    private static void nameWhole(String name, byte[] content, List<Held> held) {
-        boolean areUnknown = !held.isEmpty();
+        List<Piece> pieces = isMarkup ? new ArrayList<>() : HexText.pieces(text);
+        takePieces(name, pieces);
+        boolean areUnknown = pieces.isEmpty() || !held.isEmpty();
         for (Held each : held) {
             areUnknown &= (NO_MESSAGE + UNKNOWN).equals(each.error);
         }
         String likeness = areUnknown ? likeness(content) : HEXADECIMAL;
-        if (!likeness.startsWith(HEXADECIMAL)) {
+        // Digits that are nothing may have been read out of what is something else as a whole.
+        if (pieces.isEmpty() || !likeness.startsWith(HEXADECIMAL)) {
             held.clear();
-            held.add(Held.unknown(name, content, NO_MESSAGE + likeness));
+            held.add(Held.error(name, content, NO_MESSAGE + likeness));
         }
     }
 
@@ -95,113 +90,98 @@ final class Intake {
         return likeness == null ? UNKNOWN : likeness;
     }
 
+    private void refuse(Place place, String what) {
+        held.add(Held.error(place.toString(), null, NO_MESSAGE + what));
+    }
+
     /**
      * Takes lines of digits. Each line may hold a message, or one message all lines that follow
      * each other, or all lines of the text.
      */
-    private void takePieces(Place input, List<HexText.Piece> pieces, List<Held> held) {
-        List<Run> runs = Run.of(pieces);
+    private void takePieces(String input, List<Piece> pieces) {
+        List<List<Piece>> runs = runs(pieces);
         boolean areMessages = true;
-        for (Run run : runs) {
-            areMessages &= run.isMessage(this);
+        for (List<Piece> run : runs) {
+            areMessages &= run.get(0).isWhole || isJoinedMessage(run) || isLineByLine(run);
         }
-        if (!areMessages && runs.size() > 1 && new Run(pieces).isJoinedMessage(this)) {
-            runs = Collections.singletonList(new Run(pieces));
+        if (!areMessages && isJoinedMessage(pieces)) {
+            runs = Collections.singletonList(pieces);
         }
-        boolean isAlone = runs.size() == 1 && !runs.get(0).isLineByLine(this);
-        for (Run run : runs) {
-            if (run.isLineByLine(this)) {
-                for (HexText.Piece piece : run.pieces) {
-                    takeDigits(input.line(piece.line), piece.digits, piece.isUserData, held);
-                }
-            } else {
-                HexText.Piece first = run.pieces.get(0);
-                Place place = isAlone ? input : input.line(first.line);
-                takeDigits(place, run.digits(), first.isUserData, held);
+        for (List<Piece> run : runs) {
+            boolean isLineByLine = isLineByLine(run);
+            for (Piece piece : isLineByLine ? run : run.subList(0, 1)) {
+                boolean isAll = runs.size() == 1 && !isLineByLine;
+                Place place = isAll ? new Place(input) : new Place(input, piece.line);
+                takeDigits(place, isLineByLine ? piece.digits : digits(run), piece.isUserData);
             }
         }
     }
 
-    private void takeDigits(Place place, String digits, boolean isUserData, List<Held> held) {
+    private void takeDigits(Place place, String digits, boolean isUserData) {
         if (digits == null) {
-            held.add(Held.error(place.toString(), NO_MESSAGE + OTHER_NUMBERS));
-            return;
+            refuse(place, OTHER_NUMBERS);
+        } else if (digits.length() % 2 != 0) {
+            refuse(place, HEXADECIMAL + " with an odd number of digits, " + digits.length());
+        } else {
+            take(place, HexText.bytes(digits), isUserData && form == null ? Form.UD : form);
         }
-        if (digits.length() % 2 != 0) {
-            String odd = HEXADECIMAL + " with an odd number of digits, " + digits.length();
-            held.add(Held.error(place.toString(), NO_MESSAGE + odd));
-            return;
-        }
-        take(place, HexText.bytes(digits), isUserData && form == null ? Form.UD : form, held);
     }
 
-    /** Lines of digits that follow each other. */
-    private static final class Run {
-        final List<HexText.Piece> pieces;
-
-        Run(List<HexText.Piece> pieces) {
-            this.pieces = pieces;
-        }
-
-        static List<Run> of(List<HexText.Piece> pieces) {
-            List<Run> runs = new ArrayList<>();
-            int from = 0;
-            for (int i = 1; i <= pieces.size(); ++i) {
-                if (i == pieces.size() || !pieces.get(i).follows(pieces.get(i - 1))) {
-                    runs.add(new Run(pieces.subList(from, i)));
-                    from = i;
-                }
+    /** The pieces that follow each other. */
+    private static List<List<Piece>> runs(List<Piece> pieces) {
+        List<List<Piece>> runs = new ArrayList<>();
+        int from = 0;
+        for (int i = 1; i <= pieces.size(); ++i) {
+            if (i == pieces.size() || !pieces.get(i).follows(pieces.get(i - 1))) {
+                runs.add(pieces.subList(from, i));
+                from = i;
             }
-            return runs;
         }
+        return runs;
+    }
 
-        /** All their digits; null when there are numbers among them. */
-        String digits() {
-            StringBuilder digits = new StringBuilder();
-            for (HexText.Piece piece : pieces) {
-                if (piece.digits == null) {
-                    return null;
-                }
-                digits.append(piece.digits);
+    /** All digits of a run; null when there are numbers among them. */
+    private static String digits(List<Piece> run) {
+        StringBuilder digits = new StringBuilder();
+        for (Piece piece : run) {
+            if (piece.digits == null) {
+                return null;
             }
-            return digits.toString();
+            digits.append(piece.digits);
         }
+        return digits.toString();
+    }
 
-        /** Whether every line is a message of its own. */
-        boolean isLineByLine(Intake intake) {
-            boolean areMessages = pieces.size() > 1;
-            for (HexText.Piece piece : pieces) {
-                areMessages = areMessages && intake.isMessageAlone(piece.digits);
-            }
-            return areMessages;
+    /** Whether every line is a message of its own. */
+    private boolean isLineByLine(List<Piece> run) {
+        boolean areMessages = run.size() > 1;
+        for (Piece piece : run) {
+            areMessages = areMessages && isMessageAlone(piece.digits);
         }
+        return areMessages;
+    }
 
-        boolean isJoinedMessage(Intake intake) {
-            String digits = digits();
-            return digits != null && digits.length() % 2 == 0 && intake.isMessage(HexText.bytes(digits));
-        }
-
-        boolean isMessage(Intake intake) {
-            return pieces.get(0).isWhole || isJoinedMessage(intake) || isLineByLine(intake);
-        }
+    private boolean isJoinedMessage(List<Piece> run) {
+        String digits = digits(run);
+        return digits != null && digits.length() % 2 == 0 && isMessage(HexText.bytes(digits));
     }
 
     /** Whether a line is a message, for certain and not just the beginning of one. */
     private boolean isMessageAlone(String digits) {
         byte[] bytes = HexText.bytes(digits);
-        PushHeader header = header(bytes);
+        PushHeader header = Held.header(bytes);
         boolean isPush = isKnownPush(bytes, header) && isDocument(bytes, header.length());
         return digits.length() % 2 == 0
                 && (isPush || isDocument(bytes, 0) || shortMessage(bytes, header, form) != null);
     }
 
     private boolean isMessage(byte[] bytes) {
-        PushHeader header = header(bytes);
+        PushHeader header = Held.header(bytes);
         return header != null || isDocument(bytes, 0) || shortMessage(bytes, null, form) != null;
     }
 
-    /** The short message that bytes are by their form or, without one, by their lengths; or null. */
-    private ShortMessage shortMessage(byte[] bytes, PushHeader header, Form form) {
+    /** The short message that bytes are by their form or, without one, their lengths; or null. */
+    private static ShortMessage shortMessage(byte[] bytes, PushHeader header, Form form) {
         ShortMessage message = null;
         if (form == null || form == Form.SMS) {
             message = ShortMessage.withCentre(bytes);
@@ -219,34 +199,35 @@ final class Intake {
         return isPush ? null : message;
     }
 
-    private void take(Place place, byte[] bytes, Form form, List<Held> held) {
+    private void take(Place place, byte[] bytes, Form form) {
         String name = place.toString();
-        PushHeader header = header(bytes);
-        ShortMessage message = shortMessage(bytes, header, form);
-        boolean isPush = isPush(bytes);
+        ShortMessage message = shortMessage(bytes, Held.header(bytes), form);
+        boolean isPush = form == null ? isPush(bytes) : form == Form.PUSH;
         boolean isBody = bytes.length > 0 && bytes[0] >= 0 && bytes[0] <= LAST_WBXML_VERSION;
         if (message != null) {
-            takeShortMessage(place, message, held);
+            takeShortMessage(place, message);
         } else if (form == Form.SMS || form == Form.UD) {
             String what = form == Form.SMS ? "no SMS-DELIVER" : "no user data of an SMS";
-            held.add(Held.error(name, what + ": its lengths do not come out"));
-        } else if (form != null) {
-            held.add(Held.message(name, bytes, form == Form.PUSH));
-        } else if (isPush || isBody) {
+            held.add(Held.error(name, null, what + ": its lengths do not come out"));
+        } else if (form != null || isPush || isBody) {
             held.add(Held.message(name, bytes, isPush));
         } else {
-            held.add(Held.unknown(name, bytes, NO_MESSAGE + likeness(bytes)));
+            held.add(Held.error(name, bytes, NO_MESSAGE + likeness(bytes)));
         }
     }
 
-    private void takeShortMessage(Place place, ShortMessage message, List<Held> held) {
+    private void takeShortMessage(Place place, ShortMessage message) {
         String fault = message.fault();
-        Held whole = fault == null ? parts.take(place, message) : Held.error(place.toString(), NO_MESSAGE + fault);
-        if (whole == null) {
+        if (fault != null) {
+            refuse(place, fault);
             return;
         }
-        boolean isOther = whole.bytes != null && !message.hasPort() && header(whole.bytes) == null;
-        held.add(isOther ? Held.error(whole.name, NO_MESSAGE + "an SMS without a port") : whole);
+        Held whole = parts.take(place, message);
+        if (whole != null) {
+            boolean isPush = whole.bytes == null || message.hasPort() || whole.header() != null;
+            String none = NO_MESSAGE + "an SMS without a port";
+            held.add(isPush ? whole : Held.error(whole.name, null, none));
+        }
     }
 
     /** Whether the second byte is that of a push. */
@@ -254,25 +235,12 @@ final class Intake {
         return bytes.length > 1 && bytes[1] == PUSH;
     }
 
-    private static PushHeader header(byte[] bytes) {
-        try {
-            return isPush(bytes) ? PushHeader.parse(bytes) : null;
-        } catch (ProvisioningException none) {
-            return null;
-        }
-    }
-
     /** Whether it is a push of a type that is pushed to the decoder, or of a document. */
     private static boolean isKnownPush(byte[] bytes, PushHeader header) {
-        if (header == null) {
-            return false;
-        }
-        for (int type : KNOWN_TYPES) {
-            if (header.contentType().code() == type) {
-                return true;
-            }
-        }
-        return header.contentType().mediaType().indexOf('/') >= 0 && isDocument(bytes, header.length());
+        return header != null
+                && (KNOWN_TYPES.contains(header.contentType().code())
+                        || header.contentType().mediaType().indexOf('/') >= 0
+                                && isDocument(bytes, header.length()));
     }
 
     /** Whether WBXML begins at a place: version, document type, character set and string table. */
@@ -280,28 +248,26 @@ final class Intake {
         if (from >= bytes.length || bytes[from] < 0 || bytes[from] > LAST_WBXML_VERSION) {
             return false;
         }
-        long[] number = {from + 1, 0};
-        boolean isSound = integer(bytes, number) && number[1] <= LAST_DOCUMENT_TYPE;
-        if (isSound && number[1] == 0) {
-            isSound = integer(bytes, number);
-        }
-        if (isSound && bytes[from] != 0) {
-            isSound = integer(bytes, number) && number[1] <= LAST_CHARSET;
-        }
-        return isSound && integer(bytes, number) && number[1] <= bytes.length - number[0];
+        ByteBuffer left = ByteBuffer.wrap(bytes, from + 1, bytes.length - from - 1);
+        long type = integer(left);
+        long name = type == 0 ? integer(left) : 0;
+        long charset = bytes[from] == 0 ? 0 : integer(left);
+        long table = integer(left);
+        boolean areThere = type >= 0 && name >= 0 && charset >= 0 && table >= 0;
+        boolean areKnown = type <= LAST_DOCUMENT_TYPE && charset <= LAST_CHARSET;
+        return areThere && areKnown && table <= left.remaining();
     }
 
-    /** Reads a multi-byte integer at the place in the first cell into the second one. */
-    private static boolean integer(byte[] bytes, long[] number) {
+    /** Reads a multi-byte integer; -1 when it does not end, or is too large. */
+    private static long integer(ByteBuffer bytes) {
         long value = 0;
-        for (int at = (int) number[0]; at < bytes.length && value >> 31 == 0; ++at) {
-            value = value << 7 | bytes[at] & 0x7F;
-            if (bytes[at] >= 0) {
-                number[0] = at + 1;
-                number[1] = value;
-                return true;
+        while (bytes.hasRemaining() && value >> 31 == 0) {
+            byte next = bytes.get();
+            value = value << 7 | next & 0x7F;
+            if (next >= 0) {
+                return value;
             }
         }
-        return false;
+        return -1;
     }
 }

@@ -26,8 +26,12 @@ abstract class Job {
 
     Arguments arguments;
     Console console;
-    private int bytesRead;
-    private boolean isOneOfSeveral;
+
+    /** How many bytes of a file are read, and so how long a message may be. */
+    int limit;
+
+    /** Whether there are several files, or several messages in the only one. */
+    boolean isOneOfSeveral;
 
     /** The options that it takes, in the order of its help. */
     List<Option<?>> options() {
@@ -48,8 +52,8 @@ abstract class Job {
     /** Looks at what the command line asks for, in front of the first file. */
     abstract void begin();
 
-    /** Does it to what is no message, where a command knows more than messages. */
-    boolean takes(String name, byte[] content) {
+    /** Does it to a document in XML; false where a command does it to messages alone. */
+    boolean runXml(String name, byte[] xml) throws EncodingException {
         return false;
     }
 
@@ -65,7 +69,7 @@ abstract class Job {
     final void run(Console to, Arguments given) {
         console = to;
         arguments = given;
-        bytesRead = has(LIMIT) ? bytes(value(LIMIT)) : DEFAULT_LIMIT;
+        limit = has(LIMIT) ? bytes(value(LIMIT)) : DEFAULT_LIMIT;
         List<String> files = given.files;
         if (files.isEmpty()) {
             files.add(Input.STANDARD_INPUT);
@@ -85,12 +89,14 @@ abstract class Job {
         try {
             List<Held> messages = new ArrayList<>();
             try {
-                byte[] content = Input.read(file, console.in, bytesRead);
-                if (has(AS) || !takes(name, content)) {
+                byte[] content = Input.read(file, console.in, limit);
+                if (has(AS) || !isXml(content) || !runXml(name, content)) {
                     messages.addAll(intake.take(name, content));
                 }
             } catch (IOException unreadable) {
                 fail(Console.FAILED, name, unreadable.getMessage());
+            } catch (EncodingException refused) {
+                refuse(name, refused);
             }
             if (isLast) {
                 messages.addAll(intake.finish());
@@ -131,18 +137,14 @@ abstract class Job {
         throw new UsageException("--limit is a number of bytes, up to 1023M: " + number);
     }
 
-    /** How much of a file is read, and so how long a message may be. */
-    int limit() {
-        return bytesRead;
-    }
-
-    /** Whether there are several files, or several messages in the only one. */
-    boolean isOneOfSeveral() {
-        return isOneOfSeveral;
-    }
-
-    boolean readsStandardInput() {
-        return arguments.files.contains(Input.STANDARD_INPUT);
+    /** Whether it begins with a tag, in UTF-8 or UTF-16, and not with that of a push. */
+    private static boolean isXml(byte[] content) {
+        int at = 0;
+        while (at < content.length
+                && "\u00EF\u00BB\u00BF\u00FE\u00FF\0 \t\r\n".indexOf(content[at] & 0xFF) >= 0) {
+            ++at;
+        }
+        return at < content.length && content[at] == '<' && (at > 0 || !Intake.isPush(content));
     }
 
     Palette outPalette() {
@@ -176,7 +178,7 @@ abstract class Job {
         try {
             return PushHeader.parse(held.bytes);
         } catch (ProvisioningException none) {
-            explain(Reading.of(held, limit()));
+            explain(Reading.of(held, limit));
             failed(held.name, none.getMessage());
             return null;
         }

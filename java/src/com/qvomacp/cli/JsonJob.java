@@ -38,7 +38,7 @@ abstract class JsonJob extends Job {
     }
 
     private boolean isInArray() {
-        return has(JSON) && isOneOfSeveral();
+        return has(JSON) && isOneOfSeveral;
     }
 
     final boolean isJson() {
@@ -51,7 +51,7 @@ abstract class JsonJob extends Job {
         }
         writer.beginObject();
         inObject = true;
-        if (isOneOfSeveral()) {
+        if (isOneOfSeveral) {
             writer.member("file", name);
         }
     }

@@ -57,8 +57,9 @@ final class Lint extends MessageJob {
     }
 
     @Override
-    void runXml(String name, byte[] xml) throws EncodingException {
+    boolean runXml(String name, byte[] xml) throws EncodingException {
         tell(name, ProvisioningEncoder.lint(xml));
+        return true;
     }
 
     @Override

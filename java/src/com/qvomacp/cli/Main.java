@@ -5,6 +5,7 @@ import java.io.FileInputStream;
 import java.io.FileOutputStream;
 import java.io.InputStream;
 import java.io.OutputStream;
+import java.io.UncheckedIOException;
 
 /** The command-line program: shows, checks and makes pushed provisioning messages. */
 public final class Main {
@@ -59,9 +60,10 @@ public final class Main {
         try {
             run(console, arguments);
             console.out.flush();
-        } catch (Console.ClosedError closed) {
+        } catch (UncheckedIOException closed) {
             console.raise(Console.FAILED);
-            if (!closed.isBrokenPipe()) {
+            // Whoever reads through a pipe has seen enough, which is no news to him.
+            if (!"Broken pipe".equals(closed.getCause().getMessage())) {
                 console.err.println("omacp: the output cannot be written");
             }
         }

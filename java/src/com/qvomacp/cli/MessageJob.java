@@ -10,27 +10,16 @@ abstract class MessageJob extends JsonJob {
     abstract void run(Reading reading);
 
     /** Does it to one document in XML: to what is encoded of it. */
-    void runXml(String name, byte[] xml) throws EncodingException {
+    @Override
+    boolean runXml(String name, byte[] xml) throws EncodingException {
         byte[] body = ProvisioningEncoder.ofXml(xml, EncodeOptions.NONE).body();
         run(Reading.of(Held.message(name, body, false), body.length));
-    }
-
-    @Override
-    final boolean takes(String name, byte[] content) {
-        if (!Encode.isXml(content)) {
-            return false;
-        }
-        try {
-            runXml(name, content);
-        } catch (EncodingException unreadable) {
-            refuse(name, unreadable);
-        }
         return true;
     }
 
     @Override
     final void run(Held held) {
-        Reading reading = Reading.of(held, limit());
+        Reading reading = Reading.of(held, limit);
         if (reading.message != null) {
             run(reading);
             return;

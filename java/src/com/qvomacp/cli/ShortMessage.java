@@ -13,9 +13,11 @@ final class ShortMessage {
     private static final int TYPE = 0x03;
     static final int SUBMIT = 0x01;
     static final int HAS_HEADER = 0x40;
-    private static final int VALIDITY = 0x18;
-    private static final int RELATIVE_VALIDITY = 0x10;
     private static final int TIME_STAMP = 7;
+
+    /** How long the validity period of an SMS-SUBMIT is, by its format. */
+    private static final int[] VALIDITIES = {0, TIME_STAMP, 1, TIME_STAMP};
+
     private static final int ALPHANUMERIC = 0xD0;
     static final int INTERNATIONAL = 0x90;
     private static final int KIND = 0xF0;
@@ -47,8 +49,8 @@ final class ShortMessage {
     private int width;
 
     private int reference;
-    private int total = 1;
-    private int number = 1;
+    int total = 1;
+    int number = 1;
 
     private ShortMessage(String sender, byte[] data, String other) {
         this.sender = sender;
@@ -82,7 +84,8 @@ final class ShortMessage {
             return null;
         }
         int codingAt = address + 2 + (digits + 1) / 2 + 1;
-        int lengthAt = codingAt + 1 + (isSubmit ? validity(first) : TIME_STAMP);
+        int validity = VALIDITIES[first >> 3 & 0x03];
+        int lengthAt = codingAt + 1 + (isSubmit ? validity : TIME_STAMP);
         int length = at(bytes, lengthAt);
         int coding = at(bytes, codingAt);
         String alphabet = alphabet(coding);
@@ -92,9 +95,11 @@ final class ShortMessage {
         }
         String other = null;
         if (isSubmit) {
-            other = "an SMS-SUBMIT, which is on its way from a handset; one that is received is an SMS-DELIVER";
+            other = "an SMS-SUBMIT, which is on its way from a handset;"
+                    + " one that is received is an SMS-DELIVER";
         } else if (coding != 0x04 && (coding & 0xFC) != 0xF4) {
-            String why = "an SMS with %s (coding scheme %02X), and not with data for a port (04, F4 to F7)";
+            String why = "an SMS with %s (coding scheme %02X),"
+                    + " and not with data for a port (04, F4 to F7)";
             other = String.format(Locale.ROOT, why, alphabet, coding);
         } else if ((first & HAS_HEADER) == 0) {
             other = "an SMS without a user data header, and so without a port";
@@ -109,18 +114,10 @@ final class ShortMessage {
         return new ShortMessage("", new byte[0], other);
     }
 
-    private static int validity(int first) {
-        int format = first & VALIDITY;
-        return format == 0 ? 0 : format == RELATIVE_VALIDITY ? 1 : TIME_STAMP;
-    }
-
     /** What user data is written in, by its coding scheme. */
     private static String alphabet(int coding) {
-        if (coding >> 4 == 0xF) {
-            return ALPHABETS[coding >> 2 & 0x01];
-        }
         if (coding >= 0x80) {
-            return ALPHABETS[coding >> 4 == 0xE ? 2 : 0];
+            return ALPHABETS[coding >= 0xF0 ? coding >> 2 & 0x01 : coding >= 0xE0 ? 2 : 0];
         }
         return (coding & 0x20) != 0 ? "compressed text" : ALPHABETS[coding >> 2 & 0x03];
     }
@@ -209,14 +206,6 @@ final class ShortMessage {
 
     boolean isPart() {
         return width != 0;
-    }
-
-    int number() {
-        return number;
-    }
-
-    int total() {
-        return total;
     }
 
     /** The same for all parts of a message, and for no others. */

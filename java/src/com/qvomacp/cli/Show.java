@@ -66,7 +66,7 @@ final class Show extends JsonJob {
             showHeader(held);
             return;
         }
-        Reading reading = Reading.of(held, limit());
+        Reading reading = Reading.of(held, limit);
         if (has(BYTES)) {
             console.raise(reading.status());
             list(reading);
@@ -107,7 +107,7 @@ final class Show extends JsonJob {
     @Override
     void unknown(Held held) {
         if (has(BYTES) && held.bytes != null) {
-            list(Reading.of(held, limit()));
+            list(Reading.of(held, limit));
         }
     }
 
@@ -179,7 +179,7 @@ final class Show extends JsonJob {
 
     /** Of several files, each stands under its name. */
     private void title(String name) {
-        if (isOneOfSeveral()) {
+        if (isOneOfSeveral) {
             console.out.print(shown == 0 ? "" : "\n");
             console.out.println(outPalette().bold("==> " + Visible.of(name) + " <=="));
         }

@@ -6,38 +6,16 @@ import java.util.Arrays;
 import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
+import java.util.TreeMap;
 
 /** Puts pushes together from the parts that short messages carry, in whichever order they come. */
 final class SmsParts {
-    /** The parts of one push, and where each comes from. */
+    /** The parts of one push by their numbers, and where each comes from. */
     private static final class Push {
-        final ShortMessage[] parts;
-        final Place[] places;
+        final Map<Integer, ShortMessage> parts = new TreeMap<>();
+        final Map<Integer, Place> places = new TreeMap<>();
         final List<String> notes = new ArrayList<>();
         boolean isFinished;
-
-        Push(int total) {
-            parts = new ShortMessage[total];
-            places = new Place[total];
-        }
-
-        List<Integer> missing() {
-            List<Integer> missing = new ArrayList<>();
-            for (int i = 0; i < parts.length; ++i) {
-                if (parts[i] == null) {
-                    missing.add(i + 1);
-                }
-            }
-            return missing;
-        }
-
-        byte[] bytes() {
-            ByteArrayOutputStream bytes = new ByteArrayOutputStream();
-            for (ShortMessage part : parts) {
-                bytes.write(part.data, 0, part.data.length);
-            }
-            return bytes.toByteArray();
-        }
     }
 
     private final Map<String, Push> pushes = new LinkedHashMap<>();
@@ -47,27 +25,31 @@ final class SmsParts {
         if (!message.isPart()) {
             return Held.message(place.toString(), message.data, true);
         }
-        Push push = pushes.computeIfAbsent(message.key(), key -> new Push(message.total()));
-        int index = message.number() - 1;
-        if (push.parts[index] != null) {
-            return again(push, index, place, message);
+        Push push = pushes.computeIfAbsent(message.key(), key -> new Push());
+        if (push.parts.containsKey(message.number)) {
+            return again(push, place, message);
         }
-        push.parts[index] = message;
-        push.places[index] = place;
-        if (push.isFinished || !push.missing().isEmpty()) {
+        push.parts.put(message.number, message);
+        push.places.put(message.number, place);
+        if (push.isFinished || push.parts.size() < message.total) {
             return null;
         }
         push.isFinished = true;
-        return Held.push(Place.names(push.places), push.bytes(), push.notes);
+        ByteArrayOutputStream bytes = new ByteArrayOutputStream();
+        for (ShortMessage part : push.parts.values()) {
+            bytes.write(part.data, 0, part.data.length);
+        }
+        String name = Place.names(push.places.values());
+        return new Held(name, bytes.toByteArray(), true, null, push.notes);
     }
 
-    private static Held again(Push push, int index, Place place, ShortMessage message) {
-        boolean isSame = Arrays.equals(push.parts[index].data, message.data);
-        String what = "part " + message.number() + " of " + message + " is there twice";
-        String where = ": in " + push.places[index] + " and in " + place;
+    private static Held again(Push push, Place place, ShortMessage message) {
+        boolean isSame = Arrays.equals(push.parts.get(message.number).data, message.data);
+        String what = "part " + message.number + " of " + message + " is there twice";
+        String where = ": in " + push.places.get(message.number) + " and in " + place;
         if (!isSame) {
             push.isFinished = true;
-            return Held.error(place.toString(), what + " with different bytes" + where);
+            return Held.error(place.toString(), null, what + " with different bytes" + where);
         }
         if (push.isFinished) {
             return Held.note(place.toString(), what + where);
@@ -80,18 +62,20 @@ final class SmsParts {
     List<Held> missing() {
         List<Held> errors = new ArrayList<>();
         for (Push push : pushes.values()) {
-            List<Integer> missing = push.missing();
-            if (push.isFinished || missing.isEmpty()) {
-                continue;
+            ShortMessage any = push.parts.values().iterator().next();
+            List<Integer> missing = new ArrayList<>();
+            for (int number = 1; number <= any.total && !push.isFinished; ++number) {
+                if (!push.parts.containsKey(number)) {
+                    missing.add(number);
+                }
             }
-            ShortMessage any = null;
-            for (ShortMessage part : push.parts) {
-                any = part != null ? part : any;
+            if (!missing.isEmpty()) {
+                boolean isOne = missing.size() == 1;
+                String which = (isOne ? "part " : "parts ") + Place.listed(missing);
+                String sentence = which + " of " + any.total + " of " + any;
+                String name = Place.names(push.places.values());
+                errors.add(Held.error(name, null, sentence + (isOne ? " is" : " are") + " missing"));
             }
-            boolean isOne = missing.size() == 1;
-            String which = (isOne ? "part " : "parts ") + Place.listed(missing);
-            String sentence = which + " of " + push.parts.length + " of " + any;
-            errors.add(Held.error(Place.names(push.places), sentence + (isOne ? " is missing" : " are missing")));
         }
         return errors;
     }
