@@ -10,7 +10,6 @@ import java.nio.charset.StandardCharsets;
 import java.util.Base64;
 import java.util.Collections;
 import java.util.List;
-import java.util.Locale;
 import picocli.CommandLine.Command;
 
 /** Makes messages of documents in XML, or of messages. */
@@ -167,18 +166,16 @@ final class Encode extends Job {
         if (isRaw()) {
             written.write(message, 0, message.length);
         } else if (has(HEX)) {
-            line(digits(message));
+            line(HexText.digits(message));
         } else if (has(BASE64)) {
             line(Base64.getEncoder().encodeToString(message));
         } else {
             for (byte[] part : parts) {
-                line(digits(value(SMS) == Sms.UD ? part : ShortMessageWriter.submit(value(TO), part)));
+                boolean isWhole = value(SMS) == Sms.SUBMIT;
+                byte[] octets = isWhole ? ShortMessageWriter.submit(value(TO), part) : part;
+                line(HexText.digits(octets));
             }
         }
-    }
-
-    private static String digits(byte[] bytes) {
-        return HexText.digits(bytes).toUpperCase(Locale.ROOT);
     }
 
     private void line(String text) {

@@ -6,7 +6,8 @@ import java.util.ArrayList;
 import java.util.Arrays;
 import java.util.Base64;
 import java.util.List;
-import java.util.Locale;
+import java.util.regex.Matcher;
+import java.util.regex.Pattern;
 
 /**
  * Reads bytes out of text, as logs, dumps, gateways and source code write them. A text is a row of
@@ -15,6 +16,12 @@ import java.util.Locale;
 final class HexText {
     /** Digits on one line, or all the bytes of a dump or of a gateway's form. */
     static final class Piece {
+        // Here they are not compiled before there is a text.
+        static final Pattern OF_MODEM = Pattern.compile("(?is)\\+C.*|AT.*|OK");
+
+        /** A label all of whose letters are digits, and no byte. */
+        static final Pattern WORD = Pattern.compile("(?s)\\p{javaLetterOrDigit}{3,}:.+");
+
         /** Counted from 1. */
         final int line;
 
@@ -42,6 +49,7 @@ final class HexText {
         }
     }
 
+    private static final String DIGITS = "0123456789ABCDEF";
     private static final String BYTE_ORDER_MARK = "\uFEFF";
 
     /** So many digits are behind a label at least, lest words and times be taken for bytes. */
@@ -78,34 +86,30 @@ final class HexText {
     static List<Piece> pieces(String text) {
         List<String> lines = Arrays.asList(text.split("\r\n|[\r\n\f]", -1));
         List<Piece> pieces = new ArrayList<>();
-        HexDump.Repeats repeats = new HexDump.Repeats();
+        Dump.Repeats repeats = new Dump.Repeats();
+        Piece last = null;
         for (int i = 0; i < lines.size(); ++i) {
-            CellDump cells = CellDump.at(lines, i);
-            boolean areCells = cells != null && cells.bytes != null;
-            HexDump dump = areCells ? null : HexDump.at(lines, i, repeats);
-            Piece piece = piece(lines.get(i).trim(), i + 1);
-            if (dump != null) {
+            Dump dump = Dump.at(lines, i, repeats);
+            Piece piece;
+            if (dump == null) {
+                piece = piece(lines.get(i).trim(), i + 1);
+            } else {
                 piece = new Piece(i + 1, digits(dump.bytes), true, false);
                 i = dump.next - 1;
-            } else if (cells != null) {
-                piece = new Piece(i + 1, areCells ? digits(cells.bytes) : null, true, false);
-                i = cells.next - 1;
             }
-            boolean isMore = piece != null && piece.digits == null && areNumbers(pieces);
-            if (piece != null && !isMore) {
+            boolean areNumbers = piece != null && piece.digits == null;
+            boolean areMore = areNumbers && last != null && last.digits == null;
+            if (piece != null && !areMore) {
                 pieces.add(piece);
+                last = piece;
             }
         }
         return pieces;
     }
 
-    /** Whether the last of the pieces are numbers. */
-    private static boolean areNumbers(List<Piece> pieces) {
-        return !pieces.isEmpty() && pieces.get(pieces.size() - 1).digits == null;
-    }
-
     private static Piece piece(String line, int number) {
-        if (line.isEmpty() || isOfModem(line)) {
+        // Whatever else a modem or its user says about messages is none of them.
+        if (line.isEmpty() || Piece.OF_MODEM.matcher(line).matches()) {
             return null;
         }
         Piece form = gatewayForm(line, number);
@@ -119,12 +123,6 @@ final class HexText {
         }
         boolean areBytes = isLiteral || !areNumbers(line);
         return new Piece(number, areBytes ? digits : null, !areBytes, false);
-    }
-
-    /** Whether a modem or its user says something about messages, and not one of them. */
-    private static boolean isOfModem(String line) {
-        String upper = line.toUpperCase(Locale.ROOT);
-        return upper.startsWith("+C") || upper.startsWith("AT") || upper.equals("OK");
     }
 
     /**
@@ -142,15 +140,9 @@ final class HexText {
         while (isInWord && from < line.length() && Character.isLetterOrDigit(line.charAt(from))) {
             ++from;
         }
-        int colon = line.indexOf(':', from);
-        if (!hasLabel && colon > 2) {
-            // A word of such letters, and no byte.
-            boolean isWord = true;
-            for (int i = 0; i < colon; ++i) {
-                isWord &= Character.isLetterOrDigit(line.charAt(i));
-            }
-            hasLabel = isWord && colon + 1 < line.length();
-            from = hasLabel ? colon + 1 : from;
+        if (!hasLabel && Piece.WORD.matcher(line).matches()) {
+            hasLabel = true;
+            from = line.indexOf(':') + 1;
         }
         String digits = digitsOf(line.substring(from));
         int fewest = hasLabel ? FEWEST_BEHIND_LABEL : 1;
@@ -180,20 +172,9 @@ final class HexText {
 
     /** The digits without what may stand around them; null for an x that is no prefix. */
     private static String digitsOf(String text) {
-        StringBuilder digits = new StringBuilder(text.length());
-        for (int i = 0; i < text.length(); ++i) {
-            char c = text.charAt(i);
-            if (text.startsWith("0x", i) || text.startsWith("0X", i)) {
-                ++i;
-                boolean isSingle = isDigit(text, i + 1) && !isDigit(text, i + 2);
-                digits.append(isSingle ? "0" : "");
-            } else if (isDigit(text, i)) {
-                digits.append(c);
-            } else if (c == 'x' || c == 'X') {
-                return null;
-            }
-        }
-        return digits.toString();
+        String padded = text.replaceAll("0[xX](?=\\p{XDigit}(?!\\p{XDigit}))", "0");
+        String digits = padded.replaceAll("0[xX]|[^\\p{XDigit}xX]", "");
+        return digits.indexOf('x') < 0 && digits.indexOf('X') < 0 ? digits : null;
     }
 
     private static boolean isDigit(String text, int at) {
@@ -255,20 +236,12 @@ final class HexText {
 
     /** A member of a form; null when the line has none of that name. */
     private static byte[] member(String line, String name) {
-        String lower = line.toLowerCase(Locale.ROOT);
-        int at = lower.indexOf(name + "=");
-        while (at > 0 && Character.isLetterOrDigit(line.charAt(at - 1))) {
-            at = lower.indexOf(name + "=", at + 1);
-        }
-        if (at < 0) {
+        String member = "(?i)(?<!\\p{javaLetterOrDigit})" + name + "=([^&\"' \t]*)";
+        Matcher found = Pattern.compile(member).matcher(line);
+        if (line.indexOf('=') < 0 || !found.find()) {
             return null;
         }
-        int from = at + name.length() + 1;
-        int end = from;
-        while (end < line.length() && "&\"' \t".indexOf(line.charAt(end)) < 0) {
-            ++end;
-        }
-        String value = line.substring(from, end);
+        String value = found.group(1);
         String digits = value.indexOf('%') < 0 ? digitsOf(value) : null;
         boolean isWhole = digits != null && digits.length() == value.length();
         return isWhole && digits.length() % 2 == 0 ? bytes(digits) : percentDecoded(value);
@@ -293,20 +266,12 @@ final class HexText {
      * for what is nothing but hexadecimal digits.
      */
     static byte[] base64(String text) {
-        StringBuilder letters = new StringBuilder(text.length());
-        boolean areDigits = true;
-        for (int i = 0; i < text.length(); ++i) {
-            char c = text.charAt(i);
-            if (!Character.isWhitespace(c)) {
-                areDigits &= isDigit(text, i);
-                letters.append(c == '-' ? '+' : c == '_' ? '/' : c);
-            }
-        }
-        if (areDigits) {
+        String letters = text.replaceAll("\\p{javaWhitespace}+", "");
+        if (letters.matches("\\p{XDigit}*")) {
             return null;
         }
         try {
-            byte[] bytes = Base64.getDecoder().decode(letters.toString());
+            byte[] bytes = Base64.getDecoder().decode(letters.replace('-', '+').replace('_', '/'));
             return bytes.length == 0 ? null : bytes;
         } catch (IllegalArgumentException other) {
             return null;
@@ -322,11 +287,17 @@ final class HexText {
         return bytes;
     }
 
+    /** Two digits for each byte; null for null. */
     static String digits(byte[] bytes) {
-        StringBuilder digits = new StringBuilder(2 * bytes.length);
-        for (byte b : bytes) {
-            digits.append(Character.forDigit(b >> 4 & 0xF, 16));
-            digits.append(Character.forDigit(b & 0xF, 16));
+        return bytes == null ? null : digits(bytes, 0, bytes.length, "");
+    }
+
+    /** Two digits for each byte of a range, and something between the bytes. */
+    static String digits(byte[] bytes, int from, int to, String between) {
+        StringBuilder digits = new StringBuilder();
+        for (int i = from; i < to; ++i) {
+            digits.append(i == from ? "" : between);
+            digits.append(DIGITS.charAt(bytes[i] >> 4 & 0xF)).append(DIGITS.charAt(bytes[i] & 0xF));
         }
         return digits.toString();
     }

@@ -33,7 +33,6 @@ final class Listing implements ByteVisitor {
     private static final int LONGEST = 160;
 
     private static final String UNREAD = "not read";
-    private static final String DIGITS = "0123456789ABCDEF";
 
     private final PrintWriter out;
     private final Palette palette;
@@ -228,7 +227,7 @@ final class Listing implements ByteVisitor {
             offsets.append(' ');
         }
         StringBuilder line = new StringBuilder();
-        pad(line, hexadecimal(message, start + from, start + to), BYTES_WIDTH + 2);
+        pad(line, HexText.digits(message, start + from, start + to, " "), BYTES_WIDTH + 2);
         if (text.isEmpty()) {
             line.setLength(Math.max(3 * (to - from) - 1, 0));
         } else {
@@ -243,15 +242,6 @@ final class Listing implements ByteVisitor {
         StringBuilder text = new StringBuilder(Integer.toHexString(number).toUpperCase());
         while (text.length() < atLeast) {
             text.insert(0, '0');
-        }
-        return text.toString();
-    }
-
-    static String hexadecimal(byte[] bytes, int from, int to) {
-        StringBuilder text = new StringBuilder();
-        for (int i = from; i < to; ++i) {
-            text.append(i == from ? "" : " ");
-            text.append(DIGITS.charAt(bytes[i] >> 4 & 0xF)).append(DIGITS.charAt(bytes[i] & 0xF));
         }
         return text.toString();
     }

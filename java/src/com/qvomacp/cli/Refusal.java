@@ -98,7 +98,7 @@ final class Refusal {
         int from = Math.max(offset - AROUND, 0);
         int to = Math.min(offset + AROUND, held.bytes.length);
         String start = INDENT + INDENT + Listing.hexadecimal(from, 4) + "  ";
-        String bytes = Listing.hexadecimal(held.bytes, from, to);
+        String bytes = HexText.digits(held.bytes, from, to, " ");
         out.append(palette.dim(start)).append(bytes).append('\n');
         Listing.pad(out, "", start.length() + (offset - from) * 3);
         out.append(palette.error("^^")).append('\n');

@@ -3,14 +3,16 @@ package com.qvomacp.cli;
 import java.io.ByteArrayOutputStream;
 import java.util.Arrays;
 import java.util.List;
+import java.util.regex.Matcher;
+import java.util.regex.Pattern;
 
 /**
  * Reads a dump with a column of offsets, as hexdump, xxd, od and others print it. The offsets say
  * how many bytes a line has, so that a column of characters behind them is never taken for bytes.
  */
-final class HexDump {
-    private static final int[] RADIXES = {16, 8, 10};
-    private static final int LONGEST_LINE = 256;
+final class Dump {
+    static final int[] RADIXES = {16, 8, 10};
+    static final int LONGEST_LINE = 256;
     private static final int HALF_LINE = 8;
 
     /** How many digits od and hexdump write for a byte and for a word of two, in octal. */
@@ -18,34 +20,35 @@ final class HexDump {
 
     private static final int OCTAL_WORD = 6;
 
-    /** The bytes of the dump. */
+    /** The bytes of the dump; null when its cells are no bytes. */
     final byte[] bytes;
 
     /** The line behind it. */
     final int next;
 
-    private HexDump(byte[] bytes, int next) {
+    Dump(byte[] bytes, int next) {
         this.bytes = bytes;
         this.next = next;
     }
 
     /** Reads the dump that begins at a line; null when none does. */
-    static HexDump at(List<String> lines, int first, Repeats repeats) {
+    static Dump at(List<String> lines, int first, Repeats repeats) {
+        Dump cells = CellDump.at(lines, first);
+        boolean areRead = cells != null && cells.bytes != null;
         Row row = new Row(lines.get(first));
-        if (row.offset(16) != 0 || row.digits < 4) {
-            return null;
+        if (areRead || row.offset(16) != 0 || row.digits.length() < 4) {
+            return cells;
         }
         for (int radix : RADIXES) {
-            HexDump dump = read(lines, first, radix, repeats);
+            Dump dump = read(lines, first, radix, repeats);
             if (dump != null) {
                 return dump;
             }
         }
-        return null;
+        return cells;
     }
 
-    private static HexDump read(
-            List<String> lines, int first, int radix, Repeats repeats) {
+    private static Dump read(List<String> lines, int first, int radix, Repeats repeats) {
         ByteArrayOutputStream bytes = new ByteArrayOutputStream();
         byte[] last = {};
         boolean isRepeated = false;
@@ -74,7 +77,16 @@ final class HexDump {
             bytes.write(read, 0, read.length);
             last = read.length > 0 ? read : last;
         }
-        return bytes.size() == 0 || isRepeated ? null : new HexDump(bytes.toByteArray(), index);
+        return bytes.size() == 0 || isRepeated ? null : new Dump(bytes.toByteArray(), index);
+    }
+
+    /** What digits stand for; -1 where some are none of the radix. */
+    static long number(String digits, int radix) {
+        try {
+            return Long.parseLong(digits, radix);
+        } catch (NumberFormatException other) {
+            return -1;
+        }
     }
 
     /** What asterisks stand for in a text: lines like the last one. */
@@ -96,39 +108,32 @@ final class HexDump {
 
     /** A line of a dump: an offset, and groups of digits. */
     private static final class Row {
-        private final String line;
-        private final int offsetAt;
-        private int offsetEnd;
-        private int at;
+        private static final String END = "(?=\\p{javaWhitespace}|\\z)";
+        private static final Pattern OFFSET =
+                Pattern.compile("(?:0[xX])?([0-9a-fA-F]{1,12})(:?)" + END);
+        private static final Pattern GROUP =
+                Pattern.compile("(\\p{javaWhitespace}*)([0-9a-fA-F]+)" + END);
 
-        /** How many digits the offset has. */
-        final int digits;
+        /** The digits of the offset; empty when the line does not begin with one. */
+        final String digits;
 
-        private boolean hasColon;
+        private final boolean hasColon;
+        private final boolean hasBar;
+        private final Matcher groups;
 
         Row(String text) {
-            line = text.trim();
-            offsetAt = line.startsWith("0x") || line.startsWith("0X") ? 2 : 0;
-            offsetEnd = offsetAt;
-            while (offsetEnd < line.length() && Character.digit(line.charAt(offsetEnd), 16) >= 0) {
-                ++offsetEnd;
-            }
-            digits = offsetEnd - offsetAt;
-            hasColon = offsetEnd < line.length() && line.charAt(offsetEnd) == ':';
-            at = offsetEnd + (hasColon ? 1 : 0);
+            String line = text.trim();
+            Matcher offset = OFFSET.matcher(line);
+            boolean isRow = offset.lookingAt();
+            digits = isRow ? offset.group(1) : "";
+            hasColon = isRow && !offset.group(2).isEmpty();
+            hasBar = line.indexOf('|') >= 0;
+            groups = GROUP.matcher(line).region(isRow ? offset.end() : 0, line.length());
         }
 
         /** The offset; -1 when the line does not begin with one. */
         long offset(int radix) {
-            boolean isAlone = at == line.length() || Character.isWhitespace(line.charAt(at));
-            if (digits == 0 || digits > 12 || !isAlone) {
-                return -1;
-            }
-            try {
-                return Long.parseLong(line.substring(offsetAt, offsetEnd), radix);
-            } catch (NumberFormatException other) {
-                return -1;
-            }
+            return number(digits, radix);
         }
 
         /** Reads so many bytes; null when the line has fewer, or goes on with more. */
@@ -152,52 +157,31 @@ final class HexDump {
         byte[] readToGap(int width) {
             ByteArrayOutputStream bytes = new ByteArrayOutputStream();
             int most = width == 0 ? LONGEST_LINE : width;
-            boolean hasBar = line.indexOf('|', at) >= 0;
             while (bytes.size() < most) {
                 int gap = gap();
-                boolean isHalf = gap == 2 && bytes.size() == HALF_LINE && isPair(at + gap);
-                if (bytes.size() > 0 && gap > 1 && !hasBar && !isHalf) {
-                    break;
-                }
-                byte[] group = group();
+                boolean isPair = gap == 2 && groups.group(2).length() == 2;
+                boolean isHalf = isPair && bytes.size() == HALF_LINE;
+                byte[] group = bytes.size() > 0 && gap > 1 && !hasBar && !isHalf ? null : group();
                 if (group == null) {
                     break;
                 }
                 bytes.write(group, 0, group.length);
             }
-            byte[] read = bytes.toByteArray();
-            return read.length > most ? Arrays.copyOf(read, most) : read;
+            return Arrays.copyOf(bytes.toByteArray(), Math.min(bytes.size(), most));
         }
 
+        /** How many blanks stand in front of the next group; 0 when there is none. */
         private int gap() {
-            int blank = at;
-            while (blank < line.length() && Character.isWhitespace(line.charAt(blank))) {
-                ++blank;
-            }
-            return blank - at;
+            return groups.lookingAt() ? groups.end(1) - groups.start() : 0;
         }
 
-        private boolean isPair(int from) {
-            return from + 1 < line.length()
-                    && Character.digit(line.charAt(from), 16) >= 0
-                    && Character.digit(line.charAt(from + 1), 16) >= 0
-                    && (from + 2 == line.length()
-                            || Character.isWhitespace(line.charAt(from + 2)));
-        }
-
-        /** The next group of digits; null when there is none. */
+        /** The bytes of the next group of digits; null when there is none. */
         private byte[] group() {
-            int from = at + gap();
-            int end = from;
-            while (end < line.length() && Character.digit(line.charAt(end), 16) >= 0) {
-                ++end;
-            }
-            boolean isAlone = end == line.length() || Character.isWhitespace(line.charAt(end));
-            byte[] bytes = isAlone ? number(line.substring(from, end)) : null;
+            byte[] bytes = groups.lookingAt() ? bytes(groups.group(2)) : null;
             if (bytes == null) {
                 return null;
             }
-            at = end;
+            groups.region(groups.end(), groups.regionEnd());
             // Words without a colon behind the offset are numbers, of a machine with its low byte
             // first.
             for (int low = 0, high = bytes.length - 1; !hasColon && low < high; ++low, --high) {
@@ -208,22 +192,15 @@ final class HexDump {
             return bytes;
         }
 
-        /**
-         * The bytes of a group, the highest first; null when it has not as many digits as it must.
-         */
-        private byte[] number(String group) {
+        /** The highest byte of a group first; null when it has not as many digits as it must. */
+        private byte[] bytes(String group) {
             boolean isWord = group.length() == OCTAL_WORD && !hasColon;
             if (group.length() != OCTAL_BYTE && !isWord) {
-                return group.isEmpty() || group.length() % 2 != 0 ? null : HexText.bytes(group);
+                return group.length() % 2 != 0 ? null : HexText.bytes(group);
             }
-            try {
-                int value = Integer.parseInt(group, 8);
-                return isWord
-                        ? new byte[] {(byte) (value >> 8), (byte) value}
-                        : new byte[] {(byte) value};
-            } catch (NumberFormatException other) {
-                return null;
-            }
+            int value = (int) number(group, 8);
+            byte[] word = {(byte) (value >> 8), (byte) value};
+            return value < 0 ? null : isWord ? word : new byte[] {(byte) value};
         }
     }
 }
