@@ -74,23 +74,20 @@ final class Answers {
      */
     static boolean ask(Held held, Comparison comparison) {
         NativeLibrary.load();
-        return new Answers(comparison).ask(held);
-    }
-
-    private boolean ask(Held held) {
+        Answers answers = new Answers(comparison);
         byte[] push = held.isPush ? held.bytes : push(held.bytes);
         try {
-            if (!parser.qvomacp_parser(push, push.length, 0)) {
+            if (!answers.parser.qvomacp_parser(push, push.length, 0)) {
                 return false;
             }
             if (held.isPush) {
-                header();
+                answers.header();
             }
-            characteristics();
+            answers.characteristics();
             comparison.rest();
             return true;
         } finally {
-            parser.qvomacp_parser_del();
+            answers.parser.qvomacp_parser_del();
         }
     }
 
@@ -156,12 +153,9 @@ final class Answers {
     }
 
     private void array(String names, String[] values) {
-        int at = 0;
-        for (String name : names.split(" ")) {
-            if (!name.equals("-")) {
-                single(name, values[at]);
-            }
-            ++at;
+        String[] all = names.split(" ");
+        for (int i = 0; i < all.length; ++i) {
+            single(all[i], all[i].equals("-") ? null : values[i]);
         }
     }
 
@@ -258,8 +252,7 @@ final class Answers {
     }
 
     private void access(int a) {
-        list("RULE", accesses.qvomacp_GetPxRuleCount(a),
-                d -> accesses.qvomacp_GetPxRuleData(a, d));
+        list("RULE", accesses.qvomacp_GetPxRuleCount(a), d -> accesses.qvomacp_GetPxRuleData(a, d));
         list("APPID", accesses.qvomacp_GetPxAppIdCount(a),
                 d -> accesses.qvomacp_GetPxAppIdData(a, d));
         list("PORTNBR", accesses.qvomacp_GetPxPortNbrCount(a),

@@ -10,7 +10,6 @@ import java.util.ArrayList;
 import java.util.Collections;
 import java.util.Deque;
 import java.util.HashMap;
-import java.util.Iterator;
 import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
@@ -48,8 +47,7 @@ final class Comparison {
         }
 
         private static <T> Deque<T> left(Map<String, Deque<T>> map, String key) {
-            Deque<T> left = map.get(key);
-            return left == null ? new ArrayDeque<>() : left;
+            return map.getOrDefault(key, new ArrayDeque<>());
         }
     }
 
@@ -91,7 +89,8 @@ final class Comparison {
 
     void begin(String type) {
         boolean isHeader = type.equals(HEADER);
-        Characteristic said = isHeader ? null : Level.left(open.peek().characteristics, type).poll();
+        Map<String, Deque<Characteristic>> left = open.peek().characteristics;
+        Characteristic said = isHeader ? null : Level.left(left, type).poll();
         List<Item> items = said == null ? NOTHING : said.children();
         int column = isHeader ? TextWriter.HEADER_COLUMN : TextWriter.column(items);
         Answer answer = Answer.characteristic(type, column, true);
@@ -111,11 +110,12 @@ final class Comparison {
 
     /** An element of an array: the first parameter of the name that has the value, or the next. */
     void single(String name, String value) {
-        for (Iterator<Parameter> left = Level.left(open.peek().parameters, name).iterator(); left.hasNext(); ) {
-            if (Objects.equals(left.next().value(), value)) {
-                left.remove();
-                add(Answer.parameter(name, value, true, value));
-                return;
+        Deque<Parameter> left = Level.left(open.peek().parameters, name);
+        for (Parameter parameter : left) {
+            if (Objects.equals(parameter.value(), value)) {
+                left.remove(parameter);
+                left.push(parameter);
+                break;
             }
         }
         listed(name, value);

@@ -169,7 +169,7 @@ abstract class Job {
     void explain(Reading reading) {
         console.raise(reading.status());
         if (!reading.isAccepted()) {
-            complain(Refusal.of(reading).write(startOf(reading.held.name), errPalette()));
+            complain(new Refusal(reading).write(startOf(reading.held.name), errPalette()));
         }
     }
 

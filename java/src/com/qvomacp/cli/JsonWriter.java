@@ -93,15 +93,11 @@ final class JsonWriter {
     }
 
     JsonWriter member(String name, long value) {
-        name(name).next();
-        out.print(value);
-        return this;
+        return name(name).literal(Long.toString(value));
     }
 
     JsonWriter member(String name, boolean value) {
-        name(name).next();
-        out.print(value);
-        return this;
+        return name(name).literal(Boolean.toString(value));
     }
 
     JsonWriter nullMember(String name) {
@@ -110,8 +106,12 @@ final class JsonWriter {
 
     /** A string, or null. */
     JsonWriter text(String text) {
+        return literal(text == null ? "null" : Visible.json(text));
+    }
+
+    private JsonWriter literal(String value) {
         next();
-        out.append(text == null ? "null" : Visible.json(text));
+        out.append(value);
         return this;
     }
 

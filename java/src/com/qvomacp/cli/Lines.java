@@ -8,7 +8,15 @@ final class Lines {
     /** The columns of a terminal that everybody has. */
     static final int WIDTH = 80;
 
+    /** How many columns the lines of a paragraph are indented. */
+    static final int INDENT = 2;
+
     private Lines() {}
+
+    /** A paragraph, all of whose lines but the first are indented; that one begins as is told. */
+    static String paragraph(String start, String text) {
+        return start + String.join("\n  ", of(text, WIDTH - INDENT)) + '\n';
+    }
 
     /** The lines of a text, none wider than {@code columns}; words longer than that are cut. */
     static List<String> of(String text, int columns) {

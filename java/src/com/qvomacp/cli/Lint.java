@@ -104,20 +104,12 @@ final class Lint extends MessageJob {
         String severity = severity(finding) + ":";
         String rule = " [" + finding.rule().ruleName() + "]";
         String text = place + ": " + severity + " " + Visible.of(finding.sentence()) + rule;
-        List<String> lines = Lines.of(text, Lines.WIDTH - TextWriter.INDENT);
         boolean isError = finding.rule().severity() == Severity.ERROR;
         String painted = isError ? outPalette().error(severity) : outPalette().bold(severity);
-        console.out.println(lines.get(0).replaceFirst("(?<=: )" + severity, painted));
-        indented(lines.subList(1, lines.size()));
+        console.out.print(Lines.paragraph("", text).replaceFirst("(?<=: )" + severity, painted));
         String told = "in " + finding.path() + "; right: " + finding.remedy();
         told += "; see " + finding.rule().reference();
-        indented(Lines.of(Visible.of(told), Lines.WIDTH - TextWriter.INDENT));
-    }
-
-    private void indented(List<String> lines) {
-        for (String line : lines) {
-            console.out.append("  ").println(line);
-        }
+        console.out.print(Lines.paragraph("  ", Visible.of(told)));
     }
 
     private void json(Finding finding) {

@@ -40,8 +40,8 @@ final class Listing implements ByteVisitor {
     private final int bodyAt;
     private final int digits;
 
-    /** Whether a push header stands in front of the body. */
-    private final boolean hasTwoOffsets;
+    /** How wide the offsets in the body are; 1 where no header makes them others. */
+    private final int secondWidth;
 
     /** Where what is told begins: the offsets of a header or of a body. */
     private int start;
@@ -54,7 +54,7 @@ final class Listing implements ByteVisitor {
     private int depth;
 
     /** What the library reads otherwise: where, and what; and how much of it has been said. */
-    private int[] otherwiseAt = {};
+    private final List<Integer> otherwiseAt = new ArrayList<>();
 
     private final List<String> otherwise = new ArrayList<>();
     private int saidOtherwise;
@@ -74,31 +74,34 @@ final class Listing implements ByteVisitor {
         this.palette = palette;
         this.message = reading.held.bytes;
         this.bodyAt = reading.bodyAt();
-        this.hasTwoOffsets = reading.header != null;
         this.digits = message.length > 0x10000 ? 6 : 4;
+        this.secondWidth = reading.header == null ? 1 : digits + 2;
     }
 
     static void write(PrintWriter out, Palette palette, Reading reading) {
         Listing listing = new Listing(out, palette, reading);
-        listing.title(reading.held.isPush);
+        boolean hasHeader = reading.header != null;
+        boolean isPush = reading.held.isPush;
+        String first = hasHeader ? "msg" : isPush ? "at" : "body";
+        String titles = listing.offsets(first, hasHeader ? "body" : "");
+        StringBuilder bytes = new StringBuilder();
+        pad(bytes, "bytes", BYTES_WIDTH + 2);
+        out.append(palette.bold(titles + bytes + "meaning")).append('\n');
         Verdict verdict = reading.verdict;
-        boolean isRefused = !verdict.isAccepted();
-        if (reading.header != null) {
-            if (isRefused && verdict.isHeaderRefused()) {
-                listing.stopsAt(verdict);
-            }
+        listing.stopReason = "the library refuses: " + verdict.reason();
+        int stop = verdict.isAccepted() ? -1 : verdict.offset();
+        if (hasHeader) {
+            listing.stop = verdict.isHeaderRefused() ? stop : -1;
             reading.header.describe(listing);
             listing.end(reading.bodyAt());
         }
         listing.start = reading.bodyAt();
-        listing.isBody = reading.header != null || !reading.held.isPush;
+        listing.isBody = hasHeader || !isPush;
         listing.told = 0;
-        boolean isTooMuch =
-                reading.failure != null && reading.failure.reason() == Reason.TEXT_TOO_LONG;
-        if (isRefused && !verdict.isHeaderRefused() && (isTooMuch || reading.document != null)) {
-            listing.stopsAt(verdict);
-        }
-        if (reading.document != null) {
+        boolean isRead = reading.document != null;
+        boolean isTooMuch = !isRead && reading.failure.reason() == Reason.TEXT_TOO_LONG;
+        listing.stop = !verdict.isHeaderRefused() && (isTooMuch || isRead) ? stop : -1;
+        if (isRead) {
             listing.compare(verdict);
             listing.deviations = reading.document.deviations().iterator();
             listing.nextDeviation();
@@ -122,32 +125,15 @@ final class Listing implements ByteVisitor {
 
     private void compare(Verdict verdict) {
         Map<String, String> once = new HashMap<>();
-        verdict.describeOtherwise(
-                (offset, length, depth, meaning) -> {
-                    if (otherwise.size() == otherwiseAt.length) {
-                        otherwiseAt = Arrays.copyOf(otherwiseAt, 2 * otherwise.size() + 1);
-                    }
-                    otherwiseAt[otherwise.size()] = offset;
-                    once.putIfAbsent(meaning, meaning);
-                    otherwise.add(once.get(meaning));
-                });
-    }
-
-    private void stopsAt(Verdict verdict) {
-        stop = verdict.offset();
-        stopReason = "the library refuses: " + verdict.reason();
+        verdict.describeOtherwise((offset, length, depth, meaning) -> {
+            otherwiseAt.add(offset);
+            once.putIfAbsent(meaning, meaning);
+            otherwise.add(once.get(meaning));
+        });
     }
 
     private void nextDeviation() {
         nextDeviation = deviations.hasNext() ? deviations.next() : null;
-    }
-
-    private void title(boolean isPush) {
-        StringBuilder title = new StringBuilder();
-        pad(title, hasTwoOffsets ? "msg" : isPush ? "at" : "body", digits + 1);
-        pad(title, hasTwoOffsets ? "body" : "", hasTwoOffsets ? digits + 2 : 1);
-        pad(title, "bytes", BYTES_WIDTH + 2);
-        out.append(palette.bold(title + "meaning")).append('\n');
     }
 
     @Override
@@ -159,11 +145,12 @@ final class Listing implements ByteVisitor {
         }
         row(offset, length, meaning);
         told = offset + length;
-        while (saidOtherwise < otherwise.size() && otherwiseAt[saidOtherwise] < told) {
+        while (saidOtherwise < otherwise.size() && otherwiseAt.get(saidOtherwise) < told) {
             row(offset, 0, otherwise.get(saidOtherwise++));
         }
         if (stop >= 0 && stop < told) {
-            refused();
+            row(told, 0, stopReason);
+            stop = -1;
         }
     }
 
@@ -173,29 +160,26 @@ final class Listing implements ByteVisitor {
             visit(told, end - told, 0, UNREAD);
         }
         if (stop >= 0) {
-            refused();
+            row(told, 0, stopReason);
         }
     }
 
-    private void refused() {
-        stop = -1;
-        row(told, 0, stopReason);
-    }
-
     private void row(int offset, int length, String meaning) {
-        int column = digits + 1 + (hasTwoOffsets ? digits + 2 : 1) + BYTES_WIDTH + 2;
+        int column = digits + 1 + secondWidth + BYTES_WIDTH + 2;
         int indent = Math.min(depth, DEEPEST) * INDENT;
-        List<String> texts = Lines.of(shown(meaning), Lines.WIDTH - column - indent);
+        boolean isLong = meaning.length() > LONGEST;
+        String shown = isLong ? Visible.of(meaning.substring(0, LONGEST)) + "..." : Visible.of(meaning);
+        List<String> texts = Lines.of(shown, Lines.WIDTH - column - indent);
         int lines = Math.max((length + BYTES_PER_LINE - 1) / BYTES_PER_LINE, texts.size());
         boolean isUnread = meaning.equals(UNREAD);
         for (int i = 0; i < lines; ++i) {
             int from = offset + Math.min(i * BYTES_PER_LINE, length);
             int to = Math.min(from + BYTES_PER_LINE, offset + length);
             String text = i < texts.size() ? texts.get(i) : "";
-            if (i > 0 && isUnread) {
-                text = characters(from, to);
-            }
-            line(from, to, indent, length == 0 ? palette.error(text) : painted(meaning, text));
+            text = i > 0 && isUnread ? characters(from, to) : text;
+            boolean isText = meaning.indexOf('"') >= 0;
+            text = length == 0 ? palette.error(text) : isText ? palette.text(text) : text;
+            line(from, to, indent, text);
         }
     }
 
@@ -208,24 +192,11 @@ final class Listing implements ByteVisitor {
         return text.append('|').toString();
     }
 
-    private static String shown(String meaning) {
-        boolean isLong = meaning.length() > LONGEST;
-        return isLong ? Visible.of(meaning.substring(0, LONGEST)) + "..." : Visible.of(meaning);
-    }
-
-    private String painted(String meaning, String text) {
-        return meaning.indexOf('"') >= 0 ? palette.text(text) : text;
-    }
-
     private void line(int from, int to, int indent, String text) {
-        StringBuilder offsets = new StringBuilder();
         boolean hasBytes = from < to;
-        pad(offsets, hasBytes ? hexadecimal(start + from, digits) : "", digits + 1);
-        if (hasTwoOffsets) {
-            pad(offsets, hasBytes && isBody ? hexadecimal(from, digits) : "", digits + 2);
-        } else {
-            offsets.append(' ');
-        }
+        boolean hasTwo = hasBytes && isBody && secondWidth > 1;
+        String offsets = offsets(hasBytes ? hexadecimal(start + from, digits) : "",
+                hasTwo ? hexadecimal(from, digits) : "");
         StringBuilder line = new StringBuilder();
         pad(line, HexText.digits(message, start + from, start + to, " "), BYTES_WIDTH + 2);
         if (text.isEmpty()) {
@@ -234,7 +205,15 @@ final class Listing implements ByteVisitor {
             pad(line, "", indent);
             line.append(text);
         }
-        out.append(palette.dim(offsets.toString())).append(line).append('\n');
+        out.append(palette.dim(offsets)).append(line).append('\n');
+    }
+
+    /** The columns in front of the bytes. */
+    private String offsets(String first, String second) {
+        StringBuilder offsets = new StringBuilder();
+        pad(offsets, first, digits + 1);
+        pad(offsets, second, secondWidth);
+        return offsets.toString();
     }
 
     /** A number with at least so many digits. */

@@ -15,9 +15,9 @@ import java.util.Locale;
 
 /**
  * Writes a message as the members of a JSON object. {@code header} is null for a body alone, {@code
- * document} is null when the message cannot be read, which {@code error} then explains. {@code children} stand in the order of the message; each tells by its members what it
- * is: {@code type} a characteristic, {@code name} and {@code value} a parameter, {@code other}
- * whatever else.
+ * document} is null when the message cannot be read, which {@code error} then explains. {@code
+ * children} stand in the order of the message; each tells by its members what it is: {@code type} a
+ * characteristic, {@code name} and {@code value} a parameter, {@code other} whatever else.
  */
 final class MessageJson {
     private final JsonWriter json;
@@ -36,10 +36,8 @@ final class MessageJson {
         json.name("deviations").beginArray();
         if (reading.document != null) {
             for (Deviation deviation : reading.document.deviations()) {
-                json.beginFlatObject();
-                json.member("offset", deviation.offset());
-                json.member("path", deviation.path());
-                json.member("sentence", deviation.sentence()).end();
+                json.beginFlatObject().member("offset", deviation.offset());
+                json.member("path", deviation.path()).member("sentence", deviation.sentence()).end();
             }
         }
         json.end();
@@ -62,10 +60,8 @@ final class MessageJson {
         if (header.contentType().code() >= 0) {
             json.member("contentTypeCode", header.contentType().code());
         }
-        json.member("headerLength", header.length());
-        json.member("bodyLength", bodyLength);
-        json.member("securityMethod", header.securityMethod().name());
-        json.member("mac", header.mac());
+        json.member("headerLength", header.length()).member("bodyLength", bodyLength);
+        json.member("securityMethod", header.securityMethod().name()).member("mac", header.mac());
         fields("parameters", header.contentType().parameters());
         fields("fields", header.fields());
         json.end();
@@ -81,12 +77,10 @@ final class MessageJson {
     }
 
     private void document(ProvisioningDocument document) {
-        json.name("document").beginObject();
-        json.member("wbxmlVersion", document.wbxmlVersion());
+        json.name("document").beginObject().member("wbxmlVersion", document.wbxmlVersion());
         json.member("publicIdentifier", document.publicIdentifier());
         json.member("documentType", document.documentType());
-        json.member("charset", document.charset());
-        json.member("charsetName", document.charsetName());
+        json.member("charset", document.charset()).member("charsetName", document.charsetName());
         json.member("version", document.version());
         items("children", document.children());
         json.end();
@@ -160,8 +154,7 @@ final class MessageJson {
     }
 
     private void verdict(Verdict verdict, ProvisioningDocument document) {
-        json.name("verdict").beginObject();
-        json.member("accepted", verdict.isAccepted());
+        json.name("verdict").beginObject().member("accepted", verdict.isAccepted());
         if (!verdict.isAccepted()) {
             json.member("part", verdict.isHeaderRefused() ? "header" : "body");
         }
@@ -172,8 +165,7 @@ final class MessageJson {
         } else {
             json.member("offset", verdict.offset());
         }
-        json.member("path", verdict.path());
-        json.member("reason", verdict.reason());
+        json.member("path", verdict.path()).member("reason", verdict.reason());
         json.member("found", verdict.found());
         json.name("expected").beginArray();
         for (String expected : verdict.expected()) {

@@ -1,6 +1,7 @@
 package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.ProvisioningException;
+import com.qvomacp.eng.omacp.ProvisioningException.Reason;
 import com.qvomacp.eng.omacp.Verdict;
 import java.util.ArrayList;
 import java.util.List;
@@ -25,15 +26,14 @@ final class Refusal {
     private final String path;
     private final List<String> expected;
 
-    private Refusal(Reading reading) {
+    /** Why a message is refused that cannot be read, or is not taken by the library. */
+    Refusal(Reading reading) {
         ProvisioningException failure = reading.failure;
         Verdict verdict = reading.verdict;
-        boolean isBoth = failure != null && verdict.offset() == failure.offset() && !verdict.isHeaderRefused();
-        boolean isLibrarys = failure == null || isBoth;
-        boolean isHeader =
-                isLibrarys
-                        ? verdict.isHeaderRefused()
-                        : failure.reason() == ProvisioningException.Reason.NO_PUSH_HEADER;
+        boolean isHeaderRefused = verdict.isHeaderRefused();
+        boolean isLibrarys =
+                failure == null || verdict.offset() == failure.offset() && !isHeaderRefused;
+        boolean isHeader = isLibrarys ? isHeaderRefused : failure.reason() == Reason.NO_PUSH_HEADER;
         int place = isLibrarys ? verdict.offset() : failure.offset();
         held = reading.held;
         sentence = failure == null ? verdict.reason() : failure.getMessage();
@@ -42,11 +42,6 @@ final class Refusal {
         offset = isHeader ? place : reading.bodyAt() + place;
         path = isHeader ? "push header" : isLibrarys ? verdict.path() : failure.path();
         expected = isLibrarys ? verdict.expected() : failure.expected();
-    }
-
-    /** Why a message is refused that cannot be read, or is not taken by the library. */
-    static Refusal of(Reading reading) {
-        return new Refusal(reading);
     }
 
     /** Writes it behind {@code start}, such as the name of the file. */
@@ -60,12 +55,13 @@ final class Refusal {
         for (String line : lines.subList(1, lines.size())) {
             out.append(INDENT).append(palette.error(line)).append('\n');
         }
-        paragraph(out, place());
+        out.append(Lines.paragraph(INDENT, Visible.of(place())));
         if (held.bytes.length > 0) {
             bytes(out, palette);
         }
         if (!expected.isEmpty()) {
-            paragraph(out, "Accepted here: " + String.join(", ", expected) + ".");
+            String accepted = "Accepted here: " + String.join(", ", expected) + ".";
+            out.append(Lines.paragraph(INDENT, Visible.of(accepted)));
         }
         return out.toString();
     }
@@ -85,12 +81,6 @@ final class Refusal {
             parts.add("in " + path);
         }
         return String.join(", ", parts) + ".";
-    }
-
-    private static void paragraph(StringBuilder out, String text) {
-        for (String line : Lines.of(Visible.of(text), Lines.WIDTH - INDENT.length())) {
-            out.append(INDENT).append(line).append('\n');
-        }
     }
 
     /** The bytes around, and a mark below the first that is refused. */

@@ -71,7 +71,7 @@ final class Show extends JsonJob {
             console.raise(reading.status());
             list(reading);
             if (!reading.isAccepted()) {
-                console.out.print("\n" + Refusal.of(reading).write("", outPalette()));
+                console.out.print("\n" + new Refusal(reading).write("", outPalette()));
             }
         } else if (isJson()) {
             explain(reading);

@@ -10,6 +10,7 @@ import com.qvomacp.eng.omacp.Parameter;
 import com.qvomacp.eng.omacp.ProvisioningDocument;
 import com.qvomacp.eng.omacp.PushHeader;
 import java.io.PrintWriter;
+import java.util.ArrayList;
 import java.util.List;
 import java.util.Locale;
 
@@ -44,11 +45,8 @@ final class TextWriter {
         fact("Content type", type.mediaType() + code);
         fact("Header length", header.length() + " bytes");
         fact("Body length", bodyLength + " bytes");
-        fields(type.parameters());
-        fields(header.fields());
-    }
-
-    private void fields(List<HeaderField> fields) {
+        List<HeaderField> fields = new ArrayList<>(type.parameters());
+        fields.addAll(header.fields());
         for (HeaderField field : fields) {
             fact(field.name(), field.value());
         }
@@ -118,7 +116,8 @@ final class TextWriter {
     static String describe(Other other) {
         boolean isTrailing = other.kind() == Other.Kind.TRAILING;
         StringBuilder text = new StringBuilder("(");
-        text.append(isTrailing ? other.length() + " bytes behind the document" : nameOf(other.kind()));
+        String kind = other.kind().name().toLowerCase(Locale.ROOT);
+        text.append(isTrailing ? other.length() + " bytes behind the document" : kind);
         if (other.name() != null) {
             text.append(' ').append(Visible.of(other.name()));
         }
@@ -126,10 +125,6 @@ final class TextWriter {
             text.append(' ').append(Visible.quoted(other.text()));
         }
         return text.append(')').toString();
-    }
-
-    private static String nameOf(Other.Kind kind) {
-        return kind.name().toLowerCase(Locale.ROOT);
     }
 
     private void deviations(List<Deviation> deviations) {
@@ -140,11 +135,7 @@ final class TextWriter {
         for (Deviation deviation : deviations.subList(0, Math.min(DEVIATIONS, deviations.size()))) {
             String path = deviation.path().isEmpty() ? "" : ", " + deviation.path();
             String text = deviation.sentence() + " (body offset " + deviation.offset() + path + ")";
-            String start = "- ";
-            for (String line : Lines.of(Visible.of(text), Lines.WIDTH - INDENT)) {
-                out.append(start).append(line).append('\n');
-                start = "  ";
-            }
+            out.append(Lines.paragraph("- ", Visible.of(text)));
         }
         if (deviations.size() > DEVIATIONS) {
             int more = deviations.size() - DEVIATIONS;
