@@ -4,34 +4,39 @@ import com.qvomacp.eng.omacp.EncodeOption;
 import java.io.IOException;
 import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
+import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Locale;
+import java.util.Map;
 
 /**
- * Options of the command line that are those of encoding. A secret may also stand in a file or in the
- * environment, where no list of processes shows it.
+ * Options of the command line that are those of encoding. A secret may also stand in a file or in
+ * the environment, where no list of processes shows it.
  */
 final class Choices {
     private static final String FILE = "-file";
     private static final String ENVIRONMENT = "-env";
 
-    /** What encoding takes, and what a check of a MAC takes of it. */
-    static final List<Option<String>> ALL = new ArrayList<>();
+    /** What encoding takes, by the name, and what a check of a MAC takes of it. */
+    static final Map<String, Option<String>> ALL = new LinkedHashMap<>();
 
     static final List<Option<String>> SECRETS = new ArrayList<>();
 
     static {
         for (EncodeOption option : EncodeOption.values()) {
             String name = "--" + option.optionName();
-            String label = option.choices().isEmpty() ? option.optionName() : "how";
-            List<Option<String>> ways = new ArrayList<>();
-            ways.add(Option.text(name, label.toUpperCase(Locale.ROOT), described(option), option.choices()));
+            String[] choices = option.choices().toArray(new String[0]);
+            String label = choices.length == 0 ? option.optionName().toUpperCase(Locale.ROOT) : "HOW";
+            ALL.put(name, Option.text(name, label, described(option), choices));
             if (option.isSecret()) {
-                ways.add(Option.text(name + FILE, "FILE", "Read " + name + " from a file, or \"-\"."));
-                ways.add(Option.text(name + ENVIRONMENT, "NAME", "Take " + name + " from the environment."));
-                SECRETS.addAll(ways);
+                String file = "Read " + name + " from a file, or \"-\".";
+                ALL.put(name + FILE, Option.text(name + FILE, "FILE", file));
+                String variable = "Take " + name + " from the environment.";
+                ALL.put(name + ENVIRONMENT, Option.text(name + ENVIRONMENT, "NAME", variable));
+                for (String way : new String[] {"", FILE, ENVIRONMENT}) {
+                    SECRETS.add(ALL.get(name + way));
+                }
             }
-            ALL.addAll(ways);
         }
     }
 
@@ -57,19 +62,8 @@ final class Choices {
     /** The value that the command line states for an option, or says where it stands; or null. */
     String value(EncodeOption option) {
         String name = "--" + option.optionName();
-        String value = stated(name);
-        return option.isSecret()
-                ? one(name, value, one(name, ofFile(name + FILE), ofEnvironment(name + ENVIRONMENT)))
-                : value;
-    }
-
-    private String stated(String name) {
-        for (Option<String> option : ALL) {
-            if (option.isNamed(name)) {
-                return job.value(option);
-            }
-        }
-        throw new AssertionError(name);
+        String value = job.value(ALL.get(name));
+        return option.isSecret() ? one(name, value, one(name, ofFile(name), ofEnvironment(name))) : value;
     }
 
     private static String one(String name, String first, String second) {
@@ -79,8 +73,9 @@ final class Choices {
         return first == null ? second : first;
     }
 
-    private String ofEnvironment(String name) {
-        String variable = stated(name);
+    private String ofEnvironment(String secret) {
+        String name = secret + ENVIRONMENT;
+        String variable = job.value(ALL.get(name));
         String value = variable == null ? null : System.getenv(variable);
         if (variable != null && value == null) {
             throw new UsageException(name + " names no variable: " + variable);
@@ -88,8 +83,9 @@ final class Choices {
         return value;
     }
 
-    private String ofFile(String name) {
-        String file = stated(name);
+    private String ofFile(String secret) {
+        String name = secret + FILE;
+        String file = job.value(ALL.get(name));
         if (file == null) {
             return null;
         }
@@ -102,8 +98,8 @@ final class Choices {
             byte[] content = Input.read(file, job.console.in, job.limit);
             return new String(content, StandardCharsets.UTF_8).replaceFirst("\r?\n$", "");
         } catch (IOException unreadable) {
-            throw new UsageException(
-                    name + ": " + Input.nameOf(file) + ": " + unreadable.getMessage());
+            String what = Input.nameOf(file) + ": " + unreadable.getMessage();
+            throw new UsageException(name + ": " + what);
         }
     }
 }

@@ -60,8 +60,8 @@ final class Diff extends MessageJob {
             }
             writer.endTo(0);
         } else if (!changes.isEmpty()) {
-            console.out.println(outPalette().bold("--- " + Visible.of(left.held.name)));
-            console.out.println(outPalette().bold("+++ " + Visible.of(right.held.name)));
+            console.out.println(palette.bold("--- " + Visible.of(left.held.name)));
+            console.out.println(palette.bold("+++ " + Visible.of(right.held.name)));
             for (Change change : changes) {
                 text(change);
             }
@@ -108,7 +108,6 @@ final class Diff extends MessageJob {
         StringBuilder line = new StringBuilder("  ").append(sign).append(' ');
         Listing.pad(line, "", indent);
         line.append(text);
-        Palette palette = outPalette();
         String whole = line.toString();
         console.out.println(sign == '-' ? palette.error(whole) : palette.text(whole));
     }

@@ -66,7 +66,7 @@ final class Encode extends Job {
     List<Option<?>> options() {
         List<Option<?>> options = super.options();
         Collections.addAll(options, BODY, HEX, BASE64, SMS, TO, OUTPUT, FORCE);
-        options.addAll(Choices.ALL);
+        options.addAll(Choices.ALL.values());
         return options;
     }
 
@@ -108,7 +108,7 @@ final class Encode extends Job {
 
     @Override
     void run(Held held) {
-        Reading reading = Reading.of(held, limit);
+        Reading reading = new Reading(held, limit);
         if (reading.message == null) {
             explain(reading);
             return;
@@ -150,7 +150,7 @@ final class Encode extends Job {
         if (USERPINMAC.equals(encoder.options().value(EncodeOption.SEC))) {
             tell(name, encoder.digitsToTell());
         }
-        Reading reading = Reading.of(Held.message(name, message, !has(BODY)), message.length);
+        Reading reading = new Reading(Held.message(name, message, !has(BODY)), message.length);
         if (reading.isAccepted()) {
             complain(startOf(name) + "the library takes it\n");
         }

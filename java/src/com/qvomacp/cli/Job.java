@@ -1,5 +1,6 @@
 package com.qvomacp.cli;
 
+import com.qvomacp.cli.Terminal.Color;
 import com.qvomacp.eng.omacp.EncodingException;
 import com.qvomacp.eng.omacp.ProvisioningException;
 import com.qvomacp.eng.omacp.PushHeader;
@@ -20,12 +21,15 @@ abstract class Job {
             "What the messages are, where it does not show by itself: push, body, sms (an"
                     + " SMS-DELIVER) or ud (the user data of an SMS).");
 
-    private static final Option<Terminal.Color> COLOR =
-            Option.constant("--color", "WHEN", Terminal.Color.values(),
+    private static final Option<Color> COLOR =
+            Option.constant("--color", "WHEN", Color.values(),
                     "Use colours: auto (on a terminal, unless NO_COLOR is set), always, never.");
 
     Arguments arguments;
     Console console;
+
+    /** The colours of standard output. */
+    Palette palette;
 
     /** How many bytes of a file are read, and so how long a message may be. */
     int limit;
@@ -69,6 +73,7 @@ abstract class Job {
     final void run(Console to, Arguments given) {
         console = to;
         arguments = given;
+        palette = palette(to.terminal.hasColorOut);
         limit = has(LIMIT) ? bytes(value(LIMIT)) : DEFAULT_LIMIT;
         List<String> files = given.files;
         if (files.isEmpty()) {
@@ -147,12 +152,10 @@ abstract class Job {
         return at < content.length && content[at] == '<' && (at > 0 || !Intake.isPush(content));
     }
 
-    Palette outPalette() {
-        return console.terminal.out(value(COLOR));
-    }
-
-    Palette errPalette() {
-        return console.terminal.err(value(COLOR));
+    /** The colours of an output that has some by itself or has not. */
+    private Palette palette(boolean byItself) {
+        Color wish = value(COLOR);
+        return new Palette(wish == Color.always || wish != Color.never && byItself);
     }
 
     /** How a line begins that says something about a file where errors go. */
@@ -169,7 +172,8 @@ abstract class Job {
     void explain(Reading reading) {
         console.raise(reading.status());
         if (!reading.isAccepted()) {
-            complain(new Refusal(reading).write(startOf(reading.held.name), errPalette()));
+            Palette colors = palette(console.terminal.hasColorErr);
+            complain(new Refusal(reading).write(startOf(reading.held.name), colors));
         }
     }
 
@@ -178,7 +182,7 @@ abstract class Job {
         try {
             return PushHeader.parse(held.bytes);
         } catch (ProvisioningException none) {
-            explain(Reading.of(held, limit));
+            explain(new Reading(held, limit));
             failed(held.name, none.getMessage());
             return null;
         }

@@ -31,14 +31,15 @@ abstract class JsonJob extends Job {
 
     @Override
     void end() {
-        if (isInArray() && writer.depth() == 0) {
-            writer.beginArray();
-        }
+        beginArray();
         writer.endTo(0);
     }
 
-    private boolean isInArray() {
-        return has(JSON) && isOneOfSeveral;
+    /** Begins the array of several objects where it is not begun yet. */
+    private void beginArray() {
+        if (has(JSON) && isOneOfSeveral && writer.depth() == 0) {
+            writer.beginArray();
+        }
     }
 
     final boolean isJson() {
@@ -46,9 +47,7 @@ abstract class JsonJob extends Job {
     }
 
     final void beginObject(String name) {
-        if (isInArray() && writer.depth() == 0) {
-            writer.beginArray();
-        }
+        beginArray();
         writer.beginObject();
         inObject = true;
         if (isOneOfSeveral) {

@@ -100,10 +100,6 @@ final class JsonWriter {
         return name(name).literal(Boolean.toString(value));
     }
 
-    JsonWriter nullMember(String name) {
-        return name(name).text(null);
-    }
-
     /** A string, or null. */
     JsonWriter text(String text) {
         return literal(text == null ? "null" : Visible.json(text));

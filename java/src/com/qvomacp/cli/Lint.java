@@ -105,7 +105,7 @@ final class Lint extends MessageJob {
         String rule = " [" + finding.rule().ruleName() + "]";
         String text = place + ": " + severity + " " + Visible.of(finding.sentence()) + rule;
         boolean isError = finding.rule().severity() == Severity.ERROR;
-        String painted = isError ? outPalette().error(severity) : outPalette().bold(severity);
+        String painted = isError ? palette.error(severity) : palette.bold(severity);
         console.out.print(Lines.paragraph("", text).replaceFirst("(?<=: )" + severity, painted));
         String told = "in " + finding.path() + "; right: " + finding.remedy();
         told += "; see " + finding.rule().reference();
@@ -121,7 +121,7 @@ final class Lint extends MessageJob {
         } else if (finding.offset() >= 0) {
             writer.member("offset", finding.offset());
         } else {
-            writer.nullMember("offset");
+            writer.member("offset", null);
         }
         writer.member("sentence", finding.sentence()).member("remedy", finding.remedy());
         writer.member("reference", finding.rule().reference()).end();

@@ -13,13 +13,13 @@ abstract class MessageJob extends JsonJob {
     @Override
     boolean runXml(String name, byte[] xml) throws EncodingException {
         byte[] body = ProvisioningEncoder.ofXml(xml, EncodeOptions.NONE).body();
-        run(Reading.of(Held.message(name, body, false), body.length));
+        run(new Reading(Held.message(name, body, false), body.length));
         return true;
     }
 
     @Override
     final void run(Held held) {
-        Reading reading = Reading.of(held, limit);
+        Reading reading = new Reading(held, limit);
         if (reading.message != null) {
             run(reading);
             return;

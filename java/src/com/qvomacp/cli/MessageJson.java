@@ -29,7 +29,7 @@ final class MessageJson {
     void message(Reading reading) {
         header(reading.header, reading.held.bytes.length - reading.bodyAt());
         if (reading.document == null) {
-            json.nullMember("document");
+            json.member("document", null);
         } else {
             document(reading.document);
         }
@@ -49,7 +49,7 @@ final class MessageJson {
 
     void header(PushHeader header, int bodyLength) {
         if (header == null) {
-            json.nullMember("header");
+            json.member("header", null);
             return;
         }
         json.name("header").beginObject();
@@ -161,7 +161,7 @@ final class MessageJson {
         json.member("code", verdict.code()).member("codeName", verdict.codeName());
         json.member("bytesRead", verdict.bytesRead());
         if (verdict.isAccepted()) {
-            json.nullMember("offset");
+            json.member("offset", null);
         } else {
             json.member("offset", verdict.offset());
         }
@@ -189,7 +189,7 @@ final class MessageJson {
      */
     void answers(Comparison comparison) {
         if (comparison.unanswered != null) {
-            json.nullMember("answers").member("unanswered", comparison.unanswered);
+            json.member("answers", null).member("unanswered", comparison.unanswered);
         } else {
             json.name("answers").beginArray();
             answers(comparison.answers);

@@ -1,8 +1,6 @@
 package com.qvomacp.cli;
 
 import java.util.Arrays;
-import java.util.Collections;
-import java.util.List;
 
 /**
  * An option of a command: all that is said of it, for whoever reads command lines, explains or
@@ -22,51 +20,41 @@ final class Option<T> {
     final T[] constants;
 
     /** Texts that its value may be. */
-    final List<String> completions;
+    final String[] completions;
 
     /** Whether it may be there several times: then the texts are told with commas between. */
     final boolean isRepeated;
 
-    private Option(
-            String names,
-            String label,
-            String description,
-            T[] constants,
-            List<String> completions,
-            boolean isRepeated) {
-        this.isRepeated = isRepeated;
+    private Option(String names, String label, String description, T[] constants,
+            boolean isRepeated, String... completions) {
         this.names = names.split(" ");
         this.label = label;
         this.description = description;
         this.constants = constants;
+        this.isRepeated = isRepeated;
         this.completions = completions;
     }
 
     /** An option that is there or is not. */
     static Option<Boolean> flag(String names, String description) {
-        return new Option<>(names, null, description, null, null, false);
+        return new Option<>(names, null, description, null, false);
     }
 
     /** An option whose value is a text; there may be several names, with blanks between. */
-    static Option<String> text(String names, String label, String description) {
-        return text(names, label, description, Collections.<String>emptyList());
-    }
-
     static Option<String> text(
-            String names, String label, String description, List<String> completions) {
-        return new Option<>(names, label, description, null, completions, false);
+            String names, String label, String description, String... completions) {
+        return new Option<>(names, label, description, null, false, completions);
     }
 
     /** An option that may be there several times, its value being several texts. */
     static Option<String> texts(String names, String label, String description) {
-        List<String> none = Collections.emptyList();
-        return new Option<>(names, label, description, null, none, true);
+        return new Option<>(names, label, description, null, true);
     }
 
     /** An option whose value is a constant, named in letters of either case. */
     static <T extends Enum<T>> Option<T> constant(
             String names, String label, T[] constants, String description) {
-        return new Option<>(names, label, description, constants, null, false);
+        return new Option<>(names, label, description, constants, false);
     }
 
     boolean isNamed(String name) {

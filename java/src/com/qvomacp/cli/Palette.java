@@ -2,14 +2,11 @@ package com.qvomacp.cli;
 
 /** Colours, where they are wanted. */
 final class Palette {
-    static final Palette NONE = new Palette(false);
-    static final Palette COLORS = new Palette(true);
-
     private static final String RESET = "\u001b[0m";
 
     private final boolean on;
 
-    private Palette(boolean on) {
+    Palette(boolean on) {
         this.on = on;
     }
 

@@ -2,6 +2,7 @@ package com.qvomacp.cli;
 
 import com.qvomacp.eng.omacp.ProvisioningDocument;
 import com.qvomacp.eng.omacp.ProvisioningException;
+import com.qvomacp.eng.omacp.ProvisioningException.Reason;
 import com.qvomacp.eng.omacp.ProvisioningMessage;
 import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.ReadOptions;
@@ -25,28 +26,24 @@ final class Reading {
     /** Why the message cannot be read; null when it can. */
     final ProvisioningException failure;
 
-    private Reading(Held held, ProvisioningMessage message, ProvisioningException failure) {
-        this.held = held;
-        this.message = message;
-        this.failure = failure;
-        boolean isRead = message != null;
-        this.document = isRead ? message.document() : null;
-        this.header = isRead ? message.header() : held.header();
-        Verdict ofBytes = isRead ? null : held.isPush ? Verdict.ofPush(held.bytes) : Verdict.ofBody(held.bytes);
-        this.verdict = isRead ? message.verdict() : ofBytes;
-    }
-
-    static Reading of(Held held, int limit) {
+    Reading(Held held, int limit) {
         ReadOptions options = ReadOptions.DEFAULT.withInputLimit(limit);
+        byte[] bytes = held.bytes;
+        ProvisioningMessage read = null;
+        ProvisioningException none = null;
         try {
-            ProvisioningMessage message =
-                    held.isPush
-                            ? ProvisioningMessage.parsePush(held.bytes, options)
-                            : ProvisioningMessage.parseBody(held.bytes, options);
-            return new Reading(held, message, null);
-        } catch (ProvisioningException failure) {
-            return new Reading(held, null, failure);
+            read = held.isPush ? ProvisioningMessage.parsePush(bytes, options)
+                    : ProvisioningMessage.parseBody(bytes, options);
+        } catch (ProvisioningException unreadable) {
+            none = unreadable;
         }
+        this.held = held;
+        this.message = read;
+        this.failure = none;
+        this.document = read == null ? null : read.document();
+        this.header = read == null ? held.header() : read.header();
+        this.verdict = read != null ? read.verdict()
+                : held.isPush ? Verdict.ofPush(bytes) : Verdict.ofBody(bytes);
     }
 
     /** Where the body begins. */
@@ -61,10 +58,8 @@ final class Reading {
 
     /** The exit status that the message stands for. */
     int status() {
-        boolean isTooLong =
-                failure != null
-                        && (failure.reason() == ProvisioningException.Reason.INPUT_TOO_LONG
-                                || failure.reason() == ProvisioningException.Reason.TEXT_TOO_LONG);
+        Reason reason = failure == null ? null : failure.reason();
+        boolean isTooLong = reason == Reason.INPUT_TOO_LONG || reason == Reason.TEXT_TOO_LONG;
         return isTooLong ? Console.FAILED : isAccepted() ? Console.DONE : Console.REFUSED;
     }
 }

@@ -66,12 +66,12 @@ final class Show extends JsonJob {
             showHeader(held);
             return;
         }
-        Reading reading = Reading.of(held, limit);
+        Reading reading = new Reading(held, limit);
         if (has(BYTES)) {
             console.raise(reading.status());
             list(reading);
             if (!reading.isAccepted()) {
-                console.out.print("\n" + new Refusal(reading).write("", outPalette()));
+                console.out.print("\n" + new Refusal(reading).write("", palette));
             }
         } else if (isJson()) {
             explain(reading);
@@ -101,13 +101,13 @@ final class Show extends JsonJob {
 
     private void list(Reading reading) {
         title(reading.held.name);
-        Listing.write(console.out, outPalette(), reading);
+        Listing.write(console.out, palette, reading);
     }
 
     @Override
     void unknown(Held held) {
         if (has(BYTES) && held.bytes != null) {
-            list(Reading.of(held, limit));
+            list(new Reading(held, limit));
         }
     }
 
@@ -127,7 +127,7 @@ final class Show extends JsonJob {
             endObject();
         } else {
             title(held.name);
-            new TextWriter(console.out, outPalette()).header(read, bodyLength);
+            new TextWriter(console.out, palette).header(read, bodyLength);
         }
     }
 
@@ -136,7 +136,7 @@ final class Show extends JsonJob {
             return;
         }
         title(reading.held.name);
-        TextWriter text = new TextWriter(console.out, outPalette());
+        TextWriter text = new TextWriter(console.out, palette);
         int bodyLength = reading.held.bytes.length - reading.bodyAt();
         if (reading.header == null) {
             text.bodyAlone(bodyLength);
@@ -181,7 +181,7 @@ final class Show extends JsonJob {
     private void title(String name) {
         if (isOneOfSeveral) {
             console.out.print(shown == 0 ? "" : "\n");
-            console.out.println(outPalette().bold("==> " + Visible.of(name) + " <=="));
+            console.out.println(palette.bold("==> " + Visible.of(name) + " <=="));
         }
         ++shown;
     }

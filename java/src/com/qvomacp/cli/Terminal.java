@@ -17,8 +17,8 @@ final class Terminal {
         never
     }
 
-    private final boolean hasColorOut;
-    private final boolean hasColorErr;
+    final boolean hasColorOut;
+    final boolean hasColorErr;
 
     /** Whether the output is for people's eyes, in colours or without. */
     final boolean isScreen;
@@ -39,20 +39,6 @@ final class Terminal {
     static boolean wantsColor(Map<String, String> environment) {
         return environment.getOrDefault("NO_COLOR", "").isEmpty()
                 && !environment.getOrDefault("TERM", "dumb").equals("dumb");
-    }
-
-    /** The colours of standard output; the wish may be null. */
-    Palette out(Color wish) {
-        return palette(wish, hasColorOut);
-    }
-
-    Palette err(Color wish) {
-        return palette(wish, hasColorErr);
-    }
-
-    private static Palette palette(Color wish, boolean byItself) {
-        boolean on = wish == Color.always || wish != Color.never && byItself;
-        return on ? Palette.COLORS : Palette.NONE;
     }
 
     /** Whether a descriptor is a terminal; Java itself only tells it of all of them together. */

@@ -96,8 +96,8 @@ final class Usage {
                 names.add(constant.toString().toLowerCase(Locale.ROOT));
             }
             spec.completionCandidates(names);
-        } else if (!option.completions.isEmpty()) {
-            spec.completionCandidates(option.completions);
+        } else if (option.completions.length > 0) {
+            spec.completionCandidates(Arrays.asList(option.completions));
         }
         return spec.build();
     }

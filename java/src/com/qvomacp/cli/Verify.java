@@ -49,12 +49,10 @@ final class Verify extends JsonJob {
         if (digits == null ? pin == null && imsi == null : pin != null || imsi != null) {
             throw new UsageException("--pin or --imsi is needed, or else --key alone");
         }
-        if (digits != null) {
-            if (!digits.matches("([0-9A-Fa-f]{2})+")) {
-                throw new UsageException("--key is no even number of hexadecimal digits");
-            }
-            key = HexText.bytes(digits);
+        if (digits != null && !digits.matches("([0-9A-Fa-f]{2})+")) {
+            throw new UsageException("--key is no even number of hexadecimal digits");
         }
+        key = digits == null ? null : HexText.bytes(digits);
         super.begin();
     }
 
@@ -71,17 +69,13 @@ final class Verify extends JsonJob {
         }
         SecurityMethod method = header.securityMethod();
         byte[] body = Arrays.copyOfRange(held.bytes, header.length(), held.bytes.length);
-        MacResult result =
-                key == null
-                        ? ProvisioningMac.verify(method, header.mac(), body, pin, imsi)
-                        : ProvisioningMac.verify(method, header.mac(), body, key);
-        String computed = null;
-        if (has(SHOW_MAC)) {
-            computed =
-                    key == null
-                            ? ProvisioningMac.compute(method, body, pin, imsi)
-                            : ProvisioningMac.compute(key, body);
-        }
+        boolean isByKey = key != null;
+        String mac = header.mac();
+        MacResult result = isByKey ? ProvisioningMac.verify(method, mac, body, key)
+                : ProvisioningMac.verify(method, mac, body, pin, imsi);
+        String computed = !has(SHOW_MAC) ? null
+                : isByKey ? ProvisioningMac.compute(key, body)
+                : ProvisioningMac.compute(method, body, pin, imsi);
         String reason = result == MacResult.RIGHT ? null : reasonFor(result, header, held.bytes);
         say(held, method, result, reason, computed);
     }
@@ -148,7 +142,7 @@ final class Verify extends JsonJob {
             endObject();
             return;
         }
-        String not = outPalette().error("NOT VERIFIED") + ": " + reason;
+        String not = palette.error("NOT VERIFIED") + ": " + reason;
         String found = reason == null ? "verified (" + method + ")" : not;
         String told = computed == null ? "" : ", computed " + computed;
         console.out.println(Visible.of(held.name) + ": " + found + told);
