@@ -2,9 +2,7 @@ package com.qvomacp.cli;
 
 import com.qvomacp.cli.Differences.Change;
 import com.qvomacp.cli.Differences.Kind;
-import com.qvomacp.eng.omacp.Characteristic;
 import com.qvomacp.eng.omacp.Item;
-import com.qvomacp.eng.omacp.Other;
 import com.qvomacp.eng.omacp.Parameter;
 import java.util.ArrayList;
 import java.util.Collections;
@@ -36,7 +34,8 @@ final class Diff extends MessageJob {
     @Override
     void end() {
         if (console.status() == Console.DONE && readings.size() != 2) {
-            fail(Console.FAILED, "diff", "two messages are compared, and here are " + readings.size());
+            String found = "two messages are compared, and here are " + readings.size();
+            fail(Console.FAILED, "diff", found);
         }
         if (console.status() != Console.DONE) {
             super.end();
@@ -113,16 +112,8 @@ final class Diff extends MessageJob {
     }
 
     private static String shown(Item item) {
-        if (item instanceof Other) {
-            return TextWriter.describe((Other) item);
-        }
-        if (item instanceof Characteristic) {
-            String type = ((Characteristic) item).type();
-            return type == null ? "(no TYPE)" : Visible.of(type);
-        }
-        Parameter parameter = (Parameter) item;
-        String name = parameter.name() == null ? "(no NAME)" : Visible.of(parameter.name());
-        return parameter.value() == null ? name : name + "  " + Visible.value(parameter.value());
+        String value = TextWriter.value(item);
+        return TextWriter.title(item) + (value == null ? "" : "  " + Visible.value(value));
     }
 
     private void json(Change change) {

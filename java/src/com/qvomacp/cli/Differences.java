@@ -100,11 +100,7 @@ final class Differences {
         if (left.header != null && right.header != null) {
             differences.named("push header", fields(left.header), fields(right.header));
         }
-        Map<String, List<String>> before = new LinkedHashMap<>();
-        Map<String, List<String>> after = new LinkedHashMap<>();
-        before.put("version", Collections.singletonList(left.document.version()));
-        after.put("version", Collections.singletonList(right.document.version()));
-        differences.named("wap-provisioningdoc", before, after);
+        differences.named("wap-provisioningdoc", version(left.document), version(right.document));
         differences.open.push(right.document.children());
         differences.open.push(left.document.children());
         while (!differences.open.isEmpty()) {
@@ -113,22 +109,22 @@ final class Differences {
         return differences.changes;
     }
 
-    private static Map<String, List<String>> fields(PushHeader header) {
-        Map<String, List<String>> values = new LinkedHashMap<>();
-        int identifier = header.transactionIdentifier();
-        put(values, "transaction identifier", identifier < 0 ? null : Integer.toString(identifier));
-        put(values, "content type", header.contentType().mediaType());
-        for (HeaderField field : header.contentType().parameters()) {
-            put(values, field.name(), field.value());
-        }
-        for (HeaderField field : header.fields()) {
-            put(values, field.name(), field.value());
-        }
-        return values;
+    private static Map<String, List<String>> version(ProvisioningDocument document) {
+        return Collections.singletonMap("version", Collections.singletonList(document.version()));
     }
 
-    private static void put(Map<String, List<String>> values, String name, String value) {
-        values.computeIfAbsent(name, none -> new ArrayList<>()).add(value);
+    private static Map<String, List<String>> fields(PushHeader header) {
+        Map<String, List<String>> values = new LinkedHashMap<>();
+        String identifier = Integer.toString(header.transactionIdentifier());
+        values.computeIfAbsent("transaction identifier", name -> new ArrayList<>()).add(identifier);
+        String type = header.contentType().mediaType();
+        values.computeIfAbsent("content type", name -> new ArrayList<>()).add(type);
+        List<HeaderField> fields = new ArrayList<>(header.contentType().parameters());
+        fields.addAll(header.fields());
+        for (HeaderField field : fields) {
+            values.computeIfAbsent(field.name(), name -> new ArrayList<>()).add(field.value());
+        }
+        return values;
     }
 
     /** Compares values by their names and, of one name, by their order. */
@@ -158,7 +154,7 @@ final class Differences {
             Item item = before.get(i);
             String path = left.path(item);
             if (matches[i] == NONE) {
-                changes.add(new Change(Kind.REMOVED, path, item, value(item), null));
+                changes.add(new Change(Kind.REMOVED, path, item, TextWriter.value(item), null));
                 continue;
             }
             isThere[matches[i]] = true;
@@ -169,16 +165,17 @@ final class Differences {
                 String to = Integer.toString(matches[i] + 1);
                 changes.add(new Change(Kind.MOVED, path, item, from, to));
             }
-            if (!Objects.equals(value(item), value(counterpart))) {
-                String now = value(counterpart);
-                changes.add(new Change(Kind.CHANGED, path, null, value(item), now));
+            String old = TextWriter.value(item);
+            String now = TextWriter.value(counterpart);
+            if (!Objects.equals(old, now)) {
+                changes.add(new Change(Kind.CHANGED, path, null, old, now));
             }
         }
         for (int j = 0; j < isThere.length; ++j) {
             if (!isThere[j]) {
                 Item item = after.get(j);
                 String path = right.path(item);
-                changes.add(new Change(Kind.ADDED, path, item, null, value(item)));
+                changes.add(new Change(Kind.ADDED, path, item, null, TextWriter.value(item)));
             }
         }
         for (int i = matches.length - 1; i >= 0; --i) {
@@ -187,10 +184,6 @@ final class Differences {
                 open.push(before.get(i).children());
             }
         }
-    }
-
-    private static String value(Item item) {
-        return item instanceof Parameter ? ((Parameter) item).value() : null;
     }
 
     /** The counterpart of each item by its place; {@link #NONE} for none. */
@@ -273,23 +266,18 @@ final class Differences {
 
     /** Which of the counterparts follow each other on both sides: as many as can be. */
     private static boolean[] inOrder(int[] matches) {
-        int[] last = new int[matches.length + 1];
+        // The least counterpart that ends a row of each length, and whose it is.
+        int[] ends = new int[matches.length];
+        int[] last = new int[matches.length];
         int[] previous = new int[matches.length];
         int longest = 0;
         for (int i = 0; i < matches.length; ++i) {
-            int low = 0;
-            for (int high = longest; low < high; ) {
-                int middle = (low + high) >>> 1;
-                if (matches[last[middle]] < matches[i]) {
-                    low = middle + 1;
-                } else {
-                    high = middle;
-                }
-            }
             if (matches[i] != NONE) {
-                previous[i] = low == 0 ? NONE : last[low - 1];
-                last[low] = i;
-                longest = Math.max(longest, low + 1);
+                int length = -1 - Arrays.binarySearch(ends, 0, longest, matches[i]);
+                ends[length] = matches[i];
+                last[length] = i;
+                previous[i] = length == 0 ? NONE : last[length - 1];
+                longest = Math.max(longest, length + 1);
             }
         }
         boolean[] stay = new boolean[matches.length];

@@ -18,12 +18,6 @@ import java.nio.file.StandardOpenOption;
 final class Input {
     static final String STANDARD_INPUT = "-";
 
-    private static final OpenOption[] ONLY_NEW = {
-        StandardOpenOption.CREATE_NEW, StandardOpenOption.WRITE
-    };
-
-    private static final OpenOption[] ANY = {};
-
     private Input() {}
 
     static String nameOf(String file) {
@@ -49,7 +43,8 @@ final class Input {
             throw new IOException(reason(unreadable, "cannot be read: "), unreadable);
         }
         if (content == null) {
-            throw new IOException("is longer than " + limit + " bytes; --limit has more of them read");
+            String longer = "is longer than " + limit + " bytes; --limit has more of them read";
+            throw new IOException(longer);
         }
         return content;
     }
@@ -69,8 +64,9 @@ final class Input {
      * @throws IOException with a sentence for people
      */
     static void write(String file, byte[] content, boolean mayBeThere) throws IOException {
+        OpenOption[] onlyNew = {StandardOpenOption.CREATE_NEW, StandardOpenOption.WRITE};
         try {
-            Files.write(Paths.get(file), content, mayBeThere ? ANY : ONLY_NEW);
+            Files.write(Paths.get(file), content, mayBeThere ? new OpenOption[0] : onlyNew);
         } catch (FileAlreadyExistsException there) {
             throw new IOException("is there already; --force overwrites it", there);
         } catch (IOException | InvalidPathException unwritable) {

@@ -11,42 +11,36 @@ final class Refusal {
     private static final int AROUND = 8;
     private static final String INDENT = "  ";
 
-    private final Held held;
-    private final String sentence;
+    private final Reading reading;
 
-    /** The result code with its name; null where there is none, as for a push header. */
-    private final String code;
+    /** Whether the library refuses it too, at the same place, and so tells more. */
+    private final boolean isLibrarys;
 
-    /** What is refused, counted from the start of the body; -1 in the push header. */
-    private final int bodyOffset;
+    private final boolean isHeader;
+
+    /** What is refused, counted from the start of the body, or of the message in a header. */
+    private final int place;
 
     /** What is refused, counted from the start of the message. */
     private final int offset;
 
-    private final String path;
-    private final List<String> expected;
-
     /** Why a message is refused that cannot be read, or is not taken by the library. */
     Refusal(Reading reading) {
+        this.reading = reading;
         ProvisioningException failure = reading.failure;
         Verdict verdict = reading.verdict;
         boolean isHeaderRefused = verdict.isHeaderRefused();
-        boolean isLibrarys =
-                failure == null || verdict.offset() == failure.offset() && !isHeaderRefused;
-        boolean isHeader = isLibrarys ? isHeaderRefused : failure.reason() == Reason.NO_PUSH_HEADER;
-        int place = isLibrarys ? verdict.offset() : failure.offset();
-        held = reading.held;
-        sentence = failure == null ? verdict.reason() : failure.getMessage();
-        code = isLibrarys && verdict.code() != 0 ? verdict.code() + " " + verdict.codeName() : null;
-        bodyOffset = isHeader ? -1 : place;
+        isLibrarys = failure == null || verdict.offset() == failure.offset() && !isHeaderRefused;
+        isHeader = isLibrarys ? isHeaderRefused : failure.reason() == Reason.NO_PUSH_HEADER;
+        place = isLibrarys ? verdict.offset() : failure.offset();
         offset = isHeader ? place : reading.bodyAt() + place;
-        path = isHeader ? "push header" : isLibrarys ? verdict.path() : failure.path();
-        expected = isLibrarys ? verdict.expected() : failure.expected();
     }
 
     /** Writes it behind {@code start}, such as the name of the file. */
     String write(String start, Palette palette) {
         StringBuilder out = new StringBuilder();
+        ProvisioningException failure = reading.failure;
+        String sentence = failure == null ? reading.verdict.reason() : failure.getMessage();
         String text = start + "refused: " + Visible.of(sentence);
         List<String> lines = Lines.of(text, Lines.WIDTH - INDENT.length());
         String first = lines.get(0);
@@ -56,9 +50,10 @@ final class Refusal {
             out.append(INDENT).append(palette.error(line)).append('\n');
         }
         out.append(Lines.paragraph(INDENT, Visible.of(place())));
-        if (held.bytes.length > 0) {
-            bytes(out, palette);
+        if (reading.held.bytes.length > 0) {
+            bytes(out, reading.held.bytes, palette);
         }
+        List<String> expected = isLibrarys ? reading.verdict.expected() : failure.expected();
         if (!expected.isEmpty()) {
             String accepted = "Accepted here: " + String.join(", ", expected) + ".";
             out.append(Lines.paragraph(INDENT, Visible.of(accepted)));
@@ -67,28 +62,30 @@ final class Refusal {
     }
 
     private String place() {
+        Verdict verdict = reading.verdict;
         List<String> parts = new ArrayList<>();
-        if (code != null) {
-            parts.add(code);
+        if (isLibrarys && verdict.code() != 0) {
+            parts.add(verdict.code() + " " + verdict.codeName());
         }
-        if (bodyOffset >= 0) {
-            parts.add(String.format("body offset %d (0x%X)", bodyOffset, bodyOffset));
+        if (!isHeader && place >= 0) {
+            parts.add(String.format("body offset %d (0x%X)", place, place));
         }
-        if (held.isPush) {
+        if (reading.held.isPush) {
             parts.add(String.format("message offset %d (0x%X)", offset, offset));
         }
-        if (path != null && !path.isEmpty()) {
-            parts.add("in " + path);
+        String path = isLibrarys ? verdict.path() : reading.failure.path();
+        if (isHeader || path != null && !path.isEmpty()) {
+            parts.add("in " + (isHeader ? "push header" : path));
         }
         return String.join(", ", parts) + ".";
     }
 
     /** The bytes around, and a mark below the first that is refused. */
-    private void bytes(StringBuilder out, Palette palette) {
+    private void bytes(StringBuilder out, byte[] message, Palette palette) {
         int from = Math.max(offset - AROUND, 0);
-        int to = Math.min(offset + AROUND, held.bytes.length);
+        int to = Math.min(offset + AROUND, message.length);
         String start = INDENT + INDENT + Listing.hexadecimal(from, 4) + "  ";
-        String bytes = HexText.digits(held.bytes, from, to, " ");
+        String bytes = HexText.digits(message, from, to, " ");
         out.append(palette.dim(start)).append(bytes).append('\n');
         Listing.pad(out, "", start.length() + (offset - from) * 3);
         out.append(palette.error("^^")).append('\n');

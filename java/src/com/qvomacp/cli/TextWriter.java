@@ -76,13 +76,12 @@ final class TextWriter {
                     }
                     wasCharacteristic = isCharacteristic;
                 }
-                int indent = Math.min(depth, DEEPEST);
-                if (item instanceof Parameter) {
-                    parameter((Parameter) item, indent * INDENT, columns[indent]);
+                int nesting = Math.min(depth, DEEPEST);
+                String name = name(item);
+                if (name == null) {
+                    row(nesting * INDENT, palette.error(title(item)), INDENT, shown(value(item)));
                 } else {
-                    String type = isCharacteristic ? ((Characteristic) item).type() : null;
-                    String none = isCharacteristic ? "(no TYPE)" : describe((Other) item);
-                    row(indent * INDENT, type == null ? palette.error(none) : Visible.of(type), 0, null);
+                    line(nesting * INDENT, columns[nesting], name, shown(value(item)));
                 }
                 if (!item.children().isEmpty()) {
                     columns[Math.min(depth + 1, DEEPEST)] = column(item.children());
@@ -105,15 +104,29 @@ final class TextWriter {
         return column;
     }
 
-    private void parameter(Parameter parameter, int indent, int column) {
-        if (parameter.name() != null) {
-            line(indent, column, parameter.name(), shown(parameter.value()));
-        } else {
-            row(indent, palette.error("(no NAME)"), INDENT, shown(parameter.value()));
-        }
+    /** The type of a characteristic or the name of a parameter; null for none. */
+    private static String name(Item item) {
+        return item instanceof Characteristic ? ((Characteristic) item).type()
+                : item instanceof Parameter ? ((Parameter) item).name() : null;
     }
 
-    static String describe(Other other) {
+    /** The value of a parameter; null for none. */
+    static String value(Item item) {
+        return item instanceof Parameter ? ((Parameter) item).value() : null;
+    }
+
+    /** What an item is called; where it has no name, what it is. */
+    static String title(Item item) {
+        String name = name(item);
+        return name != null ? Visible.of(name)
+                : item instanceof Other ? describe((Other) item) : unnamed(item instanceof Parameter);
+    }
+
+    private static String unnamed(boolean isParameter) {
+        return isParameter ? "(no NAME)" : "(no TYPE)";
+    }
+
+    private static String describe(Other other) {
         boolean isTrailing = other.kind() == Other.Kind.TRAILING;
         StringBuilder text = new StringBuilder("(");
         String kind = other.kind().name().toLowerCase(Locale.ROOT);
@@ -160,10 +173,10 @@ final class TextWriter {
         for (Answer answer : answers) {
             boolean isParameter = answer.children == null;
             boolean isOtherwise = isParameter && answer.isAnswered && !answer.isSame();
-            String name = answer.name == null ? (isParameter ? "(no NAME)" : "(no TYPE)") : answer.name;
+            String mark = isOtherwise ? "!" : answer.isAnswered ? "" : "-";
+            String name = answer.name == null ? unnamed(isParameter) : answer.name;
             out.append(depth == 0 && !isParameter ? "\n" : "");
-            out.append(isOtherwise ? palette.error("!") : answer.isAnswered ? " " : palette.error("-"));
-            out.append(' ');
+            out.append(mark.isEmpty() ? " " : palette.error(mark)).append(' ');
             line(depth * INDENT, column, name, isParameter ? shown(answer) : null);
             if (!isParameter) {
                 answers(answer.children, depth + 1, answer.column);

@@ -23,19 +23,15 @@ final class Visible {
         return '"' + escaped(text, "\\\"", "\\\"") + '"';
     }
 
-    /** The text as a string of JSON, in which line breaks and tabs have the codes that people know. */
+    /** The text as a string of JSON, with the codes that people know for line breaks and tabs. */
     static String json(String text) {
         return '"' + escaped(text, "\\\"\n\r\t", "\\\"nrt") + '"';
     }
 
     /** A value as it is shown in a line of its own: in quotes where its ends could not be seen. */
     static String value(String text) {
-        boolean plain =
-                !text.isEmpty()
-                        && text.charAt(0) != '"'
-                        && !isBlank(text.charAt(0))
-                        && !isBlank(text.charAt(text.length() - 1));
-        return plain ? of(text) : quoted(text);
+        boolean isOpen = text.isEmpty() || text.charAt(0) == '"' || isBlank(text.charAt(0));
+        return isOpen || isBlank(text.charAt(text.length() - 1)) ? quoted(text) : of(text);
     }
 
     private static boolean isBlank(char c) {
@@ -43,7 +39,7 @@ final class Visible {
         return mayBe && (Character.isWhitespace(c) || Character.isSpaceChar(c));
     }
 
-    /** The text with a letter behind a backslash for some characters, and codes for what cannot be seen. */
+    /** The text with letters behind backslashes for some characters, and codes for the invisible. */
     private static String escaped(String text, String special, String letters) {
         int next = 0;
         while (next < text.length() && isPlain(text.charAt(next), special)) {
@@ -62,7 +58,10 @@ final class Visible {
             } else if (isVisible(codePoint)) {
                 visible.append(text, i, next);
             } else {
-                escape(visible, text, i, next);
+                // As JSON and Java write codes.
+                for (char c : Character.toChars(codePoint)) {
+                    visible.append("\\u").append(Integer.toHexString(0x10000 | c), 1, 5);
+                }
             }
         }
         return visible.toString();
@@ -70,13 +69,6 @@ final class Visible {
 
     private static boolean isPlain(char c, String special) {
         return c >= ' ' && c < 0x7F && special.indexOf(c) < 0;
-    }
-
-    /** Appends characters as JSON and Java write their codes. */
-    private static void escape(StringBuilder to, String text, int from, int end) {
-        for (int i = from; i < end; ++i) {
-            to.append("\\u").append(Integer.toHexString(0x10000 | text.charAt(i)), 1, 5);
-        }
     }
 
     /** The columns that a text takes on a terminal. */
