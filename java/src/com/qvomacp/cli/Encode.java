@@ -36,23 +36,17 @@ final class Encode extends Job {
     }
 
     private static final Option<Boolean> BODY = Option.flag("--body", "Write the body alone.");
-
     private static final Option<Boolean> HEX =
             Option.flag("--hex", "Write a line of hexadecimal digits.");
-
     private static final Option<Boolean> BASE64 =
             Option.flag("--base64", "Write a line of base64.");
-
     private static final Option<Sms> SMS = Option.constant("--sms", "FORM", Sms.values(),
             "Write the parts of an SMS, each a line of hexadecimal digits: ud (user data) or submit"
                     + " (an SMS-SUBMIT).");
-
     private static final Option<String> TO = Option.text("--to", "NUMBER",
             "Who gets the SMS-SUBMIT: up to 20 digits, with \"+\" or without.");
-
     private static final Option<String> OUTPUT =
             Option.text("-o --output", "FILE", "Write to a file that is not there yet.");
-
     private static final Option<Boolean> FORCE = Option.flag("--force", "Overwrite the file.");
 
     private EncodeOptions encoding = EncodeOptions.NONE;
@@ -121,7 +115,7 @@ final class Encode extends Job {
         }
     }
 
-    /** Says that what is written is not all that the message was, when it is not what it should be. */
+    /** Says that what is written is not all that the message was, where it is not as it should be. */
     private void warn(Reading reading) {
         int deviations = reading.document.deviations().size();
         String places = deviations == 1 ? "1 place" : deviations + " places";
@@ -141,41 +135,34 @@ final class Encode extends Job {
             return;
         }
         byte[] message = has(BODY) ? encoder.body() : encoder.push();
-        List<byte[]> parts = !has(SMS) ? null : ShortMessageWriter.userData(message);
-        if (has(SMS) && parts == null) {
-            fail(Console.FAILED, name, "is too long for an SMS");
-            return;
-        }
-        write(message, parts);
-        if (USERPINMAC.equals(encoder.options().value(EncodeOption.SEC))) {
-            tell(name, encoder.digitsToTell());
-        }
-        Reading reading = new Reading(Held.message(name, message, !has(BODY)), message.length);
-        if (reading.isAccepted()) {
-            complain(startOf(name) + "the library takes it\n");
-        }
-        explain(reading);
-    }
-
-    private void tell(String name, String digits) {
-        String told = digits != null ? digits : "digits, for which a PIN of 5 to 20 is needed";
-        complain(startOf(name) + "the user has to be told " + told + "\n");
-    }
-
-    private void write(byte[] message, List<byte[]> parts) {
+        List<byte[]> parts = has(SMS) ? ShortMessageWriter.userData(message) : null;
         if (isRaw()) {
             written.write(message, 0, message.length);
         } else if (has(HEX)) {
             line(HexText.digits(message));
         } else if (has(BASE64)) {
             line(Base64.getEncoder().encodeToString(message));
-        } else {
+        } else if (parts != null) {
             for (byte[] part : parts) {
                 boolean isWhole = value(SMS) == Sms.SUBMIT;
                 byte[] octets = isWhole ? ShortMessageWriter.submit(value(TO), part) : part;
                 line(HexText.digits(octets));
             }
+        } else {
+            fail(Console.FAILED, name, "is too long for an SMS");
+            return;
         }
+        if (USERPINMAC.equals(encoder.options().value(EncodeOption.SEC))) {
+            String digits = encoder.digitsToTell();
+            String none = "digits, for which a PIN of 5 to 20 is needed";
+            String told = "the user has to be told " + (digits == null ? none : digits);
+            complain(startOf(name) + told + "\n");
+        }
+        Reading reading = new Reading(Held.message(name, message, !has(BODY)), message.length);
+        if (reading.isAccepted()) {
+            complain(startOf(name) + "the library takes it\n");
+        }
+        explain(reading);
     }
 
     private void line(String text) {

@@ -41,11 +41,6 @@ final class Held {
         return new Held(name, bytes, true, sentence, NONE);
     }
 
-    /** A remark that belongs to no message. */
-    static Held note(String name, String sentence) {
-        return new Held(name, null, false, null, Collections.singletonList(sentence));
-    }
-
     /** What the push header says, whatever stands behind it; null when there is none. */
     PushHeader header() {
         return isPush ? header(bytes) : null;

@@ -16,11 +16,9 @@ abstract class Job {
     private static final Option<String> LIMIT = Option.text("--limit", "BYTES",
             "Read no more than so many bytes of a file; K and M may stand behind the number (by"
                     + " itself 64K).");
-
     private static final Option<Form> AS = Option.constant("--as", "FORM", Form.values(),
             "What the messages are, where it does not show by itself: push, body, sms (an"
                     + " SMS-DELIVER) or ud (the user data of an SMS).");
-
     private static final Option<Color> COLOR =
             Option.constant("--color", "WHEN", Color.values(),
                     "Use colours: auto (on a terminal, unless NO_COLOR is set), always, never.");
@@ -129,14 +127,13 @@ abstract class Job {
     }
 
     private static int bytes(String number) {
-        int unit = number.endsWith("K") ? 1 : number.endsWith("M") ? 2 : 0;
+        int unit = number.endsWith("K") ? 10 : number.endsWith("M") ? 20 : 0;
         try {
-            String digits = unit == 0 ? number : number.substring(0, number.length() - 1);
-            long bytes = Math.multiplyExact(Long.parseLong(digits), 1L << 10 * unit);
-            if (bytes > 0 && bytes <= Integer.MAX_VALUE / 2) {
-                return (int) bytes;
+            long count = Long.parseLong(number.substring(0, number.length() - (unit == 0 ? 0 : 1)));
+            if (count > 0 && count <= Integer.MAX_VALUE / 2 >> unit) {
+                return (int) count << unit;
             }
-        } catch (ArithmeticException | NumberFormatException none) {
+        } catch (NumberFormatException none) {
             // Said below.
         }
         throw new UsageException("--limit is a number of bytes, up to 1023M: " + number);
@@ -190,15 +187,16 @@ abstract class Job {
 
     /** Says why a document cannot be encoded, or not be written as XML. */
     void refuse(String name, EncodingException e) {
+        String reason = e.getMessage();
         if (e.line() > 0) {
-            String expected = e.expected().isEmpty() ? "" : ", expected ";
-            String place = name + ':' + e.line() + ':' + e.column();
-            fail(Console.REFUSED, place, e.getMessage() + expected + String.join(", ", e.expected()));
+            List<String> expected = e.expected();
+            reason += expected.isEmpty() ? "" : ", expected " + String.join(", ", expected);
+            fail(Console.REFUSED, name + ':' + e.line() + ':' + e.column(), reason);
         } else if (e.path() != null) {
-            fail(Console.REFUSED, name, e.getMessage() + ", in " + e.path());
+            fail(Console.REFUSED, name, reason + ", in " + e.path());
         } else {
             // An option is at fault, and not the document.
-            fail(Console.FAILED, name, e.getMessage());
+            fail(Console.FAILED, name, reason);
         }
     }
 

@@ -7,7 +7,6 @@ import java.util.List;
 abstract class JsonJob extends Job {
     private static final Option<Boolean> JSON =
             Option.flag("--json", "Print JSON: an object, or an array for several files.");
-
     private static final Option<Boolean> JSON_LINES =
             Option.flag("--json-lines", "Print JSON: an object on a line for each file.");
 

@@ -30,7 +30,6 @@ final class Lint extends MessageJob {
                     "--no --disable",
                     "RULE",
                     "Leave out a rule, or several with commas between their names.");
-
     private static final Option<Boolean> STRICT =
             Option.flag("--strict", "End with 1 for warnings, too.");
 
@@ -75,8 +74,9 @@ final class Lint extends MessageJob {
         for (Finding finding : findings) {
             if (left.contains(finding.rule())) {
                 Severity severity = finding.rule().severity();
-                boolean counts = severity == Severity.ERROR || has(STRICT) && severity == Severity.WARNING;
-                console.raise(counts ? Console.REFUSED : Console.DONE);
+                boolean isCounted = has(STRICT) && severity == Severity.WARNING;
+                isCounted |= severity == Severity.ERROR;
+                console.raise(isCounted ? Console.REFUSED : Console.DONE);
                 if (isJson()) {
                     json(finding);
                 } else {

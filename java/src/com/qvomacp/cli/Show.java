@@ -26,14 +26,11 @@ import picocli.CommandLine.Command;
 final class Show extends JsonJob {
     private static final Option<Boolean> HEADER =
             Option.flag("--header", "Show the push header alone, whatever the body is.");
-
     private static final Option<Boolean> BYTES =
             Option.flag("--bytes", "List every byte with what it means.");
-
     private static final Option<Boolean> ANSWERS = Option.flag("--answers",
             "Ask the native library as well, and mark where it answers otherwise than the message"
                     + " says.");
-
     private static final Option<Boolean> XML =
             Option.flag("--xml", "Print the document as XML, from which encode makes it.");
 
@@ -77,19 +74,16 @@ final class Show extends JsonJob {
             explain(reading);
             json(reading);
         } else {
-            if (has(XML)) {
-                xml(reading);
-            } else {
+            if (!has(XML)) {
                 text(reading);
+            } else if (reading.message != null) {
+                xml(reading);
             }
             explain(reading);
         }
     }
 
     private void xml(Reading reading) {
-        if (reading.message == null) {
-            return;
-        }
         try {
             String text = ProvisioningEncoder.of(reading.message, EncodeOptions.NONE).xml();
             title(reading.held.name);
@@ -117,17 +111,13 @@ final class Show extends JsonJob {
             return;
         }
         PushHeader read = header(held);
-        if (read == null) {
-            return;
-        }
-        int bodyLength = held.bytes.length - read.length();
-        if (isJson()) {
+        if (read != null && isJson()) {
             beginObject(held.name);
-            new MessageJson(writer).header(read, bodyLength);
+            new MessageJson(writer).header(read, held.bytes.length - read.length());
             endObject();
-        } else {
+        } else if (read != null) {
             title(held.name);
-            new TextWriter(console.out, palette).header(read, bodyLength);
+            new TextWriter(console.out, palette).header(read, held.bytes.length - read.length());
         }
     }
 

@@ -3,6 +3,7 @@ package com.qvomacp.cli;
 import java.io.ByteArrayOutputStream;
 import java.util.ArrayList;
 import java.util.Arrays;
+import java.util.Collections;
 import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
@@ -52,7 +53,8 @@ final class SmsParts {
             return Held.error(place.toString(), null, what + " with different bytes" + where);
         }
         if (push.isFinished) {
-            return Held.note(place.toString(), what + where);
+            List<String> note = Collections.singletonList(what + where);
+            return new Held(place.toString(), null, false, null, note);
         }
         push.notes.add(what + where);
         return null;
@@ -74,7 +76,8 @@ final class SmsParts {
                 String which = (isOne ? "part " : "parts ") + Place.listed(missing);
                 String sentence = which + " of " + any.total + " of " + any;
                 String name = Place.names(push.places.values());
-                errors.add(Held.error(name, null, sentence + (isOne ? " is" : " are") + " missing"));
+                String are = isOne ? " is missing" : " are missing";
+                errors.add(Held.error(name, null, sentence + are));
             }
         }
         return errors;

@@ -8,7 +8,6 @@ import java.util.Locale;
 import picocli.AutoComplete;
 import picocli.CommandLine;
 import picocli.CommandLine.Command;
-import picocli.CommandLine.IVersionProvider;
 import picocli.CommandLine.Model.CommandSpec;
 import picocli.CommandLine.Model.OptionSpec;
 import picocli.CommandLine.Model.PositionalParamSpec;
@@ -18,7 +17,6 @@ import picocli.CommandLine.ParseResult;
 /** All that picocli does: help, complaints, completion, and command lines that are not plain. */
 @Command(
         name = "omacp",
-        versionProvider = Usage.Version.class,
         description = "Shows what pushed OMA Client Provisioning messages set, checks and makes them.",
         synopsisHeading = "Usage: ",
         customSynopsis = {"omacp [show] [OPTION...] [FILE...]", "       omacp COMMAND ..."},
@@ -53,6 +51,9 @@ final class Usage {
         OptionSpec.Builder version = OptionSpec.builder("-V", "--version").versionHelp(true);
         version.description("Show the version and exit.");
         program.getCommandSpec().addOption(help()).addOption(version.build());
+        // The version that the jar states.
+        String stated = Main.class.getPackage().getImplementationVersion();
+        program.getCommandSpec().version("omacp " + (stated == null ? "unpacked" : stated));
         for (String name : Main.COMMANDS) {
             program.addSubcommand(command(Main.command(name)));
         }
@@ -88,7 +89,7 @@ final class Usage {
         }
         spec.paramLabel(option.label).type(String.class);
         if (option.isRepeated) {
-            spec.type(List.class).auxiliaryTypes(String.class);
+            spec.type(String[].class);
         } else if (option.constants != null) {
             spec.type(option.constants[0].getClass());
             List<String> names = new ArrayList<>();
@@ -126,13 +127,14 @@ final class Usage {
         }
     }
 
-    /** A script that completes the options of the first command without its name, too, and files. */
+    /** A script that completes files, and the options of the first command without its name too. */
     private static String completion() {
         CommandLine program = program();
         for (Option<?> option : Main.command(Main.COMMANDS[0]).options()) {
             program.getCommandSpec().addOption(specOf(option));
         }
-        return AutoComplete.bash("omacp", program).replace("compopt +o default", "compopt -o default");
+        String script = AutoComplete.bash("omacp", program);
+        return script.replace("compopt +o default", "compopt -o default");
     }
 
     static ParseResult parsed(CommandLine program, String[] arguments) {
@@ -153,9 +155,8 @@ final class Usage {
         Arguments given = new Arguments();
         for (Option<?> option : ((Job) command.userObject()).options()) {
             Object value = command.findOption(option.names[0]).getValue();
-            if (value != null && option.isRepeated) {
-                List<String> texts = command.findOption(option.names[0]).getValue();
-                value = String.join(",", texts);
+            if (value instanceof String[]) {
+                value = String.join(",", (String[]) value);
             }
             if (value != null && !value.equals(false)) {
                 given.values.put(option, value);
@@ -178,15 +179,6 @@ final class Usage {
         String name = command.getCommandSpec().qualifiedName();
         console.err.println('"' + name + " --help\" tells more.");
         console.raise(Console.FAILED);
-    }
-
-    /** The version that the jar states. */
-    static final class Version implements IVersionProvider {
-        @Override
-        public String[] getVersion() {
-            String version = Main.class.getPackage().getImplementationVersion();
-            return new String[] {"omacp " + (version == null ? "unpacked" : version)};
-        }
     }
 
     /** Prints what a shell needs to complete the program's command lines. */

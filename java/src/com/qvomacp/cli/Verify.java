@@ -5,8 +5,11 @@ import com.qvomacp.eng.omacp.MacResult;
 import com.qvomacp.eng.omacp.ProvisioningMac;
 import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.SecurityMethod;
+import java.nio.charset.StandardCharsets;
 import java.util.Arrays;
 import java.util.List;
+import java.util.regex.Matcher;
+import java.util.regex.Pattern;
 import picocli.CommandLine.Command;
 
 /** Checks the MAC of messages. */
@@ -21,7 +24,8 @@ import picocli.CommandLine.Command;
                     + " or the output cannot be written"
         })
 final class Verify extends JsonJob {
-    private static final int MAC_DIGITS = 40;
+    private static final Pattern DIGITS_OF_MAC =
+            Pattern.compile("(?<![0-9A-Fa-f])[0-9A-Fa-f]{40}\0");
 
     private static final Option<Boolean> SHOW_MAC =
             Option.flag("--show-mac", "Tell the MAC that the message should have.");
@@ -82,10 +86,10 @@ final class Verify extends JsonJob {
 
     /** What cannot be tried is not the message's fault. */
     private int statusOf(MacResult result) {
-        boolean isUnusable =
-                result == MacResult.UNUSABLE_PIN && pin != null
-                        || result == MacResult.UNUSABLE_IMSI && imsi != null;
-        return result == MacResult.RIGHT ? Console.DONE : isUnusable ? Console.FAILED : Console.REFUSED;
+        boolean isUnusable = result == MacResult.UNUSABLE_PIN && pin != null
+                || result == MacResult.UNUSABLE_IMSI && imsi != null;
+        boolean isRight = result == MacResult.RIGHT;
+        return isRight ? Console.DONE : isUnusable ? Console.FAILED : Console.REFUSED;
     }
 
     private String reasonFor(MacResult result, PushHeader header, byte[] message) {
@@ -95,8 +99,8 @@ final class Verify extends JsonJob {
             case WRONG:
                 return "the MAC is wrong (" + method + ")";
             case NO_METHOD:
-                boolean isNone = method == SecurityMethod.NONE;
-                return "the message states " + (isNone ? "no security method" : "a security method that is not known");
+                return method == SecurityMethod.NONE ? "the message states no security method"
+                        : "the message states a security method that is not known";
             case NO_MAC:
                 int at = digitsAt(message, header.length());
                 String where = at < 0 ? "" : ", but what may be one stands at message offset " + at;
@@ -113,16 +117,11 @@ final class Verify extends JsonJob {
         }
     }
 
-    /** Where in the body as many hexadecimal digits stand as a MAC has, with a NUL behind; or -1. */
+    /** Where in the body as many digits stand as a MAC has, with a NUL behind; or -1. */
     private static int digitsAt(byte[] message, int from) {
-        int digits = 0;
-        for (int at = from; at < message.length; ++at) {
-            if (message[at] == 0 && digits == MAC_DIGITS) {
-                return at - MAC_DIGITS;
-            }
-            digits = Character.digit(message[at], 16) < 0 ? 0 : digits + 1;
-        }
-        return -1;
+        String text = new String(message, StandardCharsets.ISO_8859_1);
+        Matcher digits = DIGITS_OF_MAC.matcher(text).region(from, text.length());
+        return digits.find() ? digits.start() : -1;
     }
 
     /** Says what came of a message; the reason is null when the MAC is right. */
