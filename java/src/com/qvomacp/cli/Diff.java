@@ -98,7 +98,7 @@ final class Diff extends MessageJob {
         new Walk() {
             @Override
             void enter(Item item, int depth) {
-                line(sign, Math.min(depth, TextWriter.DEEPEST) * TextWriter.INDENT, shown(item));
+                line(sign, Math.min(depth, TextWriter.DEEPEST) * Lines.INDENT, shown(item));
             }
         }.through(Collections.singletonList(change.item));
     }

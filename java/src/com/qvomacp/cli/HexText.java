@@ -1,6 +1,7 @@
 package com.qvomacp.cli;
 
 import java.io.ByteArrayOutputStream;
+import java.nio.charset.Charset;
 import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
 import java.util.Arrays;
@@ -69,11 +70,10 @@ final class HexText {
                 return null;
             }
         }
-        String text = new String(content, isWide ? StandardCharsets.UTF_16 : StandardCharsets.UTF_8);
-        for (int i = 0; i < text.length() && isWide; ++i) {
-            if (isControl(text.charAt(i))) {
-                return null;
-            }
+        Charset charset = isWide ? StandardCharsets.UTF_16 : StandardCharsets.UTF_8;
+        String text = new String(content, charset);
+        if (isWide && text.chars().anyMatch(HexText::isControl)) {
+            return null;
         }
         return text.startsWith(BYTE_ORDER_MARK) ? text.substring(1) : text;
     }
@@ -97,9 +97,8 @@ final class HexText {
                 piece = new Piece(i + 1, digits(dump.bytes), true, false);
                 i = dump.next - 1;
             }
-            boolean areNumbers = piece != null && piece.digits == null;
-            boolean areMore = areNumbers && last != null && last.digits == null;
-            if (piece != null && !areMore) {
+            // Of numbers that follow each other the first stand for all.
+            if (piece != null && (piece.digits != null || last == null || last.digits != null)) {
                 pieces.add(piece);
                 last = piece;
             }

@@ -8,11 +8,10 @@ import com.qvomacp.eng.omacp.ProvisioningException.Reason;
 import com.qvomacp.eng.omacp.ReadOptions;
 import com.qvomacp.eng.omacp.Verdict;
 import java.io.PrintWriter;
-import java.util.ArrayList;
+import java.util.ArrayDeque;
 import java.util.Arrays;
-import java.util.Collections;
+import java.util.Deque;
 import java.util.HashMap;
-import java.util.Iterator;
 import java.util.List;
 import java.util.Map;
 
@@ -24,8 +23,6 @@ import java.util.Map;
 final class Listing implements ByteVisitor {
     private static final int BYTES_PER_LINE = 8;
     private static final int BYTES_WIDTH = BYTES_PER_LINE * 3 - 1;
-    private static final int INDENT = 2;
-
     /** Deeper elements are indented no further. */
     private static final int DEEPEST = 8;
 
@@ -37,7 +34,6 @@ final class Listing implements ByteVisitor {
     private final PrintWriter out;
     private final Palette palette;
     private final byte[] message;
-    private final int bodyAt;
     private final int digits;
 
     /** How wide the offsets in the body are; 1 where no header makes them others. */
@@ -53,16 +49,13 @@ final class Listing implements ByteVisitor {
 
     private int depth;
 
-    /** What the library reads otherwise: where, and what; and how much of it has been said. */
-    private final List<Integer> otherwiseAt = new ArrayList<>();
+    /** What the library reads otherwise and is still to be said: where, and what. */
+    private final Deque<Integer> otherwiseAt = new ArrayDeque<>();
 
-    private final List<String> otherwise = new ArrayList<>();
-    private int saidOtherwise;
+    private final Deque<String> otherwise = new ArrayDeque<>();
 
-    /** The departures from the format that are still to be said; null behind the last. */
-    private Iterator<Deviation> deviations = Collections.emptyIterator();
-
-    private Deviation nextDeviation;
+    /** The departures from the format that are still to be said. */
+    private final Deque<Deviation> deviations = new ArrayDeque<>();
 
     /** Where the library stops, counted from {@link #start}; -1 where it does not. */
     private int stop = -1;
@@ -73,7 +66,6 @@ final class Listing implements ByteVisitor {
         this.out = out;
         this.palette = palette;
         this.message = reading.held.bytes;
-        this.bodyAt = reading.bodyAt();
         this.digits = message.length > 0x10000 ? 6 : 4;
         this.secondWidth = reading.header == null ? 1 : digits + 2;
     }
@@ -103,8 +95,7 @@ final class Listing implements ByteVisitor {
         listing.stop = !verdict.isHeaderRefused() && (isTooMuch || isRead) ? stop : -1;
         if (isRead) {
             listing.compare(verdict);
-            listing.deviations = reading.document.deviations().iterator();
-            listing.nextDeviation();
+            listing.deviations.addAll(reading.document.deviations());
             reading.document.describe(listing);
         } else if (isTooMuch) {
             listing.describe();
@@ -115,9 +106,9 @@ final class Listing implements ByteVisitor {
     /** Describes a body with too much text for a document, up to where it is too much. */
     private void describe() {
         byte[] body = Arrays.copyOfRange(message, start, message.length);
+        ReadOptions options = ReadOptions.DEFAULT.withInputLimit(body.length);
         try {
-            ProvisioningDocument.describe(
-                    body, ReadOptions.DEFAULT.withInputLimit(body.length), this);
+            ProvisioningDocument.describe(body, options, this);
         } catch (ProvisioningException tooMuch) {
             // What is left is told as not read.
         }
@@ -132,21 +123,17 @@ final class Listing implements ByteVisitor {
         });
     }
 
-    private void nextDeviation() {
-        nextDeviation = deviations.hasNext() ? deviations.next() : null;
-    }
-
     @Override
     public void visit(int offset, int length, int nesting, String meaning) {
         depth = nesting;
-        while (nextDeviation != null && nextDeviation.offset() < offset + length) {
-            row(offset, 0, "departs from the format: " + nextDeviation.sentence());
-            nextDeviation();
+        while (!deviations.isEmpty() && deviations.peek().offset() < offset + length) {
+            row(offset, 0, "departs from the format: " + deviations.poll().sentence());
         }
         row(offset, length, meaning);
         told = offset + length;
-        while (saidOtherwise < otherwise.size() && otherwiseAt.get(saidOtherwise) < told) {
-            row(offset, 0, otherwise.get(saidOtherwise++));
+        while (!otherwiseAt.isEmpty() && otherwiseAt.peek() < told) {
+            otherwiseAt.poll();
+            row(offset, 0, otherwise.poll());
         }
         if (stop >= 0 && stop < told) {
             row(told, 0, stopReason);
@@ -166,9 +153,9 @@ final class Listing implements ByteVisitor {
 
     private void row(int offset, int length, String meaning) {
         int column = digits + 1 + secondWidth + BYTES_WIDTH + 2;
-        int indent = Math.min(depth, DEEPEST) * INDENT;
-        boolean isLong = meaning.length() > LONGEST;
-        String shown = isLong ? Visible.of(meaning.substring(0, LONGEST)) + "..." : Visible.of(meaning);
+        int indent = Math.min(depth, DEEPEST) * Lines.INDENT;
+        String begin = meaning.substring(0, Math.min(meaning.length(), LONGEST));
+        String shown = Visible.of(begin) + (meaning.length() > LONGEST ? "..." : "");
         List<String> texts = Lines.of(shown, Lines.WIDTH - column - indent);
         int lines = Math.max((length + BYTES_PER_LINE - 1) / BYTES_PER_LINE, texts.size());
         boolean isUnread = meaning.equals(UNREAD);

@@ -19,7 +19,6 @@ import java.util.Locale;
  * characteristic in a column.
  */
 final class TextWriter {
-    static final int INDENT = 2;
     static final int HEADER_COLUMN = 16;
 
     /** Deeper items are indented no further. */
@@ -79,9 +78,9 @@ final class TextWriter {
                 int nesting = Math.min(depth, DEEPEST);
                 String name = name(item);
                 if (name == null) {
-                    row(nesting * INDENT, palette.error(title(item)), INDENT, shown(value(item)));
+                    row(nesting * Lines.INDENT, palette.error(title(item)), Lines.INDENT, shown(value(item)));
                 } else {
-                    line(nesting * INDENT, columns[nesting], name, shown(value(item)));
+                    line(nesting * Lines.INDENT, columns[nesting], name, shown(value(item)));
                 }
                 if (!item.children().isEmpty()) {
                     columns[Math.min(depth + 1, DEEPEST)] = column(item.children());
@@ -98,7 +97,7 @@ final class TextWriter {
             if (item instanceof Parameter) {
                 String name = ((Parameter) item).name();
                 int width = name == null ? 0 : Visible.columns(name, 0, WIDEST);
-                column = Math.max(column, width <= WIDEST ? width + INDENT : 0);
+                column = Math.max(column, width <= WIDEST ? width + Lines.INDENT : 0);
             }
         }
         return column;
@@ -177,7 +176,7 @@ final class TextWriter {
             String name = answer.name == null ? unnamed(isParameter) : answer.name;
             out.append(depth == 0 && !isParameter ? "\n" : "");
             out.append(mark.isEmpty() ? " " : palette.error(mark)).append(' ');
-            line(depth * INDENT, column, name, isParameter ? shown(answer) : null);
+            line(depth * Lines.INDENT, column, name, isParameter ? shown(answer) : null);
             if (!isParameter) {
                 answers(answer.children, depth + 1, answer.column);
             }
@@ -197,7 +196,7 @@ final class TextWriter {
     /** Writes a name, and in its column the value as it is shown; null for none. */
     void line(int indent, int column, String name, String shown) {
         String shownName = Visible.of(name);
-        int gap = shown == null ? 0 : Math.max(column - Visible.columns(shownName), INDENT);
+        int gap = shown == null ? 0 : Math.max(column - Visible.columns(shownName), Lines.INDENT);
         row(indent, shownName, gap, shown);
     }
 
