@@ -247,8 +247,8 @@ class DiffTest {
             for (int n = random.nextInt(3); n > 0; --n) {
                 other[4 + random.nextInt(body.length - 4)] = (byte) random.nextInt(0x90);
             }
-            Reading left = Reading.of(Held.message("", body, false), 1 << 20);
-            Reading right = Reading.of(Held.message("", other, false), 1 << 20);
+            Reading left = new Reading(Held.message("", body, false), 1 << 20);
+            Reading right = new Reading(Held.message("", other, false), 1 << 20);
             if (left.document != null && right.document != null) {
                 boolean isEqual = left.document.equals(right.document);
                 assertEquals(isEqual, Differences.of(left, right).isEmpty(), "body " + i);
