@@ -10,12 +10,6 @@ final class Arguments {
     final Map<Option<?>, Object> values = new HashMap<>();
     final List<String> files = new ArrayList<>();
 
-    /** The value of an option; null without one. */
-    @SuppressWarnings("unchecked")
-    <T> T value(Option<T> option) {
-        return (T) values.get(option);
-    }
-
     boolean has(Option<?> option) {
         return values.containsKey(option);
     }
@@ -35,7 +29,8 @@ final class Arguments {
                 continue;
             }
             int equals = argument.indexOf('=');
-            Option<?> option = named(options, equals < 0 ? argument : argument.substring(0, equals));
+            String name = equals < 0 ? argument : argument.substring(0, equals);
+            Option<?> option = named(options, name);
             Object value = null;
             if (option != null && option.label == null) {
                 value = equals < 0 ? true : null;

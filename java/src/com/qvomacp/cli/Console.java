@@ -48,7 +48,7 @@ final class Console {
     final Terminal terminal;
 
     /** The worst of all files. */
-    private int status = DONE;
+    int status = DONE;
 
     Console(InputStream in, OutputStream out, OutputStream err, Terminal terminal) {
         this.in = in;
@@ -75,10 +75,6 @@ final class Console {
         out.flush();
         err.print(text);
         err.flush();
-    }
-
-    int status() {
-        return status;
     }
 
     void raise(int raised) {

@@ -7,7 +7,6 @@ import com.qvomacp.eng.omacp.Parameter;
 import java.util.ArrayList;
 import java.util.Collections;
 import java.util.List;
-import java.util.Locale;
 import picocli.CommandLine.Command;
 
 /** Tells what differs between two messages. */
@@ -33,11 +32,11 @@ final class Diff extends MessageJob {
 
     @Override
     void end() {
-        if (console.status() == Console.DONE && readings.size() != 2) {
+        if (console.status == Console.DONE && readings.size() != 2) {
             String found = "two messages are compared, and here are " + readings.size();
             fail(Console.FAILED, "diff", found);
         }
-        if (console.status() != Console.DONE) {
+        if (console.status != Console.DONE) {
             super.end();
             return;
         }
@@ -67,16 +66,12 @@ final class Diff extends MessageJob {
         }
     }
 
-    private static String kind(Change change) {
-        return change.kind.name().toLowerCase(Locale.ROOT);
-    }
-
     private static boolean isValue(Change change) {
         return change.item == null || change.item instanceof Parameter;
     }
 
     private void text(Change change) {
-        console.out.println(kind(change) + ": " + Visible.of(change.path));
+        console.out.println(MessageJson.lowerCase(change.kind) + ": " + Visible.of(change.path));
         if (change.kind == Kind.MOVED) {
             console.out.println("  from place " + change.before + " to place " + change.after);
             return;
@@ -117,7 +112,8 @@ final class Diff extends MessageJob {
     }
 
     private void json(Change change) {
-        writer.beginObject().member("change", kind(change)).member("path", change.path);
+        writer.beginObject().member("change", MessageJson.lowerCase(change.kind));
+        writer.member("path", change.path);
         if (change.kind == Kind.MOVED) {
             writer.member("from", Integer.parseInt(change.before));
             writer.member("to", Integer.parseInt(change.after));

@@ -31,7 +31,7 @@ final class Graph extends MessageJob {
     /** How many boxes and other nodes the message has. */
     private int nodes;
 
-    /** Where references lead, by the parameter's name and value: a node, and the look of the edge. */
+    /** Where references lead, by a parameter's name and value: a node, and the look of the edge. */
     private final Map<String, Map<String, String>> targets = new HashMap<>();
 
     /** JSON is no form of a graph. */
@@ -45,6 +45,7 @@ final class Graph extends MessageJob {
     @Override
     void run(Reading reading) {
         nodes = 0;
+        // Of several that have one identifier, the first is what is referred to.
         targets.put("TO-PROXY", new HashMap<>());
         targets.put("TO-NAPID", new HashMap<>());
         console.out.println("digraph \"" + escaped(reading.held.name) + "\" {");
@@ -52,11 +53,12 @@ final class Graph extends MessageJob {
         line("node [shape=box, fontname=\"sans-serif\"]");
         ProvisioningMessage message = reading.message;
         for (AccessPoint point : message.accessPoints()) {
-            target("TO-NAPID", point.napId(), node("NAPDEF", point.napId(), point.name(), point.address()));
+            String node = node("NAPDEF", point.napId(), point.name(), point.address());
+            targets.get("TO-NAPID").putIfAbsent(point.napId(), node);
         }
         for (Proxy proxy : message.proxies()) {
             String node = node("PXLOGICAL", proxy.proxyId(), proxy.name());
-            target("TO-PROXY", proxy.proxyId(), node);
+            targets.get("TO-PROXY").putIfAbsent(proxy.proxyId(), node);
             for (PhysicalProxy machine : proxy.physicalProxies()) {
                 String inner = node("PXPHYSICAL", machine.physicalProxyId(), machine.address());
                 line(node + " -> " + inner);
@@ -71,21 +73,13 @@ final class Graph extends MessageJob {
         console.out.println("}");
     }
 
-    /** Of several that have one identifier, the first is what is referred to. */
-    private void target(String reference, String identifier, String node) {
-        if (identifier != null) {
-            targets.get(reference).putIfAbsent(identifier, node);
-        }
-    }
-
     private void edges(String from, String reference, List<String> identifiers) {
         Map<String, String> known = targets.get(reference);
         for (String identifier : identifiers) {
             if (!known.containsKey(identifier)) {
                 boolean isAny = reference.equals("TO-NAPID") && identifier.equals(INTERNET);
-                String node =
-                        isAny ? node(INTERNET, "any access point")
-                                : node(reference, identifier, "not in this document");
+                String node = isAny ? node(INTERNET, "any access point")
+                        : node(reference, identifier, "not in this document");
                 line(node + (isAny ? " [shape=ellipse]" : MISSING));
                 known.put(identifier, isAny ? node : node + MISSING);
             }

@@ -19,9 +19,8 @@ abstract class Job {
     private static final Option<Form> AS = Option.constant("--as", "FORM", Form.values(),
             "What the messages are, where it does not show by itself: push, body, sms (an"
                     + " SMS-DELIVER) or ud (the user data of an SMS).");
-    private static final Option<Color> COLOR =
-            Option.constant("--color", "WHEN", Color.values(),
-                    "Use colours: auto (on a terminal, unless NO_COLOR is set), always, never.");
+    private static final Option<Color> COLOR = Option.constant("--color", "WHEN", Color.values(),
+            "Use colours: auto (on a terminal, unless NO_COLOR is set), always, never.");
 
     Arguments arguments;
     Console console;
@@ -44,8 +43,10 @@ abstract class Job {
         return arguments.has(option);
     }
 
+    /** The value of an option; null without one. */
+    @SuppressWarnings("unchecked")
     <T> T value(Option<T> option) {
-        return arguments.value(option);
+        return (T) arguments.values.get(option);
     }
 
     /** Does it to one message. */

@@ -100,6 +100,11 @@ final class JsonWriter {
         return name(name).literal(Boolean.toString(value));
     }
 
+    /** A place, or null where it is negative. */
+    JsonWriter place(String name, int place) {
+        return place < 0 ? member(name, null) : member(name, place);
+    }
+
     /** A string, or null. */
     JsonWriter text(String text) {
         return literal(text == null ? "null" : Visible.json(text));

@@ -7,7 +7,6 @@ import com.qvomacp.eng.omacp.Rule;
 import com.qvomacp.eng.omacp.Rule.Severity;
 import java.util.EnumSet;
 import java.util.List;
-import java.util.Locale;
 import java.util.Set;
 import picocli.CommandLine.Command;
 
@@ -25,11 +24,8 @@ import picocli.CommandLine.Command;
             "2:wrong usage, a message or document cannot be read, the output cannot be written"
         })
 final class Lint extends MessageJob {
-    private static final Option<String> NO =
-            Option.texts(
-                    "--no --disable",
-                    "RULE",
-                    "Leave out a rule, or several with commas between their names.");
+    private static final Option<String> NO = Option.texts("--no --disable", "RULE",
+            "Leave out a rule, or several with commas between their names.");
     private static final Option<Boolean> STRICT =
             Option.flag("--strict", "End with 1 for warnings, too.");
 
@@ -90,10 +86,6 @@ final class Lint extends MessageJob {
         }
     }
 
-    private static String severity(Finding finding) {
-        return finding.rule().severity().name().toLowerCase(Locale.ROOT);
-    }
-
     private void text(String name, Finding finding) {
         StringBuilder place = new StringBuilder(Visible.of(name));
         if (finding.line() > 0) {
@@ -101,10 +93,10 @@ final class Lint extends MessageJob {
         } else if (finding.offset() >= 0) {
             place.append(':').append(finding.offset());
         }
-        String severity = severity(finding) + ":";
+        boolean isError = finding.rule().severity() == Severity.ERROR;
+        String severity = MessageJson.lowerCase(finding.rule().severity()) + ":";
         String rule = " [" + finding.rule().ruleName() + "]";
         String text = place + ": " + severity + " " + Visible.of(finding.sentence()) + rule;
-        boolean isError = finding.rule().severity() == Severity.ERROR;
         String painted = isError ? palette.error(severity) : palette.bold(severity);
         console.out.print(Lines.paragraph("", text).replaceFirst("(?<=: )" + severity, painted));
         String told = "in " + finding.path() + "; right: " + finding.remedy();
@@ -113,15 +105,13 @@ final class Lint extends MessageJob {
     }
 
     private void json(Finding finding) {
-        writer.beginObject();
-        writer.member("rule", finding.rule().ruleName()).member("severity", severity(finding));
+        writer.beginObject().member("rule", finding.rule().ruleName());
+        writer.member("severity", MessageJson.lowerCase(finding.rule().severity()));
         writer.member("path", finding.path());
         if (finding.line() > 0) {
             writer.member("line", finding.line()).member("column", finding.column());
-        } else if (finding.offset() >= 0) {
-            writer.member("offset", finding.offset());
         } else {
-            writer.member("offset", null);
+            writer.place("offset", finding.offset());
         }
         writer.member("sentence", finding.sentence()).member("remedy", finding.remedy());
         writer.member("reference", finding.rule().reference()).end();

@@ -68,7 +68,7 @@ public final class Main {
             }
         }
         console.err.flush();
-        return console.status();
+        return console.status;
     }
 
     /** Loads picocli, which takes longer than most messages, only where it is needed. */

@@ -37,7 +37,8 @@ final class MessageJson {
         if (reading.document != null) {
             for (Deviation deviation : reading.document.deviations()) {
                 json.beginFlatObject().member("offset", deviation.offset());
-                json.member("path", deviation.path()).member("sentence", deviation.sentence()).end();
+                json.member("path", deviation.path());
+                json.member("sentence", deviation.sentence()).end();
             }
         }
         json.end();
@@ -149,7 +150,8 @@ final class MessageJson {
         json.member("offset", item.offset()).member("length", item.length());
     }
 
-    private static String lowerCase(Enum<?> constant) {
+    /** A constant as it is told. */
+    static String lowerCase(Enum<?> constant) {
         return constant.name().toLowerCase(Locale.ROOT).replace('_', '-');
     }
 
@@ -160,13 +162,8 @@ final class MessageJson {
         }
         json.member("code", verdict.code()).member("codeName", verdict.codeName());
         json.member("bytesRead", verdict.bytesRead());
-        if (verdict.isAccepted()) {
-            json.member("offset", null);
-        } else {
-            json.member("offset", verdict.offset());
-        }
-        json.member("path", verdict.path()).member("reason", verdict.reason());
-        json.member("found", verdict.found());
+        json.place("offset", verdict.offset()).member("path", verdict.path());
+        json.member("reason", verdict.reason()).member("found", verdict.found());
         json.name("expected").beginArray();
         for (String expected : verdict.expected()) {
             json.text(expected);

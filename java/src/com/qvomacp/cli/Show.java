@@ -127,12 +127,7 @@ final class Show extends JsonJob {
         }
         title(reading.held.name);
         TextWriter text = new TextWriter(console.out, palette);
-        int bodyLength = reading.held.bytes.length - reading.bodyAt();
-        if (reading.header == null) {
-            text.bodyAlone(bodyLength);
-        } else {
-            text.header(reading.header, bodyLength);
-        }
+        text.header(reading.header, reading.held.bytes.length - reading.bodyAt());
         if (reading.document != null) {
             text.document(reading.document);
         }

@@ -12,7 +12,6 @@ import com.qvomacp.eng.omacp.PushHeader;
 import java.io.PrintWriter;
 import java.util.ArrayList;
 import java.util.List;
-import java.util.Locale;
 
 /**
  * Writes a message for people: its items in their order, indented as they nest, the values of a
@@ -37,8 +36,12 @@ final class TextWriter {
         this.palette = palette;
     }
 
-    /** Writes what the push header says. */
+    /** Writes what the push header says; null for a body alone. */
     void header(PushHeader header, int bodyLength) {
+        if (header == null) {
+            fact("Body length", bodyLength + " bytes, without a push header");
+            return;
+        }
         ContentType type = header.contentType();
         String code = type.code() < 0 ? "" : " (" + type.code() + ")";
         fact("Content type", type.mediaType() + code);
@@ -49,10 +52,6 @@ final class TextWriter {
         for (HeaderField field : fields) {
             fact(field.name(), field.value());
         }
-    }
-
-    void bodyAlone(int length) {
-        fact("Body length", length + " bytes, without a push header");
     }
 
     private void fact(String name, String value) {
@@ -70,17 +69,17 @@ final class TextWriter {
             void enter(Item item, int depth) {
                 boolean isCharacteristic = item instanceof Characteristic;
                 if (depth == 0) {
-                    if (isCharacteristic || wasCharacteristic) {
-                        out.append('\n');
-                    }
+                    out.append(isCharacteristic || wasCharacteristic ? "\n" : "");
                     wasCharacteristic = isCharacteristic;
                 }
                 int nesting = Math.min(depth, DEEPEST);
+                int indent = nesting * Lines.INDENT;
                 String name = name(item);
+                String value = shown(value(item));
                 if (name == null) {
-                    row(nesting * Lines.INDENT, palette.error(title(item)), Lines.INDENT, shown(value(item)));
+                    row(indent, palette.error(title(item)), Lines.INDENT, value);
                 } else {
-                    line(nesting * Lines.INDENT, columns[nesting], name, shown(value(item)));
+                    line(indent, columns[nesting], name, value);
                 }
                 if (!item.children().isEmpty()) {
                     columns[Math.min(depth + 1, DEEPEST)] = column(item.children());
@@ -117,8 +116,8 @@ final class TextWriter {
     /** What an item is called; where it has no name, what it is. */
     static String title(Item item) {
         String name = name(item);
-        return name != null ? Visible.of(name)
-                : item instanceof Other ? describe((Other) item) : unnamed(item instanceof Parameter);
+        String none = unnamed(item instanceof Parameter);
+        return name != null ? Visible.of(name) : item instanceof Other ? describe((Other) item) : none;
     }
 
     private static String unnamed(boolean isParameter) {
@@ -128,7 +127,7 @@ final class TextWriter {
     private static String describe(Other other) {
         boolean isTrailing = other.kind() == Other.Kind.TRAILING;
         StringBuilder text = new StringBuilder("(");
-        String kind = other.kind().name().toLowerCase(Locale.ROOT);
+        String kind = MessageJson.lowerCase(other.kind());
         text.append(isTrailing ? other.length() + " bytes behind the document" : kind);
         if (other.name() != null) {
             text.append(' ').append(Visible.of(other.name()));
