@@ -4,7 +4,7 @@ import java.util.ArrayList;
 import java.util.List;
 import java.util.Objects;
 
-/** What the library answers of a characteristic or a parameter, beside what the message says of it. */
+/** What the library answers of a characteristic or a parameter, beside what the message says. */
 final class Answer {
     /** The type or the name; null for one that has none. */
     final String name;

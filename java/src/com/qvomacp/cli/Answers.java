@@ -11,8 +11,8 @@ import com.qvomacp.eng.parser.XCPCtxPxLogical;
 import com.qvomacp.eng.parser.XCPCtxVendorConfig;
 import com.qvomacp.eng.parser.XCPCtxVoWifi;
 import com.qvomacp.eng.parser.XCPCtxWifi;
+import java.nio.ByteBuffer;
 import java.nio.charset.StandardCharsets;
-import java.util.Arrays;
 import java.util.function.IntConsumer;
 import java.util.function.IntFunction;
 
@@ -75,7 +75,9 @@ final class Answers {
     static boolean ask(Held held, Comparison comparison) {
         NativeLibrary.load();
         Answers answers = new Answers(comparison);
-        byte[] push = held.isPush ? held.bytes : push(held.bytes);
+        int length = BARE_HEADER.length + held.bytes.length;
+        byte[] push = held.isPush ? held.bytes
+                : ByteBuffer.allocate(length).put(BARE_HEADER).put(held.bytes).array();
         try {
             if (!answers.parser.qvomacp_parser(push, push.length, 0)) {
                 return false;
@@ -89,12 +91,6 @@ final class Answers {
         } finally {
             answers.parser.qvomacp_parser_del();
         }
-    }
-
-    private static byte[] push(byte[] body) {
-        byte[] push = Arrays.copyOf(BARE_HEADER, BARE_HEADER.length + body.length);
-        System.arraycopy(body, 0, push, BARE_HEADER.length, body.length);
-        return push;
     }
 
     private void header() {

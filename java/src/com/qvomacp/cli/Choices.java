@@ -26,7 +26,8 @@ final class Choices {
         for (EncodeOption option : EncodeOption.values()) {
             String name = "--" + option.optionName();
             String[] choices = option.choices().toArray(new String[0]);
-            String label = choices.length == 0 ? option.optionName().toUpperCase(Locale.ROOT) : "HOW";
+            String label = choices.length == 0 ? option.optionName() : "how";
+            label = label.toUpperCase(Locale.ROOT);
             ALL.put(name, Option.text(name, label, described(option), choices));
             if (option.isSecret()) {
                 String file = "Read " + name + " from a file, or \"-\".";
@@ -63,7 +64,8 @@ final class Choices {
     String value(EncodeOption option) {
         String name = "--" + option.optionName();
         String value = job.value(ALL.get(name));
-        return option.isSecret() ? one(name, value, one(name, ofFile(name), ofEnvironment(name))) : value;
+        return !option.isSecret() ? value
+                : one(name, value, one(name, ofFile(name), ofEnvironment(name)));
     }
 
     private static String one(String name, String first, String second) {

@@ -16,8 +16,8 @@ import java.util.Map;
 import java.util.Objects;
 
 /**
- * Holds what the native library answers against what the message says. The characteristics of a type
- * that stand in the same one are compared by their order, and so are the parameters of a name.
+ * Holds what the native library answers against what the message says. The characteristics of a
+ * type that stand in the same one are compared by their order, and so the parameters of a name.
  */
 final class Comparison {
     /** In place of a type, for what is answered of the push header. */

@@ -15,6 +15,7 @@ import java.util.Deque;
 import java.util.HashMap;
 import java.util.HashSet;
 import java.util.LinkedHashMap;
+import java.util.LinkedHashSet;
 import java.util.List;
 import java.util.Map;
 import java.util.Objects;
@@ -56,7 +57,7 @@ final class Differences {
         }
     }
 
-    /** What tells characteristics of a type from each other: the first parameter more than the last. */
+    /** What tells characteristics of a type from each other, the first parameter above all. */
     private static final Map<String, List<String>> IDENTIFIERS = new HashMap<>();
 
     static {
@@ -128,17 +129,20 @@ final class Differences {
     }
 
     /** Compares values by their names and, of one name, by their order. */
-    private void named(String path, Map<String, List<String>> before, Map<String, List<String>> after) {
-        Map<String, List<String>> all = new LinkedHashMap<>(before);
-        after.forEach(all::putIfAbsent);
-        for (String name : all.keySet()) {
-            List<String> old = before.getOrDefault(name, Collections.<String>emptyList());
-            List<String> now = after.getOrDefault(name, Collections.<String>emptyList());
+    private void named(
+            String path, Map<String, List<String>> before, Map<String, List<String>> after) {
+        Set<String> names = new LinkedHashSet<>(before.keySet());
+        names.addAll(after.keySet());
+        for (String name : names) {
+            List<String> old = before.getOrDefault(name, Collections.emptyList());
+            List<String> now = after.getOrDefault(name, Collections.emptyList());
             for (int i = 0; i < Math.max(old.size(), now.size()); ++i) {
-                String first = i < old.size() ? old.get(i) : null;
-                String second = i < now.size() ? now.get(i) : null;
-                Kind kind = i >= now.size() ? Kind.REMOVED : i >= old.size() ? Kind.ADDED : Kind.CHANGED;
-                if (kind != Kind.CHANGED || !Objects.equals(first, second)) {
+                boolean isOld = i < old.size();
+                boolean isNow = i < now.size();
+                Kind kind = !isNow ? Kind.REMOVED : isOld ? Kind.CHANGED : Kind.ADDED;
+                String first = isOld ? old.get(i) : null;
+                String second = isNow ? now.get(i) : null;
+                if (isOld != isNow || !Objects.equals(first, second)) {
                     changes.add(new Change(kind, path + " / " + name, null, first, second));
                 }
             }
@@ -201,7 +205,8 @@ final class Differences {
             }
             for (int i = 0; i < matches.length && !waiting.isEmpty(); ++i) {
                 List<Object> key = matches[i] == NONE ? key(before.get(i), tier) : null;
-                Integer j = key == null || !waiting.containsKey(key) ? null : waiting.get(key).poll();
+                Deque<Integer> left = waiting.get(key);
+                Integer j = left == null ? null : left.poll();
                 if (j != null && (tier < BY_ORDER || isLike(before.get(i), after.get(j)))) {
                     matches[i] = j;
                     taken[j] = true;
@@ -215,13 +220,12 @@ final class Differences {
     private static List<Object> key(Item item, int tier) {
         if (item instanceof Parameter) {
             Parameter parameter = (Parameter) item;
-            return tier == 0
-                    ? Arrays.<Object>asList(Parameter.class, parameter.name(), parameter.value())
-                    : Arrays.<Object>asList(Parameter.class, parameter.name());
+            String value = tier == 0 ? parameter.value() : null;
+            return Arrays.asList(Parameter.class, parameter.name(), value);
         }
         if (item instanceof Other) {
             Other other = (Other) item;
-            return Arrays.<Object>asList(other.kind(), other.name(), other.text());
+            return Arrays.asList(other.kind(), other.name(), other.text());
         }
         Characteristic characteristic = (Characteristic) item;
         List<Object> key = new ArrayList<>();
@@ -240,7 +244,7 @@ final class Differences {
     }
 
     private static List<String> identifiers(Characteristic characteristic) {
-        return IDENTIFIERS.getOrDefault(characteristic.type(), Collections.<String>emptyList());
+        return IDENTIFIERS.getOrDefault(characteristic.type(), Collections.emptyList());
     }
 
     /**
@@ -248,7 +252,8 @@ final class Differences {
      * alone: of those with another identifier half of the other parameters have to be the same.
      */
     private static boolean isLike(Item before, Item after) {
-        if (!(before instanceof Characteristic) || !NAMED.contains(((Characteristic) before).type())) {
+        boolean isOne = before instanceof Characteristic;
+        if (!isOne || !NAMED.contains(((Characteristic) before).type())) {
             return true;
         }
         Set<Parameter> old = others((Characteristic) before);

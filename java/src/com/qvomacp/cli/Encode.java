@@ -56,23 +56,22 @@ final class Encode extends Job {
 
     private final ByteArrayOutputStream written = new ByteArrayOutputStream();
 
-    @Override
-    List<Option<?>> options() {
-        List<Option<?>> options = super.options();
+    Encode() {
         Collections.addAll(options, BODY, HEX, BASE64, SMS, TO, OUTPUT, FORCE);
         options.addAll(Choices.ALL.values());
-        return options;
     }
 
     @Override
     void begin() {
         int forms = (has(HEX) ? 1 : 0) + (has(BASE64) ? 1 : 0) + (has(SMS) ? 1 : 0);
         if (forms > 1 || has(SMS) && has(BODY)) {
-            throw new UsageException("--hex, --base64 and --sms go not together, nor --sms with --body");
+            throw new UsageException(
+                    "--hex, --base64 and --sms go not together, nor --sms with --body");
         }
         String to = value(TO);
         if (value(SMS) == Sms.SUBMIT ? to == null || !to.matches("\\+?[0-9]{1,20}") : to != null) {
-            throw new UsageException("--sms=submit, and nothing else, needs --to with 1 to 20 digits");
+            throw new UsageException(
+                    "--sms=submit, and nothing else, needs --to with 1 to 20 digits");
         }
         output = Input.STANDARD_INPUT.equals(value(OUTPUT)) ? null : value(OUTPUT);
         if (output == null && isRaw() && console.terminal.isScreen) {
@@ -115,7 +114,7 @@ final class Encode extends Job {
         }
     }
 
-    /** Says that what is written is not all that the message was, where it is not as it should be. */
+    /** Says of a message that is not what it should be that not all of it is written. */
     private void warn(Reading reading) {
         int deviations = reading.document.deviations().size();
         String places = deviations == 1 ? "1 place" : deviations + " places";
@@ -123,8 +122,8 @@ final class Encode extends Job {
         String refused = reading.isAccepted() ? "" : "is refused by the library";
         String and = departs.isEmpty() || refused.isEmpty() ? "" : " and ";
         if (!(departs + refused).isEmpty()) {
-            String note = "note: what is read " + departs + and + refused + "; only what it sets is encoded";
-            complain(startOf(reading.held.name) + note + "\n");
+            String note = "note: what is read " + departs + and + refused;
+            complain(startOf(reading.held.name) + note + "; only what it sets is encoded\n");
         }
     }
 

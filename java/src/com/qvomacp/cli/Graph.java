@@ -35,11 +35,8 @@ final class Graph extends MessageJob {
     private final Map<String, Map<String, String>> targets = new HashMap<>();
 
     /** JSON is no form of a graph. */
-    @Override
-    List<Option<?>> options() {
-        List<Option<?>> options = super.options();
+    Graph() {
         options.removeIf(option -> option.names[0].startsWith("--json"));
-        return options;
     }
 
     @Override

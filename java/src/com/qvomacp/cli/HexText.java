@@ -23,6 +23,9 @@ final class HexText {
         /** A label all of whose letters are digits, and no byte. */
         static final Pattern WORD = Pattern.compile("(?s)\\p{javaLetterOrDigit}{3,}:.+");
 
+        /** Digits without a prefix. */
+        static final Pattern GROUP = Pattern.compile("(?<![\\p{XDigit}xX])\\p{XDigit}++(?![xX])");
+
         /** Counted from 1. */
         final int line;
 
@@ -129,10 +132,7 @@ final class HexText {
      * in front is a label. Null when there are none, or too few behind a label.
      */
     private static String behindLabel(String line) {
-        int from = line.length();
-        while (from > 0 && isDigitOrAround(line, from - 1)) {
-            --from;
-        }
+        int from = tail(line);
         boolean hasLabel = from > 0;
         boolean isInWord = hasLabel && Character.isLetterOrDigit(line.charAt(from - 1));
         // A label may end with letters that are digits too.
@@ -150,23 +150,22 @@ final class HexText {
 
     /** Whether a line ends with groups of odd numbers of digits, as no bytes do. */
     private static boolean areNumbers(String line) {
+        Matcher groups = Piece.GROUP.matcher(line.substring(tail(line)));
         int odd = 0;
-        int digits = 0;
-        for (int at = line.length() - 1; at >= 0 && isDigitOrAround(line, at) && odd < 3; --at) {
-            digits = isDigit(line, at) ? digits + 1 : 0;
-            boolean isBegin = digits > 0 && (at == 0 || !isDigit(line, at - 1));
-            boolean hasPrefix = isX(line, at - 1) || isX(line, at + digits);
-            odd += isBegin && digits % 2 != 0 && !hasPrefix ? 1 : 0;
+        while (groups.find()) {
+            odd += (groups.end() - groups.start()) % 2;
         }
         return odd > 2;
     }
 
-    private static boolean isX(String line, int at) {
-        return at >= 0 && at < line.length() && (line.charAt(at) | 0x20) == 'x';
-    }
-
-    private static boolean isDigitOrAround(String line, int at) {
-        return isDigit(line, at) || AROUND.indexOf(line.charAt(at)) >= 0;
+    /** Where the digits begin that a line ends with, and what may stand around them. */
+    private static int tail(String line) {
+        int from = line.length();
+        while (from > 0
+                && (isDigit(line, from - 1) || AROUND.indexOf(line.charAt(from - 1)) >= 0)) {
+            --from;
+        }
+        return from;
     }
 
     /** The digits without what may stand around them; null for an x that is no prefix. */

@@ -22,6 +22,9 @@ abstract class Job {
     private static final Option<Color> COLOR = Option.constant("--color", "WHEN", Color.values(),
             "Use colours: auto (on a terminal, unless NO_COLOR is set), always, never.");
 
+    /** What it takes, in the order of its help; each kind of job adds its own. */
+    final List<Option<?>> options = new ArrayList<>(Arrays.asList(LIMIT, AS, COLOR));
+
     Arguments arguments;
     Console console;
 
@@ -34,9 +37,8 @@ abstract class Job {
     /** Whether there are several files, or several messages in the only one. */
     boolean isOneOfSeveral;
 
-    /** The options that it takes, in the order of its help. */
     List<Option<?>> options() {
-        return new ArrayList<>(Arrays.asList(LIMIT, AS, COLOR));
+        return options;
     }
 
     boolean has(Option<?> option) {

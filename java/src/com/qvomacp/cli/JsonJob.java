@@ -1,7 +1,6 @@
 package com.qvomacp.cli;
 
 import java.util.Collections;
-import java.util.List;
 
 /** A job whose results can be JSON: an object for each message. */
 abstract class JsonJob extends Job {
@@ -13,11 +12,8 @@ abstract class JsonJob extends Job {
     JsonWriter writer;
     private boolean inObject;
 
-    @Override
-    List<Option<?>> options() {
-        List<Option<?>> options = super.options();
+    JsonJob() {
         Collections.addAll(options, JSON, JSON_LINES);
-        return options;
     }
 
     @Override

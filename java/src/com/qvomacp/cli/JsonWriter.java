@@ -140,7 +140,7 @@ final class JsonWriter {
         isFirst = false;
     }
 
-    /** Ends the line in front of a value that is going to follow, for something to stand between. */
+    /** Ends the line in front of a value that will follow, for something to stand between. */
     void separate() {
         if (open.length() > 0 && !isFlat() && !isSeparated) {
             out.append(isFirst ? "\n" : ",\n");

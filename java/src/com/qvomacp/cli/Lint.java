@@ -5,6 +5,7 @@ import com.qvomacp.eng.omacp.Finding;
 import com.qvomacp.eng.omacp.ProvisioningEncoder;
 import com.qvomacp.eng.omacp.Rule;
 import com.qvomacp.eng.omacp.Rule.Severity;
+import java.util.Collections;
 import java.util.EnumSet;
 import java.util.List;
 import java.util.Set;
@@ -31,12 +32,8 @@ final class Lint extends MessageJob {
 
     private final Set<Rule> left = EnumSet.allOf(Rule.class);
 
-    @Override
-    List<Option<?>> options() {
-        List<Option<?>> options = super.options();
-        options.add(NO);
-        options.add(STRICT);
-        return options;
+    Lint() {
+        Collections.addAll(options, NO, STRICT);
     }
 
     @Override
@@ -87,16 +84,14 @@ final class Lint extends MessageJob {
     }
 
     private void text(String name, Finding finding) {
-        StringBuilder place = new StringBuilder(Visible.of(name));
-        if (finding.line() > 0) {
-            place.append(':').append(finding.line()).append(':').append(finding.column());
-        } else if (finding.offset() >= 0) {
-            place.append(':').append(finding.offset());
-        }
+        String offset = finding.offset() < 0 ? "" : ":" + finding.offset();
+        boolean hasLine = finding.line() > 0;
+        String place = hasLine ? ":" + finding.line() + ":" + finding.column() : offset;
         boolean isError = finding.rule().severity() == Severity.ERROR;
         String severity = MessageJson.lowerCase(finding.rule().severity()) + ":";
         String rule = " [" + finding.rule().ruleName() + "]";
-        String text = place + ": " + severity + " " + Visible.of(finding.sentence()) + rule;
+        String start = Visible.of(name) + place + ": " + severity;
+        String text = start + " " + Visible.of(finding.sentence()) + rule;
         String painted = isError ? palette.error(severity) : palette.bold(severity);
         console.out.print(Lines.paragraph("", text).replaceFirst("(?<=: )" + severity, painted));
         String told = "in " + finding.path() + "; right: " + finding.remedy();

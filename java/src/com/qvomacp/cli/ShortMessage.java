@@ -135,14 +135,12 @@ final class ShortMessage {
         }
         byte[] data = Arrays.copyOfRange(bytes, end, bytes.length);
         ShortMessage message = new ShortMessage(sender, data, null);
-        int element = from + 1;
-        while (element < end) {
-            int next = element + 1 < end ? element + 2 + at(bytes, element + 1) : end + 1;
+        for (int element = from + 1, next; element < end; element = next) {
+            next = element + 1 < end ? element + 2 + at(bytes, element + 1) : end + 1;
             if (next > end) {
                 return null;
             }
             message.take(at(bytes, element), bytes, element + 2, next - element - 2);
-            element = next;
         }
         return message;
     }

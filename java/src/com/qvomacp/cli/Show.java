@@ -36,11 +36,8 @@ final class Show extends JsonJob {
 
     private int shown;
 
-    @Override
-    List<Option<?>> options() {
-        List<Option<?>> options = super.options();
+    Show() {
         Collections.addAll(options, HEADER, BYTES, ANSWERS, XML);
-        return options;
     }
 
     @Override

@@ -116,8 +116,9 @@ final class TextWriter {
     /** What an item is called; where it has no name, what it is. */
     static String title(Item item) {
         String name = name(item);
-        String none = unnamed(item instanceof Parameter);
-        return name != null ? Visible.of(name) : item instanceof Other ? describe((Other) item) : none;
+        boolean isOther = item instanceof Other;
+        String what = isOther ? describe((Other) item) : unnamed(item instanceof Parameter);
+        return name == null ? what : Visible.of(name);
     }
 
     private static String unnamed(boolean isParameter) {
@@ -187,8 +188,9 @@ final class TextWriter {
             return shown(answer.said);
         }
         String shown = answer.value == null ? "(none)" : Visible.value(answer.value);
-        String says = answer.said == null ? "gives no value" : "says " + Visible.quoted(answer.said);
-        String instead = answer.isSaid ? "the message " + says : "the message does not say it";
+        String says = answer.said == null ? "the message gives no value"
+                : "the message says " + Visible.quoted(answer.said);
+        String instead = answer.isSaid ? says : "the message does not say it";
         return answer.isSame() ? shown : shown + "  (" + instead + ")";
     }
 

@@ -139,15 +139,12 @@ final class Usage {
 
     static ParseResult parsed(CommandLine program, String[] arguments) {
         String first = arguments.length == 0 ? "" : arguments[0];
-        boolean isWhole =
-                program.getSubcommands().containsKey(first)
-                        || program.getCommandSpec().findOption(first) != null;
-        if (isWhole) {
-            return program.parseArgs(arguments);
+        boolean isCommand = program.getSubcommands().containsKey(first);
+        List<String> whole = new ArrayList<>(Arrays.asList(arguments));
+        if (!isCommand && program.getCommandSpec().findOption(first) == null) {
+            whole.add(0, Main.COMMANDS[0]);
         }
-        List<String> withCommand = new ArrayList<>(Arrays.asList(arguments));
-        withCommand.add(0, Main.COMMANDS[0]);
-        return program.parseArgs(withCommand.toArray(new String[0]));
+        return program.parseArgs(whole.toArray(new String[0]));
     }
 
     /** What picocli has read for a command. */

@@ -7,7 +7,6 @@ import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.SecurityMethod;
 import java.nio.charset.StandardCharsets;
 import java.util.Arrays;
-import java.util.List;
 import java.util.regex.Matcher;
 import java.util.regex.Pattern;
 import picocli.CommandLine.Command;
@@ -36,12 +35,9 @@ final class Verify extends JsonJob {
     /** In place of PIN and IMSI; null to make it of them. */
     private byte[] key;
 
-    @Override
-    List<Option<?>> options() {
-        List<Option<?>> options = super.options();
+    Verify() {
         options.add(SHOW_MAC);
         options.addAll(Choices.SECRETS);
-        return options;
     }
 
     @Override

@@ -39,7 +39,7 @@ final class Visible {
         return mayBe && (Character.isWhitespace(c) || Character.isSpaceChar(c));
     }
 
-    /** The text with letters behind backslashes for some characters, and codes for the invisible. */
+    /** The text with letters behind backslashes for some characters, codes for the invisible. */
     private static String escaped(String text, String special, String letters) {
         int next = 0;
         while (next < text.length() && isPlain(text.charAt(next), special)) {
