@@ -1,6 +1,7 @@
 package com.qvomacp.cli;
 
 import java.util.ArrayList;
+import java.util.Arrays;
 import java.util.HashMap;
 import java.util.List;
 import java.util.Map;
@@ -51,7 +52,7 @@ final class Arguments {
 
     private static Option<?> named(List<Option<?>> options, String name) {
         for (Option<?> option : options) {
-            if (option.isNamed(name)) {
+            if (Arrays.asList(option.names).contains(name)) {
                 return option;
             }
         }

@@ -70,7 +70,8 @@ final class Dump {
             isRepeated = false;
             long end = index + 1 < lines.size() ? new Row(lines.get(index + 1)).offset(radix) : -1;
             boolean isKnown = end > offset && end - offset <= LONGEST_LINE;
-            byte[] read = isKnown ? row.read((int) (end - offset)) : row.readToGap(last.length);
+            int most = last.length == 0 ? LONGEST_LINE : last.length;
+            byte[] read = row.read(isKnown ? (int) (end - offset) : most, !isKnown);
             if (read == null) {
                 return null;
             }
@@ -136,38 +137,27 @@ final class Dump {
             return number(digits, radix);
         }
 
-        /** Reads so many bytes; null when the line has fewer, or goes on with more. */
-        byte[] read(int count) {
+        /**
+         * Reads so many bytes; null when the line has fewer, or goes on with more. The last line
+         * may have fewer, and ends at a bar, a gap or what is no group; but eight bytes may be
+         * followed by a gap of two blanks.
+         */
+        byte[] read(int count, boolean isLast) {
             ByteArrayOutputStream bytes = new ByteArrayOutputStream();
             while (bytes.size() < count) {
-                byte[] group = group();
-                if (group == null) {
-                    return null;
-                }
-                bytes.write(group, 0, group.length);
-            }
-            boolean isLonger = gap() == 1 && group() != null;
-            return isLonger ? null : Arrays.copyOf(bytes.toByteArray(), count);
-        }
-
-        /**
-         * Reads the bytes of the last line: up to a bar, a gap or what is no group, and no more
-         * than the lines before have. Eight bytes may be followed by a gap of two blanks.
-         */
-        byte[] readToGap(int width) {
-            ByteArrayOutputStream bytes = new ByteArrayOutputStream();
-            int most = width == 0 ? LONGEST_LINE : width;
-            while (bytes.size() < most) {
                 int gap = gap();
                 boolean isPair = gap == 2 && groups.group(2).length() == 2;
                 boolean isHalf = isPair && bytes.size() == HALF_LINE;
-                byte[] group = bytes.size() > 0 && gap > 1 && !hasBar && !isHalf ? null : group();
+                boolean isAtGap = bytes.size() > 0 && gap > 1 && !hasBar && !isHalf;
+                byte[] group = isLast && isAtGap ? null : group();
                 if (group == null) {
                     break;
                 }
                 bytes.write(group, 0, group.length);
             }
-            return Arrays.copyOf(bytes.toByteArray(), Math.min(bytes.size(), most));
+            int read = Math.min(bytes.size(), count);
+            boolean isOther = read < count || gap() == 1 && group() != null;
+            return isOther && !isLast ? null : Arrays.copyOf(bytes.toByteArray(), read);
         }
 
         /** How many blanks stand in front of the next group; 0 when there is none. */

@@ -171,15 +171,13 @@ final class Encode extends Job {
 
     @Override
     void end() {
-        if (written.size() == 0) {
-            return;
-        }
-        if (output == null) {
-            console.write(written.toByteArray());
-            return;
-        }
+        byte[] all = written.toByteArray();
         try {
-            Input.write(output, written.toByteArray(), has(FORCE));
+            if (all.length > 0 && output == null) {
+                console.write(all);
+            } else if (all.length > 0) {
+                Input.write(output, all, has(FORCE));
+            }
         } catch (IOException unwritable) {
             fail(Console.FAILED, output, unwritable.getMessage());
         }

@@ -21,35 +21,29 @@ final class Lines {
     /** The lines of a text, none wider than {@code columns}; words longer than that are cut. */
     static List<String> of(String text, int columns) {
         List<String> lines = new ArrayList<>();
-        StringBuilder line = new StringBuilder();
+        String line = "";
         for (String word : text.split(" ", -1)) {
-            int wanted = Visible.columns(word, 0, columns) + (line.length() == 0 ? 0 : 1);
-            if (line.length() > 0 && Visible.columns(line, 0, columns) + wanted > columns) {
-                lines.add(line.toString());
-                line.setLength(0);
+            String longer = line.isEmpty() ? word : line + ' ' + word;
+            if (!line.isEmpty() && end(longer, 0, columns) < longer.length()) {
+                lines.add(line);
+                longer = word;
             }
-            if (line.length() > 0) {
-                line.append(' ');
-            }
-            line.append(word);
             int start = 0;
-            while (Visible.columns(line, start, columns) > columns) {
-                int end = cut(line, start, columns);
-                lines.add(line.substring(start, end));
-                start = end;
+            for (int end; (end = end(longer, start, columns)) < longer.length(); start = end) {
+                lines.add(longer.substring(start, end));
             }
-            line.delete(0, start);
+            line = longer.substring(start);
         }
-        lines.add(line.toString());
+        lines.add(line);
         return lines;
     }
 
-    /** Where a line is cut that is too wide from a place on; behind one character at least. */
-    private static int cut(CharSequence line, int start, int columns) {
+    /** Where a line ends that begins at a place of a text; behind one character at least. */
+    private static int end(String text, int start, int columns) {
         int used = 0;
         int end = start;
-        while (end < line.length()) {
-            int codePoint = Character.codePointAt(line, end);
+        while (end < text.length()) {
+            int codePoint = text.codePointAt(end);
             used += Visible.isWide(codePoint) ? 2 : 1;
             if (used > columns && end > start) {
                 break;

@@ -1,7 +1,5 @@
 package com.qvomacp.cli;
 
-import java.util.Arrays;
-
 /**
  * An option of a command: all that is said of it, for whoever reads command lines, explains or
  * completes them.
@@ -55,10 +53,6 @@ final class Option<T> {
     static <T extends Enum<T>> Option<T> constant(
             String names, String label, T[] constants, String description) {
         return new Option<>(names, label, description, constants, false);
-    }
-
-    boolean isNamed(String name) {
-        return Arrays.asList(names).contains(name);
     }
 
     /** The value that a text stands for; null where it stands for none. */

@@ -95,7 +95,7 @@ final class TextWriter {
         for (Item item : items) {
             if (item instanceof Parameter) {
                 String name = ((Parameter) item).name();
-                int width = name == null ? 0 : Visible.columns(name, 0, WIDEST);
+                int width = name == null ? 0 : Visible.columns(name);
                 column = Math.max(column, width <= WIDEST ? width + Lines.INDENT : 0);
             }
         }

@@ -35,8 +35,7 @@ final class Visible {
     }
 
     private static boolean isBlank(char c) {
-        boolean mayBe = c <= ' ' || c >= 0x7F;
-        return mayBe && (Character.isWhitespace(c) || Character.isSpaceChar(c));
+        return Character.isWhitespace(c) || Character.isSpaceChar(c);
     }
 
     /** The text with letters behind backslashes for some characters, codes for the invisible. */
@@ -73,16 +72,9 @@ final class Visible {
 
     /** The columns that a text takes on a terminal. */
     static int columns(String text) {
-        return columns(text, 0, Integer.MAX_VALUE - 2);
-    }
-
-    /** The columns that a text takes from a place on; counted until they are too many. */
-    static int columns(CharSequence text, int from, int most) {
         int columns = 0;
-        for (int i = from; i < text.length() && columns <= most; ) {
-            int codePoint = Character.codePointAt(text, i);
-            columns += isWide(codePoint) ? 2 : 1;
-            i += Character.charCount(codePoint);
+        for (int i = 0; i < text.length(); i += Character.charCount(text.codePointAt(i))) {
+            columns += isWide(text.codePointAt(i)) ? 2 : 1;
         }
         return columns;
     }
