@@ -99,10 +99,7 @@ final class Diff extends MessageJob {
     }
 
     private void line(char sign, int indent, String text) {
-        StringBuilder line = new StringBuilder("  ").append(sign).append(' ');
-        Listing.pad(line, "", indent);
-        line.append(text);
-        String whole = line.toString();
+        String whole = "  " + sign + ' ' + Lines.blanks(indent) + text;
         console.out.println(sign == '-' ? palette.error(whole) : palette.text(whole));
     }
 

@@ -7,8 +7,6 @@ import java.io.PrintWriter;
  * is escaped in strings.
  */
 final class JsonWriter {
-    private static final String INDENT = "  ";
-
     /** Deeper values are indented no further: the brackets tell how deep they are. */
     private static final int DEEPEST = 12;
 
@@ -153,8 +151,6 @@ final class JsonWriter {
     }
 
     private void indent() {
-        for (int i = Math.min(open.length(), DEEPEST); i > 0; --i) {
-            out.append(INDENT);
-        }
+        out.append(Lines.blanks(Math.min(open.length(), DEEPEST) * Lines.INDENT));
     }
 }

@@ -1,6 +1,7 @@
 package com.qvomacp.cli;
 
 import java.util.ArrayList;
+import java.util.Arrays;
 import java.util.List;
 
 /** Breaks text into lines. */
@@ -12,6 +13,17 @@ final class Lines {
     static final int INDENT = 2;
 
     private Lines() {}
+
+    static String blanks(int count) {
+        char[] blanks = new char[Math.max(count, 0)];
+        Arrays.fill(blanks, ' ');
+        return new String(blanks);
+    }
+
+    /** A text with blanks behind it until it is so wide. */
+    static String padded(String text, int width) {
+        return text + blanks(width - text.length());
+    }
 
     /** A paragraph, all of whose lines but the first are indented; that one begins as is told. */
     static String paragraph(String start, String text) {

@@ -76,8 +76,7 @@ final class Listing implements ByteVisitor {
         boolean isPush = reading.held.isPush;
         String first = hasHeader ? "msg" : isPush ? "at" : "body";
         String titles = listing.offsets(first, hasHeader ? "body" : "");
-        StringBuilder bytes = new StringBuilder();
-        pad(bytes, "bytes", BYTES_WIDTH + 2);
+        String bytes = Lines.padded("bytes", BYTES_WIDTH + 2);
         out.append(palette.bold(titles + bytes + "meaning")).append('\n');
         Verdict verdict = reading.verdict;
         listing.stopReason = "the library refuses: " + verdict.reason();
@@ -181,42 +180,22 @@ final class Listing implements ByteVisitor {
 
     private void line(int from, int to, int indent, String text) {
         boolean hasBytes = from < to;
+        String first = hasBytes ? hexadecimal(start + from, digits) : "";
         boolean hasTwo = hasBytes && isBody && secondWidth > 1;
-        String offsets = offsets(hasBytes ? hexadecimal(start + from, digits) : "",
-                hasTwo ? hexadecimal(from, digits) : "");
-        StringBuilder line = new StringBuilder();
-        pad(line, HexText.digits(message, start + from, start + to, " "), BYTES_WIDTH + 2);
-        if (text.isEmpty()) {
-            line.setLength(Math.max(3 * (to - from) - 1, 0));
-        } else {
-            pad(line, "", indent);
-            line.append(text);
-        }
+        String offsets = offsets(first, hasTwo ? hexadecimal(from, digits) : "");
+        String bytes = HexText.digits(message, start + from, start + to, " ");
+        String line = text.isEmpty() ? bytes : Lines.padded(bytes, BYTES_WIDTH + 2 + indent) + text;
         out.append(palette.dim(offsets)).append(line).append('\n');
     }
 
     /** The columns in front of the bytes. */
     private String offsets(String first, String second) {
-        StringBuilder offsets = new StringBuilder();
-        pad(offsets, first, digits + 1);
-        pad(offsets, second, secondWidth);
-        return offsets.toString();
+        return Lines.padded(first, digits + 1) + Lines.padded(second, secondWidth);
     }
 
-    /** A number with at least so many digits. */
+    /** A number with at least so many digits, up to eight. */
     static String hexadecimal(int number, int atLeast) {
-        StringBuilder text = new StringBuilder(Integer.toHexString(number).toUpperCase());
-        while (text.length() < atLeast) {
-            text.insert(0, '0');
-        }
-        return text.toString();
-    }
-
-    /** Appends a text, and blanks until it is so wide. */
-    static void pad(StringBuilder to, String text, int width) {
-        to.append(text);
-        for (int i = text.length(); i < width; ++i) {
-            to.append(' ');
-        }
+        String text = Integer.toHexString(number).toUpperCase();
+        return "00000000".substring(0, Math.max(atLeast - text.length(), 0)) + text;
     }
 }

@@ -87,7 +87,7 @@ final class Refusal {
         String start = INDENT + INDENT + Listing.hexadecimal(from, 4) + "  ";
         String bytes = HexText.digits(message, from, to, " ");
         out.append(palette.dim(start)).append(bytes).append('\n');
-        Listing.pad(out, "", start.length() + (offset - from) * 3);
+        out.append(Lines.blanks(start.length() + (offset - from) * 3));
         out.append(palette.error("^^")).append('\n');
     }
 }

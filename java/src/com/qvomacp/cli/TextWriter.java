@@ -202,14 +202,8 @@ final class TextWriter {
     }
 
     private void row(int indent, String name, int gap, String shown) {
-        StringBuilder row = new StringBuilder(Lines.WIDTH);
-        Listing.pad(row, "", indent);
-        row.append(name);
-        if (shown != null) {
-            Listing.pad(row, "", gap);
-            row.append(shown);
-        }
-        out.append(row.append('\n'));
+        String value = shown == null ? "" : Lines.blanks(gap) + shown;
+        out.append(Lines.blanks(indent) + name + value + '\n');
     }
 
     private static String shown(String value) {
