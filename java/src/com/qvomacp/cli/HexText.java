@@ -176,17 +176,14 @@ final class HexText {
     }
 
     private static boolean isDigit(String text, int at) {
-        return at < text.length() && text.charAt(at) < 0x80 && digit(text, at) >= 0;
-    }
-
-    private static int digit(String text, int at) {
-        return Character.digit(text.charAt(at), 16);
+        char c = at < text.length() ? text.charAt(at) : 0;
+        return c < 0x80 && Character.digit(c, 16) >= 0;
     }
 
     /** What two digits stand for; -1 where there are none. */
     private static int byteAt(String text, int at) {
         boolean isByte = isDigit(text, at) && isDigit(text, at + 1);
-        return isByte ? digit(text, at) << 4 | digit(text, at + 1) : -1;
+        return isByte ? Integer.parseInt(text.substring(at, at + 2), 16) : -1;
     }
 
     /** A literal of source code, where some bytes are escapes and others stand for themselves. */
@@ -280,7 +277,7 @@ final class HexText {
     static byte[] bytes(String digits) {
         byte[] bytes = new byte[digits.length() / 2];
         for (int i = 0; i < bytes.length; ++i) {
-            bytes[i] = (byte) (digit(digits, 2 * i) << 4 | digit(digits, 2 * i + 1));
+            bytes[i] = (byte) byteAt(digits, 2 * i);
         }
         return bytes;
     }

@@ -56,12 +56,8 @@ final class JsonWriter {
             out.append('\n');
             indent();
         }
-        out.append(bracket);
-        isFirst = false;
-        if (open.length() == 0) {
-            out.append('\n');
-            isFirst = true;
-        }
+        isFirst = open.length() == 0;
+        out.append(bracket).append(isFirst ? "\n" : "");
         return this;
     }
 
@@ -96,6 +92,11 @@ final class JsonWriter {
 
     JsonWriter member(String name, boolean value) {
         return name(name).literal(Boolean.toString(value));
+    }
+
+    /** A member that is left out where it is null. */
+    JsonWriter optional(String name, String value) {
+        return value == null ? this : member(name, value);
     }
 
     /** A place, or null where it is negative. */

@@ -9,7 +9,6 @@ import com.qvomacp.eng.omacp.Parameter;
 import com.qvomacp.eng.omacp.ProvisioningDocument;
 import com.qvomacp.eng.omacp.PushHeader;
 import com.qvomacp.eng.omacp.Verdict;
-import com.qvomacp.eng.omacp.Writing;
 import java.util.List;
 import java.util.Locale;
 
@@ -43,9 +42,7 @@ final class MessageJson {
         }
         json.end();
         verdict(reading.verdict, reading.document);
-        if (reading.failure != null) {
-            json.member("error", reading.failure.getMessage());
-        }
+        json.optional("error", reading.failure == null ? null : reading.failure.getMessage());
     }
 
     void header(PushHeader header, int bodyLength) {
@@ -125,41 +122,34 @@ final class MessageJson {
         if (item instanceof Characteristic) {
             Characteristic characteristic = (Characteristic) item;
             json.member("type", characteristic.type());
-            writing("typeWriting", characteristic.typeWriting());
+            json.optional("typeWriting", lowerCase(characteristic.typeWriting()));
         } else if (item instanceof Parameter) {
             Parameter parameter = (Parameter) item;
             json.member("name", parameter.name()).member("value", parameter.value());
-            writing("nameWriting", parameter.nameWriting());
-            writing("valueWriting", parameter.valueWriting());
+            json.optional("nameWriting", lowerCase(parameter.nameWriting()));
+            json.optional("valueWriting", lowerCase(parameter.valueWriting()));
         } else {
             Other other = (Other) item;
             json.member("other", lowerCase(other.kind()));
             json.member("name", other.name()).member("text", other.text());
-            writing("textWriting", other.textWriting());
+            json.optional("textWriting", lowerCase(other.textWriting()));
         }
         place(item);
-    }
-
-    private void writing(String member, Writing writing) {
-        if (writing != null) {
-            json.member(member, lowerCase(writing));
-        }
     }
 
     private void place(Item item) {
         json.member("offset", item.offset()).member("length", item.length());
     }
 
-    /** A constant as it is told. */
+    /** A constant as it is told; null for null. */
     static String lowerCase(Enum<?> constant) {
-        return constant.name().toLowerCase(Locale.ROOT).replace('_', '-');
+        return constant == null ? null : constant.name().toLowerCase(Locale.ROOT).replace('_', '-');
     }
 
     private void verdict(Verdict verdict, ProvisioningDocument document) {
         json.name("verdict").beginObject().member("accepted", verdict.isAccepted());
-        if (!verdict.isAccepted()) {
-            json.member("part", verdict.isHeaderRefused() ? "header" : "body");
-        }
+        String part = verdict.isHeaderRefused() ? "header" : "body";
+        json.optional("part", verdict.isAccepted() ? null : part);
         json.member("code", verdict.code()).member("codeName", verdict.codeName());
         json.member("bytesRead", verdict.bytesRead());
         json.place("offset", verdict.offset()).member("path", verdict.path());

@@ -59,7 +59,8 @@ final class Reading {
     /** The exit status that the message stands for. */
     int status() {
         Reason reason = failure == null ? null : failure.reason();
-        boolean isTooLong = reason == Reason.INPUT_TOO_LONG || reason == Reason.TEXT_TOO_LONG;
+        boolean isTooLong = reason != null
+                && (reason == Reason.INPUT_TOO_LONG || reason == Reason.TEXT_TOO_LONG);
         return isTooLong ? Console.FAILED : isAccepted() ? Console.DONE : Console.REFUSED;
     }
 }

@@ -128,12 +128,7 @@ final class Verify extends JsonJob {
             beginObject(held.name);
             writer.member("verified", reason == null).member("result", result.name());
             writer.member("method", method.name());
-            if (reason != null) {
-                writer.member("reason", reason);
-            }
-            if (computed != null) {
-                writer.member("computedMac", computed);
-            }
+            writer.optional("reason", reason).optional("computedMac", computed);
             endObject();
             return;
         }
