@@ -35,8 +35,10 @@ final class Dump {
     static Dump at(List<String> lines, int first, Repeats repeats) {
         Dump cells = CellDump.at(lines, first);
         boolean areRead = cells != null && cells.bytes != null;
-        Row row = new Row(lines.get(first));
-        if (areRead || row.offset(16) != 0 || row.digits.length() < 4) {
+        String line = lines.get(first).trim();
+        boolean hasPrefix = line.startsWith("0x") || line.startsWith("0X");
+        boolean isFirst = line.startsWith("0000", hasPrefix ? 2 : 0);
+        if (areRead || !isFirst || new Row(line).offset(16) != 0) {
             return cells;
         }
         for (int radix : RADIXES) {
@@ -109,11 +111,11 @@ final class Dump {
 
     /** A line of a dump: an offset, and groups of digits. */
     private static final class Row {
-        private static final String END = "(?=\\p{javaWhitespace}|\\z)";
+        private static final String END = "(?!\\S)";
         private static final Pattern OFFSET =
                 Pattern.compile("(?:0[xX])?([0-9a-fA-F]{1,12})(:?)" + END);
         private static final Pattern GROUP =
-                Pattern.compile("(\\p{javaWhitespace}*)([0-9a-fA-F]+)" + END);
+                Pattern.compile("(\\s*)([0-9a-fA-F]+)" + END);
 
         /** The digits of the offset; empty when the line does not begin with one. */
         final String digits;

@@ -7,6 +7,7 @@ import java.util.ArrayList;
 import java.util.Arrays;
 import java.util.Base64;
 import java.util.List;
+import java.util.Locale;
 import java.util.regex.Matcher;
 import java.util.regex.Pattern;
 
@@ -17,15 +18,6 @@ import java.util.regex.Pattern;
 final class HexText {
     /** Digits on one line, or all the bytes of a dump or of a gateway's form. */
     static final class Piece {
-        // Here they are not compiled before there is a text.
-        static final Pattern OF_MODEM = Pattern.compile("(?is)\\+C.*|AT.*|OK");
-
-        /** A label all of whose letters are digits, and no byte. */
-        static final Pattern WORD = Pattern.compile("(?s)\\p{javaLetterOrDigit}{3,}:.+");
-
-        /** Digits without a prefix. */
-        static final Pattern GROUP = Pattern.compile("(?<![\\p{XDigit}xX])\\p{XDigit}++(?![xX])");
-
         /** Counted from 1. */
         final int line;
 
@@ -110,8 +102,9 @@ final class HexText {
     }
 
     private static Piece piece(String line, int number) {
-        // Whatever else a modem or its user says about messages is none of them.
-        if (line.isEmpty() || Piece.OF_MODEM.matcher(line).matches()) {
+        // What a modem or its user says about messages is none of them.
+        String upper = line.toUpperCase(Locale.ROOT);
+        if (line.isEmpty() || upper.startsWith("+C") || upper.startsWith("AT") || upper.equals("OK")) {
             return null;
         }
         Piece form = gatewayForm(line, number);
@@ -139,9 +132,11 @@ final class HexText {
         while (isInWord && from < line.length() && Character.isLetterOrDigit(line.charAt(from))) {
             ++from;
         }
-        if (!hasLabel && Piece.WORD.matcher(line).matches()) {
+        int colon = line.indexOf(':');
+        // A word of such letters, and no byte.
+        if (!hasLabel && colon > 2 && line.matches("(?s)\\p{javaLetterOrDigit}+:.+")) {
             hasLabel = true;
-            from = line.indexOf(':') + 1;
+            from = colon + 1;
         }
         String digits = digitsOf(line.substring(from));
         int fewest = hasLabel ? FEWEST_BEHIND_LABEL : 1;
@@ -150,12 +145,19 @@ final class HexText {
 
     /** Whether a line ends with groups of odd numbers of digits, as no bytes do. */
     private static boolean areNumbers(String line) {
-        Matcher groups = Piece.GROUP.matcher(line.substring(tail(line)));
         int odd = 0;
-        while (groups.find()) {
-            odd += (groups.end() - groups.start()) % 2;
+        int digits = 0;
+        for (int at = line.length() - 1, from = tail(line); at >= from; --at) {
+            digits = isDigit(line, at) ? digits + 1 : 0;
+            boolean isBegin = digits > 0 && (at == 0 || !isDigit(line, at - 1));
+            boolean hasPrefix = isX(line, at - 1) || isX(line, at + digits);
+            odd += isBegin && digits % 2 != 0 && !hasPrefix ? 1 : 0;
         }
         return odd > 2;
+    }
+
+    private static boolean isX(String line, int at) {
+        return at >= 0 && at < line.length() && (line.charAt(at) | 0x20) == 'x';
     }
 
     /** Where the digits begin that a line ends with, and what may stand around them. */
@@ -170,9 +172,19 @@ final class HexText {
 
     /** The digits without what may stand around them; null for an x that is no prefix. */
     private static String digitsOf(String text) {
-        String padded = text.replaceAll("0[xX](?=\\p{XDigit}(?!\\p{XDigit}))", "0");
-        String digits = padded.replaceAll("0[xX]|[^\\p{XDigit}xX]", "");
-        return digits.indexOf('x') < 0 && digits.indexOf('X') < 0 ? digits : null;
+        StringBuilder digits = new StringBuilder(text.length());
+        for (int i = 0; i < text.length(); ++i) {
+            boolean isX = isX(text, i);
+            if (isDigit(text, i)) {
+                digits.append(text.charAt(i));
+            } else if (isX && (i == 0 || text.charAt(i - 1) != '0')) {
+                return null;
+            } else if (isX && (!isDigit(text, i + 1) || isDigit(text, i + 2))) {
+                // The zero of a prefix; in front of a single digit it stays.
+                digits.setLength(digits.length() - 1);
+            }
+        }
+        return digits.toString();
     }
 
     private static boolean isDigit(String text, int at) {
@@ -231,9 +243,12 @@ final class HexText {
 
     /** A member of a form; null when the line has none of that name. */
     private static byte[] member(String line, String name) {
+        if (line.indexOf('=') < 0) {
+            return null;
+        }
         String member = "(?i)(?<!\\p{javaLetterOrDigit})" + name + "=([^&\"' \t]*)";
         Matcher found = Pattern.compile(member).matcher(line);
-        if (line.indexOf('=') < 0 || !found.find()) {
+        if (!found.find()) {
             return null;
         }
         String value = found.group(1);
@@ -261,8 +276,8 @@ final class HexText {
      * for what is nothing but hexadecimal digits.
      */
     static byte[] base64(String text) {
-        String letters = text.replaceAll("\\p{javaWhitespace}+", "");
-        if (letters.matches("\\p{XDigit}*")) {
+        String letters = text.replaceAll("\\s+", "");
+        if (letters.matches("[0-9a-fA-F]*")) {
             return null;
         }
         try {
