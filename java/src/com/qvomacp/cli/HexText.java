@@ -104,7 +104,8 @@ final class HexText {
     private static Piece piece(String line, int number) {
         // What a modem or its user says about messages is none of them.
         String upper = line.toUpperCase(Locale.ROOT);
-        if (line.isEmpty() || upper.startsWith("+C") || upper.startsWith("AT") || upper.equals("OK")) {
+        boolean isOfModem = upper.startsWith("+C") || upper.startsWith("AT");
+        if (line.isEmpty() || isOfModem || upper.equals("OK")) {
             return null;
         }
         Piece form = gatewayForm(line, number);

@@ -41,16 +41,19 @@ final class Place {
             }
         }
         List<String> names = new ArrayList<>();
-        lines.forEach((input, known) -> {
+        for (Map.Entry<String, Set<Integer>> entry : lines.entrySet()) {
+            Set<Integer> known = entry.getValue();
             String which = known.size() == 1 ? ", line " : ", lines ";
-            names.add(known.isEmpty() ? input : input + which + listed(known));
-        });
+            names.add(entry.getKey() + (known.isEmpty() ? "" : which + listed(known)));
+        }
         return String.join(" + ", names);
     }
 
     /** Numbers with commas and a word between the last two. */
     static String listed(Collection<Integer> numbers) {
         String text = numbers.toString();
-        return text.substring(1, text.length() - 1).replaceFirst(", (\\d+)$", " and $1");
+        String all = text.substring(1, text.length() - 1);
+        int last = all.lastIndexOf(", ");
+        return last < 0 ? all : all.substring(0, last) + " and " + all.substring(last + 2);
     }
 }
