@@ -3,8 +3,6 @@ package com.qvomacp.cli;
 import java.io.ByteArrayOutputStream;
 import java.util.Arrays;
 import java.util.List;
-import java.util.regex.Matcher;
-import java.util.regex.Pattern;
 
 /**
  * Reads a dump with a column of offsets, as hexdump, xxd, od and others print it. The offsets say
@@ -14,6 +12,8 @@ final class Dump {
     static final int[] RADIXES = {16, 8, 10};
     static final int LONGEST_LINE = 256;
     private static final int HALF_LINE = 8;
+    private static final int SHORTEST_OFFSET = 4;
+    private static final int LONGEST_OFFSET = 12;
 
     /** How many digits od and hexdump write for a byte and for a word of two, in octal. */
     private static final int OCTAL_BYTE = 3;
@@ -35,10 +35,8 @@ final class Dump {
     static Dump at(List<String> lines, int first, Repeats repeats) {
         Dump cells = CellDump.at(lines, first);
         boolean areRead = cells != null && cells.bytes != null;
-        String line = lines.get(first).trim();
-        boolean hasPrefix = line.startsWith("0x") || line.startsWith("0X");
-        boolean isFirst = line.startsWith("0000", hasPrefix ? 2 : 0);
-        if (areRead || !isFirst || new Row(line).offset(16) != 0) {
+        Row row = new Row(lines.get(first));
+        if (areRead || row.offset(16) != 0 || row.offsetEnd - row.offsetAt < SHORTEST_OFFSET) {
             return cells;
         }
         for (int radix : RADIXES) {
@@ -111,32 +109,38 @@ final class Dump {
 
     /** A line of a dump: an offset, and groups of digits. */
     private static final class Row {
-        private static final String END = "(?!\\S)";
-        private static final Pattern OFFSET =
-                Pattern.compile("(?:0[xX])?([0-9a-fA-F]{1,12})(:?)" + END);
-        private static final Pattern GROUP =
-                Pattern.compile("(\\s*)([0-9a-fA-F]+)" + END);
-
-        /** The digits of the offset; empty when the line does not begin with one. */
-        final String digits;
-
+        private final String line;
+        private final int offsetAt;
+        private final int offsetEnd;
         private final boolean hasColon;
-        private final boolean hasBar;
-        private final Matcher groups;
+
+        /** Up to where the line has been read. */
+        private int at;
 
         Row(String text) {
-            String line = text.trim();
-            Matcher offset = OFFSET.matcher(line);
-            boolean isRow = offset.lookingAt();
-            digits = isRow ? offset.group(1) : "";
-            hasColon = isRow && !offset.group(2).isEmpty();
-            hasBar = line.indexOf('|') >= 0;
-            groups = GROUP.matcher(line).region(isRow ? offset.end() : 0, line.length());
+            line = text.trim();
+            offsetAt = line.startsWith("0x") || line.startsWith("0X") ? 2 : 0;
+            offsetEnd = endOfDigits(offsetAt);
+            hasColon = line.startsWith(":", offsetEnd);
+            at = offsetEnd + (hasColon ? 1 : 0);
+        }
+
+        private int endOfDigits(int from) {
+            int end = from;
+            while (end < line.length() && Character.digit(line.charAt(end), 16) >= 0) {
+                ++end;
+            }
+            return end;
+        }
+
+        private boolean isAlone(int end) {
+            return end == line.length() || Character.isWhitespace(line.charAt(end));
         }
 
         /** The offset; -1 when the line does not begin with one. */
         long offset(int radix) {
-            return number(digits, radix);
+            boolean isOffset = isAlone(at) && offsetEnd - offsetAt <= LONGEST_OFFSET;
+            return isOffset ? number(line.substring(offsetAt, offsetEnd), radix) : -1;
         }
 
         /**
@@ -146,9 +150,10 @@ final class Dump {
          */
         byte[] read(int count, boolean isLast) {
             ByteArrayOutputStream bytes = new ByteArrayOutputStream();
+            boolean hasBar = line.indexOf('|') >= 0;
             while (bytes.size() < count) {
                 int gap = gap();
-                boolean isPair = gap == 2 && groups.group(2).length() == 2;
+                boolean isPair = gap == 2 && endOfDigits(at + gap) == at + gap + 2;
                 boolean isHalf = isPair && bytes.size() == HALF_LINE;
                 boolean isAtGap = bytes.size() > 0 && gap > 1 && !hasBar && !isHalf;
                 byte[] group = isLast && isAtGap ? null : group();
@@ -162,18 +167,24 @@ final class Dump {
             return isOther && !isLast ? null : Arrays.copyOf(bytes.toByteArray(), read);
         }
 
-        /** How many blanks stand in front of the next group; 0 when there is none. */
+        /** How many blanks stand in front of what comes next. */
         private int gap() {
-            return groups.lookingAt() ? groups.end(1) - groups.start() : 0;
+            int blank = at;
+            while (blank < line.length() && Character.isWhitespace(line.charAt(blank))) {
+                ++blank;
+            }
+            return blank - at;
         }
 
         /** The bytes of the next group of digits; null when there is none. */
         private byte[] group() {
-            byte[] bytes = groups.lookingAt() ? bytes(groups.group(2)) : null;
+            int from = at + gap();
+            int end = endOfDigits(from);
+            byte[] bytes = isAlone(end) ? bytes(line.substring(from, end)) : null;
             if (bytes == null) {
                 return null;
             }
-            groups.region(groups.end(), groups.regionEnd());
+            at = end;
             // Words without a colon behind the offset are numbers, of a machine with its low byte
             // first.
             for (int low = 0, high = bytes.length - 1; !hasColon && low < high; ++low, --high) {
@@ -188,7 +199,7 @@ final class Dump {
         private byte[] bytes(String group) {
             boolean isWord = group.length() == OCTAL_WORD && !hasColon;
             if (group.length() != OCTAL_BYTE && !isWord) {
-                return group.length() % 2 != 0 ? null : HexText.bytes(group);
+                return group.isEmpty() || group.length() % 2 != 0 ? null : HexText.bytes(group);
             }
             int value = (int) number(group, 8);
             byte[] word = {(byte) (value >> 8), (byte) value};

@@ -277,12 +277,20 @@ final class HexText {
      * for what is nothing but hexadecimal digits.
      */
     static byte[] base64(String text) {
-        String letters = text.replaceAll("\\s+", "");
-        if (letters.matches("[0-9a-fA-F]*")) {
+        StringBuilder letters = new StringBuilder(text.length());
+        boolean areDigits = true;
+        for (int i = 0; i < text.length(); ++i) {
+            char c = text.charAt(i);
+            if (!Character.isWhitespace(c)) {
+                areDigits &= isDigit(text, i);
+                letters.append(c == '-' ? '+' : c == '_' ? '/' : c);
+            }
+        }
+        if (areDigits) {
             return null;
         }
         try {
-            byte[] bytes = Base64.getDecoder().decode(letters.replace('-', '+').replace('_', '/'));
+            byte[] bytes = Base64.getDecoder().decode(letters.toString());
             return bytes.length == 0 ? null : bytes;
         } catch (IllegalArgumentException other) {
             return null;
