@@ -13,7 +13,7 @@ import java.util.Map;
  * Writes a document as a body: the Binary XML Content Format (WAP-192-WBXML), version 1.3, with the
  * tokens of OMA provisioning content (OMA-WAP-TS-ProvCont).
  */
-final class BodyWriter extends DocumentSource.Steps {
+final class BodyWriter extends DocumentTaker {
     private static final int SWITCH_PAGE = 0x00;
     private static final int END = 0x01;
     private static final int STR_I = 0x03;
@@ -43,42 +43,46 @@ final class BodyWriter extends DocumentSource.Steps {
 
     private final ByteArrayOutputStream table = new ByteArrayOutputStream();
     private final ByteArrayOutputStream out = new ByteArrayOutputStream();
+    private final String version;
     private final WritingTokens tokens;
     private final CharsetEncoder encoder;
     private final int terminatorLength;
 
     private int page;
 
-    private BodyWriter(WritingTokens tokens, CharacterSet charset) {
+    private BodyWriter(Item root, String version, WritingTokens tokens, CharacterSet charset) {
+        super(root);
+        this.version = version;
         this.tokens = tokens;
         this.encoder = charset.newEncoder();
         this.terminatorLength = charset.unit();
     }
 
-    static byte[] write(DocumentSource source, EncodeOptions options) throws EncodingException {
+    static byte[] write(Item root, String version, EncodeOptions options)
+            throws EncodingException {
         String name = options.value(EncodeOption.CHARSET);
         int charset = CharacterSet.number(name);
         if (charset == CharacterSet.NOT_STATED) {
             throw EncodingException.in(null, "the character set " + name + " is not known");
         }
         WritingTokens tokens = new WritingTokens(options.value(EncodeOption.TOKENS));
-        return new BodyWriter(tokens, CharacterSet.of(charset)).body(source, options, charset);
+        BodyWriter writer = new BodyWriter(root, version, tokens, CharacterSet.of(charset));
+        return writer.body(options, charset);
     }
 
-    private byte[] body(DocumentSource source, EncodeOptions options, int charset)
-            throws EncodingException {
+    private byte[] body(EncodeOptions options, int charset) throws EncodingException {
         boolean typeAsText = options.is(EncodeOption.IDENTIFIER, "table");
         if (typeAsText) {
             place(PROV_1_0_TEXT);
         }
-        document(source);
+        document();
         if (options.is(EncodeOption.STRINGS, "table")) {
             for (Map.Entry<String, Integer> text : counts.entrySet()) {
                 if (text.getValue() > 1) {
                     place(text.getKey());
                 }
             }
-            document(source);
+            document();
         }
         ByteArrayOutputStream body = new ByteArrayOutputStream();
         body.write(WBXML_1_3);
@@ -101,19 +105,19 @@ final class BodyWriter extends DocumentSource.Steps {
         string(text, table);
     }
 
-    private void document(DocumentSource source) throws EncodingException {
+    private void document() throws EncodingException {
         out.reset();
         page = 0;
-        out.write(source.version == null ? DOCUMENT : DOCUMENT | ATTRIBUTES);
-        if ("1.0".equals(source.version)) {
+        out.write(version == null ? DOCUMENT : DOCUMENT | ATTRIBUTES);
+        if ("1.0".equals(version)) {
             out.write(VERSION_1_0);
             out.write(END);
-        } else if (source.version != null) {
+        } else if (version != null) {
             out.write(VERSION);
-            text(source.version);
+            text(version);
             out.write(END);
         }
-        source.take(this);
+        take();
         out.write(END);
     }
 
@@ -187,14 +191,13 @@ final class BodyWriter extends DocumentSource.Steps {
     /** Writes a text in the character set of the document, with its terminator. */
     private void string(String text, ByteArrayOutputStream to) throws EncodingException {
         if (text.indexOf(0) >= 0) {
-            throw EncodingException.in(path(), "a text with a NUL has no inline form");
+            throw error("a text with a NUL has no inline form");
         }
         try {
             ByteBuffer bytes = encoder.encode(CharBuffer.wrap(text));
             to.write(bytes.array(), bytes.arrayOffset(), bytes.limit());
         } catch (CharacterCodingException e) {
-            throw EncodingException.in(
-                    path(), "a text cannot be written in " + encoder.charset().name());
+            throw error("a text cannot be written in " + encoder.charset().name());
         }
         for (int i = 0; i < terminatorLength; ++i) {
             to.write(0);

@@ -89,7 +89,7 @@ final class WritingTokens {
             return value;
         }
         String rest = value;
-        if (name.equals(JOINED) && (!library || type.equals(JOINING))) {
+        if (name.equals(JOINED) && (!library || JOINING.equals(type))) {
             ByteArrayOutputStream first = new ByteArrayOutputStream();
             int comma = rest.indexOf(',');
             while (comma >= 0 && writePiece(row, page, rest.substring(0, comma), first)) {
