@@ -1,7 +1,5 @@
 package com.qvomacp.eng.omacp;
 
-import java.util.Locale;
-
 /** The options with which a message that was read could have been encoded. */
 final class MessageOptions {
     private static final int FIRST_TEXT = 0x20;
@@ -36,7 +34,7 @@ final class MessageOptions {
         SecurityMethod method = header.securityMethod();
         boolean isSecured = method != SecurityMethod.NONE && method != SecurityMethod.UNKNOWN;
         if (isSecured) {
-            set(EncodeOption.SEC, method.name().toLowerCase(Locale.ROOT));
+            set(EncodeOption.SEC, Printable.nameOf(method));
         }
         for (HeaderField parameter : type.parameters()) {
             security(parameter, header);

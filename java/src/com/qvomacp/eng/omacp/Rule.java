@@ -1,7 +1,5 @@
 package com.qvomacp.eng.omacp;
 
-import java.util.Locale;
-
 /**
  * What is looked for in a message, beyond whether it can be read: {@link ProvisioningMessage#lint}.
  *
@@ -107,7 +105,7 @@ public enum Rule {
 
     /** {@return the name for people and programs, such as {@code napid-missing}} */
     public String ruleName() {
-        return name().toLowerCase(Locale.ROOT).replace('_', '-');
+        return Printable.nameOf(this);
     }
 
     /** {@return how much its findings weigh: the severity} */
