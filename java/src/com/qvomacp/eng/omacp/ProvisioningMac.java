@@ -60,7 +60,7 @@ public final class ProvisioningMac {
         missing = missing != null ? missing : unusable(method, pin, imsi);
         return missing != null
                 ? missing
-                : compare(compute(method, body, pin, imsi), isTold ? secondHalf(pin) : mac);
+                : compare(compute(method, body, pin, imsi), isTold ? pin.substring(pin.length() / 2) : mac);
     }
 
     /**
@@ -98,7 +98,7 @@ public final class ProvisioningMac {
             return null;
         }
         if (method == SecurityMethod.USERPINMAC) {
-            return told(firstHalf(pin), body);
+            return told(pin.substring(0, pin.length() / 2), body);
         }
         byte[] network = isOfNetwork(method) ? imsiKey(imsi) : new byte[0];
         byte[] user = method == SecurityMethod.NETWPIN ? new byte[0] : utf8(pin);
@@ -171,19 +171,10 @@ public final class ProvisioningMac {
         return isGood;
     }
 
-    private static String firstHalf(String pin) {
-        return pin.substring(0, pin.length() / 2);
-    }
-
-    private static String secondHalf(String pin) {
-        return pin.substring(pin.length() / 2);
-    }
-
     private static MacResult compare(String computed, String stated) {
         byte[] capitals = utf8(stated.toUpperCase(Locale.ROOT));
-        return MessageDigest.isEqual(utf8(computed), capitals)
-                ? MacResult.RIGHT
-                : MacResult.WRONG;
+        boolean isRight = MessageDigest.isEqual(utf8(computed), capitals);
+        return isRight ? MacResult.RIGHT : MacResult.WRONG;
     }
 
     /** The MAC as digits, as many as the key has. */

@@ -9,6 +9,8 @@ final class XmlWriter extends DocumentTaker {
             "<!DOCTYPE wap-provisioningdoc PUBLIC \"-//WAPFORUM//DTD PROV 1.0//EN\""
                     + " \"http://www.wapforum.org/DTD/prov.dtd\">\n";
 
+    private static final String MARKUP = "<&\"";
+    private static final String[] ENTITIES = {"&lt;", "&amp;", "&quot;"};
     private static final int DEEPEST_SHOWN = 20;
 
     private final StringBuilder out = new StringBuilder();
@@ -91,22 +93,13 @@ final class XmlWriter extends DocumentTaker {
     }
 
     private void character(int c) {
-        switch (c) {
-            case '<':
-                out.append("&lt;");
-                break;
-            case '&':
-                out.append("&amp;");
-                break;
-            case '"':
-                out.append("&quot;");
-                break;
-            default:
-                if (Printable.isShown(c)) {
-                    out.appendCodePoint(c);
-                } else {
-                    out.append("&#").append(c).append(';');
-                }
+        int markup = MARKUP.indexOf(c);
+        if (markup >= 0) {
+            out.append(ENTITIES[markup]);
+        } else if (Printable.isShown(c)) {
+            out.appendCodePoint(c);
+        } else {
+            out.append("&#").append(c).append(';');
         }
     }
 

@@ -4,9 +4,6 @@ package com.qvomacp.eng.parser;
  * The APPLICATION characteristics of the message, with their TO-PROXY, TO-NAPID, ADDR, APPADDR,
  * APPAUTH, RESOURCE and ROAMING below them.
  *
- * <p>Parameter names used here: {@code application} counts the APPLICATION of the message, the
- * others count within the characteristic before them. All count from 1.
- *
  * <pre>{@code
  * XCPCtxApplication applications = new XCPCtxApplication();
  * for (int a = 1; a <= applications.qvomacp_GetPxApplicationCount(); ++a) {
