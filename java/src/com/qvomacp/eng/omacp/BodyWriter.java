@@ -14,11 +14,6 @@ import java.util.Map;
  * tokens of OMA provisioning content (OMA-WAP-TS-ProvCont).
  */
 final class BodyWriter extends DocumentTaker {
-    private static final int SWITCH_PAGE = 0x00;
-    private static final int END = 0x01;
-    private static final int STR_I = 0x03;
-    private static final int STR_T = 0x83;
-
     private static final int ATTRIBUTES = 0x80;
     private static final int CONTENT = 0x40;
     private static final int DOCUMENT = 0x05 | CONTENT;
@@ -111,14 +106,14 @@ final class BodyWriter extends DocumentTaker {
         out.write(version == null ? DOCUMENT : DOCUMENT | ATTRIBUTES);
         if ("1.0".equals(version)) {
             out.write(VERSION_1_0);
-            out.write(END);
+            out.write(BodyReader.END);
         } else if (version != null) {
             out.write(VERSION);
             text(version);
-            out.write(END);
+            out.write(BodyReader.END);
         }
         take();
-        out.write(END);
+        out.write(BodyReader.END);
     }
 
     /** One without children is written as one with content, too. */
@@ -127,7 +122,7 @@ final class BodyWriter extends DocumentTaker {
         out.write(type == null ? CHARACTERISTIC ^ ATTRIBUTES : CHARACTERISTIC);
         if (type != null) {
             start(tokens.type(type, page), TYPE, type);
-            out.write(END);
+            out.write(BodyReader.END);
         }
     }
 
@@ -148,12 +143,12 @@ final class BodyWriter extends DocumentTaker {
                 text(rest);
             }
         }
-        out.write(END);
+        out.write(BodyReader.END);
     }
 
     @Override
     void end() {
-        out.write(END);
+        out.write(BodyReader.END);
     }
 
     /**
@@ -169,7 +164,7 @@ final class BodyWriter extends DocumentTaker {
         }
         if (token >> 8 != page) {
             page = token >> 8;
-            out.write(SWITCH_PAGE);
+            out.write(BodyReader.SWITCH_PAGE);
             out.write(page);
         }
         out.write(token & 0xFF);
@@ -180,10 +175,10 @@ final class BodyWriter extends DocumentTaker {
         counts.put(text, count == null ? 1 : count + 1);
         Integer place = places.get(text);
         if (place == null) {
-            out.write(STR_I);
+            out.write(BodyReader.STR_I);
             string(text, out);
         } else {
-            out.write(STR_T);
+            out.write(BodyReader.STR_T);
             integer(place, out);
         }
     }

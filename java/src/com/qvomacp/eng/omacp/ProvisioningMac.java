@@ -58,9 +58,11 @@ public final class ProvisioningMac {
         boolean isTold = method == SecurityMethod.USERPINMAC;
         MacResult missing = isTold ? null : missing(method, mac);
         missing = missing != null ? missing : unusable(method, pin, imsi);
-        return missing != null
-                ? missing
-                : compare(compute(method, body, pin, imsi), isTold ? pin.substring(pin.length() / 2) : mac);
+        if (missing != null) {
+            return missing;
+        }
+        String stated = isTold ? pin.substring(pin.length() / 2) : mac;
+        return compare(compute(method, body, pin, imsi), stated);
     }
 
     /**
