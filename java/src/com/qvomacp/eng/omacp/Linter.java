@@ -174,9 +174,7 @@ final class Linter {
     private void characteristic(Characteristic characteristic) {
         String type = characteristic.type();
         boolean isForeign = foreign.contains(characteristic.parent());
-        if (type == null) {
-            add(Rule.TYPE_MISSING, characteristic, "the characteristic has no TYPE", null);
-        } else if (!isForeign) {
+        if (type != null && !isForeign) {
             type = meant(characteristic, "TYPE", type, TYPES);
         }
         if (isForeign || type != null && !TYPES.containsKey(upper(type)) || "VENDORCONFIG".equals(type)) {
@@ -269,11 +267,7 @@ final class Linter {
 
     private void parameter(Parameter parameter, List<Parameter> references) {
         String name = parameter.name();
-        if (name == null) {
-            add(Rule.NAME_MISSING, parameter, "the parm has no NAME", null);
-            return;
-        }
-        if (foreign.contains(parameter.parent())) {
+        if (name == null || foreign.contains(parameter.parent())) {
             return;
         }
         name = meant(parameter, "NAME", name, NAMES);
@@ -332,8 +326,11 @@ final class Linter {
 
     private void deviations(List<Deviation> deviations) {
         for (Deviation deviation : deviations) {
-            // The walk tells of those two.
-            if (deviation.kind() != Kind.NAME_MISSING && deviation.kind() != Kind.TYPE_MISSING) {
+            boolean isName = deviation.kind() == Kind.NAME_MISSING;
+            if (isName || deviation.kind() == Kind.TYPE_MISSING) {
+                Rule rule = isName ? Rule.NAME_MISSING : Rule.TYPE_MISSING;
+                add(rule, deviation.item(), deviation.sentence(), null);
+            } else {
                 findings.add(Finding.of(Rule.FORMAT, deviation.item(), deviation.offset(),
                         deviation.sentence(), null));
             }
