@@ -41,7 +41,7 @@ final class BodyWriter extends DocumentTaker {
     private final String version;
     private final WritingTokens tokens;
     private final CharsetEncoder encoder;
-    private final int terminatorLength;
+    private final byte[] terminator;
 
     private int page;
 
@@ -50,7 +50,7 @@ final class BodyWriter extends DocumentTaker {
         this.version = version;
         this.tokens = tokens;
         this.encoder = charset.newEncoder();
-        this.terminatorLength = charset.unit();
+        this.terminator = new byte[charset.unit()];
     }
 
     static byte[] write(Item root, String version, EncodeOptions options)
@@ -89,8 +89,8 @@ final class BodyWriter extends DocumentTaker {
         }
         integer(charset, body);
         integer(table.size(), body);
-        append(table, body);
-        append(out, body);
+        body.write(table.toByteArray(), 0, table.size());
+        body.write(out.toByteArray(), 0, out.size());
         return body.toByteArray();
     }
 
@@ -104,12 +104,8 @@ final class BodyWriter extends DocumentTaker {
         out.reset();
         page = 0;
         out.write(version == null ? DOCUMENT : DOCUMENT | ATTRIBUTES);
-        if ("1.0".equals(version)) {
-            out.write(VERSION_1_0);
-            out.write(BodyReader.END);
-        } else if (version != null) {
-            out.write(VERSION);
-            text(version);
+        if (version != null) {
+            start("1.0".equals(version) ? VERSION_1_0 : WritingTokens.NONE, VERSION, version);
             out.write(BodyReader.END);
         }
         take();
@@ -194,9 +190,7 @@ final class BodyWriter extends DocumentTaker {
         } catch (CharacterCodingException e) {
             throw error("a text cannot be written in " + encoder.charset().name());
         }
-        for (int i = 0; i < terminatorLength; ++i) {
-            to.write(0);
-        }
+        to.write(terminator, 0, terminator.length);
     }
 
     /** Writes a multi-byte integer. */
@@ -207,9 +201,5 @@ final class BodyWriter extends DocumentTaker {
             }
         }
         to.write(number & 0x7F);
-    }
-
-    private static void append(ByteArrayOutputStream bytes, ByteArrayOutputStream to) {
-        to.write(bytes.toByteArray(), 0, bytes.size());
     }
 }
