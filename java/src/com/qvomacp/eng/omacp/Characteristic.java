@@ -89,9 +89,12 @@ public final class Characteristic extends Item {
      */
     public List<String> values(String name) {
         List<String> values = new ArrayList<>();
-        for (Parameter parameter : children(Parameter.class, Objects.requireNonNull(name))) {
-            if (parameter.value() != null) {
-                values.add(parameter.value());
+        for (Item child : inside()) {
+            if (child instanceof Parameter && name.equals(((Parameter) child).name())) {
+                String value = ((Parameter) child).value();
+                if (value != null) {
+                    values.add(value);
+                }
             }
         }
         return Collections.unmodifiableList(values);

@@ -2,7 +2,6 @@ package com.qvomacp.eng.omacp;
 
 import com.qvomacp.eng.omacp.LibraryStop.Cause;
 import com.qvomacp.eng.omacp.LibraryStop.Place;
-import java.nio.charset.StandardCharsets;
 import java.util.Arrays;
 
 /**
@@ -137,8 +136,7 @@ final class LibraryWalk extends LibraryText {
     private boolean isTypeInTable() {
         int length = endOfTableText(tableAt) - tableAt;
         return length == DOCUMENT_TYPE.length()
-                && new String(data, tableAt, length, StandardCharsets.ISO_8859_1)
-                        .equals(DOCUMENT_TYPE);
+                && CharacterSet.latin1(data, tableAt, tableAt + length).equals(DOCUMENT_TYPE);
     }
 
     // ---- Tokens

@@ -28,45 +28,65 @@ public abstract class TypedCharacteristic {
         this.characteristic = characteristic;
     }
 
-    /**
-     * The view of a characteristic of a type. A switch: for the first method reference a new
-     * virtual machine takes longer than for everything else of a message; and not of the classes'
-     * own type, for which it would load them all.
-     */
-    private static Object of(String type, Characteristic in) {
-        switch (type) {
-            case "NAPDEF": return new AccessPoint(in);
-            case "NAPAUTHINFO": return new AccessPointAuthentication(in);
-            case "ACCESS": return new AccessRule(in);
-            case "APPLICATION": return new Application(in);
-            case "APPADDR": return new ApplicationAddress(in);
-            case "APPAUTH": return new ApplicationAuthentication(in);
-            case "BOOTSTRAP": return new Bootstrap(in);
-            case "CLIENTIDENTITY": return new ClientIdentity(in);
-            case "PXPHYSICAL": return new PhysicalProxy(in);
-            case "PORT": return new Port(in);
-            case "PXLOGICAL": return new Proxy(in);
-            case "PXAUTHINFO": return new ProxyAuthentication(in);
-            case "RESOURCE": return new Resource(in);
-            case "ROAMING": return new Roaming(in);
-            case "VALIDITY": return new Validity(in);
-            case "VENDORCONFIG": return new VendorConfiguration(in);
-            case "Vodafone VoWiFi": return new VoWifi(in);
-            case "WI-FI": return new Wifi(in);
-            default: throw new AssertionError(type);
+    /** The kinds that there are views of. */
+    enum Kind {
+        NAPDEF, NAPAUTHINFO, ACCESS, APPLICATION, APPADDR, APPAUTH, BOOTSTRAP, CLIENTIDENTITY,
+        PXPHYSICAL, PORT, PXLOGICAL, PXAUTHINFO, RESOURCE, ROAMING, VALIDITY, VENDORCONFIG,
+        VODAFONE_VOWIFI("Vodafone VoWiFi"), WI_FI("WI-FI");
+
+        /** What TYPE is. */
+        final String type;
+
+        Kind() {
+            type = name();
+        }
+
+        Kind(String type) {
+            this.type = type;
+        }
+
+        /**
+         * The view of a characteristic. A switch: for the first method reference a new virtual
+         * machine takes longer than for everything else of a message; and not of the classes' own
+         * type, for which it would load them all.
+         */
+        private Object of(Characteristic in) {
+            switch (this) {
+                case NAPDEF: return new AccessPoint(in);
+                case NAPAUTHINFO: return new AccessPointAuthentication(in);
+                case ACCESS: return new AccessRule(in);
+                case APPLICATION: return new Application(in);
+                case APPADDR: return new ApplicationAddress(in);
+                case APPAUTH: return new ApplicationAuthentication(in);
+                case BOOTSTRAP: return new Bootstrap(in);
+                case CLIENTIDENTITY: return new ClientIdentity(in);
+                case PXPHYSICAL: return new PhysicalProxy(in);
+                case PORT: return new Port(in);
+                case PXLOGICAL: return new Proxy(in);
+                case PXAUTHINFO: return new ProxyAuthentication(in);
+                case RESOURCE: return new Resource(in);
+                case ROAMING: return new Roaming(in);
+                case VALIDITY: return new Validity(in);
+                case VENDORCONFIG: return new VendorConfiguration(in);
+                case VODAFONE_VOWIFI: return new VoWifi(in);
+                case WI_FI: return new Wifi(in);
+                default: throw new AssertionError(this);
+            }
         }
     }
 
-    /** A view of each characteristic of a type directly in an item, in a list that stays so. */
-    static <V> List<V> views(Item item, Class<V> kind, String type) {
+    /** A view of each characteristic of a kind directly in an item, in a list that stays so. */
+    static <V> List<V> views(Item item, Class<V> view, Kind kind) {
         // Most messages lack most kinds: the list is made for the first.
         List<V> views = Collections.emptyList();
-        for (Item child : item.inside()) {
-            if (child instanceof Characteristic && type.equals(((Characteristic) child).type())) {
+        String type = kind.type;
+        Characteristic[] inside = item.insideCharacteristics();
+        for (Characteristic child : inside) {
+            if (type.equals(child.type())) {
                 if (views.isEmpty()) {
-                    views = new ArrayList<>();
+                    views = new ArrayList<>(Math.min(inside.length, 8));
                 }
-                views.add(kind.cast(of(type, (Characteristic) child)));
+                views.add(view.cast(kind.of(child)));
             }
         }
         return views.isEmpty() ? views : Collections.unmodifiableList(views);
@@ -101,8 +121,8 @@ public abstract class TypedCharacteristic {
         return characteristic.values(name);
     }
 
-    final <V> List<V> views(Class<V> kind, String type) {
-        return views(characteristic, kind, type);
+    final <V> List<V> views(Class<V> view, Kind kind) {
+        return views(characteristic, view, kind);
     }
 
     /**
