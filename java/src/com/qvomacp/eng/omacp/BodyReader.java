@@ -104,6 +104,9 @@ final class BodyReader {
         deviationsOfHeader();
         for (int token; (token = cursor.take()) >= 0; ) {
             int from = cursor.at() - 1;
+            if (token == PLAIN_PARM && plainParm(from)) {
+                continue;
+            }
             if (depth == 0 && (rootEnded ? token != PI : token == END)) {
                 trailing(from);
                 break;
@@ -153,10 +156,6 @@ final class BodyReader {
     // --- Elements and instructions -------------------------------------------------------------
 
     private void element(int from, int token) throws ProvisioningException {
-        boolean isParm = token == PLAIN_PARM && depth > 0 && elements.element(PARM) == Element.PARM;
-        if (isParm && plainParm(from)) {
-            return;
-        }
         String name = null;
         if ((token & ELEMENT) == LITERAL) {
             name = literal(from);
@@ -185,6 +184,9 @@ final class BodyReader {
         byte[] body = this.body;
         int at = from + 1;
         if (cursor.left() < SHORTEST_ATTRIBUTES || body[at] < 0 || body[at + 1] != VALUE) {
+            return false;
+        }
+        if (depth == 0 || elements.element(PARM) != Element.PARM) {
             return false;
         }
         String name = PIECES[body[at]] ? null : attributes.name(body[at]);

@@ -18,15 +18,11 @@ import java.util.List;
  */
 public abstract class Item {
     static final Item[] NONE = {};
-    private static final Characteristic[] NO_CHARACTERISTICS = {};
     private static final int LONGEST_PATH = 8;
 
     private final int offset;
     private final int end;
     private final Item[] children;
-
-    /** Those of the children, so that a look at them need not look at all others. */
-    private final Characteristic[] characteristics;
 
     /** Set once, by the item that this one stands in, before anybody else sees either. */
     private Item parent;
@@ -35,16 +31,8 @@ public abstract class Item {
         this.offset = offset;
         this.end = end;
         this.children = children;
-        int count = 0;
         for (Item child : children) {
             child.parent = this;
-            count += child instanceof Characteristic ? 1 : 0;
-        }
-        characteristics = count == 0 ? NO_CHARACTERISTICS : new Characteristic[count];
-        for (int i = children.length; count > 0; ) {
-            if (children[--i] instanceof Characteristic) {
-                characteristics[--count] = (Characteristic) children[i];
-            }
         }
     }
 
@@ -86,9 +74,9 @@ public abstract class Item {
         return children;
     }
 
-    /** The characteristics that stand in the item, not to be changed. */
-    final Characteristic[] insideCharacteristics() {
-        return characteristics;
+    /** How many of those that stand in the item may be passed over by who looks for characteristics. */
+    int beforeCharacteristics() {
+        return 0;
     }
 
     /** The item that this one stands in; {@code null} for the document element. */

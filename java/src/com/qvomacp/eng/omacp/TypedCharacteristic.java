@@ -77,19 +77,31 @@ public abstract class TypedCharacteristic {
 
     /** A view of each characteristic of a kind directly in an item, in a list that stays so. */
     static <V> List<V> views(Item item, Class<V> view, Kind kind) {
-        // Most messages lack most kinds: the list is made for the first.
-        List<V> views = Collections.emptyList();
-        String type = kind.type;
-        Characteristic[] inside = item.insideCharacteristics();
-        for (Characteristic child : inside) {
-            if (type.equals(child.type())) {
-                if (views.isEmpty()) {
-                    views = new ArrayList<>(Math.min(inside.length, 8));
-                }
-                views.add(view.cast(kind.of(child)));
-            }
+        // Most messages lack most kinds.
+        Item[] inside = item.inside();
+        int first = next(inside, item.beforeCharacteristics(), kind);
+        return first == inside.length
+                ? Collections.<V>emptyList()
+                : Collections.unmodifiableList(viewsFrom(inside, first, view, kind));
+    }
+
+    private static <V> List<V> viewsFrom(Item[] inside, int first, Class<V> view, Kind kind) {
+        List<V> views = new ArrayList<>(Math.min(inside.length - first, 8));
+        for (int i = first; i < inside.length; i = next(inside, i + 1, kind)) {
+            views.add(view.cast(kind.of((Characteristic) inside[i])));
         }
-        return views.isEmpty() ? views : Collections.unmodifiableList(views);
+        return views;
+    }
+
+    /** The place of the next characteristic of a kind; behind the last item when there is none. */
+    private static int next(Item[] items, int from, Kind kind) {
+        int i = from;
+        while (i < items.length
+                && !(items[i] instanceof Characteristic
+                        && kind.type.equals(((Characteristic) items[i]).type()))) {
+            ++i;
+        }
+        return i;
     }
 
     /** {@return the characteristic of the tree, with everything in it; never {@code null}} */
