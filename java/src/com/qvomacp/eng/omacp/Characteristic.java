@@ -97,6 +97,7 @@ public final class Characteristic extends Item {
      * @param name what NAME is, in exactly this case
      */
     public List<String> values(String name) {
+        Objects.requireNonNull(name);
         List<String> values = new ArrayList<>();
         for (Item child : inside()) {
             if (child instanceof Parameter && name.equals(((Parameter) child).name())) {
