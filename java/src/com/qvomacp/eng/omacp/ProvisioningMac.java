@@ -150,19 +150,15 @@ public final class ProvisioningMac {
         if (isOfNetwork(method) && !isDigits(imsi, 1, LONGEST_IMSI)) {
             return MacResult.UNUSABLE_IMSI;
         }
-        return method == SecurityMethod.NETWPIN || isPin(method, pin)
-                ? null
-                : MacResult.UNUSABLE_PIN;
+        boolean isPin = pin != null && !pin.isEmpty();
+        if (method == SecurityMethod.USERPINMAC) {
+            isPin = isDigits(pin, 2 * SHORTEST_HALF, 2 * LONGEST_HALF) && pin.length() % 2 == 0;
+        }
+        return isPin || method == SecurityMethod.NETWPIN ? null : MacResult.UNUSABLE_PIN;
     }
 
     private static boolean isOfNetwork(SecurityMethod method) {
         return method == SecurityMethod.NETWPIN || method == SecurityMethod.USERNETWPIN;
-    }
-
-    private static boolean isPin(SecurityMethod method, String pin) {
-        return method == SecurityMethod.USERPINMAC
-                ? isDigits(pin, 2 * SHORTEST_HALF, 2 * LONGEST_HALF) && pin.length() % 2 == 0
-                : pin != null && !pin.isEmpty();
     }
 
     private static boolean isDigits(String text, int least, int most) {
