@@ -13,7 +13,7 @@ import java.util.regex.Pattern;
  * is ever read: there is nothing here that could open a file or a connection.
  */
 final class XmlText {
-    /** The start of an XML declaration, be it behind a byte order mark, up to its encoding. */
+    /** The start of an XML declaration, be it behind a byte order mark, with its encoding. */
     private static final Pattern ENCODING =
             Pattern.compile(
                     "(?s)(?:\u00EF\u00BB\u00BF)?<\\?xml(?>.*?encoding)[^\"']*([\"'])(.*?)\\1");
@@ -54,24 +54,17 @@ final class XmlText {
         if (first == 0xFF && second == 0xFE || first == '<' && second == 0) {
             return StandardCharsets.UTF_16LE;
         }
-        String stated = statedEncoding(bytes);
-        if (stated == null) {
+        int length = Math.min(bytes.length, LONGEST_DECLARATION);
+        String start = new String(bytes, 0, length, StandardCharsets.ISO_8859_1);
+        Matcher declaration = ENCODING.matcher(start).region(0, Math.max(start.indexOf("?>"), 0));
+        if (!declaration.lookingAt()) {
             return StandardCharsets.UTF_8;
         }
         try {
-            return Charset.forName(stated);
+            return Charset.forName(declaration.group(2));
         } catch (IllegalArgumentException e) {
             throw EncodingException.at(1, 1, "the encoding of the document is not known");
         }
-    }
-
-    /** What the XML declaration calls the encoding; null when it does not. */
-    private static String statedEncoding(byte[] bytes) {
-        int length = Math.min(bytes.length, LONGEST_DECLARATION);
-        String start = new String(bytes, 0, length, StandardCharsets.ISO_8859_1);
-        int end = Math.max(start.indexOf("?>"), 0);
-        Matcher declaration = ENCODING.matcher(start).region(0, end);
-        return declaration.lookingAt() ? declaration.group(2) : null;
     }
 
     /** The next character, or -1 at the end; the place stays. */

@@ -51,11 +51,7 @@ public class XCPCtxApplication {
     /** {@return the number of SERVICE values of a port of an APPADDR} */
     public native int qvomacp_GetPxServiceCount(int application, int appAddr, int port);
 
-    /**
-     * One SERVICE of a port of an APPADDR. Unlike a proxy's port, this answers the text itself.
-     *
-     * @return its text, or {@code null}
-     */
+    /** {@return one SERVICE of an APPADDR's port: unlike a proxy's, its text, or {@code null}} */
     public native String qvomacp_GetPxServiceData(
             int application, int appAddr, int port, int service);
 
