@@ -20,9 +20,16 @@ import java.util.List;
 public final class EncodingException extends Exception {
     private static final long serialVersionUID = 1L;
 
+    /** Counted from 1, or 0. */
     private final int line;
+
+    /** Counted from 1, or 0. */
     private final int column;
+
+    /** Null for XML. */
     private final String path;
+
+    /** What would have been taken. */
     private final ArrayList<String> expected;
 
     private EncodingException(

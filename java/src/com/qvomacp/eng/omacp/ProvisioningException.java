@@ -34,10 +34,19 @@ public final class ProvisioningException extends Exception {
         REFUSED
     }
 
+    /** Why the message is not read. */
     private final Reason reason;
+
+    /** The library's result code, or 0. */
     private final int code;
+
+    /** Where the reading ends. */
     private final int offset;
+
+    /** In which element it ends, or null. */
     private final String path;
+
+    /** What would have been taken there. */
     private final ArrayList<String> expected;
 
     ProvisioningException(Reason reason, int offset, String text) {
