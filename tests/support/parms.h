@@ -1,5 +1,5 @@
-// The PARM decoder of a characteristic as a test describes it by a type, for the suites in
-// parm_suite.h and named_parm_suite.h; bytes of parms, and records by their fields.
+// The PARM decoder of a characteristic as a test describes it by a type; the suites that hold what
+// every such decoder does; bytes of parms, and records by their fields.
 #ifndef PARMS_H
 #define PARMS_H
 
@@ -97,17 +97,22 @@ inline Strings refusal(const std::string &name, uint8_t token)
 
 // ---- Records
 
-// The fields that are not null, by their numbers from 1.
-template <class Record>
-records::Numbers fieldsSet(const Record *record)
+// The fields that are not null of so many, by their numbers from 1.
+inline records::Numbers fieldsSet(const void *record, size_t fields)
 {
     records::Numbers out;
-    for (const size_t field : records::range(1, sizeof(Record) / sizeof(void *))) {
+    for (const size_t field : records::range(1, fields)) {
         if (records::get(record, field)) {
             out.push_back(field);
         }
     }
     return out;
+}
+
+template <class Record>
+records::Numbers fieldsSet(const Record *record)
+{
+    return fieldsSet(record, sizeof(Record) / sizeof(void *));
 }
 
 template <class Record, class Field>
@@ -150,17 +155,6 @@ template <class R>
 struct Row {
     Row(uint8_t t, const char *n, char *R::*f) : token(t), name(n), text(f) {}
     Row(uint8_t t, const char *n, qvsList *R::*f) : token(t), name(n), list(f) {}
-
-    size_t fieldOf(const R *record) const
-    {
-        return text ? numberOf(record, text) : numberOf(record, list);
-    }
-    std::string shownIn(const R *record) const
-    {
-        return text ? shown(record->*text) : shown(record->*list);
-    }
-    // How it is shown when these values came in, one after the other.
-    std::string of(const Strings &values) const { return list ? shown(values) : values.back(); }
 
     uint8_t token;
     const char *name;
@@ -226,14 +220,125 @@ struct Reading {
     Held<D> record;
 };
 
+// ---- Decoders without the types of their records
+
+// A parameter whose name is a token: its field by its number, and whether that is a list.
+struct AnyRow {
+    // How it is shown when these values came in, one after the other.
+    std::string of(const Strings &values) const { return list ? shown(values) : values.back(); }
+
+    uint8_t token;
+    const char *name;
+    size_t field;
+    bool list;
+};
+
+// A parameter whose name is a text.
+struct AnyName {
+    const char *name;
+    size_t field;
+};
+
+// A decoder as the suites see it, which are compiled once for all of them.
+struct AnyParm {
+    const char *characteristic;
+    size_t fields;
+    qvsResult (*decode)(qvsWbxmlDecoder *decoder, void *record);
+    void (*release)(void *record);
+    bool fresh;
+    bool (*hasOtherMeaning)(uint8_t token);
+    bool (*goesOn)(uint8_t token);
+    const char *(*withoutValue)(uint8_t token);
+    Strings (*refused)(uint8_t token);
+    std::vector<AnyRow> rows;
+
+    // Of one that reads names: what its traces begin with, whether it reads the value of any name,
+    // and the names that it knows.
+    const char *label = nullptr;
+    bool readsAnyValue = false;
+    qvsResult (*readName)(qvsWbxmlDecoder *decoder, uint8_t tag) = nullptr;
+    std::vector<AnyName> names = {};
+};
+
+inline void PrintTo(const AnyParm &parm, std::ostream *out)
+{
+    *out << parm.characteristic;
+}
+
+template <class D>
+AnyParm anyParm()
+{
+    using R = typename D::Record;
+    const R record{};
+    AnyParm parm = {
+        .characteristic = D::kCharacteristic,
+        .fields = sizeof(R) / sizeof(void *),
+        .decode = [](auto *decoder, void *to) { return D::decode(decoder, static_cast<R *>(to)); },
+        .release = [](void *made) { D::release(static_cast<R *>(made)); },
+        .fresh = D::kFresh,
+        .hasOtherMeaning = D::hasOtherMeaning,
+        .goesOn = D::goesOn,
+        .withoutValue = D::withoutValue,
+        .refused = D::refused,
+        .rows = {},
+    };
+    for (const Row<R> &row : D::rows()) {
+        const size_t field = row.text ? numberOf(&record, row.text) : numberOf(&record, row.list);
+        parm.rows.push_back({row.token, row.name, field, row.list != nullptr});
+    }
+    if constexpr (requires { D::kLabel; }) {
+        parm.label = D::kLabel;
+        parm.readsAnyValue = D::kReadsAnyValue;
+        parm.readName = [](qvsWbxmlDecoder *decoder, uint8_t tag) {
+            R *made = nullptr;
+            return D::readName(decoder, &made, tag);
+        };
+    }
+    if constexpr (requires { D::names(); }) {
+        for (const NamedRow<R> &row : D::names()) {
+            parm.names.push_back({row.name, numberOf(&record, row.text)});
+        }
+    }
+    return parm;
+}
+
+// A decoder over some parms, and the record that they go to.
+class AnyReading {
+public:
+    AnyReading(const AnyParm &of, const Bytes &bytes)
+        : decoder(bytes), record(records::blank(of.fields)), parm(of), size(bytes.size())
+    {
+    }
+    AnyReading(const AnyReading &) = delete;
+    AnyReading &operator=(const AnyReading &) = delete;
+    ~AnyReading() { parm.release(record); }
+
+    qvsResult read() { return parm.decode(decoder, record); }
+    size_t left() const { return size - decoder.position(); }
+
+    records::Numbers fieldsSet() const { return parms::fieldsSet(record, parm.fields); }
+    char *text(size_t field) const { return static_cast<char *>(records::get(record, field)); }
+    std::string shown(const AnyRow &row) const
+    {
+        return row.list ? parms::shown(static_cast<qvsList *>(records::get(record, row.field)))
+                        : parms::shown(text(row.field));
+    }
+
+    decoding::Decoder decoder;
+    void *record;
+
+private:
+    const AnyParm &parm;
+    size_t size;
+};
+
 // Runs over `bytes` with each allocation of the decoder failing in turn. A run in which one failed
 // must not be a success.
-template <class D>
-void failEachAllocation(const Bytes &bytes)
+inline void failEachAllocation(const AnyParm &parm, const Bytes &bytes)
 {
     const auto attempt = [&] {
         const long failAt = std::exchange(blocks::failAt, -1);
-        Reading<D> run(bytes);
+        AnyReading run(parm, bytes);
         blocks::failAt = failAt;
         const qvsResult result = run.read();
         if (blocks::failAt < 0) {
@@ -244,6 +349,35 @@ void failEachAllocation(const Bytes &bytes)
     };
     EXPECT_GT(blocks::failEach(attempt), 0);
     EXPECT_GT(blocks::failEachFrom(attempt), 0);
+}
+
+// ---- The suites
+
+class ParmSuite : public blocks::BlockTest, public testing::WithParamInterface<AnyParm> {};
+
+// The loop around the parameters.
+class ParmLoop : public ParmSuite {};
+
+// Parameters whose name is a token; of these, the texts; and the lists.
+class TokenParm : public ParmSuite {};
+class TextParm : public ParmSuite {};
+class ListParm : public ParmSuite {};
+
+// A reader of parameters that are named by text, whatever it does with the name; one that knows
+// some.
+class NameReader : public ParmSuite {};
+class NamedParm : public ParmSuite {};
+
+// Some decoders, for a suite.
+template <class... D>
+auto decoders()
+{
+    return testing::ValuesIn(std::vector<AnyParm>{anyParm<D>()...});
+}
+
+inline std::string nameOf(const testing::TestParamInfo<AnyParm> &info)
+{
+    return info.param.characteristic;
 }
 
 // The names of the types in the names of the tests.

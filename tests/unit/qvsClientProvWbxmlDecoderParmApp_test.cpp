@@ -1,6 +1,5 @@
 // The parameters of applications: APPLICATION, APPADDR, APPAUTH, RESOURCE.
-#include "named_parm_suite.h"
-#include "parm_suite.h"
+#include "parms.h"
 
 #include <cstring>
 
@@ -117,13 +116,15 @@ struct Resource : Usual<qvsWapResource, qvsClientProvWbxmlDecoderParamResource,
     }
 };
 
-using Decoders = testing::Types<Application, AppAddr, AppAuth, Resource>;
-INSTANTIATE_TYPED_TEST_SUITE_P(Applications, ParmLoop, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Applications, TokenParm, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Applications, TextParm, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Applications, ListParm, testing::Types<Application>, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Applications, NameReader, testing::Types<Application>, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Applications, NamedParm, testing::Types<Application>, TypeNames);
+INSTANTIATE_TEST_SUITE_P(Applications, ParmLoop,
+                         (decoders<Application, AppAddr, AppAuth, Resource>()), nameOf);
+INSTANTIATE_TEST_SUITE_P(Applications, TokenParm,
+                         (decoders<Application, AppAddr, AppAuth, Resource>()), nameOf);
+INSTANTIATE_TEST_SUITE_P(Applications, TextParm,
+                         (decoders<Application, AppAddr, AppAuth, Resource>()), nameOf);
+INSTANTIATE_TEST_SUITE_P(Applications, ListParm, decoders<Application>(), nameOf);
+INSTANTIATE_TEST_SUITE_P(Applications, NameReader, decoders<Application>(), nameOf);
+INSTANTIATE_TEST_SUITE_P(Applications, NamedParm, decoders<Application>(), nameOf);
 
 class ApplicationParm : public blocks::BlockTest {};
 class AppAuthParm : public blocks::BlockTest {};

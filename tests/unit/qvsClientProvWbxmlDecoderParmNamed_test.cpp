@@ -1,6 +1,5 @@
 // The parameters of the characteristics that are named by text: ROAMING, WI-FI, Vodafone VoWiFi.
-#include "named_parm_suite.h"
-#include "parm_suite.h"
+#include "parms.h"
 #include "qvsParm.h"
 
 using namespace parms;
@@ -95,9 +94,9 @@ struct VoWifi
 };
 
 using Decoders = testing::Types<Roaming, Wifi, VoWifi>;
-INSTANTIATE_TYPED_TEST_SUITE_P(Named, ParmLoop, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Named, NameReader, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Named, NamedParm, Decoders, TypeNames);
+INSTANTIATE_TEST_SUITE_P(Named, ParmLoop, (decoders<Roaming, Wifi, VoWifi>()), nameOf);
+INSTANTIATE_TEST_SUITE_P(Named, NameReader, (decoders<Roaming, Wifi, VoWifi>()), nameOf);
+INSTANTIATE_TEST_SUITE_P(Named, NamedParm, (decoders<Roaming, Wifi, VoWifi>()), nameOf);
 
 template <class D>
 class TextCharacteristic : public blocks::BlockTest {

@@ -1,6 +1,5 @@
 // The parameters of network access points: NAPDEF, NAPAUTHINFO, VALIDITY.
-#include "named_parm_suite.h"
-#include "parm_suite.h"
+#include "parms.h"
 
 using namespace parms;
 
@@ -97,13 +96,14 @@ struct Validity : Usual<qvsWapValidity, qvsClientProvWbxmlDecoderParamValidity,
     }
 };
 
-using Decoders = testing::Types<NapDef, NapAuthInfo, Validity>;
-using WithLists = testing::Types<NapDef, NapAuthInfo>;
-INSTANTIATE_TYPED_TEST_SUITE_P(AccessPoints, ParmLoop, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(AccessPoints, TokenParm, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(AccessPoints, TextParm, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(AccessPoints, ListParm, WithLists, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(AccessPoints, NameReader, testing::Types<NapDef>, TypeNames);
+INSTANTIATE_TEST_SUITE_P(AccessPoints, ParmLoop, (decoders<NapDef, NapAuthInfo, Validity>()),
+                         nameOf);
+INSTANTIATE_TEST_SUITE_P(AccessPoints, TokenParm, (decoders<NapDef, NapAuthInfo, Validity>()),
+                         nameOf);
+INSTANTIATE_TEST_SUITE_P(AccessPoints, TextParm, (decoders<NapDef, NapAuthInfo, Validity>()),
+                         nameOf);
+INSTANTIATE_TEST_SUITE_P(AccessPoints, ListParm, (decoders<NapDef, NapAuthInfo>()), nameOf);
+INSTANTIATE_TEST_SUITE_P(AccessPoints, NameReader, decoders<NapDef>(), nameOf);
 
 class NapDefNamedParm : public blocks::BlockTest {};
 class NapAuthInfoParm : public blocks::BlockTest {};

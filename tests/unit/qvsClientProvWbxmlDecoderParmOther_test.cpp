@@ -1,5 +1,5 @@
 // The parameters of BOOTSTRAP, CLIENTIDENTITY, VENDORCONFIG and ACCESS.
-#include "parm_suite.h"
+#include "parms.h"
 
 using namespace parms;
 
@@ -75,13 +75,13 @@ struct Access
     }
 };
 
-using Decoders = testing::Types<Bootstrap, ClientIdentity, VendorConfig, Access>;
-using WithTexts = testing::Types<Bootstrap, ClientIdentity, VendorConfig>;
-using WithLists = testing::Types<Bootstrap, Access>;
-INSTANTIATE_TYPED_TEST_SUITE_P(Others, ParmLoop, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Others, TokenParm, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Others, TextParm, WithTexts, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Others, ListParm, WithLists, TypeNames);
+INSTANTIATE_TEST_SUITE_P(Others, ParmLoop,
+                         (decoders<Bootstrap, ClientIdentity, VendorConfig, Access>()), nameOf);
+INSTANTIATE_TEST_SUITE_P(Others, TokenParm,
+                         (decoders<Bootstrap, ClientIdentity, VendorConfig, Access>()), nameOf);
+INSTANTIATE_TEST_SUITE_P(Others, TextParm, (decoders<Bootstrap, ClientIdentity, VendorConfig>()),
+                         nameOf);
+INSTANTIATE_TEST_SUITE_P(Others, ListParm, (decoders<Bootstrap, Access>()), nameOf);
 
 class AccessParm : public blocks::BlockTest {};
 class VendorParm : public blocks::BlockTest {};
@@ -248,7 +248,7 @@ TEST_F(VendorParm, LeavesBothFieldsAloneWhereverTheDataEnds)
 
 TEST_F(VendorParm, FailsCleanlyWithoutMemory)
 {
-    failEachAllocation<VendorConfig>(named("name", "value"));
+    failEachAllocation(anyParm<VendorConfig>(), named("name", "value"));
 }
 
 TEST(Kept, vendor_name_trace)

@@ -2,7 +2,7 @@
 #include "qvsDecoding.h"
 #include "qvsParm.h"
 
-#include "parm_suite.h"
+#include "parms.h"
 
 #include <algorithm>
 #include <optional>
@@ -102,12 +102,13 @@ struct PxPhysical : Usual<qvsWapPxPhysical, qvsClientProvWbxmlDecoderParamPxPhys
     }
 };
 
-using Decoders = testing::Types<PxLogical, PxAuthInfo, Port, PxPhysical>;
-using WithLists = testing::Types<PxLogical, Port, PxPhysical>;
-INSTANTIATE_TYPED_TEST_SUITE_P(Proxies, ParmLoop, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Proxies, TokenParm, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Proxies, TextParm, Decoders, TypeNames);
-INSTANTIATE_TYPED_TEST_SUITE_P(Proxies, ListParm, WithLists, TypeNames);
+INSTANTIATE_TEST_SUITE_P(Proxies, ParmLoop, (decoders<PxLogical, PxAuthInfo, Port, PxPhysical>()),
+                         nameOf);
+INSTANTIATE_TEST_SUITE_P(Proxies, TokenParm, (decoders<PxLogical, PxAuthInfo, Port, PxPhysical>()),
+                         nameOf);
+INSTANTIATE_TEST_SUITE_P(Proxies, TextParm, (decoders<PxLogical, PxAuthInfo, Port, PxPhysical>()),
+                         nameOf);
+INSTANTIATE_TEST_SUITE_P(Proxies, ListParm, (decoders<PxLogical, Port, PxPhysical>()), nameOf);
 
 class PxLogicalParm : public blocks::BlockTest {};
 class PxAuthInfoParm : public blocks::BlockTest {};

@@ -94,11 +94,11 @@ public final class AccessPoint extends TypedCharacteristic {
 
     /** {@return every NAPAUTHINFO: how to authenticate towards the access point} */
     public List<AccessPointAuthentication> authentications() {
-        return views(AccessPointAuthentication.class, "NAPAUTHINFO");
+        return views(AccessPointAuthentication.class, Kind.NAPAUTHINFO);
     }
 
     /** {@return every VALIDITY: where and until when the access point may be used} */
     public List<Validity> validities() {
-        return views(Validity.class, "VALIDITY");
+        return views(Validity.class, Kind.VALIDITY);
     }
 }

@@ -1,5 +1,7 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.EnumMap;
+import java.util.Map;
 import java.util.regex.Pattern;
 
 /** Whether a text can be an address of a type. */
@@ -9,12 +11,24 @@ final class AddressSyntax {
 
     private static final Pattern QUAD = Pattern.compile("[0-9]{1,9}(\\.[0-9]{1,9}){3}");
     private static final String IPV4_PART = "(25[0-5]|2[0-4][0-9]|1[0-9][0-9]|[1-9]?[0-9])";
-    private static final Pattern IPV4 = Pattern.compile(IPV4_PART + "(\\." + IPV4_PART + "){3}");
     private static final Pattern IPV6_PART = Pattern.compile("[0-9A-Fa-f]{1,4}");
-    private static final Pattern E164 = Pattern.compile("\\+?[0-9]{1,20}");
-    private static final Pattern APN = Pattern.compile("[A-Za-z0-9._-]+");
-    private static final Pattern SERVICE_CODE = Pattern.compile("[0-9*#]+");
-    private static final Pattern NUMBER = Pattern.compile("[0-9A-Fa-f]+");
+
+    /** What an address of a type looks like; IPV6 takes more than that. */
+    private static final Map<AddressType, Pattern> FORMS = new EnumMap<>(AddressType.class);
+
+    static {
+        form(AddressType.IPV4, IPV4_PART + "(\\." + IPV4_PART + "){3}");
+        form(AddressType.E164, "\\+?[0-9]{1,20}");
+        form(AddressType.ALPHA, "(?s).+");
+        form(AddressType.APN, "(?!" + QUAD + "$)[A-Za-z0-9._-]+");
+        form(AddressType.SCODE, "[0-9*#]+");
+        form(AddressType.TETRA_ITSI, "[0-9A-Fa-f]+");
+        form(AddressType.MAN, "[0-9A-Fa-f]+");
+    }
+
+    private static void form(AddressType type, String pattern) {
+        FORMS.put(type, Pattern.compile(pattern));
+    }
 
     private AddressSyntax() {}
 
@@ -32,23 +46,9 @@ final class AddressSyntax {
         if (type == null || type == AddressType.UNKNOWN) {
             return !looksLikeIpv4(address) || isIpv4(address);
         }
-        switch (type) {
-            case IPV4:
-                return isIpv4(address);
-            case IPV6:
-                return isIpv6(address);
-            case E164:
-                return E164.matcher(address).matches();
-            case APN:
-                return APN.matcher(address).matches() && !looksLikeIpv4(address);
-            case SCODE:
-                return SERVICE_CODE.matcher(address).matches();
-            case TETRA_ITSI:
-            case MAN:
-                return NUMBER.matcher(address).matches();
-            default:
-                return !address.isEmpty();
-        }
+        return type == AddressType.IPV6
+                ? isIpv6(address)
+                : FORMS.get(type).matcher(address).matches();
     }
 
     static boolean looksLikeIpv4(String address) {
@@ -56,7 +56,7 @@ final class AddressSyntax {
     }
 
     static boolean isIpv4(String address) {
-        return IPV4.matcher(address).matches();
+        return FORMS.get(AddressType.IPV4).matcher(address).matches();
     }
 
     /** The same four numbers without zeros in front of them; null where that is none either. */

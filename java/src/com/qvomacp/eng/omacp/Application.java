@@ -76,21 +76,21 @@ public final class Application extends TypedCharacteristic {
 
     /** {@return every APPADDR: the addresses of the service that have ports or a type} */
     public List<ApplicationAddress> addresses() {
-        return views(ApplicationAddress.class, "APPADDR");
+        return views(ApplicationAddress.class, Kind.APPADDR);
     }
 
     /** {@return every APPAUTH: how application and service authenticate themselves} */
     public List<ApplicationAuthentication> authentications() {
-        return views(ApplicationAuthentication.class, "APPAUTH");
+        return views(ApplicationAuthentication.class, Kind.APPAUTH);
     }
 
     /** {@return every RESOURCE: the resources of the service, such as bookmarks and databases} */
     public List<Resource> resources() {
-        return views(Resource.class, "RESOURCE");
+        return views(Resource.class, Kind.RESOURCE);
     }
 
     /** {@return every ROAMING: what the application may do while roaming} */
     public List<Roaming> roamings() {
-        return views(Roaming.class, "ROAMING");
+        return views(Roaming.class, Kind.ROAMING);
     }
 }

@@ -33,6 +33,6 @@ public final class ApplicationAddress extends TypedCharacteristic {
 
     /** {@return every PORT: the ports of the service at this address} */
     public List<Port> ports() {
-        return views(Port.class, "PORT");
+        return views(Port.class, Kind.PORT);
     }
 }

@@ -3,6 +3,7 @@ package com.qvomacp.eng.omacp;
 /** What stands before the elements of a body: version, document type, character set, string table. */
 final class BodyHeader {
     private static final int UNKNOWN = 1;
+    private static final int PROVISIONING = 11;
     private static final String PROVISIONING_TEXT = "//DTD PROV ";
     private static final int FIRST_VERSION = 0x00;
     private static final int LAST_VERSION = 0x03;
@@ -103,6 +104,9 @@ final class BodyHeader {
 
     /** Refuses another document type. One that is not stated is looked at: its root must fit. */
     private void requireProvisioning(byte[] body, Cursor cursor) throws ProvisioningException {
+        if (publicIdentifier == PROVISIONING) {
+            return;
+        }
         if (isStated()) {
             if (!documentType.contains(PROVISIONING_TEXT)) {
                 throw otherType(body, "the document type is " + Printable.quoted(documentType));

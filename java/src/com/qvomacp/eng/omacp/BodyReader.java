@@ -34,6 +34,11 @@ final class BodyReader {
     /** The token of a parm with attributes and without content, and that of VALUE on either page. */
     private static final int PLAIN_PARM = 0x87;
 
+    private static final int PARM = 0x07;
+
+    /** A token for NAME, one for VALUE, one value, END. */
+    private static final int SHORTEST_ATTRIBUTES = 4;
+
     private static final int VALUE = 0x06;
 
     /** The tokens that are a piece of text, in values as well as where elements stand. */
@@ -99,6 +104,10 @@ final class BodyReader {
         deviationsOfHeader();
         for (int token; (token = cursor.take()) >= 0; ) {
             int from = cursor.at() - 1;
+            // Here, in the loop: on 32 bits HotSpot pays much for a call that it does not inline.
+            if (token == PLAIN_PARM && plainParm(from)) {
+                continue;
+            }
             if (depth == 0 && (rootEnded ? token != PI : token == END)) {
                 trailing(from);
                 break;
@@ -159,9 +168,6 @@ final class BodyReader {
         if (element == Element.DOCUMENT && depth > 0) {
             element = Element.OTHER;
         }
-        if (token == PLAIN_PARM && element == Element.PARM && depth > 0 && plainParm(from)) {
-            return;
-        }
         reading.element(from, cursor.at(), element, name, (token & ATTRIBUTES) != 0);
         ++depth;
         if ((token & ATTRIBUTES) != 0) {
@@ -176,35 +182,37 @@ final class BodyReader {
      * its value one token, or one text of ASCII in its place. Of another one it reads nothing.
      */
     private boolean plainParm(int from) throws ProvisioningException {
-        CodePage page = attributes;
-        int name = cursor.peek();
-        if (name < 0 || name >= FIRST_VALUE || cursor.peek(1) != VALUE) {
+        byte[] body = this.body;
+        int at = from + 1;
+        if (cursor.left() < SHORTEST_ATTRIBUTES || body[at] < 0 || body[at + 1] != VALUE) {
             return false;
         }
-        if (page.attribute(name) != Attribute.NAME || page.begin(name) == null || PIECES[name]) {
+        if (depth == 0 || elements.element(PARM) != Element.PARM) {
             return false;
         }
-        int value = cursor.peek(2);
-        String text = null;
-        Writing writing = Writing.TOKEN;
-        int ahead = 3;
-        if (value == STR_I) {
-            int start = cursor.at() + ahead;
-            int zero = asciiEnd(start);
-            if (zero >= 0 && cursor.peek(ahead + zero - start + 1) == END) {
-                charge(start - 1, zero - start);
-                text = CharacterSet.ascii(body, start, zero);
-                writing = Writing.INLINE;
-                ahead += zero - start + 1;
+        String name = PIECES[body[at]] ? null : attributes.name(body[at]);
+        if (name == null) {
+            return false;
+        }
+        int token = body[at + 2] & 0xFF;
+        int start = at + 3;
+        String value = null;
+        int end = start;
+        if (token == STR_I) {
+            end = asciiEnd(start) + 1;
+            if (end > 0 && end < body.length && body[end] == END) {
+                charge(start - 1, end - 1 - start);
+                value = CharacterSet.latin1(body, start, end - 1);
             }
-        } else if (value >= FIRST_VALUE && !PIECES[value] && cursor.peek(ahead) == END) {
-            text = page.value(value);
+        } else if (token >= FIRST_VALUE && !PIECES[token] && body[start] == END) {
+            value = attributes.value(token);
         }
-        if (text == null) {
+        if (value == null) {
             return false;
         }
-        cursor.skip(ahead + 1);
-        reading.parameter(from, cursor.at(), page.begin(name), text, writing);
+        cursor.skip(end + 1 - at);
+        Writing writing = token == STR_I ? Writing.INLINE : Writing.TOKEN;
+        reading.parameter(from, end + 1, name, value, writing);
         return true;
     }
 
@@ -373,7 +381,7 @@ final class BodyReader {
         if (zero >= 0) {
             cursor.skip(zero - start + 1);
             charge(from, zero - start);
-            return CharacterSet.ascii(body, start, zero);
+            return CharacterSet.latin1(body, start, zero);
         }
         int end = start + cursor.left();
         zero = charset.zero(body, start, end);

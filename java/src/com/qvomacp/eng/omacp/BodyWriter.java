@@ -13,12 +13,7 @@ import java.util.Map;
  * Writes a document as a body: the Binary XML Content Format (WAP-192-WBXML), version 1.3, with the
  * tokens of OMA provisioning content (OMA-WAP-TS-ProvCont).
  */
-final class BodyWriter extends DocumentSource.Steps {
-    private static final int SWITCH_PAGE = 0x00;
-    private static final int END = 0x01;
-    private static final int STR_I = 0x03;
-    private static final int STR_T = 0x83;
-
+final class BodyWriter extends DocumentTaker {
     private static final int ATTRIBUTES = 0x80;
     private static final int CONTENT = 0x40;
     private static final int DOCUMENT = 0x05 | CONTENT;
@@ -43,42 +38,46 @@ final class BodyWriter extends DocumentSource.Steps {
 
     private final ByteArrayOutputStream table = new ByteArrayOutputStream();
     private final ByteArrayOutputStream out = new ByteArrayOutputStream();
+    private final String version;
     private final WritingTokens tokens;
     private final CharsetEncoder encoder;
-    private final int terminatorLength;
+    private final byte[] terminator;
 
     private int page;
 
-    private BodyWriter(WritingTokens tokens, CharacterSet charset) {
+    private BodyWriter(Item root, String version, WritingTokens tokens, CharacterSet charset) {
+        super(root);
+        this.version = version;
         this.tokens = tokens;
         this.encoder = charset.newEncoder();
-        this.terminatorLength = charset.unit();
+        this.terminator = new byte[charset.unit()];
     }
 
-    static byte[] write(DocumentSource source, EncodeOptions options) throws EncodingException {
+    static byte[] write(Item root, String version, EncodeOptions options)
+            throws EncodingException {
         String name = options.value(EncodeOption.CHARSET);
         int charset = CharacterSet.number(name);
         if (charset == CharacterSet.NOT_STATED) {
             throw EncodingException.in(null, "the character set " + name + " is not known");
         }
         WritingTokens tokens = new WritingTokens(options.value(EncodeOption.TOKENS));
-        return new BodyWriter(tokens, CharacterSet.of(charset)).body(source, options, charset);
+        BodyWriter writer = new BodyWriter(root, version, tokens, CharacterSet.of(charset));
+        return writer.body(options, charset);
     }
 
-    private byte[] body(DocumentSource source, EncodeOptions options, int charset)
-            throws EncodingException {
+    private byte[] body(EncodeOptions options, int charset) throws EncodingException {
         boolean typeAsText = options.is(EncodeOption.IDENTIFIER, "table");
         if (typeAsText) {
             place(PROV_1_0_TEXT);
         }
-        document(source);
+        document();
         if (options.is(EncodeOption.STRINGS, "table")) {
             for (Map.Entry<String, Integer> text : counts.entrySet()) {
                 if (text.getValue() > 1) {
                     place(text.getKey());
                 }
             }
-            document(source);
+            document();
         }
         ByteArrayOutputStream body = new ByteArrayOutputStream();
         body.write(WBXML_1_3);
@@ -90,8 +89,8 @@ final class BodyWriter extends DocumentSource.Steps {
         }
         integer(charset, body);
         integer(table.size(), body);
-        append(table, body);
-        append(out, body);
+        body.write(table.toByteArray(), 0, table.size());
+        body.write(out.toByteArray(), 0, out.size());
         return body.toByteArray();
     }
 
@@ -101,20 +100,16 @@ final class BodyWriter extends DocumentSource.Steps {
         string(text, table);
     }
 
-    private void document(DocumentSource source) throws EncodingException {
+    private void document() throws EncodingException {
         out.reset();
         page = 0;
-        out.write(source.version == null ? DOCUMENT : DOCUMENT | ATTRIBUTES);
-        if ("1.0".equals(source.version)) {
-            out.write(VERSION_1_0);
-            out.write(END);
-        } else if (source.version != null) {
-            out.write(VERSION);
-            text(source.version);
-            out.write(END);
+        out.write(version == null ? DOCUMENT : DOCUMENT | ATTRIBUTES);
+        if (version != null) {
+            start("1.0".equals(version) ? VERSION_1_0 : WritingTokens.NONE, VERSION, version);
+            out.write(BodyReader.END);
         }
-        source.take(this);
-        out.write(END);
+        take();
+        out.write(BodyReader.END);
     }
 
     /** One without children is written as one with content, too. */
@@ -123,7 +118,7 @@ final class BodyWriter extends DocumentSource.Steps {
         out.write(type == null ? CHARACTERISTIC ^ ATTRIBUTES : CHARACTERISTIC);
         if (type != null) {
             start(tokens.type(type, page), TYPE, type);
-            out.write(END);
+            out.write(BodyReader.END);
         }
     }
 
@@ -144,12 +139,12 @@ final class BodyWriter extends DocumentSource.Steps {
                 text(rest);
             }
         }
-        out.write(END);
+        out.write(BodyReader.END);
     }
 
     @Override
     void end() {
-        out.write(END);
+        out.write(BodyReader.END);
     }
 
     /**
@@ -165,7 +160,7 @@ final class BodyWriter extends DocumentSource.Steps {
         }
         if (token >> 8 != page) {
             page = token >> 8;
-            out.write(SWITCH_PAGE);
+            out.write(BodyReader.SWITCH_PAGE);
             out.write(page);
         }
         out.write(token & 0xFF);
@@ -176,10 +171,10 @@ final class BodyWriter extends DocumentSource.Steps {
         counts.put(text, count == null ? 1 : count + 1);
         Integer place = places.get(text);
         if (place == null) {
-            out.write(STR_I);
+            out.write(BodyReader.STR_I);
             string(text, out);
         } else {
-            out.write(STR_T);
+            out.write(BodyReader.STR_T);
             integer(place, out);
         }
     }
@@ -187,18 +182,15 @@ final class BodyWriter extends DocumentSource.Steps {
     /** Writes a text in the character set of the document, with its terminator. */
     private void string(String text, ByteArrayOutputStream to) throws EncodingException {
         if (text.indexOf(0) >= 0) {
-            throw EncodingException.in(path(), "a text with a NUL has no inline form");
+            throw error("a text with a NUL has no inline form");
         }
         try {
             ByteBuffer bytes = encoder.encode(CharBuffer.wrap(text));
             to.write(bytes.array(), bytes.arrayOffset(), bytes.limit());
         } catch (CharacterCodingException e) {
-            throw EncodingException.in(
-                    path(), "a text cannot be written in " + encoder.charset().name());
+            throw error("a text cannot be written in " + encoder.charset().name());
         }
-        for (int i = 0; i < terminatorLength; ++i) {
-            to.write(0);
-        }
+        to.write(terminator, 0, terminator.length);
     }
 
     /** Writes a multi-byte integer. */
@@ -209,9 +201,5 @@ final class BodyWriter extends DocumentSource.Steps {
             }
         }
         to.write(number & 0x7F);
-    }
-
-    private static void append(ByteArrayOutputStream bytes, ByteArrayOutputStream to) {
-        to.write(bytes.toByteArray(), 0, bytes.size());
     }
 }

@@ -148,15 +148,15 @@ final class CharacterSet {
                 ++at;
             }
             if (at == to) {
-                return ascii(bytes, from, to);
+                return latin1(bytes, from, to);
             }
         }
         return charset == null ? utf8(bytes, from, to) : new String(bytes, from, to - from, charset);
     }
 
-    /** The text of bytes that are all ASCII, by the constructor that is faster than any charset. */
+    /** The text of bytes as ISO-8859-1, by the constructor that is faster than that charset. */
     @SuppressWarnings("deprecation")
-    static String ascii(byte[] bytes, int from, int to) {
+    static String latin1(byte[] bytes, int from, int to) {
         return from == to ? "" : new String(bytes, 0, from, to - from);
     }
 

@@ -21,6 +21,9 @@ public final class Characteristic extends Item {
     private final String type;
     private final byte typeWriting;
 
+    /** How many of its children stand before the first characteristic; at most what a byte holds. */
+    private final byte beforeCharacteristics;
+
     /** The number of the characteristic in a path; 0 until somebody asks for one beside it. */
     private int ordinal;
 
@@ -28,6 +31,12 @@ public final class Characteristic extends Item {
         super(offset, end, children);
         this.type = type;
         this.typeWriting = Writing.code(typeWriting);
+        byte before = 0;
+        int most = Math.min(children.length, Byte.MAX_VALUE);
+        while (before < most && !(children[before] instanceof Characteristic)) {
+            ++before;
+        }
+        beforeCharacteristics = before;
     }
 
     /** {@return TYPE as the OMA documents write it, as {@code NAPDEF}; {@code null} for none} */
@@ -88,13 +97,22 @@ public final class Characteristic extends Item {
      * @param name what NAME is, in exactly this case
      */
     public List<String> values(String name) {
+        Objects.requireNonNull(name);
         List<String> values = new ArrayList<>();
-        for (Parameter parameter : children(Parameter.class, Objects.requireNonNull(name))) {
-            if (parameter.value() != null) {
-                values.add(parameter.value());
+        for (Item child : inside()) {
+            if (child instanceof Parameter && name.equals(((Parameter) child).name())) {
+                String value = ((Parameter) child).value();
+                if (value != null) {
+                    values.add(value);
+                }
             }
         }
         return Collections.unmodifiableList(values);
+    }
+
+    @Override
+    int beforeCharacteristics() {
+        return beforeCharacteristics;
     }
 
     @Override

@@ -155,6 +155,11 @@ final class CodePage {
         return begins[token];
     }
 
+    /** The name of a parameter that a token below 80 hexadecimal stands for, or {@code null}. */
+    String name(int token) {
+        return attributes[token] == Attribute.NAME ? begins[token] : null;
+    }
+
     /** The part of a value that a token from 80 hexadecimal on stands for, or {@code null}. */
     String value(int token) {
         return values[token - FIRST_VALUE];

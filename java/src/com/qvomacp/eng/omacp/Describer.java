@@ -2,7 +2,6 @@ package com.qvomacp.eng.omacp;
 
 import java.util.ArrayDeque;
 import java.util.Deque;
-import java.util.Locale;
 
 /** Tells a {@link ByteVisitor} what each byte of a body means. Nothing of it is kept. */
 final class Describer implements Reading {
@@ -49,7 +48,7 @@ final class Describer implements Reading {
 
     @Override
     public void text(int from, int to, Writing writing, String text) {
-        visit(from, to, quoted(text) + ", " + writing.name().toLowerCase(Locale.ROOT));
+        visit(from, to, quoted(text) + ", " + Printable.nameOf(writing));
     }
 
     @Override

@@ -160,9 +160,8 @@ final class DeviationFinder implements Reading {
             kinds = Arrays.copyOf(kinds, 2 * count);
             in = Arrays.copyOf(in, 2 * count);
         }
-        Item item = depth == 0 ? null : items[offsets[depth]];
         this.at[count] = at;
         kinds[count] = (byte) kind.ordinal();
-        in[count++] = item == null ? root : item;
+        in[count++] = depth == 0 ? root : items[offsets[depth]];
     }
 }

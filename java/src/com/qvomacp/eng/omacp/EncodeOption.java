@@ -19,63 +19,48 @@ public enum EncodeOption {
      * Where tokens are written: {@code library}, where the native library answers the text for which
      * the token stands; {@code oma}, wherever the format has a token; {@code none}.
      */
-    TOKENS("tokens", "where tokens are written", "library", "library", "oma", "none"),
+    TOKENS("where tokens are written", "library", "library", "oma", "none"),
 
     /** The character set of the texts, by its IANA name. */
-    CHARSET("charset", "the character set", "UTF-8"),
+    CHARSET("the character set", "UTF-8"),
 
     /** How the document type is named: by its number, or by a text in the string table. */
-    IDENTIFIER("identifier", "how the document type is named", "token", "token", "table"),
+    IDENTIFIER("how the document type is named", "token", "token", "table"),
 
     /** Where texts stand that occur more than once: each in its place, or in the string table. */
-    STRINGS("strings", "where repeated texts stand", "inline", "inline", "table"),
+    STRINGS("where repeated texts stand", "inline", "inline", "table"),
 
     /** The content type: a number or a text, alone or with a quoted length in front. */
-    CONTENT_TYPE(
-            "content-type",
-            "how the content type is written",
-            "quoted",
-            "short",
-            "text",
-            "quoted",
-            "quoted-text"),
+    CONTENT_TYPE("how the content type is written", "quoted",
+            "short", "text", "quoted", "quoted-text"),
 
     /** The security method; without one, the push has neither SEC nor MAC. */
-    SEC(
-            "sec",
-            "the security method",
-            null,
-            "netwpin",
-            "userpin",
-            "usernetwpin",
-            "userpinmac"),
+    SEC("the security method", null, "netwpin", "userpin", "usernetwpin", "userpinmac"),
 
     /** The PIN, for {@code userpin}, {@code usernetwpin} and {@code userpinmac}. */
-    PIN("pin", "what the user has been told (USERPIN, USERNETWPIN, USERPINMAC)", null),
+    PIN("what the user has been told (USERPIN, USERNETWPIN, USERPINMAC)", null),
 
     /** The subscriber's number, for {@code netwpin} and {@code usernetwpin}. */
-    IMSI("imsi", "the subscriber's number (NETWPIN, USERNETWPIN)", null),
+    IMSI("the subscriber's number (NETWPIN, USERNETWPIN)", null),
 
     /** The bytes of the key in hexadecimal, in place of PIN and IMSI. */
-    KEY("key", "the key in hexadecimal, in place of PIN and IMSI", null),
+    KEY("the key in hexadecimal, in place of PIN and IMSI", null),
 
     /** How SEC and MAC are named: by number or by text. */
-    PARAMETERS("parameters", "how SEC and MAC are named", "binary", "binary", "text"),
+    PARAMETERS("how SEC and MAC are named", "binary", "binary", "text"),
 
     /** The transaction identifier, two hexadecimal digits. */
-    TID("tid", "the transaction identifier, two hexadecimal digits", "01"),
+    TID("the transaction identifier, two hexadecimal digits", "01"),
 
     /** Further headers, in hexadecimal. */
-    HEADERS("headers", "further headers, in hexadecimal", "");
+    HEADERS("further headers, in hexadecimal", "");
 
-    private final String optionName;
+    private final String optionName = Printable.nameOf(this);
     private final String description;
     private final String defaultValue;
     private final List<String> choices;
 
-    EncodeOption(
-            String optionName, String description, String defaultValue, String... choices) {
-        this.optionName = optionName;
+    EncodeOption(String description, String defaultValue, String... choices) {
         this.description = description;
         this.defaultValue = defaultValue;
         this.choices = Collections.unmodifiableList(Arrays.asList(choices));

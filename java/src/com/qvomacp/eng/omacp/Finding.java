@@ -41,9 +41,9 @@ public final class Finding {
         return new Finding(rule, item, at, 0, 0, sentence, remedy);
     }
 
-    /** The same at its place in a document in XML. */
-    Finding at(int xmlLine, int xmlColumn) {
-        return new Finding(rule, item, NO_OFFSET, xmlLine, xmlColumn, sentence, remedy);
+    /** The same at its place in a document in XML: line and column. */
+    Finding at(int[] place) {
+        return new Finding(rule, item, NO_OFFSET, place[0], place[1], sentence, remedy);
     }
 
     /** {@return the rule that it is found by: the rule, never {@code null}} */

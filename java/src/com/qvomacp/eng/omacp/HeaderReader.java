@@ -2,7 +2,6 @@ package com.qvomacp.eng.omacp;
 
 import com.qvomacp.eng.omacp.ProvisioningException.Reason;
 import com.qvomacp.eng.omacp.WspTable.Kind;
-import java.nio.charset.StandardCharsets;
 import java.text.SimpleDateFormat;
 import java.util.ArrayList;
 import java.util.Arrays;
@@ -391,12 +390,9 @@ final class HeaderReader {
             cursor.skip(1);
         }
         textAt = cursor.at();
-        int octet = cursor.take();
-        while (octet > 0) {
-            octet = cursor.take();
-        }
-        int length = cursor.at() - textAt - (octet == 0 ? 1 : 0);
-        return length == 0 ? "" : new String(bytes, textAt, length, StandardCharsets.ISO_8859_1);
+        int length = CharacterSet.UTF_8.zero(bytes, textAt, end) - textAt;
+        cursor.skip(length + 1);
+        return CharacterSet.latin1(bytes, textAt, textAt + length);
     }
 
     /** A short or long integer; -1 for one that is cut off or has more than 31 bits. */

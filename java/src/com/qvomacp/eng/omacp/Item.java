@@ -74,6 +74,11 @@ public abstract class Item {
         return children;
     }
 
+    /** How many of those that stand in the item may be passed over by who looks for characteristics. */
+    int beforeCharacteristics() {
+        return 0;
+    }
+
     /** The item that this one stands in; {@code null} for the document element. */
     final Item parent() {
         return parent;

@@ -1,7 +1,5 @@
 package com.qvomacp.eng.omacp;
 
-import java.nio.charset.StandardCharsets;
-
 /**
  * What the native library makes of a push header: PDU type, length, content type, SEC and MAC,
  * which it knows in a few forms only. The length of the headers bounds none of these, it only finds
@@ -150,7 +148,7 @@ final class LibraryHeader {
     }
 
     private static String text(byte[] push, int at, int length) {
-        return new String(push, at, length, StandardCharsets.ISO_8859_1);
+        return CharacterSet.latin1(push, at, at + length);
     }
 
     private static int endOfText(byte[] push, int at) {

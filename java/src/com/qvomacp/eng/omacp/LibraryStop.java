@@ -1,7 +1,6 @@
 package com.qvomacp.eng.omacp;
 
 import java.util.Arrays;
-import java.util.Collections;
 import java.util.List;
 
 /** Ends the walk over a body that the native library refuses. */
@@ -42,24 +41,34 @@ final class LibraryStop extends Exception {
 
     /** Why the walk ends. */
     enum Cause {
-        EMPTY_BODY(Result.BAD_ARGUMENT),
-        DOCUMENT_TYPE(Result.DOCUMENT_TYPE),
-        ENDED(Result.NO_DATA),
-        ENDED_IN_SWITCH(Result.UNKNOWN_ELEMENT),
-        MISPLACED(Result.UNKNOWN_ELEMENT),
-        MISPLACED_IN_VALUE(Result.NO_DATA),
-        NO_SUCH_PAGE(Result.UNKNOWN_ELEMENT),
-        NO_SUCH_STRING(Result.NO_DATA),
-        OPAQUE_TOO_LONG(Result.NO_DATA),
-        OPAQUE_WITHOUT_LENGTH(Result.NO_DATA),
-        EMPTY_NAME(Result.FAILED),
-        UNKNOWN_NAME(Result.UNKNOWN_ELEMENT),
-        TOO_MUCH_TEXT(Result.NO_MEMORY);
+        EMPTY_BODY(Result.BAD_ARGUMENT, "the body is empty", "a WBXML document"),
+        DOCUMENT_TYPE(Result.DOCUMENT_TYPE, null, "public identifier 11",
+                "public identifier 0 with a string table that begins with \""
+                        + LibraryWalk.DOCUMENT_TYPE + '"'),
+        ENDED(Result.NO_DATA, null),
+        ENDED_IN_SWITCH(Result.UNKNOWN_ELEMENT, null),
+        MISPLACED(Result.UNKNOWN_ELEMENT, null),
+        MISPLACED_IN_VALUE(Result.NO_DATA, null),
+        NO_SUCH_PAGE(Result.UNKNOWN_ELEMENT, null, "page 0", "page 1"),
+        NO_SUCH_STRING(Result.NO_DATA, null),
+        OPAQUE_TOO_LONG(Result.NO_DATA, "the opaque data is longer than the rest of the body"),
+        OPAQUE_WITHOUT_LENGTH(Result.NO_DATA, null),
+        EMPTY_NAME(Result.FAILED, "the name of the parameter is empty"),
+        UNKNOWN_NAME(Result.UNKNOWN_ELEMENT, null),
+        TOO_MUCH_TEXT(Result.NO_MEMORY, "the body is decoded to too much text");
 
         final Result result;
 
-        Cause(Result result) {
+        /** In words; null for those that the bytes say more of. */
+        final String reason;
+
+        /** What would have been taken, where that is always the same. */
+        final List<String> expected;
+
+        Cause(Result result, String reason, String... expected) {
             this.result = result;
+            this.reason = reason;
+            this.expected = Arrays.asList(expected);
         }
     }
 
@@ -103,7 +112,7 @@ final class LibraryStop extends Exception {
         Place(String where, String refused, String... expected) {
             this.where = where;
             this.refused = refused;
-            this.expected = Collections.unmodifiableList(Arrays.asList(expected));
+            this.expected = Arrays.asList(expected);
         }
     }
 

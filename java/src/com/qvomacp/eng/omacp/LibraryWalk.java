@@ -2,7 +2,6 @@ package com.qvomacp.eng.omacp;
 
 import com.qvomacp.eng.omacp.LibraryStop.Cause;
 import com.qvomacp.eng.omacp.LibraryStop.Place;
-import java.nio.charset.StandardCharsets;
 import java.util.Arrays;
 
 /**
@@ -25,8 +24,10 @@ final class LibraryWalk extends LibraryText {
     private static final int PROVISIONING = 11;
     private static final long LONGEST_TABLE = 0xFFFFFFFDL;
 
-    /** NAME, VALUE and STR_I. */
-    private static final int PLAIN_START = 3;
+    /** A parm with attributes and without content; behind it stand NAME, VALUE and STR_I. */
+    private static final byte PLAIN_PARM = (byte) 0x87;
+
+    private static final int PLAIN_START = 4;
 
     private static final byte[] COMMA = {','};
 
@@ -137,8 +138,7 @@ final class LibraryWalk extends LibraryText {
     private boolean isTypeInTable() {
         int length = endOfTableText(tableAt) - tableAt;
         return length == DOCUMENT_TYPE.length()
-                && new String(data, tableAt, length, StandardCharsets.ISO_8859_1)
-                        .equals(DOCUMENT_TYPE);
+                && CharacterSet.latin1(data, tableAt, tableAt + length).equals(DOCUMENT_TYPE);
     }
 
     // ---- Tokens
@@ -312,7 +312,10 @@ final class LibraryWalk extends LibraryText {
         for (; ; ) {
             int tag = peekTag(Place.IN_CHARACTERISTIC);
             if (tag == TAG_PARM && kind != null) {
-                parm(kind);
+                // Here, in the loop, for the reason that BodyReader has.
+                if (trace != LibraryTrace.NONE || !takePlain(kind)) {
+                    parm(kind);
+                }
             } else if (tag == END) {
                 ++at;
                 return false;
@@ -342,10 +345,6 @@ final class LibraryWalk extends LibraryText {
                 switchPage();
                 token = kind.readsTokenAfresh() ? peek(Place.PARM) : peekTag(Place.PARM);
             }
-            if (trace == LibraryTrace.NONE && takePlain(kind, token)) {
-                inParm = false;
-                return;
-            }
             if (token == END) {
                 ++at;
                 inParm = false;
@@ -357,20 +356,22 @@ final class LibraryWalk extends LibraryText {
     }
 
     /**
-     * Reads the usual parameter in one go: NAME, VALUE, an inline string and the END of the parm.
-     * Any other is read step by step, and so is one that would pass the limit of text.
+     * Reads the usual parm in one go: NAME, VALUE, an inline string and END. Any other is read step by
+     * step, and so is one that would pass the limit of text.
      */
-    private boolean takePlain(LibraryKind kind, int token) {
+    private boolean takePlain(LibraryKind kind) {
         byte[] bytes = data;
         int end = size;
-        int start = at + PLAIN_START;
-        byte shape = kind.shapes[token];
-        if (shape == LibraryKind.UNKNOWN
-                || shape > LibraryKind.OPTIONAL_LIST
-                || start >= end
-                || bytes[at] != (byte) token
-                || bytes[at + 1] != VALUE
-                || bytes[at + 2] != STR_I) {
+        int from = at;
+        int start = from + PLAIN_START;
+        if (start >= end
+                || bytes[from] != PLAIN_PARM
+                || bytes[from + 2] != VALUE
+                || bytes[from + 3] != STR_I) {
+            return false;
+        }
+        byte shape = kind.shapes[bytes[from + 1] & 0xFF];
+        if (shape == LibraryKind.UNKNOWN || shape > LibraryKind.OPTIONAL_LIST) {
             return false;
         }
         int nul = endOfText(start, end);

@@ -1,8 +1,9 @@
 package com.qvomacp.eng.omacp;
 
+import com.qvomacp.eng.omacp.Deviation.Kind;
 import java.util.ArrayList;
 import java.util.Collections;
-import java.util.Comparator;
+import java.util.EnumMap;
 import java.util.HashMap;
 import java.util.HashSet;
 import java.util.IdentityHashMap;
@@ -38,37 +39,24 @@ final class Linter {
         }
     }
 
-    /** What a characteristic is referred to by. */
+    /** What a characteristic of a type is referred to by. */
     private enum Identifier {
-        NAPID("NAPDEF", "NAPID", Rule.NAPID_MISSING, Rule.NAPID_TWICE),
-        PROXY_ID("PXLOGICAL", "PROXY-ID", Rule.PROXY_ID_MISSING, Rule.PROXY_ID_TWICE),
-        PHYSICAL("PXPHYSICAL", "PHYSICAL-PROXY-ID", null, Rule.PHYSICAL_PROXY_ID_TWICE),
-        APPID("APPLICATION", "APPID", Rule.APPID_MISSING, null);
+        NAPDEF("NAPID", Rule.NAPID_MISSING, Rule.NAPID_TWICE),
+        PXLOGICAL("PROXY-ID", Rule.PROXY_ID_MISSING, Rule.PROXY_ID_TWICE),
+        PXPHYSICAL("PHYSICAL-PROXY-ID", null, Rule.PHYSICAL_PROXY_ID_TWICE),
+        APPLICATION("APPID", Rule.APPID_MISSING, null);
 
-        private static final Identifier[] ALL = values();
-
-        final String type;
-        final String name;
+        final String parameter;
 
         /** Null where it may be missing, or may stand twice. */
         final Rule missing;
 
         final Rule twice;
 
-        Identifier(String type, String name, Rule missing, Rule twice) {
-            this.type = type;
-            this.name = name;
+        Identifier(String parameter, Rule missing, Rule twice) {
+            this.parameter = parameter;
             this.missing = missing;
             this.twice = twice;
-        }
-
-        static Identifier of(String type) {
-            for (Identifier identifier : ALL) {
-                if (identifier.type.equals(type)) {
-                    return identifier;
-                }
-            }
-            return null;
         }
     }
 
@@ -119,7 +107,7 @@ final class Linter {
     private final Set<Item> foreign = identities();
 
     /** The identifiers that stand in the document or, of machines, in the proxy around. */
-    private final Map<Identifier, Set<String>> present = new HashMap<>();
+    private final Map<Identifier, Set<String>> present = new EnumMap<>(Identifier.class);
 
     private Item proxy;
 
@@ -128,7 +116,11 @@ final class Linter {
 
     private boolean isNone;
 
-    private Linter() {}
+    private Linter() {
+        for (Identifier identifier : Identifier.values()) {
+            present.put(identifier, new HashSet<String>());
+        }
+    }
 
     private static Set<Item> identities() {
         return Collections.newSetFromMap(new IdentityHashMap<Item, Boolean>());
@@ -156,17 +148,10 @@ final class Linter {
             linter.reference(reference);
         }
         linter.verdict(document, verdict);
-        Collections.sort(linter.findings, BY_OFFSET);
+        Collections.sort(
+                linter.findings, (left, right) -> Integer.compare(left.offset(), right.offset()));
         return Collections.unmodifiableList(linter.findings);
     }
-
-    private static final Comparator<Finding> BY_OFFSET =
-            new Comparator<Finding>() {
-                @Override
-                public int compare(Finding left, Finding right) {
-                    return Integer.compare(left.offset(), right.offset());
-                }
-            };
 
     private void add(Rule rule, Item item, String sentence, String remedy) {
         int offset = item == null ? Finding.NO_OFFSET : item.offset();
@@ -189,9 +174,7 @@ final class Linter {
     private void characteristic(Characteristic characteristic) {
         String type = characteristic.type();
         boolean isForeign = foreign.contains(characteristic.parent());
-        if (type == null) {
-            add(Rule.TYPE_MISSING, characteristic, "the characteristic has no TYPE", null);
-        } else if (!isForeign) {
+        if (type != null && !isForeign) {
             type = meant(characteristic, "TYPE", type, TYPES);
         }
         if (isForeign || type != null && !TYPES.containsKey(upper(type)) || "VENDORCONFIG".equals(type)) {
@@ -201,46 +184,42 @@ final class Linter {
         if ("PXLOGICAL".equals(type)) {
             // The machines of a proxy stand in it, and have names of their own.
             proxy = characteristic;
-            present.remove(Identifier.PHYSICAL);
+            present.get(Identifier.PXPHYSICAL).clear();
         }
-        Identifier identifier = Identifier.of(type);
-        if (identifier != null) {
-            identifier(characteristic, identifier);
+        for (Identifier identifier : present.keySet()) {
+            if (identifier.name().equals(type)) {
+                identifier(characteristic, identifier);
+            }
         }
         addresses(characteristic);
     }
 
     private void identifier(Characteristic characteristic, Identifier identifier) {
         Set<String> values = present.get(identifier);
-        if (values == null) {
-            values = new HashSet<>();
-            present.put(identifier, values);
-        }
         boolean isThere = false;
         for (Item child : characteristic.inside()) {
-            String value = valueOf(child, identifier.name);
+            String value = valueOf(child, identifier.parameter);
             if (value == null || value.isEmpty()) {
                 continue;
             }
             isThere = true;
-            boolean isProxys = identifier != Identifier.PHYSICAL || characteristic.parent() == proxy;
-            if (isProxys && !values.add(value) && identifier.twice != null) {
-                String sentence = identifier.name + " " + Printable.quoted(value) + " stands twice";
-                add(identifier.twice, child, sentence, null);
+            boolean isOther =
+                    identifier == Identifier.PXPHYSICAL && characteristic.parent() != proxy;
+            if (!isOther && !values.add(value) && identifier.twice != null) {
+                String shown = identifier.parameter + " " + Printable.quoted(value);
+                add(identifier.twice, child, shown + " stands twice", null);
             }
         }
         if (!isThere && identifier.missing != null) {
-            String sentence = "the " + identifier.type + " has no " + identifier.name;
+            String sentence = "the " + identifier + " has no " + identifier.parameter;
             add(identifier.missing, characteristic, sentence, null);
         }
     }
 
     /** The value of a parameter of a name in any case; null when it has none or is none. */
     private static String valueOf(Item item, String name) {
-        if (!(item instanceof Parameter) || !name.equalsIgnoreCase(((Parameter) item).name())) {
-            return null;
-        }
-        return ((Parameter) item).value();
+        boolean is = item instanceof Parameter && name.equalsIgnoreCase(item.called());
+        return is ? ((Parameter) item).value() : null;
     }
 
     private static String firstValue(Item item, String name) {
@@ -288,11 +267,7 @@ final class Linter {
 
     private void parameter(Parameter parameter, List<Parameter> references) {
         String name = parameter.name();
-        if (name == null) {
-            add(Rule.NAME_MISSING, parameter, "the parm has no NAME", null);
-            return;
-        }
-        if (foreign.contains(parameter.parent())) {
+        if (name == null || foreign.contains(parameter.parent())) {
             return;
         }
         name = meant(parameter, "NAME", name, NAMES);
@@ -340,22 +315,22 @@ final class Linter {
 
     private void reference(Parameter reference) {
         boolean isProxy = "TO-PROXY".equalsIgnoreCase(reference.name());
-        Identifier identifier = isProxy ? Identifier.PROXY_ID : Identifier.NAPID;
-        Set<String> targets = present.get(identifier);
+        Identifier identifier = isProxy ? Identifier.PXLOGICAL : Identifier.NAPDEF;
         String value = reference.value();
-        boolean isFound = targets != null && targets.contains(value) || !isProxy && INTERNET.equals(value);
-        if (!isFound) {
+        if (!present.get(identifier).contains(value) && (isProxy || !INTERNET.equals(value))) {
             String shown = value == null ? "without a value" : Printable.quoted(value);
-            String sentence = reference.name() + " " + shown + " leads to no " + identifier.type;
+            String sentence = reference.name() + " " + shown + " leads to no " + identifier;
             add(isProxy ? Rule.TO_PROXY : Rule.TO_NAPID, reference, sentence, null);
         }
     }
 
     private void deviations(List<Deviation> deviations) {
         for (Deviation deviation : deviations) {
-            boolean isRule = deviation.kind() == Deviation.Kind.NAME_MISSING
-                    || deviation.kind() == Deviation.Kind.TYPE_MISSING;
-            if (!isRule) {
+            boolean isName = deviation.kind() == Kind.NAME_MISSING;
+            if (isName || deviation.kind() == Kind.TYPE_MISSING) {
+                Rule rule = isName ? Rule.NAME_MISSING : Rule.TYPE_MISSING;
+                add(rule, deviation.item(), deviation.sentence(), null);
+            } else {
                 findings.add(Finding.of(Rule.FORMAT, deviation.item(), deviation.offset(),
                         deviation.sentence(), null));
             }
@@ -372,15 +347,11 @@ final class Linter {
             told.add(item);
         }
         if (!verdict.isAccepted()) {
-            boolean isHeader = verdict.isHeaderRefused();
-            Item item = isHeader ? null : document.itemAt(verdict.offset());
-            StringBuilder right = new StringBuilder();
-            for (String expected : verdict.expected()) {
-                right.append(right.length() == 0 ? "" : ", ").append(expected);
-            }
+            Item item = verdict.isHeaderRefused() ? null : document.itemAt(verdict.offset());
+            String expected = verdict.expected().toString();
+            String right = expected.substring(1, expected.length() - 1);
             findings.add(Finding.of(Rule.LIBRARY_REFUSES, item, verdict.offset(),
-                    "the library refuses this: " + verdict.reason(),
-                    right.length() == 0 ? null : right.toString()));
+                    "the library refuses this: " + verdict.reason(), right.isEmpty() ? null : right));
         }
     }
 }

@@ -1,7 +1,5 @@
 package com.qvomacp.eng.omacp;
 
-import java.util.Locale;
-
 /** The options with which a message that was read could have been encoded. */
 final class MessageOptions {
     private static final int FIRST_TEXT = 0x20;
@@ -28,33 +26,32 @@ final class MessageOptions {
 
     private void header(PushHeader header) {
         ContentType type = header.contentType();
-        boolean text = header.byteAt(type.mediaTypeOffset()) >= FIRST_TEXT
-                && header.byteAt(type.mediaTypeOffset()) < 0x80;
-        boolean quoted = header.byteAt(type.offset()) <= LONGEST_SHORT_LENGTH;
-        set(
-                EncodeOption.CONTENT_TYPE,
-                quoted ? text ? "quoted-text" : "quoted" : text ? "text" : "short");
+        int mediaType = header.byteAt(type.mediaTypeOffset());
+        boolean isText = mediaType >= FIRST_TEXT && mediaType < 0x80;
+        boolean isQuoted = header.byteAt(type.offset()) <= LONGEST_SHORT_LENGTH;
+        String form = isText ? "text" : "short";
+        set(EncodeOption.CONTENT_TYPE, isQuoted ? isText ? "quoted-text" : "quoted" : form);
         SecurityMethod method = header.securityMethod();
         boolean isSecured = method != SecurityMethod.NONE && method != SecurityMethod.UNKNOWN;
         if (isSecured) {
-            set(EncodeOption.SEC, method.name().toLowerCase(Locale.ROOT));
+            set(EncodeOption.SEC, Printable.nameOf(method));
         }
         for (HeaderField parameter : type.parameters()) {
             security(parameter, header);
         }
         if (header.transactionIdentifier() >= 0) {
-            set(EncodeOption.TID, hexadecimal(header.transactionIdentifier()));
+            set(EncodeOption.TID, hexadecimal(header, 0, 1));
         }
         StringBuilder further = new StringBuilder();
         int at = type.offset() + type.length();
         for (HeaderField field : header.fields()) {
             // Encoding writes them anew.
             if (isSecured && security(field, header)) {
-                append(further, header, at, field.offset());
+                further.append(hexadecimal(header, at, field.offset()));
                 at = field.offset() + field.length();
             }
         }
-        append(further, header, at, header.length());
+        further.append(hexadecimal(header, at, header.length()));
         set(EncodeOption.HEADERS, further.toString());
     }
 
@@ -67,10 +64,8 @@ final class MessageOptions {
         return is;
     }
 
-    private static void append(StringBuilder to, PushHeader header, int from, int end) {
-        for (int at = from; at < end; ++at) {
-            to.append(hexadecimal(header.byteAt(at)));
-        }
+    private static String hexadecimal(PushHeader header, int from, int end) {
+        return HeaderReader.hexadecimal(header.bytes(), from, end - from);
     }
 
     private void document(ProvisioningDocument document) {
@@ -80,12 +75,9 @@ final class MessageOptions {
         int table = document.stringTable().length;
         if (document.publicIdentifier() == 0) {
             set(EncodeOption.IDENTIFIER, "table");
-            table -= document.documentType().length() + 1;
+            String type = document.documentType();
+            table -= type == null ? 0 : type.length() + 1;
         }
         set(EncodeOption.STRINGS, table > 0 ? "table" : "inline");
-    }
-
-    private static String hexadecimal(int octet) {
-        return String.format(Locale.ROOT, "%02X", octet);
     }
 }

@@ -101,11 +101,7 @@ public final class Other extends Item {
     /** {@return the item, without its text, which may be a secret: one line of text} */
     @Override
     public String toString() {
-        return "Other{kind="
-                + kind()
-                + (name == null ? "" : ", name=" + Printable.of(name))
-                + ", children="
-                + inside().length
-                + "}";
+        return "Other{kind=" + kind() + (name == null ? "" : ", name=" + Printable.of(name))
+                + ", children=" + inside().length + "}";
     }
 }

@@ -78,9 +78,7 @@ public final class Parameter extends Item {
     /** {@return the parameter, without its value, which may be a secret: one line of text} */
     @Override
     public String toString() {
-        return "Parameter{name="
-                + (name == null ? "none" : Printable.of(name))
-                + (value == null ? ", no value" : ", a value")
-                + "}";
+        return "Parameter{name=" + (name == null ? "none" : Printable.of(name))
+                + (value == null ? ", no value" : ", a value") + "}";
     }
 }

@@ -68,6 +68,6 @@ public final class PhysicalProxy extends TypedCharacteristic {
 
     /** {@return every PORT: the ports of the machine} */
     public List<Port> ports() {
-        return views(Port.class, "PORT");
+        return views(Port.class, Kind.PORT);
     }
 }

@@ -1,5 +1,7 @@
 package com.qvomacp.eng.omacp;
 
+import java.util.Locale;
+
 /** Texts of a message in a form that may stand in one line of a log. */
 final class Printable {
     private static final int LONGEST = 60;
@@ -30,6 +32,11 @@ final class Printable {
         if (end < text.length()) {
             line.append("...");
         }
+    }
+
+    /** The name of a constant, as people and programs write it. */
+    static String nameOf(Enum<?> constant) {
+        return constant.name().toLowerCase(Locale.ROOT).replace('_', '-');
     }
 
     static String quoted(String text) {

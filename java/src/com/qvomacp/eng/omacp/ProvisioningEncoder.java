@@ -17,11 +17,13 @@ import java.util.Map;
  * }</pre>
  */
 public final class ProvisioningEncoder {
-    private final DocumentSource source;
+    private final Item root;
+    private final String version;
     private final EncodeOptions options;
 
-    private ProvisioningEncoder(DocumentSource source, EncodeOptions options) {
-        this.source = source;
+    private ProvisioningEncoder(Item root, String version, EncodeOptions options) {
+        this.root = root;
+        this.version = version;
         this.options = options;
     }
 
@@ -37,8 +39,8 @@ public final class ProvisioningEncoder {
      */
     public static ProvisioningEncoder ofXml(byte[] xml, EncodeOptions options)
             throws EncodingException {
-        XmlReader.Result result = XmlReader.read(xml, false);
-        return new ProvisioningEncoder(result.source, options.orElse(result.options));
+        XmlReader read = new XmlReader(xml, false);
+        return new ProvisioningEncoder(read.root, read.version, options.orElse(read.options));
     }
 
     /**
@@ -51,8 +53,8 @@ public final class ProvisioningEncoder {
      * @throws EncodingException when the bytes are no wap-provisioningdoc, with line and column
      */
     public static List<Finding> lint(byte[] xml) throws EncodingException {
-        XmlReader.Result result = XmlReader.read(xml, true);
-        byte[] body = BodyWriter.write(result.source, result.options);
+        XmlReader read = new XmlReader(xml, true);
+        byte[] body = BodyWriter.write(read.root, read.version, read.options);
         ProvisioningDocument document;
         try {
             document = ProvisioningDocument.of(body, ReadOptions.DEFAULT
@@ -61,15 +63,15 @@ public final class ProvisioningEncoder {
             throw new AssertionError(e);
         }
         // The items stand in the body in the order of their tags.
-        Map<Item, int[]> places = new IdentityHashMap<>();
+        Map<Item, Item> tags = new IdentityHashMap<>();
         Walk items = new Walk(document.root());
-        for (int[] place : result.source.places) {
-            places.put(items.next(), place);
+        Walk elements = new Walk(read.root);
+        for (Item element; (element = elements.next()) != null; ) {
+            tags.put(items.next(), element);
         }
         List<Finding> findings = new ArrayList<>();
         for (Finding finding : document.lint()) {
-            int[] place = places.get(finding.item());
-            findings.add(finding.at(place[0], place[1]));
+            findings.add(finding.at(read.place(tags.get(finding.item()))));
         }
         return Collections.unmodifiableList(findings);
     }
@@ -85,7 +87,18 @@ public final class ProvisioningEncoder {
      */
     public static ProvisioningEncoder of(ProvisioningDocument document, EncodeOptions options)
             throws EncodingException {
-        return new ProvisioningEncoder(source(document), options);
+        Walk items = new Walk(document.root());
+        items.next();
+        for (Item item; (item = items.next()) != null; ) {
+            if (item instanceof Other || item.called() == null) {
+                throw EncodingException.in(
+                        item.path(), "what stands here is no element of the document type");
+            }
+            if (item instanceof Parameter) {
+                items.pass();
+            }
+        }
+        return new ProvisioningEncoder(document.root(), document.version(), options);
     }
 
     /**
@@ -99,8 +112,7 @@ public final class ProvisioningEncoder {
      */
     public static ProvisioningEncoder of(ProvisioningMessage message, EncodeOptions options)
             throws EncodingException {
-        return new ProvisioningEncoder(
-                source(message.document()), options.orElse(MessageOptions.of(message)));
+        return of(message.document(), options.orElse(MessageOptions.of(message)));
     }
 
     /**
@@ -118,7 +130,7 @@ public final class ProvisioningEncoder {
      * @throws EncodingException when a text cannot be written in the character set, with its path
      */
     public byte[] body() throws EncodingException {
-        return BodyWriter.write(source, options);
+        return BodyWriter.write(root, version, options);
     }
 
     /**
@@ -153,41 +165,6 @@ public final class ProvisioningEncoder {
      * @throws EncodingException when a text holds a character that XML does not have, with its path
      */
     public String xml() throws EncodingException {
-        return XmlWriter.write(source, options);
-    }
-
-    /** The steps of a document, whose nesting costs no stack. */
-    private static DocumentSource source(ProvisioningDocument document) throws EncodingException {
-        DocumentSource source = new DocumentSource(document.version());
-        List<List<Item>> open = new ArrayList<>();
-        List<Integer> places = new ArrayList<>();
-        open.add(document.children());
-        places.add(0);
-        while (true) {
-            int innermost = open.size() - 1;
-            int place = places.get(innermost);
-            if (place == open.get(innermost).size()) {
-                open.remove(innermost);
-                places.remove(innermost);
-                if (innermost == 0) {
-                    return source;
-                }
-                source.end();
-                continue;
-            }
-            places.set(innermost, place + 1);
-            Item item = open.get(innermost).get(place);
-            if (item instanceof Characteristic && ((Characteristic) item).type() != null) {
-                Characteristic characteristic = (Characteristic) item;
-                source.characteristic(characteristic.type());
-                open.add(characteristic.children());
-                places.add(0);
-            } else if (item instanceof Parameter && ((Parameter) item).name() != null) {
-                source.parameter(((Parameter) item).name(), ((Parameter) item).value());
-            } else {
-                throw EncodingException.in(
-                        item.path(), "what stands here is no element of the document type");
-            }
-        }
+        return XmlWriter.write(root, version, options);
     }
 }

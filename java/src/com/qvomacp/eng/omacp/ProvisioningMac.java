@@ -58,9 +58,11 @@ public final class ProvisioningMac {
         boolean isTold = method == SecurityMethod.USERPINMAC;
         MacResult missing = isTold ? null : missing(method, mac);
         missing = missing != null ? missing : unusable(method, pin, imsi);
-        return missing != null
-                ? missing
-                : compare(compute(method, body, pin, imsi), isTold ? secondHalf(pin) : mac);
+        if (missing != null) {
+            return missing;
+        }
+        String stated = isTold ? pin.substring(pin.length() / 2) : mac;
+        return compare(compute(method, body, pin, imsi), stated);
     }
 
     /**
@@ -98,7 +100,7 @@ public final class ProvisioningMac {
             return null;
         }
         if (method == SecurityMethod.USERPINMAC) {
-            return told(firstHalf(pin), body);
+            return told(pin.substring(0, pin.length() / 2), body);
         }
         byte[] network = isOfNetwork(method) ? imsiKey(imsi) : new byte[0];
         byte[] user = method == SecurityMethod.NETWPIN ? new byte[0] : utf8(pin);
@@ -148,19 +150,15 @@ public final class ProvisioningMac {
         if (isOfNetwork(method) && !isDigits(imsi, 1, LONGEST_IMSI)) {
             return MacResult.UNUSABLE_IMSI;
         }
-        return method == SecurityMethod.NETWPIN || isPin(method, pin)
-                ? null
-                : MacResult.UNUSABLE_PIN;
+        boolean isPin = pin != null && !pin.isEmpty();
+        if (method == SecurityMethod.USERPINMAC) {
+            isPin = isDigits(pin, 2 * SHORTEST_HALF, 2 * LONGEST_HALF) && pin.length() % 2 == 0;
+        }
+        return isPin || method == SecurityMethod.NETWPIN ? null : MacResult.UNUSABLE_PIN;
     }
 
     private static boolean isOfNetwork(SecurityMethod method) {
         return method == SecurityMethod.NETWPIN || method == SecurityMethod.USERNETWPIN;
-    }
-
-    private static boolean isPin(SecurityMethod method, String pin) {
-        return method == SecurityMethod.USERPINMAC
-                ? isDigits(pin, 2 * SHORTEST_HALF, 2 * LONGEST_HALF) && pin.length() % 2 == 0
-                : pin != null && !pin.isEmpty();
     }
 
     private static boolean isDigits(String text, int least, int most) {
@@ -171,19 +169,10 @@ public final class ProvisioningMac {
         return isGood;
     }
 
-    private static String firstHalf(String pin) {
-        return pin.substring(0, pin.length() / 2);
-    }
-
-    private static String secondHalf(String pin) {
-        return pin.substring(pin.length() / 2);
-    }
-
     private static MacResult compare(String computed, String stated) {
         byte[] capitals = utf8(stated.toUpperCase(Locale.ROOT));
-        return MessageDigest.isEqual(utf8(computed), capitals)
-                ? MacResult.RIGHT
-                : MacResult.WRONG;
+        boolean isRight = MessageDigest.isEqual(utf8(computed), capitals);
+        return isRight ? MacResult.RIGHT : MacResult.WRONG;
     }
 
     /** The MAC as digits, as many as the key has. */

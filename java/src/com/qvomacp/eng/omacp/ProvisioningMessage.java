@@ -1,5 +1,6 @@
 package com.qvomacp.eng.omacp;
 
+import com.qvomacp.eng.omacp.TypedCharacteristic.Kind;
 import java.io.ByteArrayOutputStream;
 import java.util.Arrays;
 import java.util.List;
@@ -208,22 +209,22 @@ public final class ProvisioningMessage {
 
     /** {@return the proxies: every PXLOGICAL} */
     public List<Proxy> proxies() {
-        return views(Proxy.class, "PXLOGICAL");
+        return views(Proxy.class, Kind.PXLOGICAL);
     }
 
     /** {@return the network access points: every NAPDEF} */
     public List<AccessPoint> accessPoints() {
-        return views(AccessPoint.class, "NAPDEF");
+        return views(AccessPoint.class, Kind.NAPDEF);
     }
 
     /** {@return where further provisioning comes from: every BOOTSTRAP} */
     public List<Bootstrap> bootstraps() {
-        return views(Bootstrap.class, "BOOTSTRAP");
+        return views(Bootstrap.class, Kind.BOOTSTRAP);
     }
 
     /** {@return the identities that the client gets: every CLIENTIDENTITY} */
     public List<ClientIdentity> clientIdentities() {
-        return views(ClientIdentity.class, "CLIENTIDENTITY");
+        return views(ClientIdentity.class, Kind.CLIENTIDENTITY);
     }
 
     /** {@return CLIENT-ID of the first CLIENTIDENTITY; {@code null} when it is not set} */
@@ -234,31 +235,31 @@ public final class ProvisioningMessage {
 
     /** {@return what vendors' own software is told: every VENDORCONFIG} */
     public List<VendorConfiguration> vendorConfigurations() {
-        return views(VendorConfiguration.class, "VENDORCONFIG");
+        return views(VendorConfiguration.class, Kind.VENDORCONFIG);
     }
 
     /** {@return the settings of applications: every APPLICATION} */
     public List<Application> applications() {
-        return views(Application.class, "APPLICATION");
+        return views(Application.class, Kind.APPLICATION);
     }
 
     /** {@return which traffic takes which way: every ACCESS} */
     public List<AccessRule> accessRules() {
-        return views(AccessRule.class, "ACCESS");
+        return views(AccessRule.class, Kind.ACCESS);
     }
 
     /** {@return the Wi-Fi networks: every WI-FI} */
     public List<Wifi> wifis() {
-        return views(Wifi.class, "WI-FI");
+        return views(Wifi.class, Kind.WI_FI);
     }
 
     /** {@return the settings for voice over Wi-Fi: every such characteristic} */
     public List<VoWifi> voWifis() {
-        return views(VoWifi.class, "Vodafone VoWiFi");
+        return views(VoWifi.class, Kind.VODAFONE_VOWIFI);
     }
 
-    private <V> List<V> views(Class<V> kind, String type) {
-        return TypedCharacteristic.views(document.root(), kind, type);
+    private <V> List<V> views(Class<V> view, Kind kind) {
+        return TypedCharacteristic.views(document.root(), view, kind);
     }
 
     /**

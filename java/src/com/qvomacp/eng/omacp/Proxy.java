@@ -81,16 +81,16 @@ public final class Proxy extends TypedCharacteristic {
 
     /** {@return every PXAUTHINFO: how to authenticate towards the proxy} */
     public List<ProxyAuthentication> authentications() {
-        return views(ProxyAuthentication.class, "PXAUTHINFO");
+        return views(ProxyAuthentication.class, Kind.PXAUTHINFO);
     }
 
     /** {@return every PORT: the ports of each physical proxy that has none of its own} */
     public List<Port> ports() {
-        return views(Port.class, "PORT");
+        return views(Port.class, Kind.PORT);
     }
 
     /** {@return every PXPHYSICAL: the machines behind the proxy} */
     public List<PhysicalProxy> physicalProxies() {
-        return views(PhysicalProxy.class, "PXPHYSICAL");
+        return views(PhysicalProxy.class, Kind.PXPHYSICAL);
     }
 }

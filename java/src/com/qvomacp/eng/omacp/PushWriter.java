@@ -33,9 +33,8 @@ final class PushWriter {
             headers.write(LENGTH_QUOTE);
             BodyWriter.integer(contentType.size(), headers);
         }
-        headers.write(contentType.toByteArray(), 0, contentType.size());
-        byte[] further = hexadecimal(EncodeOption.HEADERS, options);
-        headers.write(further, 0, further.length);
+        append(contentType.toByteArray(), headers);
+        append(hexadecimal(EncodeOption.HEADERS, options), headers);
 
         byte[] tid = hexadecimal(EncodeOption.TID, options);
         if (tid.length != 1) {
@@ -45,8 +44,8 @@ final class PushWriter {
         push.write(tid[0]);
         push.write(PUSH);
         BodyWriter.integer(headers.size(), push);
-        push.write(headers.toByteArray(), 0, headers.size());
-        push.write(body, 0, body.length);
+        append(headers.toByteArray(), push);
+        append(body, push);
         return push.toByteArray();
     }
 
@@ -96,9 +95,12 @@ final class PushWriter {
         String imsi = options.value(EncodeOption.IMSI);
         String mac = ProvisioningMac.compute(method, body, pin, imsi);
         if (mac == null) {
+            String needsPin = method == SecurityMethod.NETWPIN ? "" : " a PIN";
+            String needsImsi = method == SecurityMethod.USERPIN ? "" : " an IMSI of 1 to 15 digits";
+            String and = needsPin.isEmpty() || needsImsi.isEmpty() ? "" : " and";
             throw EncodingException.in(
                     null,
-                    options.value(EncodeOption.SEC) + " needs " + needs(method),
+                    options.value(EncodeOption.SEC) + " needs" + needsPin + and + needsImsi,
                     EncodeOption.PIN.optionName(),
                     EncodeOption.IMSI.optionName(),
                     EncodeOption.KEY.optionName());
@@ -106,21 +108,13 @@ final class PushWriter {
         return mac;
     }
 
-    private static String needs(SecurityMethod method) {
-        switch (method) {
-            case NETWPIN:
-                return "an IMSI of 1 to 15 digits";
-            case USERPIN:
-                return "a PIN";
-            default:
-                return "a PIN and an IMSI of 1 to 15 digits";
-        }
+    private static void text(String text, ByteArrayOutputStream out) {
+        append(text.getBytes(StandardCharsets.US_ASCII), out);
+        out.write(0);
     }
 
-    private static void text(String text, ByteArrayOutputStream out) {
-        byte[] bytes = text.getBytes(StandardCharsets.US_ASCII);
+    private static void append(byte[] bytes, ByteArrayOutputStream out) {
         out.write(bytes, 0, bytes.length);
-        out.write(0);
     }
 
     private static byte[] hexadecimal(EncodeOption option, EncodeOptions options)

@@ -92,12 +92,7 @@ public final class ReadOptions {
     /** {@return the options: one line of text} */
     @Override
     public String toString() {
-        return "ReadOptions{inputLimit="
-                + inputLimit
-                + ", textLimit="
-                + textLimit
-                + ", acceptedOnly="
-                + acceptedOnly
-                + "}";
+        return "ReadOptions{inputLimit=" + inputLimit + ", textLimit=" + textLimit
+                + ", acceptedOnly=" + acceptedOnly + "}";
     }
 }

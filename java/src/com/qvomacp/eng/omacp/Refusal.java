@@ -128,12 +128,11 @@ final class Refusal {
 
         /** Where the walk has ended, which may be behind the one text between characteristics. */
         private Place place() {
-            boolean isText =
-                    stop.offset < walk.size
+            boolean isBehindText =
+                    stop.place == Place.NEXT_CHARACTERISTIC
+                            && stop.offset < walk.size
                             && (walk.data[stop.offset] & LibraryText.TAG_MASK) == LibraryText.STR_I;
-            return stop.place == Place.NEXT_CHARACTERISTIC && isText
-                    ? Place.BEHIND_TEXT
-                    : stop.place;
+            return isBehindText ? Place.BEHIND_TEXT : stop.place;
         }
 
         // ---- What stands there
@@ -223,17 +222,10 @@ final class Refusal {
         // ---- What would have been taken
 
         List<String> expected() {
+            if (!stop.cause.expected.isEmpty()) {
+                return stop.cause.expected;
+            }
             switch (stop.cause) {
-                case EMPTY_BODY:
-                    return Collections.singletonList("a WBXML document");
-                case DOCUMENT_TYPE:
-                    return Arrays.asList(
-                            "public identifier 11",
-                            "public identifier 0 with a string table that begins with \""
-                                    + LibraryWalk.DOCUMENT_TYPE
-                                    + '"');
-                case NO_SUCH_PAGE:
-                    return Arrays.asList("page 0", "page 1");
                 case NO_SUCH_STRING:
                     return walk.unreadItem == null
                             ? Collections.singletonList("an index below " + walk.tableLength)
@@ -253,24 +245,15 @@ final class Refusal {
 
         private List<String> expectedThere() {
             List<String> expected = new ArrayList<>(place().expected);
-            switch (stop.place) {
-                case TYPE:
-                    expected.addAll(LibraryKind.expectedTypes(walk.page));
-                    break;
-                case IN_CHARACTERISTIC:
-                    if (kind != null && kind.nests) {
-                        expected.add(LibraryStop.CHARACTERISTIC);
-                    }
-                    if (kind != null) {
-                        expected.add(LibraryStop.PARM);
-                    }
-                    break;
-                case PARM:
-                case MASKED_NAME:
-                    expected.addAll(kind.expectedParms());
-                    break;
-                default:
-                    break;
+            if (stop.place == Place.TYPE) {
+                expected.addAll(LibraryKind.expectedTypes(walk.page));
+            } else if (stop.place == Place.PARM || stop.place == Place.MASKED_NAME) {
+                expected.addAll(kind.expectedParms());
+            } else if (stop.place == Place.IN_CHARACTERISTIC && kind != null) {
+                if (kind.nests) {
+                    expected.add(LibraryStop.CHARACTERISTIC);
+                }
+                expected.add(LibraryStop.PARM);
             }
             return expected;
         }
@@ -278,10 +261,11 @@ final class Refusal {
         // ---- Why
 
         String reason(String found) {
+            if (stop.cause.reason != null) {
+                return stop.cause.reason;
+            }
             boolean isAtEnd = walk.at >= walk.size;
             switch (stop.cause) {
-                case EMPTY_BODY:
-                    return "the body is empty";
                 case DOCUMENT_TYPE:
                     return wrongType();
                 case ENDED:
@@ -297,14 +281,8 @@ final class Refusal {
                     return isAtEnd
                             ? "the body ends within the length of opaque data"
                             : "the length of the opaque data has no end";
-                case OPAQUE_TOO_LONG:
-                    return "the opaque data is longer than the rest of the body";
-                case EMPTY_NAME:
-                    return "the name of the parameter is empty";
                 case UNKNOWN_NAME:
                     return Printable.quoted(walk.nameText()) + " is no parameter of " + kind.type;
-                case TOO_MUCH_TEXT:
-                    return "the body is decoded to too much text";
                 default:
                     return found + " " + place().refused + characteristic(false);
             }
@@ -323,10 +301,11 @@ final class Refusal {
             if (walk.at < walk.size) {
                 return "the " + walk.unreadItem + " has no end";
             }
-            String within = "the body ends within its header, where its ";
             return walk.size == 1
                     ? "the body ends behind its version"
-                    : within + walk.unreadItem + " is expected";
+                    : "the body ends within its header, where its "
+                            + walk.unreadItem
+                            + " is expected";
         }
 
         private String ended() {

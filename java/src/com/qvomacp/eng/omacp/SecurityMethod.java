@@ -29,6 +29,7 @@ public enum SecurityMethod {
     UNKNOWN;
 
     private static final SecurityMethod[] BY_NUMBER = {NETWPIN, USERPIN, USERNETWPIN, USERPINMAC};
+    private static final String[] DIGITS = {"0", "1", "2", "3"};
 
     /** The name of the method that a number stands for; its digits when it stands for none. */
     static String nameOf(long number) {
@@ -41,7 +42,7 @@ public enum SecurityMethod {
     static SecurityMethod stated(String sec) {
         for (int number = 0; number < BY_NUMBER.length; ++number) {
             SecurityMethod method = BY_NUMBER[number];
-            if (method.name().equalsIgnoreCase(sec) || Integer.toString(number).equals(sec)) {
+            if (method.name().equalsIgnoreCase(sec) || DIGITS[number].equals(sec)) {
                 return method;
             }
         }

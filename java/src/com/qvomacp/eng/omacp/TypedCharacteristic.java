@@ -28,48 +28,80 @@ public abstract class TypedCharacteristic {
         this.characteristic = characteristic;
     }
 
-    /**
-     * The view of a characteristic of a type. A switch: for the first method reference a new
-     * virtual machine takes longer than for everything else of a message; and not of the classes'
-     * own type, for which it would load them all.
-     */
-    private static Object of(String type, Characteristic in) {
-        switch (type) {
-            case "NAPDEF": return new AccessPoint(in);
-            case "NAPAUTHINFO": return new AccessPointAuthentication(in);
-            case "ACCESS": return new AccessRule(in);
-            case "APPLICATION": return new Application(in);
-            case "APPADDR": return new ApplicationAddress(in);
-            case "APPAUTH": return new ApplicationAuthentication(in);
-            case "BOOTSTRAP": return new Bootstrap(in);
-            case "CLIENTIDENTITY": return new ClientIdentity(in);
-            case "PXPHYSICAL": return new PhysicalProxy(in);
-            case "PORT": return new Port(in);
-            case "PXLOGICAL": return new Proxy(in);
-            case "PXAUTHINFO": return new ProxyAuthentication(in);
-            case "RESOURCE": return new Resource(in);
-            case "ROAMING": return new Roaming(in);
-            case "VALIDITY": return new Validity(in);
-            case "VENDORCONFIG": return new VendorConfiguration(in);
-            case "Vodafone VoWiFi": return new VoWifi(in);
-            case "WI-FI": return new Wifi(in);
-            default: throw new AssertionError(type);
+    /** The kinds that there are views of. */
+    enum Kind {
+        NAPDEF, NAPAUTHINFO, ACCESS, APPLICATION, APPADDR, APPAUTH, BOOTSTRAP, CLIENTIDENTITY,
+        PXPHYSICAL, PORT, PXLOGICAL, PXAUTHINFO, RESOURCE, ROAMING, VALIDITY, VENDORCONFIG,
+        VODAFONE_VOWIFI("Vodafone VoWiFi"), WI_FI("WI-FI");
+
+        /** What TYPE is. */
+        final String type;
+
+        Kind() {
+            type = name();
+        }
+
+        Kind(String type) {
+            this.type = type;
+        }
+
+        /**
+         * The view of a characteristic. A switch: for the first method reference a new virtual
+         * machine takes longer than for everything else of a message; and not of the classes' own
+         * type, for which it would load them all.
+         */
+        private Object of(Characteristic in) {
+            switch (this) {
+                case NAPDEF: return new AccessPoint(in);
+                case NAPAUTHINFO: return new AccessPointAuthentication(in);
+                case ACCESS: return new AccessRule(in);
+                case APPLICATION: return new Application(in);
+                case APPADDR: return new ApplicationAddress(in);
+                case APPAUTH: return new ApplicationAuthentication(in);
+                case BOOTSTRAP: return new Bootstrap(in);
+                case CLIENTIDENTITY: return new ClientIdentity(in);
+                case PXPHYSICAL: return new PhysicalProxy(in);
+                case PORT: return new Port(in);
+                case PXLOGICAL: return new Proxy(in);
+                case PXAUTHINFO: return new ProxyAuthentication(in);
+                case RESOURCE: return new Resource(in);
+                case ROAMING: return new Roaming(in);
+                case VALIDITY: return new Validity(in);
+                case VENDORCONFIG: return new VendorConfiguration(in);
+                case VODAFONE_VOWIFI: return new VoWifi(in);
+                case WI_FI: return new Wifi(in);
+                default: throw new AssertionError(this);
+            }
         }
     }
 
-    /** A view of each characteristic of a type directly in an item, in a list that stays so. */
-    static <V> List<V> views(Item item, Class<V> kind, String type) {
-        // Most messages lack most kinds: the list is made for the first.
-        List<V> views = Collections.emptyList();
-        for (Item child : item.inside()) {
-            if (child instanceof Characteristic && type.equals(((Characteristic) child).type())) {
-                if (views.isEmpty()) {
-                    views = new ArrayList<>();
-                }
-                views.add(kind.cast(of(type, (Characteristic) child)));
-            }
+    /** A view of each characteristic of a kind directly in an item, in a list that stays so. */
+    static <V> List<V> views(Item item, Class<V> view, Kind kind) {
+        // Most messages lack most kinds.
+        Item[] inside = item.inside();
+        int first = next(inside, item.beforeCharacteristics(), kind);
+        return first == inside.length
+                ? Collections.<V>emptyList()
+                : Collections.unmodifiableList(viewsFrom(inside, first, view, kind));
+    }
+
+    private static <V> List<V> viewsFrom(Item[] inside, int first, Class<V> view, Kind kind) {
+        List<V> views = new ArrayList<>(Math.min(inside.length - first, 8));
+        for (int i = first; i < inside.length; i = next(inside, i + 1, kind)) {
+            views.add(view.cast(kind.of((Characteristic) inside[i])));
         }
-        return views.isEmpty() ? views : Collections.unmodifiableList(views);
+        return views;
+    }
+
+    /** The place of the next characteristic of a kind; behind the last item when there is none. */
+    private static int next(Item[] items, int from, Kind kind) {
+        int i = from;
+        while (i < items.length
+                && !(items[i] instanceof Characteristic
+                        && kind.type.equals(((Characteristic) items[i]).type()))) {
+            ++i;
+        }
+        return i;
     }
 
     /** {@return the characteristic of the tree, with everything in it; never {@code null}} */
@@ -101,8 +133,8 @@ public abstract class TypedCharacteristic {
         return characteristic.values(name);
     }
 
-    final <V> List<V> views(Class<V> kind, String type) {
-        return views(characteristic, kind, type);
+    final <V> List<V> views(Class<V> view, Kind kind) {
+        return views(characteristic, view, kind);
     }
 
     /**

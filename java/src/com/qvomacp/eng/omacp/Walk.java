@@ -32,6 +32,13 @@ final class Walk {
         return item;
     }
 
+    /** Goes past what stands in the item that came last. */
+    void pass() {
+        if (next[depth] == 0) {
+            --depth;
+        }
+    }
+
     static boolean same(Item left, Item right) {
         if (left == right) {
             return true;

@@ -1,6 +1,8 @@
 package com.qvomacp.eng.omacp;
 
 import java.io.ByteArrayOutputStream;
+import java.util.Arrays;
+import java.util.List;
 
 /** Which types, names and values are written as tokens, and as which. */
 final class WritingTokens {
@@ -14,29 +16,23 @@ final class WritingTokens {
 
     private static final int LAST_NAME = 0x3B;
 
-    /** What values tokens stand for: a page, a parameter, its first and its last token. */
+    /** What values tokens stand for: a page, the first and the last token, and the parameters. */
     private static final Object[][] VALUES = {
-        {0, "NAP-ADDRTYPE", 0x85, 0x8C},
-        {0, "LOCAL-ADDRTYPE", 0x85, 0x8C},
-        {0, "PXADDRTYPE", 0x85, 0x8C},
-        {0, "CALLTYPE", 0x90, 0x95},
-        {0, "AUTHTYPE", 0x9A, 0x9F},
-        {0, "PXAUTH-TYPE", 0x9A, 0x9F},
-        {0, "PPGAUTH-TYPE", 0x9A, 0x9F},
-        {0, "BEARER", 0xA2, 0xBC},
-        {0, "LINKSPEED", 0xC5, 0xC5},
-        {0, "DNLINKSPEED", 0xC5, 0xC5},
-        {0, "SERVICE", 0xCA, 0xD3},
-        {0, "AUTH-ENTITY", 0xE0, 0xE1},
-        {1, "ADDRTYPE", 0x86, 0x88},
-        {1, "AAUTHLEVEL", 0x8D, 0x8E},
-        {1, "AAUTHTYPE", 0x91, 0x93},
+        {0, 0x85, 0x8C, "NAP-ADDRTYPE", "LOCAL-ADDRTYPE", "PXADDRTYPE"},
+        {0, 0x90, 0x95, "CALLTYPE"},
+        {0, 0x9A, 0x9F, "AUTHTYPE", "PXAUTH-TYPE", "PPGAUTH-TYPE"},
+        {0, 0xA2, 0xBC, "BEARER"},
+        {0, 0xC5, 0xC5, "LINKSPEED", "DNLINKSPEED"},
+        {0, 0xCA, 0xD3, "SERVICE"},
+        {0, 0xE0, 0xE1, "AUTH-ENTITY"},
+        {1, 0x86, 0x88, "ADDRTYPE"},
+        {1, 0x8D, 0x8E, "AAUTHLEVEL"},
+        {1, 0x91, 0x93, "AAUTHTYPE"},
     };
 
-    /** The tokens of each page for which the library answers another text than theirs, or none. */
-    private static final int[][] ANSWERED_OTHERWISE = {
-        {0x91, 0x92, 0x93, 0x9E, 0xC5, 0xE0, 0xE1}, {0x8E, 0x91}
-    };
+    /** Page and token of those for which the library answers another text than theirs, or none. */
+    private static final List<Integer> ANSWERED_OTHERWISE =
+            Arrays.asList(0x91, 0x92, 0x93, 0x9E, 0xC5, 0xE0, 0xE1, 0x18E, 0x191);
 
     /** The parameter that may hold several values, and what the tokens between and in them say. */
     private static final String JOINED = "AAUTHTYPE";
@@ -84,12 +80,12 @@ final class WritingTokens {
      * @return what has to follow as text; null for nothing
      */
     String writeValue(String type, String name, String value, int page, ByteArrayOutputStream out) {
-        Object[] row = none ? null : row(name, page);
+        Object[] row = row(name, page);
         if (row == null) {
             return value;
         }
         String rest = value;
-        if (name.equals(JOINED) && (!library || type.equals(JOINING))) {
+        if (name.equals(JOINED) && (!library || JOINING.equals(type))) {
             ByteArrayOutputStream first = new ByteArrayOutputStream();
             int comma = rest.indexOf(',');
             while (comma >= 0 && writePiece(row, page, rest.substring(0, comma), first)) {
@@ -105,9 +101,9 @@ final class WritingTokens {
         return writePiece(row, page, rest, out) ? null : rest;
     }
 
-    private static Object[] row(String name, int page) {
+    private Object[] row(String name, int page) {
         for (Object[] row : VALUES) {
-            if ((Integer) row[0] == page && row[1].equals(name)) {
+            if (!none && row[0].equals(page) && Arrays.asList(row).contains(name)) {
                 return row;
             }
         }
@@ -134,21 +130,12 @@ final class WritingTokens {
     }
 
     private int token(Object[] row, int page, String text) {
-        for (int token = (Integer) row[2]; token <= (Integer) row[3]; ++token) {
+        for (int token = (Integer) row[1]; token <= (Integer) row[2]; ++token) {
             if (text.equals(CodePage.of(page).value(token))
-                    && !(library && isAnsweredOtherwise(page, token))) {
+                    && !(library && ANSWERED_OTHERWISE.contains(page << 8 | token))) {
                 return token;
             }
         }
         return NONE;
-    }
-
-    private static boolean isAnsweredOtherwise(int page, int token) {
-        for (int other : ANSWERED_OTHERWISE[page]) {
-            if (other == token) {
-                return true;
-            }
-        }
-        return false;
     }
 }

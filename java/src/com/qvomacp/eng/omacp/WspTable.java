@@ -107,7 +107,7 @@ final class WspTable {
             }
             String name = words[i + 1];
             int nameEnd = name.indexOf('=');
-            names[number] = nameEnd < 0 ? name : name.substring(0, nameEnd);
+            names[number] = (nameEnd < 0 ? name : name.substring(0, nameEnd)).intern();
             kinds[number] = nameEnd < 0 ? Kind.PLAIN : Kind.valueOf(name.substring(nameEnd + 1));
         }
     }

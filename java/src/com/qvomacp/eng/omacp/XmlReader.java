@@ -3,6 +3,7 @@ package com.qvomacp.eng.omacp;
 import java.util.ArrayList;
 import java.util.LinkedHashMap;
 import java.util.List;
+import java.util.Locale;
 import java.util.Map;
 
 /**
@@ -11,14 +12,6 @@ import java.util.Map;
  * document type is read over, and an entity that it may define is an error.
  */
 final class XmlReader {
-    private static final String ROOT = "wap-provisioningdoc";
-    private static final String CHARACTERISTIC = "characteristic";
-    private static final String PARM = "parm";
-    private static final String TYPE = "type";
-    private static final String NAME = "name";
-    private static final String VALUE = "value";
-    private static final String VERSION = "version";
-
     /** A namespace without a prefix says nothing that the element's name does not. */
     private static final String NAMESPACE = "xmlns";
 
@@ -27,34 +20,37 @@ final class XmlReader {
         "lt", "<", "gt", ">", "amp", "&", "quot", "\"", "apos", "'"
     };
 
+    private static final String[] OUTER = {"<wap-provisioningdoc>"};
+    private static final String[] INNER = {"<characteristic>", "<parm>"};
+    private static final String NO_CHARACTER = "a character that XML does not have";
+
     private final XmlText text;
 
     /** Whether a characteristic may lack its type, and a parm its name. */
     private final boolean isLenient;
 
-    private EncodeOptions options = EncodeOptions.NONE;
-    private DocumentSource source;
+    private final TreeBuilder tree = new TreeBuilder(0);
 
-    private XmlReader(XmlText text, boolean isLenient) {
-        this.text = text;
+    /** The document element; the offset of an item is that of its tag among the characters. */
+    final Item root;
+
+    /** The version that the document states; null without one. */
+    final String version;
+
+    /** The options that its instruction states. */
+    EncodeOptions options = EncodeOptions.NONE;
+
+    XmlReader(byte[] bytes, boolean isLenient) throws EncodingException {
+        this.text = new XmlText(bytes);
         this.isLenient = isLenient;
+        document();
+        root = tree.root();
+        version = tree.version();
     }
 
-    /** A document, and the options that its instruction states. */
-    static final class Result {
-        final DocumentSource source;
-        final EncodeOptions options;
-
-        Result(DocumentSource source, EncodeOptions options) {
-            this.source = source;
-            this.options = options;
-        }
-    }
-
-    static Result read(byte[] bytes, boolean isLenient) throws EncodingException {
-        XmlReader reader = new XmlReader(XmlText.of(bytes), isLenient);
-        reader.document();
-        return new Result(reader.source, reader.options);
+    /** Line and column of the tag of an item. */
+    int[] place(Item item) {
+        return text.place(item.offset());
     }
 
     private void document() throws EncodingException {
@@ -66,7 +62,14 @@ final class XmlReader {
             documentType();
             miscellany();
         }
-        root();
+        if (!text.startsWith("<")) {
+            throw text.error(
+                    text.isAtEnd() ? "there is no document" : "text stands in front of the document",
+                    OUTER);
+        }
+        if (begin(Element.DOCUMENT) != null) {
+            content();
+        }
         miscellany();
         if (!text.isAtEnd()) {
             throw text.error(
@@ -93,26 +96,23 @@ final class XmlReader {
     }
 
     private boolean instruction() throws EncodingException {
-        if (!text.startsWith("<?")) {
+        int from = text.at();
+        if (!text.skipIf("<?")) {
             return false;
         }
-        int line = text.line();
-        int column = text.column();
-        text.skip(2);
         String target = text.takeName();
         if (target.equals("xml")) {
-            throw EncodingException.at(
-                    line, column, "an XML declaration stands behind the start of the file");
+            throw text.errorAt(from, "an XML declaration stands behind the start of the file");
         }
         String data = text.takeUntil("?>", "a processing instruction");
         if (target.equals(INSTRUCTION)) {
-            instruction(data, line, column);
+            options(data, from);
         }
         return true;
     }
 
     /** Takes the options of an instruction. */
-    private void instruction(String data, int line, int column) throws EncodingException {
+    private void options(String data, int from) throws EncodingException {
         int at = 0;
         while (at < data.length()) {
             if (XmlText.isBlank(data.charAt(at))) {
@@ -124,29 +124,21 @@ final class XmlReader {
             int end = quote == '"' || quote == '\'' ? data.indexOf(quote, equals + 2) : -1;
             EncodeOption option = end < 0 ? null : EncodeOption.named(data.substring(at, equals));
             if (option == null) {
-                throw EncodingException.at(
-                        line, column, "the instruction " + INSTRUCTION + " cannot be read", names());
+                List<String> names = new ArrayList<>();
+                for (EncodeOption known : EncodeOption.values()) {
+                    names.add(known.optionName());
+                }
+                String sentence = "the instruction " + INSTRUCTION + " cannot be read";
+                throw text.errorAt(from, sentence, names.toArray(new String[0]));
             }
-            String value = data.substring(equals + 2, end);
             try {
-                options = options.with(option, value);
+                options = options.with(option, data.substring(equals + 2, end));
             } catch (IllegalArgumentException e) {
-                throw EncodingException.at(
-                        line,
-                        column,
-                        option.optionName() + " of the instruction has an unknown value",
-                        option.choices().toArray(new String[0]));
+                String sentence = option.optionName() + " of the instruction has an unknown value";
+                throw text.errorAt(from, sentence, option.choices().toArray(new String[0]));
             }
             at = end + 1;
         }
-    }
-
-    private static String[] names() {
-        List<String> names = new ArrayList<>();
-        for (EncodeOption option : EncodeOption.values()) {
-            names.add(option.optionName());
-        }
-        return names.toArray(new String[0]);
     }
 
     /** Reads over the rest of a document type, whatever it declares. */
@@ -170,208 +162,155 @@ final class XmlReader {
         }
     }
 
-    private void root() throws EncodingException {
-        if (!text.startsWith("<")) {
-            throw text.error(
-                    text.isAtEnd() ? "there is no document" : "text stands in front of the document",
-                    "<" + ROOT + ">");
-        }
-        Tag root = tag();
-        root.require(ROOT);
-        source = new DocumentSource(root.only(VERSION, null).get(VERSION));
-        source.places.add(root.place());
-        if (!root.isEmpty) {
-            content();
-        }
-    }
+    // ---- Elements
 
     /** Reads the content of the root, and its end. The elements that are open are counted. */
     private void content() throws EncodingException {
         int open = 1;
         while (open > 0) {
-            between(open == 1 ? ROOT : CHARACTERISTIC);
+            Element around = open == 1 ? Element.DOCUMENT : Element.CHARACTERISTIC;
+            between(around);
             if (text.startsWith("</")) {
-                close(open == 1 ? ROOT : CHARACTERISTIC);
+                end(around);
                 --open;
-                if (open > 0) {
-                    source.end();
-                }
                 continue;
             }
-            Tag tag = tag();
-            source.places.add(tag.place());
-            if (tag.name.equals(PARM)) {
-                Map<String, String> attributes = tag.only(NAME, VALUE);
-                need(tag, NAME);
-                source.parameter(attributes.get(NAME), attributes.get(VALUE));
-                if (!tag.isEmpty) {
-                    between(PARM);
-                    close(PARM);
-                }
-                continue;
-            }
-            tag.require(CHARACTERISTIC);
-            Map<String, String> attributes = tag.only(TYPE, null);
-            need(tag, TYPE);
-            source.characteristic(attributes.get(TYPE));
-            if (tag.isEmpty) {
-                source.end();
-            } else {
+            Element begun = begin(Element.CHARACTERISTIC);
+            if (begun == Element.PARM) {
+                between(Element.PARM);
+                end(Element.PARM);
+            } else if (begun != null) {
                 ++open;
             }
         }
     }
 
-    private void need(Tag tag, String needed) throws EncodingException {
-        if (!isLenient && !tag.attributes.containsKey(needed)) {
-            throw tag.error("<" + tag.name + "> without " + needed, needed);
+    /** Reads a start tag: of the document or, inside it, another; null for an empty one. */
+    private Element begin(Element fitting) throws EncodingException {
+        int from = text.at();
+        text.skip(1);
+        String name = text.takeName();
+        if (name.isEmpty()) {
+            throw text.errorAt(from, "a tag without a name", INNER);
         }
-    }
-
-    /** Reads over what says nothing, up to the next tag. */
-    private void between(String parent) throws EncodingException {
-        while (true) {
-            text.skipBlanks();
-            if (comment() || instruction()) {
-                continue;
-            }
-            if (text.startsWith("<![CDATA[")) {
-                EncodingException error = strayText(parent);
-                text.skip("<![CDATA[".length());
-                if (!text.takeUntil("]]>", "a CDATA section").trim().isEmpty()) {
-                    throw error;
-                }
-                continue;
-            }
-            if (text.isAtEnd()) {
-                throw text.error("the document ends within <" + parent + ">", tags(parent));
-            }
-            if (text.peek() == '&') {
-                // A blank is one however it is written; anything else is text.
-                EncodingException error = strayText(parent);
-                StringBuilder character = new StringBuilder();
-                reference(character);
-                if (!XmlText.isBlank(character.charAt(0))) {
-                    throw error;
-                }
-                continue;
-            }
-            if (!text.startsWith("<")) {
-                throw strayText(parent);
-            }
-            if (parent.equals(PARM) && !text.startsWith("</")) {
-                throw text.error("a parm has no content", tags(parent));
-            }
-            return;
-        }
-    }
-
-    private EncodingException strayText(String parent) {
-        return text.error("text stands in <" + parent + ">", tags(parent));
-    }
-
-    private static String[] tags(String parent) {
-        return parent.equals(PARM)
-                ? new String[] {"</parm>"}
-                : new String[] {"<characteristic>", "<parm>", "</" + parent + ">"};
-    }
-
-    private void close(String name) throws EncodingException {
-        int line = text.line();
-        int column = text.column();
-        text.skip(2);
-        String closed = text.takeName();
-        text.skipBlanks();
-        if (!closed.equals(name) || !text.skipIf(">")) {
-            throw EncodingException.at(line, column, "another element is open", "</" + name + ">");
-        }
-    }
-
-    /** A start tag that was read. */
-    private static final class Tag {
-        final String name;
-        final int line;
-        final int column;
-        final Map<String, String> attributes = new LinkedHashMap<>();
-        boolean isEmpty;
-
-        Tag(String name, int line, int column) {
-            this.name = name;
-            this.line = line;
-            this.column = column;
-        }
-
-        EncodingException error(String sentence, String... expected) {
-            return EncodingException.at(line, column, sentence, expected);
-        }
-
-        void require(String required) throws EncodingException {
-            if (name.equals(required)) {
-                return;
-            }
+        Map<String, String> stated = new LinkedHashMap<>();
+        boolean isEmpty = attributes(stated);
+        Element element = Element.of(name);
+        boolean isInner = fitting != Element.DOCUMENT;
+        if (element != fitting && !(isInner && element == Element.PARM)) {
+            boolean isInCapitals =
+                    name.equalsIgnoreCase(fitting.text) || name.equalsIgnoreCase(Element.PARM.text);
             String sentence =
                     name.indexOf(':') >= 0
                             ? "an element with a prefix"
-                            : name.equalsIgnoreCase(required) || name.equalsIgnoreCase(PARM)
+                            : isInCapitals
                                     ? "element names are in lower case"
                                     : "no element of a provisioning document";
-            if (required.equals(ROOT)) {
-                throw error(sentence, "<" + ROOT + ">");
-            }
-            throw error(sentence, "<characteristic>", "<parm>");
+            throw text.errorAt(from, sentence, isInner ? INNER : OUTER);
         }
-
-        /** The attributes, which are no others than these, or a namespace. */
-        Map<String, String> only(String first, String second) throws EncodingException {
-            for (String attribute : attributes.keySet()) {
-                if (!attribute.equals(first)
-                        && !attribute.equals(second)
-                        && !attribute.equals(NAMESPACE)) {
-                    String sentence =
-                            attribute.indexOf(':') >= 0
-                                    ? "an attribute with a prefix"
-                                    : "no attribute of <" + name + ">";
-                    throw second == null ? error(sentence, first) : error(sentence, first, second);
-                }
-            }
-            return attributes;
+        tree.element(from, from, element, name, true);
+        takeAttributes(from, element, stated);
+        if (isEmpty) {
+            tree.end(from, from);
+            return null;
         }
+        tree.attributesEnd(from, from);
+        return element;
+    }
 
-        int[] place() {
-            return new int[] {line, column};
+    /** Takes the attributes, which are those of the element, or a namespace. */
+    private void takeAttributes(int from, Element element, Map<String, String> stated)
+            throws EncodingException {
+        List<String> known = new ArrayList<>();
+        for (Attribute attribute : new Attribute[] {element.name, element.value}) {
+            if (attribute != null) {
+                known.add(attribute.name().toLowerCase(Locale.ROOT));
+            }
+        }
+        for (Map.Entry<String, String> attribute : stated.entrySet()) {
+            String name = attribute.getKey();
+            if (known.contains(name)) {
+                tree.attribute(from, from, Attribute.of(name), null, attribute.getValue());
+            } else if (!name.equals(NAMESPACE)) {
+                boolean isPrefixed = name.indexOf(':') >= 0;
+                String other = "no attribute of <" + element.text + ">";
+                String sentence = isPrefixed ? "an attribute with a prefix" : other;
+                throw text.errorAt(from, sentence, known.toArray(new String[0]));
+            }
+        }
+        String needed = known.get(0);
+        if (!isLenient && element.name != null && !stated.containsKey(needed)) {
+            throw text.errorAt(from, "<" + element.text + "> without " + needed, needed);
         }
     }
 
-    private Tag tag() throws EncodingException {
-        int line = text.line();
-        int column = text.column();
-        text.skip(1);
-        Tag tag = new Tag(text.takeName(), line, column);
-        if (tag.name.isEmpty()) {
-            throw tag.error("a tag without a name", "<characteristic>", "<parm>");
-        }
+    /** Reads attributes up to the end of their tag; whether the element ends with it. */
+    private boolean attributes(Map<String, String> stated) throws EncodingException {
         while (true) {
             boolean blank = text.skipBlanks();
             if (text.skipIf(">")) {
-                return tag;
+                return false;
             }
             if (text.skipIf("/>")) {
-                tag.isEmpty = true;
-                return tag;
+                return true;
             }
-            EncodingException error = text.error("no attribute", "an attribute", ">", "/>");
+            int from = text.at();
             String name = text.takeName();
             text.skipBlanks();
             if (!blank || name.isEmpty() || !text.skipIf("=")) {
-                throw error;
+                throw text.errorAt(from, "no attribute", "an attribute", ">", "/>");
             }
             text.skipBlanks();
-            if (tag.attributes.containsKey(name)) {
-                throw EncodingException.at(error.line(), error.column(), "an attribute stands twice");
+            if (stated.containsKey(name)) {
+                throw text.errorAt(from, "an attribute stands twice");
             }
-            tag.attributes.put(name, attributeValue());
+            stated.put(name, attributeValue());
         }
     }
+
+    private void end(Element element) throws EncodingException {
+        int from = text.at();
+        text.skip(2);
+        String closed = text.takeName();
+        text.skipBlanks();
+        if (!closed.equals(element.text) || !text.skipIf(">")) {
+            throw text.errorAt(from, "another element is open", "</" + element.text + ">");
+        }
+        tree.end(from, from);
+    }
+
+    /** Reads over what says nothing, up to the next tag. */
+    private void between(Element parent) throws EncodingException {
+        String end = "</" + parent.text + ">";
+        boolean isParm = parent == Element.PARM;
+        String[] tags = isParm ? new String[] {end} : new String[] {INNER[0], INNER[1], end};
+        while (true) {
+            miscellany();
+            int from = text.at();
+            boolean isBlank = false;
+            if (text.isAtEnd()) {
+                throw text.error("the document ends within <" + parent.text + ">", tags);
+            }
+            if (text.skipIf("<![CDATA[")) {
+                isBlank = text.takeUntil("]]>", "a CDATA section").trim().isEmpty();
+            } else if (text.peek() == '&') {
+                // A blank is one however it is written; anything else is text.
+                StringBuilder character = new StringBuilder();
+                reference(character);
+                isBlank = XmlText.isBlank(character.charAt(0));
+            } else if (text.startsWith("<")) {
+                if (isParm && !text.startsWith("</")) {
+                    throw text.error("a parm has no content", tags);
+                }
+                return;
+            }
+            if (!isBlank) {
+                throw text.errorAt(from, "text stands in <" + parent.text + ">", tags);
+            }
+        }
+    }
+
+    // ---- Texts
 
     /** An attribute's value, in which a blank that is not given as a reference is a space. */
     private String attributeValue() throws EncodingException {
@@ -381,8 +320,7 @@ final class XmlReader {
         }
         text.skip(1);
         StringBuilder value = new StringBuilder();
-        while (text.peek() != quote) {
-            int c = text.peek();
+        for (int c; (c = text.peek()) != quote; ) {
             if (c < 0) {
                 throw text.error("a value does not end", String.valueOf((char) quote));
             }
@@ -393,9 +331,6 @@ final class XmlReader {
                 reference(value);
             } else if (text.skipIf("\r\n")) {
                 value.append(' ');
-            } else if (XmlText.isBlank(c)) {
-                text.skip(1);
-                value.append(' ');
             } else {
                 character(value);
             }
@@ -405,63 +340,51 @@ final class XmlReader {
     }
 
     private void character(StringBuilder value) throws EncodingException {
-        EncodingException error = text.error("a character that XML does not have");
-        char c = text.take();
-        if (!Character.isSurrogate(c)) {
-            if (!XmlWriter.isXmlCharacter(c)) {
-                throw error;
-            }
-            value.append(c);
-            return;
+        int from = text.at();
+        int c = text.takeCodePoint();
+        if (!XmlWriter.isXmlCharacter(c)) {
+            throw text.errorAt(from, NO_CHARACTER);
         }
-        int low = text.peek();
-        if (!Character.isHighSurrogate(c) || low < 0 || !Character.isLowSurrogate((char) low)) {
-            throw error;
-        }
-        value.append(c).append(text.take());
+        value.appendCodePoint(XmlText.isBlank(c) ? ' ' : c);
     }
 
     /** A character reference, or one of the five entities that need no declaration. */
     private void reference(StringBuilder value) throws EncodingException {
-        EncodingException error =
-                text.error(
-                        "a reference that is none of a character's, nor to one of five entities",
-                        "&lt;", "&gt;", "&amp;", "&quot;", "&apos;", "&#N;", "&#xN;");
+        int from = text.at();
         text.skip(1);
         if (text.skipIf("#")) {
             int radix = text.skipIf("x") ? 16 : 10;
-            String digits = text.takeName();
-            int c = number(digits, radix);
-            if (!text.skipIf(";") || !XmlWriter.isXmlCharacter(c)) {
-                throw c >= 0
-                        ? EncodingException.at(
-                                error.line(), error.column(), "a character that XML does not have")
-                        : error;
-            }
-            value.appendCodePoint(c);
-            return;
-        }
-        String name = text.takeName();
-        for (int i = 0; i < ENTITIES.length; i += 2) {
-            if (name.equals(ENTITIES[i]) && text.skipIf(";")) {
-                value.append(ENTITIES[i + 1]);
+            int c = number(text.takeName(), radix);
+            if (text.skipIf(";") && XmlWriter.isXmlCharacter(c)) {
+                value.appendCodePoint(c);
                 return;
             }
+            if (c >= 0) {
+                throw text.errorAt(from, NO_CHARACTER);
+            }
+        } else {
+            String name = text.takeName();
+            for (int i = 0; i < ENTITIES.length; i += 2) {
+                if (name.equals(ENTITIES[i]) && text.skipIf(";")) {
+                    value.append(ENTITIES[i + 1]);
+                    return;
+                }
+            }
         }
-        throw error;
+        throw text.errorAt(
+                from,
+                "a reference that is none of a character's, nor to one of five entities",
+                "&lt;", "&gt;", "&amp;", "&quot;", "&apos;", "&#N;", "&#xN;");
     }
 
     /** The number of digits; -1 for one that is none. Any beyond Unicode is one number beyond it. */
     private static int number(String digits, int radix) {
-        int number = 0;
-        for (int i = 0; i < digits.length(); ++i) {
-            char c = digits.charAt(i);
-            int digit = c < 0x80 ? Character.digit(c, radix) : -1;
-            if (digit < 0) {
-                return -1;
-            }
-            number = Math.min(number * radix + digit, Character.MAX_CODE_POINT + 1);
+        if (!digits.matches(radix == 16 ? "[0-9A-Fa-f]+" : "[0-9]+")) {
+            return -1;
         }
-        return digits.isEmpty() ? -1 : number;
+        String significant = digits.replaceFirst("^0+(?=.)", "");
+        return significant.length() > 7
+                ? Character.MAX_CODE_POINT + 1
+                : Integer.parseInt(significant, radix);
     }
 }

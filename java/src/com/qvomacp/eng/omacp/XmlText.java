@@ -2,51 +2,47 @@ package com.qvomacp.eng.omacp;
 
 import java.nio.ByteBuffer;
 import java.nio.CharBuffer;
-import java.nio.charset.CharacterCodingException;
 import java.nio.charset.Charset;
 import java.nio.charset.CharsetDecoder;
-import java.nio.charset.CoderResult;
-import java.nio.charset.CodingErrorAction;
 import java.nio.charset.StandardCharsets;
-import java.util.Arrays;
+import java.util.regex.Matcher;
+import java.util.regex.Pattern;
 
 /**
  * The characters of a document in XML, and the place where reading stands. Nothing but these bytes
  * is ever read: there is nothing here that could open a file or a connection.
  */
 final class XmlText {
-    private static final char BYTE_ORDER_MARK = '\uFEFF';
+    /** The start of an XML declaration, be it behind a byte order mark, with its encoding. */
+    private static final Pattern ENCODING =
+            Pattern.compile(
+                    "(?s)(?:\u00EF\u00BB\u00BF)?<\\?xml(?>.*?encoding)[^\"']*([\"'])(.*?)\\1");
+
+    private static final int LONGEST_DECLARATION = 200;
+    private static final String BYTE_ORDER_MARK = "\uFEFF";
 
     private final String text;
     private int at;
-    private int line = 1;
+
+    /** How far the lines have been counted, how many there are, and where the last one begins. */
+    private int counted;
+
+    private int lines;
     private int lineStart;
 
-    private XmlText(String text) {
-        this.text = text;
-    }
-
     /** The text of bytes in the encoding that they state, or else in UTF-8. */
-    static XmlText of(byte[] bytes) throws EncodingException {
+    XmlText(byte[] bytes) throws EncodingException {
         Charset charset = charset(bytes);
-        CharsetDecoder decoder =
-                charset.newDecoder()
-                        .onMalformedInput(CodingErrorAction.REPORT)
-                        .onUnmappableCharacter(CodingErrorAction.REPORT);
+        CharsetDecoder decoder = charset.newDecoder();
         ByteBuffer in = ByteBuffer.wrap(bytes);
         CharBuffer out = CharBuffer.allocate((int) (bytes.length * decoder.maxCharsPerByte()) + 1);
-        CoderResult result = decoder.decode(in, out, true);
+        boolean isError = decoder.decode(in, out, true).isError();
         out.flip();
-        XmlText text = new XmlText(out.toString());
-        if (text.peek() == BYTE_ORDER_MARK) {
-            text.at = 1;
-            text.lineStart = 1;
+        String decoded = out.toString();
+        text = decoded.startsWith(BYTE_ORDER_MARK) ? decoded.substring(1) : decoded;
+        if (isError) {
+            throw errorAt(text.length(), "the bytes here are not " + charset.name());
         }
-        if (result.isError()) {
-            text.skip(out.length() - text.at);
-            throw text.error("the bytes here are not " + charset.name());
-        }
-        return text;
     }
 
     private static Charset charset(byte[] bytes) throws EncodingException {
@@ -58,37 +54,17 @@ final class XmlText {
         if (first == 0xFF && second == 0xFE || first == '<' && second == 0) {
             return StandardCharsets.UTF_16LE;
         }
-        String stated = statedEncoding(bytes);
-        if (stated == null) {
+        int length = Math.min(bytes.length, LONGEST_DECLARATION);
+        String start = new String(bytes, 0, length, StandardCharsets.ISO_8859_1);
+        Matcher declaration = ENCODING.matcher(start).region(0, Math.max(start.indexOf("?>"), 0));
+        if (!declaration.lookingAt()) {
             return StandardCharsets.UTF_8;
         }
         try {
-            return Charset.forName(stated);
+            return Charset.forName(declaration.group(2));
         } catch (IllegalArgumentException e) {
             throw EncodingException.at(1, 1, "the encoding of the document is not known");
         }
-    }
-
-    /** What the XML declaration calls the encoding; null when it does not. */
-    private static String statedEncoding(byte[] bytes) {
-        String start =
-                new String(
-                        Arrays.copyOf(bytes, Math.min(bytes.length, 200)),
-                        StandardCharsets.ISO_8859_1);
-        int end = start.indexOf("?>");
-        if (!start.replaceFirst("^\u00EF\u00BB\u00BF", "").startsWith("<?xml") || end < 0) {
-            return null;
-        }
-        int name = start.indexOf("encoding");
-        if (name < 0 || name > end) {
-            return null;
-        }
-        int from = name;
-        while (from < end && start.charAt(from) != '"' && start.charAt(from) != '\'') {
-            ++from;
-        }
-        int to = start.indexOf(start.charAt(from), from + 1);
-        return to > from && to < end ? start.substring(from + 1, to) : null;
     }
 
     /** The next character, or -1 at the end; the place stays. */
@@ -106,19 +82,19 @@ final class XmlText {
 
     /** Goes on by one character, which is there. */
     char take() {
-        char c = text.charAt(at++);
-        if (c == '\n' || c == '\r' && peek() != '\n') {
-            ++line;
-            lineStart = at;
-        }
+        return text.charAt(at++);
+    }
+
+    /** Goes on by one character, which is there, with both its halves. */
+    int takeCodePoint() {
+        int c = text.codePointAt(at);
+        at += Character.charCount(c);
         return c;
     }
 
     /** Goes on by so many characters, which are there. */
     void skip(int count) {
-        for (int i = 0; i < count; ++i) {
-            take();
-        }
+        at += count;
     }
 
     /** Goes on behind `what`, if that stands here. */
@@ -126,7 +102,7 @@ final class XmlText {
         if (!startsWith(what)) {
             return false;
         }
-        skip(what.length());
+        at += what.length();
         return true;
     }
 
@@ -137,7 +113,7 @@ final class XmlText {
             throw error(name + " does not end", what);
         }
         String taken = text.substring(at, end);
-        skip(end + what.length() - at);
+        at = end + what.length();
         return taken;
     }
 
@@ -145,7 +121,7 @@ final class XmlText {
     boolean skipBlanks() {
         int from = at;
         while (isBlank(peek())) {
-            take();
+            ++at;
         }
         return at > from;
     }
@@ -158,33 +134,45 @@ final class XmlText {
     String takeName() {
         int from = at;
         while (isNameCharacter(peek())) {
-            take();
+            ++at;
         }
         return text.substring(from, at);
     }
 
     private static boolean isNameCharacter(int c) {
-        return c >= 'a' && c <= 'z'
-                || c >= 'A' && c <= 'Z'
-                || c >= '0' && c <= '9'
-                || c == '-'
-                || c == '_'
-                || c == '.'
-                || c == ':'
-                || c >= 0x80 && Character.isUnicodeIdentifierPart(c);
+        return c < 0x80
+                ? Character.isLetterOrDigit(c) || "-_.:".indexOf(c) >= 0
+                : Character.isUnicodeIdentifierPart(c);
     }
 
-    int line() {
-        return line;
+    int at() {
+        return at;
     }
 
-    /** Counted from 1. */
-    int column() {
-        return at - lineStart + 1;
+    /** Line and column of a place, counted from 1: in one go for places in their order. */
+    int[] place(int offset) {
+        if (offset < counted) {
+            counted = 0;
+            lines = 0;
+            lineStart = 0;
+        }
+        for (; counted < offset; ++counted) {
+            char c = text.charAt(counted);
+            if (c == '\n' || c == '\r' && !text.startsWith("\n", counted + 1)) {
+                ++lines;
+                lineStart = counted + 1;
+            }
+        }
+        return new int[] {lines + 1, offset - lineStart + 1};
     }
 
     /** An error at this place. */
     EncodingException error(String sentence, String... expected) {
-        return EncodingException.at(line, column(), sentence, expected);
+        return errorAt(at, sentence, expected);
+    }
+
+    EncodingException errorAt(int offset, String sentence, String... expected) {
+        int[] place = place(offset);
+        return EncodingException.at(place[0], place[1], sentence, expected);
     }
 }

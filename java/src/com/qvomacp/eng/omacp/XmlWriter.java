@@ -4,28 +4,31 @@ import java.util.Locale;
 import java.util.Map;
 
 /** Writes a document as XML. */
-final class XmlWriter extends DocumentSource.Steps {
+final class XmlWriter extends DocumentTaker {
     private static final String DOCUMENT_TYPE =
             "<!DOCTYPE wap-provisioningdoc PUBLIC \"-//WAPFORUM//DTD PROV 1.0//EN\""
                     + " \"http://www.wapforum.org/DTD/prov.dtd\">\n";
 
+    private static final String MARKUP = "<&\"";
+    private static final String[] ENTITIES = {"&lt;", "&amp;", "&quot;"};
     private static final int DEEPEST_SHOWN = 20;
 
     private final StringBuilder out = new StringBuilder();
 
-    private XmlWriter() {}
+    private XmlWriter(Item root) {
+        super(root);
+    }
 
     /** The document; its instruction states the options that are set and no secrets. */
-    static String write(DocumentSource source, EncodeOptions options) throws EncodingException {
-        XmlWriter writer = new XmlWriter();
+    static String write(Item root, String version, EncodeOptions options)
+            throws EncodingException {
+        XmlWriter writer = new XmlWriter(root);
         writer.out.append("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n");
         writer.instruction(options.set());
         writer.out.append(DOCUMENT_TYPE).append("<wap-provisioningdoc");
-        if (source.version != null) {
-            writer.attribute("version", source.version);
-        }
+        writer.attribute("version", version);
         writer.out.append(">\n");
-        source.take(writer);
+        writer.take();
         return writer.out.append("</wap-provisioningdoc>\n").toString();
     }
 
@@ -55,9 +58,7 @@ final class XmlWriter extends DocumentSource.Steps {
         indent(depth());
         out.append("<parm");
         attribute("name", name);
-        if (value != null) {
-            attribute("value", value);
-        }
+        attribute("value", value);
         out.append("/>\n");
     }
 
@@ -74,14 +75,17 @@ final class XmlWriter extends DocumentSource.Steps {
         }
     }
 
+    /** An attribute; none for a value that is null. */
     private void attribute(String name, String value) throws EncodingException {
+        if (value == null) {
+            return;
+        }
         out.append(' ').append(name).append("=\"");
         for (int i = 0; i < value.length(); ) {
             int c = value.codePointAt(i);
             i += Character.charCount(c);
             if (!isXmlCharacter(c)) {
-                throw EncodingException.in(
-                        path(), String.format(Locale.ROOT, "XML has no character U+%04X", c));
+                throw error(String.format(Locale.ROOT, "XML has no character U+%04X", c));
             }
             character(c);
         }
@@ -89,22 +93,13 @@ final class XmlWriter extends DocumentSource.Steps {
     }
 
     private void character(int c) {
-        switch (c) {
-            case '<':
-                out.append("&lt;");
-                break;
-            case '&':
-                out.append("&amp;");
-                break;
-            case '"':
-                out.append("&quot;");
-                break;
-            default:
-                if (Printable.isShown(c)) {
-                    out.appendCodePoint(c);
-                } else {
-                    out.append("&#").append(c).append(';');
-                }
+        int markup = MARKUP.indexOf(c);
+        if (markup >= 0) {
+            out.append(ENTITIES[markup]);
+        } else if (Printable.isShown(c)) {
+            out.appendCodePoint(c);
+        } else {
+            out.append("&#").append(c).append(';');
         }
     }
 

@@ -32,6 +32,11 @@ public final class NativeLibrary {
 
     private static final String NAME = "omacp";
 
+    /** What virtual machines call an architecture, and what the copies for it are called. */
+    private static final String[][] MACHINES = {
+        {"i[3-6]86", "x86"}, {"amd64", "x86_64"}, {"arm64", "aarch64"}, {"arm", "armhf"}
+    };
+
     private static boolean loaded;
     private static LinkageError failure;
 
@@ -80,27 +85,11 @@ public final class NativeLibrary {
     /** The resource with the library for an operating system and an architecture. */
     static String resource(String system, String architecture) {
         String platform = system.toLowerCase(Locale.ROOT).replaceAll("[^a-z0-9]", "");
-        return "/com/qvomacp/eng/native/" + platform + '-' + machine(architecture) + "/lib" + NAME + ".so";
-    }
-
-    private static String machine(String architecture) {
-        switch (architecture.toLowerCase(Locale.ROOT)) {
-            case "x86":
-            case "i386":
-            case "i486":
-            case "i586":
-            case "i686":
-                return "x86";
-            case "amd64":
-            case "x86_64":
-                return "x86_64";
-            case "arm64":
-                return "aarch64";
-            case "arm":
-                return "armhf";
-            default:
-                return architecture.toLowerCase(Locale.ROOT);
+        String machine = architecture.toLowerCase(Locale.ROOT);
+        for (String[] names : MACHINES) {
+            machine = machine.matches(names[0]) ? names[1] : machine;
         }
+        return "/com/qvomacp/eng/native/" + platform + '-' + machine + "/lib" + NAME + ".so";
     }
 
     private static UnsatisfiedLinkError error(String text, Throwable cause) {

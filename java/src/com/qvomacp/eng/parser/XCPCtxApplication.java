@@ -4,9 +4,6 @@ package com.qvomacp.eng.parser;
  * The APPLICATION characteristics of the message, with their TO-PROXY, TO-NAPID, ADDR, APPADDR,
  * APPAUTH, RESOURCE and ROAMING below them.
  *
- * <p>Parameter names used here: {@code application} counts the APPLICATION of the message, the
- * others count within the characteristic before them. All count from 1.
- *
  * <pre>{@code
  * XCPCtxApplication applications = new XCPCtxApplication();
  * for (int a = 1; a <= applications.qvomacp_GetPxApplicationCount(); ++a) {
@@ -54,11 +51,7 @@ public class XCPCtxApplication {
     /** {@return the number of SERVICE values of a port of an APPADDR} */
     public native int qvomacp_GetPxServiceCount(int application, int appAddr, int port);
 
-    /**
-     * One SERVICE of a port of an APPADDR. Unlike a proxy's port, this answers the text itself.
-     *
-     * @return its text, or {@code null}
-     */
+    /** {@return one SERVICE of an APPADDR's port: unlike a proxy's, its text, or {@code null}} */
     public native String qvomacp_GetPxServiceData(
             int application, int appAddr, int port, int service);
 

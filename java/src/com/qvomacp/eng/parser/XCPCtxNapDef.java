@@ -38,11 +38,8 @@ public class XCPCtxNapDef {
     public native void qvomacp_SetPxNapDefIndex(int napDef);
 
     /**
-     * Counts the BEARER values of an access point.
-     *
-     * <p>Unlike its siblings, an index of 0 or below answers for the first access point.
-     *
-     * @return their number
+     * {@return the number of BEARER values of an access point; unlike its siblings, an index of 0
+     * or below answers for the first access point}
      */
     public native int qvomacp_GetPxBearerCount(int napDef);
 

@@ -4,10 +4,6 @@ package com.qvomacp.eng.parser;
  * The proxies of the message: its PXLOGICAL characteristics, with their DOMAIN, PXAUTHINFO, PORT
  * and PXPHYSICAL below them.
  *
- * <p>Parameter names used here: {@code proxy} counts the PXLOGICAL of the message, {@code physical}
- * the PXPHYSICAL of that PXLOGICAL, {@code port} the PORT of the one or of the other. All count
- * from 1.
- *
  * <pre>{@code
  * XCPCtxPxLogical proxies = new XCPCtxPxLogical();
  * for (int p = 1; p <= proxies.qvomacp_GetPxLogicalCount(); ++p) {

@@ -255,6 +255,26 @@ class EncodingTest {
     }
 
     @Test
+    void thePathOfADocumentWithoutItsElementIsThatOfItsItems() throws Exception {
+        byte[] control = {0x03, 0x0B, 0x6A, 0x00, (byte) 0xC6, 0x55, 0x01,
+            (byte) 0x87, 0x07, 0x06, 0x03, 0x07, 0x00, 0x01, 0x01};
+        ProvisioningDocument document = ProvisioningDocument.parse(control);
+        ProvisioningEncoder encoder = ProvisioningEncoder.of(document, EncodeOptions.NONE);
+        EncodingException e = assertThrows(EncodingException.class, encoder::xml);
+        assertEquals(document.path(document.children().get(0)), e.path());
+    }
+
+    @Test
+    void aMessageWhoseDocumentTypeCannotBeHadIsEncoded() throws Exception {
+        byte[] body = {0x03, 0x00, 0x05, 0x6A, 0x00, 0x45, (byte) 0xC6, 0x55, 0x01, 0x01, 0x01};
+        ProvisioningMessage message = ProvisioningMessage.parseBody(body);
+        assertNull(message.document().documentType());
+        ProvisioningEncoder encoder = ProvisioningEncoder.of(message, EncodeOptions.NONE);
+        assertEquals("table", encoder.options().value(EncodeOption.IDENTIFIER));
+        assertEquals(message.document(), ProvisioningDocument.parse(encoder.body()));
+    }
+
+    @Test
     void contentThatIsNoElementOfTheDocumentTypeIsToldWithItsPath() throws Exception {
         byte[] text = {0x03, 0x0B, 0x6A, 0x00, 0x45, (byte) 0xC6, 0x55, 0x01, 0x03, 'x', 0x00, 0x01, 0x01};
         ProvisioningDocument document = ProvisioningDocument.parse(text);
