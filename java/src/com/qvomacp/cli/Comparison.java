@@ -94,7 +94,7 @@ final class Comparison {
         List<Item> items = said == null ? NOTHING : said.children();
         int column = isHeader ? TextWriter.HEADER_COLUMN : TextWriter.column(items);
         Answer answer = Answer.characteristic(type, column, true);
-        open.peek().answers.add(answer);
+        add(answer);
         open.push(new Level(answer.children, items));
     }
 

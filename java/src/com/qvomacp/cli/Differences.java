@@ -26,12 +26,7 @@ import java.util.Set;
  * stack, and no two items are compared that are not each other's counterparts.
  */
 final class Differences {
-    enum Kind {
-        ADDED,
-        REMOVED,
-        CHANGED,
-        MOVED
-    }
+    enum Kind { ADDED, REMOVED, CHANGED, MOVED }
 
     /** One difference. */
     static final class Change {

@@ -30,10 +30,7 @@ final class Encode extends Job {
     private static final String USERPINMAC = "userpinmac";
 
     /** How the parts of an SMS are written. */
-    enum Sms {
-        UD,
-        SUBMIT
-    }
+    enum Sms { UD, SUBMIT }
 
     private static final Option<Boolean> BODY = Option.flag("--body", "Write the body alone.");
     private static final Option<Boolean> HEX =

@@ -11,11 +11,7 @@ final class Terminal {
     static final Terminal NONE = new Terminal(false, false, false);
 
     /** When colours are wanted. */
-    enum Color {
-        auto,
-        always,
-        never
-    }
+    enum Color { auto, always, never }
 
     final boolean hasColorOut;
     final boolean hasColorErr;
