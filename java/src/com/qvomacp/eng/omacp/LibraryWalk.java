@@ -312,7 +312,6 @@ final class LibraryWalk extends LibraryText {
         for (; ; ) {
             int tag = peekTag(Place.IN_CHARACTERISTIC);
             if (tag == TAG_PARM && kind != null) {
-                // Here, in the loop, for the reason that BodyReader has.
                 if (trace != LibraryTrace.NONE || !takePlain(kind)) {
                     parm(kind);
                 }
