@@ -220,6 +220,16 @@ struct Reading {
     Held<D> record;
 };
 
+// The traces of one parm, whose reading ends with `result`.
+template <class D>
+Strings tracesOf(const Bytes &bytes, qvsResult result = 0)
+{
+    Reading<D> run(bytes);
+    Traces traces;
+    EXPECT_EQ(run.read(), result);
+    return traces.texts;
+}
+
 // ---- Decoders without the types of their records
 
 // A parameter whose name is a token: its field by its number, and whether that is a list.

@@ -139,16 +139,6 @@ std::string labelOf(std::string name)
     return "SMLDM_CPPARSER_ATTR_PARM_CODE_1_NAME_" + name;
 }
 
-// The traces of one parm that is read.
-template <class D>
-Strings tracesOf(const Bytes &bytes)
-{
-    Reading<D> run(bytes);
-    Traces traces;
-    EXPECT_EQ(run.read(), 0U);
-    return traces.texts;
-}
-
 // What AAUTHTYPE holds behind parms of these attributes, with "tab" at 1 in the string table, and
 // the joins that were traced.
 struct Joined {

@@ -105,16 +105,6 @@ TYPED_TEST_SUITE(TextCharacteristic, Decoders, TypeNames);
 
 class WifiParm : public blocks::BlockTest {};
 
-// The traces of one parm, which ends with `result`.
-template <class D>
-Strings tracesOf(const Bytes &bytes, qvsResult result)
-{
-    Reading<D> run(bytes);
-    Traces traces;
-    EXPECT_EQ(run.read(), result);
-    return traces.texts;
-}
-
 } // namespace
 
 TYPED_TEST(TextCharacteristic, TracesItsStepsAndTheTokenBehindTheNameTwice)

@@ -114,16 +114,6 @@ class PxLogicalParm : public blocks::BlockTest {};
 class PxAuthInfoParm : public blocks::BlockTest {};
 class PxPhysicalParm : public blocks::BlockTest {};
 
-// The traces of one parm.
-template <class D>
-Strings tracesOf(const Bytes &bytes)
-{
-    Reading<D> run(bytes);
-    Traces traces;
-    (void)run.read();
-    return traces.texts;
-}
-
 // Those that begin as the decoder's own do.
 Strings own(const Strings &texts)
 {
@@ -148,7 +138,7 @@ TEST_F(PxLogicalParm, TracesTheResultAtItsEnd)
 
 TEST_F(PxLogicalParm, TracesTheResultOfAParmThatCannotBeRead)
 {
-    EXPECT_EQ(tracesOf<PxLogical>({0x87, 0x15, 0x06, 0x03, 'p'}),
+    EXPECT_EQ(tracesOf<PxLogical>({0x87, 0x15, 0x06, 0x03, 'p'}, 4103),
               lines({"qvsClientProvWbxmlDecoderContent Error:4103",
                      "qvsClientProvWbxmlDecoderParamString Error Code:4103",
                      "qvsClientProvWbxmlDecoderParamPxlogical Error Code:4103"}));
@@ -156,10 +146,10 @@ TEST_F(PxLogicalParm, TracesTheResultOfAParmThatCannotBeRead)
 
 TEST_F(PxLogicalParm, TracesNoResultWhenTheTokenCannotBeRead)
 {
-    EXPECT_EQ(tracesOf<PxLogical>({0x87, 0x15, 0x06, 0x85}),
+    EXPECT_EQ(tracesOf<PxLogical>({0x87, 0x15, 0x06, 0x85}, 4103),
               lines({"qvsClientProvWbxmlDecoderContent Error:0",
                      "qvsClientProvWbxmlDecoderParamString Error Code:0"}));
-    EXPECT_EQ(tracesOf<PxLogical>({0x87}), Strings{});
+    EXPECT_EQ(tracesOf<PxLogical>({0x87}, 4103), Strings{});
 }
 
 TEST_F(PxAuthInfoParm, TracesEachTokenAndTheLastOneAsAnError)
@@ -175,16 +165,16 @@ TEST_F(PxAuthInfoParm, TracesEachTokenAndTheLastOneAsAnError)
 TEST_F(PxAuthInfoParm, TracesTheTokenOfAParmThatCannotBeRead)
 {
     EXPECT_EQ(
-        own(tracesOf<PxAuthInfo>({0x87, 0x1B, 0x06, 0x03, 'p'})),
+        own(tracesOf<PxAuthInfo>({0x87, 0x1B, 0x06, 0x03, 'p'}, 4103)),
         lines({"DecoderParam : nId = [0x1b]", "DecoderParam : QVS_WBXML_DECODER_ERROR nId = [0x1b]",
                "return ErrorCode[4103]"}));
 }
 
 TEST_F(PxAuthInfoParm, TracesNoErrorWhenTheTokenCannotBeRead)
 {
-    EXPECT_EQ(own(tracesOf<PxAuthInfo>({0x87, 0x19, 0x06, 0x85})),
+    EXPECT_EQ(own(tracesOf<PxAuthInfo>({0x87, 0x19, 0x06, 0x85}, 4103)),
               lines({"DecoderParam : nId = [0x19]"}));
-    EXPECT_EQ(tracesOf<PxAuthInfo>({0x87}), Strings{});
+    EXPECT_EQ(tracesOf<PxAuthInfo>({0x87}, 4103), Strings{});
 }
 
 TEST_F(PxPhysicalParm, GoesOnWithWhatFollowsADomainThatCannotBeRead)
