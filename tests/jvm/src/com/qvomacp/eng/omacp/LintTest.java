@@ -310,7 +310,7 @@ class LintTest {
                 parm("NAME", "By message"), parm("NAP-ADDRESS", "+15550101"));
         String packets = in("NAPDEF", parm("NAPID", "INTERNET"), parm("BEARER", "GSM-GPRS"),
                 parm("NAME", "By packets"), parm("NAP-ADDRESS", "packets.example"),
-                parm("NAP-ADDRTYPE", "APN"), parm("DELIVERY-ERR-SDU", "3"), parm("RESIDUAL-BER", "7A"),
+                parm("NAP-ADDRTYPE", "APN"), parm("DELIVERY-ERR-SDU", "3"), parm("SDU-ERROR-RATIO", "7A"),
                 parm("TRAFFIC-CLASS", "60"), parm("MAX-BITRATE-DNLINK", "8"), account);
         String proxies = in("PXLOGICAL", parm("PROXY-ID", "www.example"), parm("NAME", "Proxy"),
                 "<parm name='MASTER'/>", parm("STARTPAGE", "http://www.example/start"),
