@@ -105,7 +105,7 @@ final class BodyHeader {
     /** Refuses another document type. One that is not stated is looked at: its root must fit. */
     private void requireProvisioning(byte[] body, Cursor cursor) throws ProvisioningException {
         if (publicIdentifier == PROVISIONING) {
-            return;
+            return; // as nearly all: its name need not be looked at
         }
         if (isStated()) {
             if (!documentType.contains(PROVISIONING_TEXT)) {

@@ -31,15 +31,14 @@ final class BodyReader {
     private static final int ELEMENT = 0x3F;
     private static final int FIRST_VALUE = 0x80;
 
-    /** The token of a parm with attributes and without content, and that of VALUE on either page. */
-    private static final int PLAIN_PARM = 0x87;
-
+    /** The tokens of a parm and of VALUE on either page, and a parm with attributes alone. */
     private static final int PARM = 0x07;
 
-    /** The parm, NAME, VALUE, one value, END. */
-    private static final int SHORTEST_PARM = 5;
-
     private static final int VALUE = 0x06;
+    private static final int PLAIN_PARM = 0x87;
+
+    /** The parm, NAME, VALUE, one value, END: bytes. */
+    private static final int SHORTEST_PARM = 5;
 
     /** The tokens that are a piece of text, in values as well as where elements stand. */
     private static final boolean[] PIECES = new boolean[0x100];
