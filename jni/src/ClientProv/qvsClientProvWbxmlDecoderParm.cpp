@@ -275,14 +275,10 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
     }
 }
 
-// Reads a parm element, of which a byte was seen, into `record`.
-[[gnu::noinline]] qvsResult readElement(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
-                                        const ParmTable &table)
+// Reads the parm element at the read position into `record`, its attributes up to END.
+inline qvsResult readElement(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                             const ParmTable &table)
 {
-    traceEntry(table);
-    if (!record) {
-        return QVS_ERROR_BAD_ARGUMENT;
-    }
     if (qvsResult result = takeStart(decoder)) {
         return result;
     }
@@ -313,6 +309,25 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
     return QVS_ERROR_WBXML_NO_DATA;
 }
 
+// Reads a parm element, of which a byte was seen; with `all` those that follow it too, while nobody
+// takes traces.
+qvsResult readElements(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                       const ParmTable &table, bool all)
+{
+    traceEntry(table);
+    if (!record) {
+        return QVS_ERROR_BAD_ARGUMENT;
+    }
+    const smlBuffer *const buffer = decoder->ptBuffer;
+    for (;;) {
+        const qvsResult result = readElement(decoder, state, record, table);
+        if (result != QVS_OK || !all || traceSink || buffer->pHead >= endOf(buffer) ||
+            *buffer->pHead != kParmStart) {
+            return result;
+        }
+    }
+}
+
 } // namespace
 
 // kept[repeated-parm]: the text that was there stays allocated.
@@ -338,9 +353,7 @@ qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvs
 qvsResult qvs::readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t field,
                         uint8_t place)
 {
-    qvsListNode *unknown = nullptr;
-    qvsListNode **last = state->open ? state->open->last + place : &unknown;
-    return readOnto(decoder, state, listAt(record, field), last);
+    return readOnto(decoder, state, listAt(record, field), state->open->last + place);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
@@ -351,18 +364,11 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable
     }
     OpenRecord open = {};
     DecodeState alone = {.open = &open};
-    return readElement(decoder, &alone, record, table);
+    return readElements(decoder, &alone, record, table, false);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
                          const ParmTable &table)
 {
-    for (;;) {
-        const qvsResult result = readElement(decoder, state, record, table);
-        const smlBuffer *const buffer = decoder->ptBuffer;
-        if (result != QVS_OK || traceSink || buffer->pHead >= endOf(buffer) ||
-            *buffer->pHead != kParmStart) {
-            return result;
-        }
-    }
+    return readElements(decoder, state, record, table, true);
 }
