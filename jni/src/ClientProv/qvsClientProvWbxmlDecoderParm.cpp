@@ -9,6 +9,40 @@ namespace {
 
 // ---- Values
 
+// readNext() of a value whose first piece, of `length` bytes, is followed by more, from `at` on.
+// Their length is known before a block is made, and they are looked at again to be written.
+[[gnu::noinline]] qvsResult readPieces(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                                       uint8_t *at, uint32_t length)
+{
+    smlBuffer *const buffer = decoder->ptBuffer;
+    uint8_t *const value = buffer->pHead + 1;
+    const uint8_t *const end = endOf(buffer);
+    const size_t most = state->textLeft < kLongest ? state->textLeft : kLongest - 1;
+    Piece piece;
+    bool usual = wbxml::isString(*value) && !tracking && length <= most;
+    while (usual && !endsRun(*at)) {
+        usual = nextPiece(decoder, &at, end, &piece) && piece.join == Join::kDirect &&
+                piece.length <= most - length;
+        length += usual ? piece.length : 0;
+    }
+    if (!usual) {
+        return readValue(decoder, state, text);
+    }
+    state->textLeft -= length;
+    buffer->pHead = at;
+    char *block = newText(length + 1, kDecoderModule);
+    if (!block) [[unlikely]] {
+        return lackValue(decoder, state, value);
+    }
+    *text = block;
+    for (at = value; !endsRun(*at) && nextPiece(decoder, &at, end, &piece);) {
+        memcpy(block, piece.bytes, piece.length);
+        block += piece.length;
+    }
+    memset(block, 0, 1 + kSpareZeros);
+    return QVS_OK;
+}
+
 // readValue() of a VALUE that was seen, while nobody takes traces: most are one piece.
 [[gnu::noinline]] qvsResult readNext(qvsWbxmlDecoder *decoder, DecodeState *state, char **text)
 {
@@ -17,10 +51,13 @@ namespace {
     const uint8_t *const end = endOf(buffer);
     uint8_t *at = value;
     Piece piece;
-    if (at == end || !onlyPiece(decoder, &at, end, &piece) || piece.length > state->textLeft) {
+    if (at == end || !nextPiece(decoder, &at, end, &piece) || piece.length > state->textLeft) {
         return readValue(decoder, state, text);
     }
     const uint32_t length = piece.length;
+    if (!endsRun(*at)) {
+        return readPieces(decoder, state, text, at, length);
+    }
     state->textLeft -= length;
     buffer->pHead = at;
     char *block = length < kLongest ? newText(length + 1, kDecoderModule) : nullptr;
@@ -159,7 +196,7 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
     const uint8_t *const end = endOf(buffer);
     uint8_t *at = buffer->pHead;
     Piece name;
-    if (traceSink || *at++ != attr::kName || at == end || !onlyPiece(decoder, &at, end, &name) ||
+    if (traceSink || *at++ != attr::kName || at == end || !nextPiece(decoder, &at, end, &name) ||
         *at != attr::kValue || name.length == 0 || name.length > state->textLeft) {
         return readNamed(decoder, state, record, attr::kName, parms);
     }
