@@ -189,8 +189,8 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
 // ---- Names given as text
 
 // readNamed() where a name of one piece and a VALUE are next.
-[[gnu::noinline]] qvsResult readNamedNext(qvsWbxmlDecoder *decoder, DecodeState *state,
-                                          void *record, const NamedParms &parms)
+inline qvsResult readNamedNext(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                               const NamedParms &parms)
 {
     smlBuffer *const buffer = decoder->ptBuffer;
     const uint8_t *const end = endOf(buffer);
