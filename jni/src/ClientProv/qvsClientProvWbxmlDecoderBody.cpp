@@ -276,7 +276,8 @@ qvsResult readParmElement(qvsWbxmlDecoder *decoder, DecodeState *state, Open *op
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
     state->open = &open->record;
-    return readParms(decoder, state, pointerAt(&open->node, open->kind->slot), *open->kind->parms);
+    return readParms(decoder, state, pointerAt(&open->node, open->kind->slot), *open->kind->parms,
+                     true);
 }
 
 // Whether a characteristic may nest in an open one.

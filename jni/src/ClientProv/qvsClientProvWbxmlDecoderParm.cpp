@@ -188,6 +188,31 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
 
 // ---- Names given as text
 
+// leaveUnknown() of a VALUE that was seen, while nobody takes traces.
+[[gnu::noinline]] qvsResult leaveNext(qvsWbxmlDecoder *decoder, DecodeState *state,
+                                      const NamedParms &parms)
+{
+    smlBuffer *const buffer = decoder->ptBuffer;
+    const uint8_t *const value = buffer->pHead + 1;
+    const uint8_t *const end = endOf(buffer);
+    uint8_t *at = buffer->pHead + 1;
+    size_t left = state->textLeft;
+    Piece piece;
+    do {
+        if (!parms.dropsUnknown || at == end || !nextPiece(decoder, &at, end, &piece) ||
+            piece.length > left || (left != state->textLeft && piece.join != Join::kDirect)) {
+            return leaveUnknown(decoder, state, parms);
+        }
+        left -= piece.length;
+    } while (!endsRun(*at) && wbxml::isString(*value) && !tracking);
+    if (!endsRun(*at)) {
+        return leaveUnknown(decoder, state, parms);
+    }
+    state->textLeft = left;
+    buffer->pHead = at;
+    return QVS_OK;
+}
+
 // readNamed() where a name of one piece and a VALUE are next.
 inline qvsResult readNamedNext(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
                                const NamedParms &parms)
@@ -203,7 +228,7 @@ inline qvsResult readNamedNext(qvsWbxmlDecoder *decoder, DecodeState *state, voi
     state->textLeft -= name.length;
     buffer->pHead = at;
     char **field = findNamed(record, parms.names, name.bytes, name.length);
-    return field ? readNext(decoder, state, field) : leaveUnknown(decoder, state, parms);
+    return field ? readNext(decoder, state, field) : leaveNext(decoder, state, parms);
 }
 
 // ---- The loop
@@ -346,25 +371,6 @@ inline qvsResult readElement(qvsWbxmlDecoder *decoder, DecodeState *state, void 
     return QVS_ERROR_WBXML_NO_DATA;
 }
 
-// Reads a parm element, of which a byte was seen; with `all` those that follow it too, while nobody
-// takes traces.
-qvsResult readElements(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
-                       const ParmTable &table, bool all)
-{
-    traceEntry(table);
-    if (!record) {
-        return QVS_ERROR_BAD_ARGUMENT;
-    }
-    const smlBuffer *const buffer = decoder->ptBuffer;
-    for (;;) {
-        const qvsResult result = readElement(decoder, state, record, table);
-        if (result != QVS_OK || !all || traceSink || buffer->pHead >= endOf(buffer) ||
-            *buffer->pHead != kParmStart) {
-            return result;
-        }
-    }
-}
-
 } // namespace
 
 // kept[repeated-parm]: the text that was there stays allocated.
@@ -401,11 +407,28 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable
     }
     OpenRecord open = {};
     DecodeState alone = {.open = &open};
-    return readElements(decoder, &alone, record, table, false);
+    return readParms(decoder, &alone, record, table, false);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
-                         const ParmTable &table)
+                         const ParmTable &table, bool all)
 {
-    return readElements(decoder, state, record, table, true);
+    traceEntry(table);
+    if (!record) {
+        return QVS_ERROR_BAD_ARGUMENT;
+    }
+    const smlBuffer *const buffer = decoder->ptBuffer;
+    for (;;) {
+        qvsResult result = readElement(decoder, state, record, table);
+        if (!all || traceSink) {
+            return result;
+        }
+        while (result == QVS_OK && buffer->pHead < endOf(buffer) &&
+               *buffer->pHead == wbxml::kStrI) {
+            result = dropInlineString(decoder, state);
+        }
+        if (result != QVS_OK || buffer->pHead >= endOf(buffer) || *buffer->pHead != kParmStart) {
+            return result;
+        }
+    }
 }
