@@ -276,8 +276,7 @@ qvsResult readParmElement(qvsWbxmlDecoder *decoder, DecodeState *state, Open *op
         return QVS_ERROR_WBXML_UNKNOWN_ELEMENT;
     }
     state->open = &open->record;
-    return readParms(decoder, state, pointerAt(&open->node, open->kind->slot), *open->kind->parms,
-                     true);
+    return readParms(decoder, state, pointerAt(&open->node, open->kind->slot), *open->kind->parms);
 }
 
 // Whether a characteristic may nest in an open one.

@@ -19,7 +19,7 @@ namespace {
     const uint8_t *const end = endOf(buffer);
     const size_t most = state->textLeft < kLongest ? state->textLeft : kLongest - 1;
     Piece piece;
-    bool usual = wbxml::isString(*value) && !tracking && length <= most;
+    bool usual = !tracking && length <= most;
     while (usual && !endsRun(*at)) {
         usual = nextPiece(decoder, &at, end, &piece) && piece.join == Join::kDirect &&
                 piece.length <= most - length;
@@ -55,7 +55,7 @@ namespace {
         return readValue(decoder, state, text);
     }
     const uint32_t length = piece.length;
-    if (!endsRun(*at)) {
+    if (!endsRun(*at) && wbxml::isString(*value)) {
         return readPieces(decoder, state, text, at, length);
     }
     state->textLeft -= length;
@@ -205,7 +205,7 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
         }
         left -= piece.length;
     } while (!endsRun(*at) && wbxml::isString(*value) && !tracking);
-    if (!endsRun(*at)) {
+    if (!endsRun(*at) && wbxml::isString(*value)) {
         return leaveUnknown(decoder, state, parms);
     }
     state->textLeft = left;

@@ -205,7 +205,7 @@ qvsResult readParms(qvsWbxmlDecoder *decoder, Record *record, const ParmsOf<Reco
 // The same where a byte of it was seen; with `all` parm elements that follow it are read too, and
 // inline strings between them, while nobody takes traces.
 qvsResult readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
-                    const ParmTable &table, bool all);
+                    const ParmTable &table, bool all = true);
 
 // Reads the parameter that the NAME attribute `token` announces into `*text`.
 qvsResult readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token);

@@ -5,16 +5,9 @@ using namespace qvs;
 
 namespace {
 
-// Bytes in front of a piece that joins a text.
-inline uint32_t separatorOf(const Piece &piece)
-{
-    return piece.join == Join::kComma || piece.join == Join::kHidden ? 1 : 0;
-}
-
 // Makes room for `added` bytes behind a text and a terminator, `spare` bytes more. False without
 // memory, or once the texts of the message passed their limit.
-[[gnu::always_inline]] inline bool reserve(DecodeState *state, Text *text, uint64_t added,
-                                           uint32_t spare)
+bool reserve(DecodeState *state, Text *text, uint64_t added, uint32_t spare)
 {
     if (!countText(state, text->data ? added : text->length + added)) [[unlikely]] {
         return false;
@@ -142,7 +135,8 @@ DecodeState qvs::wholeDecode(const qvsWbxmlDecoder *decoder, qvsArena *arena)
 bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
 {
     const bool joins = text->str() != nullptr;
-    const uint32_t separator = joins ? separatorOf(piece) : 0;
+    const bool separated = piece.join == Join::kComma || piece.join == Join::kHidden;
+    const uint32_t separator = joins && separated ? 1 : 0;
     const bool opaque = piece.join == Join::kOpaque;
     if (!reserve(state, text, uint64_t{piece.length} + separator, opaque ? 1 : 0)) [[unlikely]] {
         return lackBlock(piece);
@@ -214,7 +208,7 @@ qvsResult qvs::lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
     uint8_t *at = buffer->pHead;
     Piece piece;
     if (bytesLeft(decoder) == 0 || !nextPiece(decoder, &at, endOf(buffer), &piece) ||
-        !endsRun(*at) || piece.length > state->textLeft) {
+        (!endsRun(*at) && wbxml::isString(*buffer->pHead)) || piece.length > state->textLeft) {
         return content(decoder, state, text);
     }
     state->textLeft -= piece.length;

@@ -47,8 +47,7 @@ struct Piece {
     uint8_t *unread = nullptr; // the read position when a string cannot be had; null for a token's
 };
 
-// A text that grows at its end, by as many pieces at a time as are known. Owns its block until
-// take().
+// A text that grows at its end, piece by piece. Owns its block until take().
 struct Text {
     Text() = default;
     // Goes on with a text that already is a block of its own. `known` may tell its length and
