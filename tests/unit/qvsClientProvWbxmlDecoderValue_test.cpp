@@ -682,6 +682,51 @@ TEST_F(ParamString, MakesOneBlockForThePiecesOfAParm)
     }
 }
 
+// The value of a parm, or what became of it.
+std::string valueInParm(const Bytes &value, size_t left = SIZE_MAX, bool lacksMemory = false)
+{
+    Bytes parm = {0x87, 0x15, 0x06};
+    parm.insert(parm.end(), value.begin(), value.end());
+    parm.push_back(0x01);
+    Decoder decoder(parm);
+    qvsWapPxLogical record = {};
+    qvs::DecodeState state = {.textLeft = left};
+    if (lacksMemory) {
+        blocks::failAt = 0;
+    }
+    const qvsResult result = qvs::readParms(decoder, &state, &record, qvs::kPxLogicalParms.table);
+    OwnText text;
+    text.text = record.pszProxyId;
+    return (result ? std::to_string(result) + " at " + std::to_string(decoder.position())
+                   : text.str()) +
+           (state.textLimit ? ", too much" : "");
+}
+
+TEST_F(ParamString, JoinsThePiecesOfAParmAsTheirTokensSay)
+{
+    EXPECT_EQ(valueInParm({0x03, 'a', 0, 0x86, 0x03, 'b', 0}), "aIPV6b");
+    EXPECT_EQ(valueInParm({0x03, 'a', 0, 0x9A, 0x03, 'b', 0}), "a,PAPb");
+    EXPECT_EQ(valueInParm({0x03, 'a', 0, 0x94, 0x03, 'b', 0}), "ab");
+    EXPECT_EQ(valueInParm({0x03, 0, 0x03, 0}), "");
+    EXPECT_EQ(valueInParm({0x03, 'a', 0, 0x02}), "4103 at 7");
+    EXPECT_EQ(valueInParm({0x03, 'a', 0, 0x83, 0x09}), "4103 at 8");
+}
+
+TEST_F(ParamString, CountsThePiecesOfAParmTogether)
+{
+    const Bytes value = {0x03, 'a', 'b', 0, 0x03, 'c', 0};
+    EXPECT_EQ(valueInParm(value, 3), "abc");
+    EXPECT_EQ(valueInParm(value, 2), "4111 at 8, too much");
+    EXPECT_EQ(valueInParm(value, 1), "4111 at 4, too much");
+}
+
+TEST_F(ParamString, OfAParmInPiecesWithoutMemoryIs4103AtTheFirst)
+{
+    for (const Bytes &value : {Bytes{0x03, 'a', 0}, Bytes{0x03, 'a', 0, 0x03, 'b', 0}}) {
+        EXPECT_EQ(valueInParm(value, SIZE_MAX, true), "4103 at 4");
+    }
+}
+
 // A table of one megabyte, and references to it until the texts pass their limit.
 TEST_F(TextLimit, EndsTheDecodeWith4111BeyondBothItsBounds)
 {
