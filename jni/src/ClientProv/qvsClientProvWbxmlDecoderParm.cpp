@@ -19,14 +19,12 @@ namespace {
     const uint8_t *const end = endOf(buffer);
     const size_t most = state->textLeft < kLongest ? state->textLeft : kLongest - 1;
     Piece piece;
-    bool usual = !tracking && length <= most;
-    while (usual && !endsRun(*at)) {
-        usual = nextPiece(decoder, &at, end, &piece) && piece.join == Join::kDirect &&
-                piece.length <= most - length;
-        length += usual ? piece.length : 0;
-    }
-    if (!usual) {
-        return readValue(decoder, state, text);
+    while (!endsRun(*at)) {
+        if (tracking || !nextPiece(decoder, &at, end, &piece) || piece.join != Join::kDirect ||
+            piece.length > most - length) {
+            return readValue(decoder, state, text);
+        }
+        length += piece.length;
     }
     state->textLeft -= length;
     buffer->pHead = at;
@@ -51,7 +49,8 @@ namespace {
     const uint8_t *const end = endOf(buffer);
     uint8_t *at = value;
     Piece piece;
-    if (at == end || !nextPiece(decoder, &at, end, &piece) || piece.length > state->textLeft) {
+    if (at == end || !nextPiece(decoder, &at, end, &piece) || piece.length > state->textLeft ||
+        piece.length >= kLongest) {
         return readValue(decoder, state, text);
     }
     const uint32_t length = piece.length;
@@ -60,7 +59,7 @@ namespace {
     }
     state->textLeft -= length;
     buffer->pHead = at;
-    char *block = length < kLongest ? newText(length + 1, kDecoderModule) : nullptr;
+    char *block = newText(length + 1, kDecoderModule);
     if (!block) [[unlikely]] {
         return lackValue(decoder, state, value);
     }
@@ -200,7 +199,7 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
     Piece piece;
     do {
         if (!parms.dropsUnknown || at == end || !nextPiece(decoder, &at, end, &piece) ||
-            piece.length > left || (left != state->textLeft && piece.join != Join::kDirect)) {
+            piece.length > left || (piece.join != Join::kDirect && wbxml::isString(*value))) {
             return leaveUnknown(decoder, state, parms);
         }
         left -= piece.length;

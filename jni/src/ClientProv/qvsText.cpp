@@ -163,26 +163,23 @@ bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
 bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
     Rest rest(decoder);
-    bool complete = false;
-    while (rest.at < rest.end && !complete) {
+    bool more = true;
+    while (more && rest.at < rest.end && !endsRun(*rest.at)) {
         const uint8_t token = *rest.at++;
         Piece piece;
-        if (endsRun(token)) {
-            --rest.at;
-            complete = true;
-        } else if (token == wbxml::kStrI) {
+        if (token == wbxml::kStrI) {
             inlinePiece(&rest.at, rest.end, &piece);
-        } else if (token == wbxml::kStrT ? !tablePiece(decoder, &rest.at, rest.end, &piece)
-                                         : !tokenPiece(token, &piece)) {
-            break;
+        } else {
+            more = token == wbxml::kStrT ? tablePiece(decoder, &rest.at, rest.end, &piece)
+                                         : tokenPiece(token, &piece);
         }
-        if (!complete && !append(state, text, piece)) {
+        if (more && !append(state, text, piece)) {
             rest.at = piece.unread;
-            break;
+            more = false;
         }
     }
     decoder->ptBuffer->pHead = rest.at;
-    return complete;
+    return more && rest.at < rest.end;
 }
 
 qvsResult qvs::dropInlineString(qvsWbxmlDecoder *decoder, DecodeState *state)
