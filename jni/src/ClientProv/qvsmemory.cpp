@@ -123,7 +123,7 @@ void *qvsMemAlloc_debug(uint32_t size, const char *file, int line)
 
 void *qvs::newTrackedText(uint32_t size, const char *module, int line)
 {
-    return remembered(malloc(size + kSpareZeros), size, module, line);
+    return remembered(requested(size + kSpareZeros), size, module, line);
 }
 
 void *qvsMemAllocSetZero_debug(uint32_t size, const char *file, int line)
