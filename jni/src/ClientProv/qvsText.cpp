@@ -205,6 +205,18 @@ bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
     return appendAll(state, text, &piece, &piece + 1, added) != &piece;
 }
 
+uint32_t qvs::lengthBehind(const smlBuffer *buffer, const uint8_t *at, uint32_t left)
+{
+    // hardened: behind the data nothing is read but the storage, which the buffer has to tell.
+    const size_t from = static_cast<size_t>(at - buffer->pStorage);
+    const size_t capacity = static_cast<size_t>(buffer->pEnd - buffer->pStorage);
+    if (from + left > capacity || capacity != buffer->nCapacity) {
+        return left;
+    }
+    const void *nul = memchr(at, '\0', capacity - from);
+    return static_cast<uint32_t>((nul ? static_cast<const uint8_t *>(nul) : buffer->pEnd) - at);
+}
+
 // All pieces are looked at before a block is made for them; of many, so many at a time, and while
 // blocks are tracked each by itself.
 bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
@@ -222,7 +234,7 @@ bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
             const uint8_t token = *at++;
             bool found = true;
             if (token == wbxml::kStrI) {
-                inlinePiece(&at, end, piece);
+                inlinePiece(decoder->ptBuffer, &at, end, piece);
             } else if (token == wbxml::kStrT) {
                 found = tablePiece(decoder, &at, end, piece);
             } else if (endsRun(token)) {
@@ -252,7 +264,7 @@ qvsResult qvs::dropInlineString(qvsWbxmlDecoder *decoder, DecodeState *state)
 {
     uint8_t *at = decoder->ptBuffer->pHead;
     Piece piece;
-    inlinePiece(&at, at + bytesLeft(decoder), &piece);
+    inlinePiece(decoder->ptBuffer, &at, at + bytesLeft(decoder), &piece);
     if (!countText(state, piece.length)) {
         return QVS_ERROR_NO_MEMORY;
     }
