@@ -130,6 +130,16 @@ TEST_F(Memory, CountsTheBlocksThatCouldNotBeHad)
     EXPECT_EQ(qvs::refusals, before);
 }
 
+TEST_F(Memory, CountsATextThatCouldNotBeHadWhileBlocksAreTracked)
+{
+    qvsMemStartMemCheck();
+    const uint32_t before = qvs::refusals;
+    blocks::failAt = 0;
+    EXPECT_EQ(qvs::newText(8, kFile), nullptr);
+    EXPECT_EQ(qvs::refusals, before + 1);
+    qvsMemEndMemCheck();
+}
+
 TEST_F(Memory, StrdupCopiesATextAndItsTerminator)
 {
     char text[] = "abc";
