@@ -462,11 +462,10 @@ qvsResult qvsClientProvWbxmlDecoderCharacterAttribute(qvsWbxmlDecoder *decoder,
 {
     DecodeState alone;
     const Kind *kind = nullptr;
-    ScopedText type;
-    if (qvsResult result = readAttributes(decoder, &alone, node, attrId, &kind, &type.text)) {
+    *name = nullptr;
+    if (qvsResult result = readAttributes(decoder, &alone, node, attrId, &kind, name)) {
         return result;
     }
     *codePage = decoder->nCodePage;
-    *name = type.take();
     return QVS_OK;
 }
