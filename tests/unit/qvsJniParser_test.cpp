@@ -351,6 +351,25 @@ TEST(Parser, TakesAMessageWholeOrRefusesItWithEveryAllocationFailing)
     vm.call("qvomacp_parser_del");
 }
 
+TEST(Parser, TakesAMessageWholeOrRefusesItWhileBlocksAreTracked)
+{
+    LoadedVm vm;
+    Body body;
+    body.characteristic(message::kNapDef, [&] {
+        body.parm(message::kNapAddrType, message::token(0x89));
+        body.parm(message::kBearer, message::Value("GSM") + message::token(0x9A));
+    });
+    const Bytes pushed = message::push(message::document(body));
+    qvsMemStartMemCheck();
+    const auto session = [&] {
+        const Answer parsed = vm.parse(pushed);
+        EXPECT_EQ(parsed.number, blocks::failAt < 0 ? 0 : 1);
+        vm.call("qvomacp_parser_del");
+    };
+    EXPECT_GE(blocks::failEach(session), 10);
+    qvsMemEndMemCheck();
+}
+
 TEST(Kept, parse_overwrites)
 {
     Session vm;

@@ -116,28 +116,25 @@ TEST_F(Memory, CountsTheBlocksThatCouldNotBeHad)
         [](void *from) { return qvsMemDup_debug(from, 4, kFile, 1); },
         [](void *from) { return qvsMemReAlloc_debug(from, 4, kFile, 1); },
         [](void *) { return qvs::newBlock(8, kFile); },
+        [](void *) -> void * { return qvs::newText(8, kFile); },
     };
-    for (const auto &request : requests) {
-        const uint32_t before = qvs::refusals;
-        blocks::failAt = 0;
-        EXPECT_EQ(request(text), nullptr);
-        EXPECT_EQ(qvs::refusals, before + 1);
-        blocks::reset();
+    for (const bool tracked : {false, true}) {
+        if (tracked) {
+            qvsMemStartMemCheck();
+        }
+        for (const auto &request : requests) {
+            const uint32_t before = qvs::refusals;
+            blocks::failAt = 0;
+            EXPECT_EQ(request(text), nullptr);
+            EXPECT_EQ(qvs::refusals, before + 1);
+            blocks::reset();
+        }
+        qvsMemEndMemCheck();
     }
     const uint32_t before = qvs::refusals;
     qvsMemFree_debug(qvsMemAlloc_debug(8, kFile, 1));
     EXPECT_EQ(qvsStrdup_debug(nullptr, kFile, 1), nullptr);
     EXPECT_EQ(qvs::refusals, before);
-}
-
-TEST_F(Memory, CountsATextThatCouldNotBeHadWhileBlocksAreTracked)
-{
-    qvsMemStartMemCheck();
-    const uint32_t before = qvs::refusals;
-    blocks::failAt = 0;
-    EXPECT_EQ(qvs::newText(8, kFile), nullptr);
-    EXPECT_EQ(qvs::refusals, before + 1);
-    qvsMemEndMemCheck();
 }
 
 TEST_F(Memory, StrdupCopiesATextAndItsTerminator)
