@@ -225,8 +225,8 @@ inline qvsResult switchPage(qvsWbxmlDecoder *decoder)
 // Gives the byte read last back.
 inline void stepBack(qvsWbxmlDecoder *decoder)
 {
-    smlBuffer *buffer = decoder ? decoder->ptBuffer : nullptr;
-    if (buffer && buffer->pHead > buffer->pStorage) {
+    smlBuffer *const buffer = decoder->ptBuffer;
+    if (buffer->pHead > buffer->pStorage) {
         --buffer->pHead;
     }
 }
