@@ -47,8 +47,7 @@ struct Piece {
     uint8_t *unread = nullptr; // the read position when a string cannot be had; null for a token's
 };
 
-// A text that grows at its end, by as many pieces at a time as are known. Owns its block until
-// take().
+// A text that grows at its end, piece by piece. Owns its block until take().
 struct Text {
     Text() = default;
     // Goes on with a text that already is a block of its own, in which there is no room. `known`
@@ -352,9 +351,9 @@ constexpr bool endsRun(uint8_t token)
     return token == wbxml::kEnd || token == attr::kValue;
 }
 
-// The only piece of a value, as most have. False for any other, and for one that the data ends
-// with. Inline, with nothing that a function outside writes to, since nothing is called as often.
-[[gnu::always_inline]] inline bool onlyPiece(const qvsWbxmlDecoder *decoder, uint8_t **at,
+// The next piece of a value. False for anything else, and for one that the data ends with. Inline,
+// with nothing that a function outside writes to, since nothing is called as often.
+[[gnu::always_inline]] inline bool nextPiece(const qvsWbxmlDecoder *decoder, uint8_t **at,
                                              const uint8_t *end, Piece *piece)
 {
     const uint8_t token = *(*at)++;
@@ -365,12 +364,11 @@ constexpr bool endsRun(uint8_t token)
         }
         *piece = {reinterpret_cast<const char *>(*at), static_cast<uint32_t>(nul - *at)};
         *at = nul + 1;
-    } else if (token != wbxml::kStrT) {
-        return tokenPiece(token, piece) && *at < end;
-    } else if (!tablePiece(decoder, at, end, piece)) {
+    } else if (token == wbxml::kStrT ? !tablePiece(decoder, at, end, piece)
+                                     : !tokenPiece(token, piece)) {
         return false;
     }
-    return *at < end && endsRun(**at);
+    return *at < end;
 }
 
 // The end of the data, where the read position is in front of it.
