@@ -454,20 +454,30 @@ void addLimits(std::vector<Family> *all)
     below.table = std::string(90 * below.unit.size(), 't') + '\0';
     all->push_back(below);
     // What stays allocated by design: records whose place another one of the same element takes,
-    // and texts of parms that are repeated.
+    // and texts that both the tree and the context leave.
     constexpr size_t kRecords = 300;
-    constexpr size_t kTexts = 10;
+    const std::string names[] = {"XCAP_AUID_DCS",    "XCAP_AUID_PMS",   "XCAP_AUID_CDMS",
+                                 "XCAP_IMEI_HEADER", "XCAP_TID_HEADER", "FROM"};
     below.name = "limit-below-left";
     below.open.clear();
-    below.unit = {kCharacteristic};
-    below.unit.resize(1 + kRecords, static_cast<uint8_t>(message::kNapDef));
-    below.unit = below.unit + kElementEnd;
-    for (size_t i = 0; i < kTexts; ++i) {
-        below.unit = below.unit + parm(message::kName, reference(0));
+    below.unit = {kCharacteristic, message::kSwitchPage, 0};
+    below.unit.resize(3 + kRecords, static_cast<uint8_t>(message::kNapDef));
+    below.unit = below.unit + Bytes{message::kSwitchPage, 1,
+                                    static_cast<uint8_t>(message::kApplication), message::kEnd};
+    below.table.clear();
+    for (const std::string &name : names) {
+        below.table += name + '\0';
+    }
+    const Bytes value = reference(static_cast<uint32_t>(below.table.size()));
+    uint32_t at = 0;
+    for (const std::string &name : names) {
+        below.unit = below.unit + Bytes{message::kParm, message::kNameText} + reference(at) +
+                     Bytes{message::kValue} + value + kElementEnd;
+        at += static_cast<uint32_t>(name.size()) + 1;
     }
     below.unit = below.unit + kElementEnd;
     below.close.clear();
-    below.table = std::string(90 * below.unit.size() / kTexts, 't') + '\0';
+    below.table += std::string(90 * below.unit.size() / std::size(names), 't') + '\0';
     all->push_back(below);
 }
 

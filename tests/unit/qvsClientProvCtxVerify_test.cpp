@@ -325,6 +325,25 @@ TEST_F(ContextTop, TakesAllKindsOfOneCharacteristic)
     }
 }
 
+TEST_F(ContextTop, TakesThemInTheirOrder)
+{
+    add(&document, fullHolder());
+    Numbers order;
+    for (long n = 1; order.size() < kRootFields && n < 1000; ++n) {
+        blocks::failFromThenOn = true;
+        blocks::failAt = n; // behind the root
+        const qvsClientProvCtx *root = verify();
+        blocks::reset();
+        for (const size_t field : setFields(root, kRootFields)) {
+            if (std::find(order.begin(), order.end(), field) == order.end()) {
+                order.push_back(field);
+            }
+        }
+    }
+    blocks::failFromThenOn = false;
+    EXPECT_EQ(order, (Numbers{1, 2, 3, 4, 5, 8, 9, 6, 7}));
+}
+
 TEST_F(ContextTop, KeepsTheOrder)
 {
     for (const char *value : {"1", "2", "3"}) {

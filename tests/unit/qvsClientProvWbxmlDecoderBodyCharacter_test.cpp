@@ -2,6 +2,7 @@
 #include "qvsDecoding.h"
 
 #include "kinds.h"
+#include "memcheck.h"
 
 using namespace parms;
 using kinds::Character;
@@ -208,6 +209,40 @@ TEST_F(Characteristic, FillsAllItsSlotsAtOnce)
 
 // ---- What stands inside a characteristic
 
+TEST_F(Characteristic, KeepsListsApartThatGrowByTurns)
+{
+    struct Lists {
+        const char *name;
+        std::map<uint8_t, size_t> fields; // by their tokens
+    };
+    const Lists all[] = {
+        {"PXPHYSICAL", {{0x22, 8}, {0x17, 9}}},
+        {"NAPDEF", {{0x48, 29}, {0x10, 30}}},
+        {"APPLICATION", {{0x39, 13}, {0x22, 14}, {0x34, 15}}},
+        {"BOOTSTRAP", {{0x15, 5}, {0x13, 6}}},
+        {"ACCESS", {{0x3B, 1}, {0x36, 2}, {0x23, 3}, {0x17, 4}, {0x22, 5}, {0x39, 6}}},
+    };
+    for (const Lists &lists : all) {
+        Bytes content;
+        for (const char *value : {"1", "2", "3"}) {
+            for (const auto &[token, field] : lists.fields) {
+                content = join({content, parm(token, std::to_string(field) + value)});
+            }
+        }
+        const Kind &kind = kinds::of(lists.name);
+        const Character read(characteristic(kind.type, content));
+        ASSERT_TRUE(read.node) << lists.name;
+        const void *record = records::get(read.node, kind.slot);
+        for (const auto &[token, field] : lists.fields) {
+            const auto *list = static_cast<const qvsList *>(records::get(record, field));
+            const std::string number = std::to_string(field);
+            EXPECT_EQ(shown(list),
+                      shown(records::Strings{number + "1", number + "2", number + "3"}))
+                << lists.name;
+        }
+    }
+}
+
 TEST_F(Characteristic, IsNoNodeWithoutContent)
 {
     const Bytes elements[] = {{0x86, 0x01}, {0x06, 0x01}, {0x86}, {0x06, 0x81}};
@@ -359,6 +394,21 @@ TEST_F(Characteristic, FailsWithoutMemoryForTheRecordOfItsName)
         (void)qvsClientProvWbxmlDeleteCharacter(node);
     }
     EXPECT_EQ(failures, 3) << "the element and its record, and none";
+}
+
+TEST_F(Characteristic, IsRecordedWithTheSizesOfItsNodeAndItsRecord)
+{
+    for (const Kind &kind : kinds::all()) {
+        qvsWapCharacter *node = nullptr;
+        decoding::Decoder decoder(characteristic(kind.type));
+        const auto blocks = memcheck::reportedBy(
+            [&] { EXPECT_EQ(qvsClientProvWbxmlDecoderCharacter(decoder, &node), QVS_OK); });
+        ASSERT_EQ(blocks.size(), 2U) << kind.name;
+        EXPECT_EQ(blocks[0].size, static_cast<int>(sizeof(qvsWapCharacter)));
+        EXPECT_EQ(blocks[1].size, static_cast<int>(kind.fields * sizeof(void *))) << kind.name;
+        kinds::releaseKept(node);
+        (void)qvsClientProvWbxmlDeleteCharacter(node);
+    }
 }
 
 TEST_F(Characteristic, EndsAtAStringThatPassesTheLimitOfAllTexts)

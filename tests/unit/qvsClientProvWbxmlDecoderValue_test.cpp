@@ -791,7 +791,6 @@ TEST_F(TextLimit, CountsTheTextThatALaterPairContinues)
     qvs::OpenRecord open = {};
     state.open = &open;
     qvsWapPxPhysical record = {};
-    static constexpr qvs::Parm<qvsWapPxPhysical> kDomain = {0x17, &qvsWapPxPhysical::ptDomainList};
-    EXPECT_EQ(qvs::readList(decoder, &state, &record, kDomain), 4111U);
+    EXPECT_EQ(qvs::readList(decoder, &state, &record, {&qvsWapPxPhysical::ptDomainList}), 4111U);
     EXPECT_EQ(record.ptDomainList, nullptr);
 }

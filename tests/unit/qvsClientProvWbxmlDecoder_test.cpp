@@ -332,7 +332,7 @@ Bytes manyProxies()
     for (int i = 0; i < 20; ++i) {
         body.characteristic(message::kPxLogical, [&] {
             body.parm(message::kProxyId, "p1").parm(message::kDomain, "d1");
-            body.parm(message::kDomain, "d2").parm(message::kStartPage, "s1");
+            body.parm(message::kDomain, message::token(0x9A)).parm(message::kStartPage, "s1");
             body.characteristic(message::kPort, [&] { body.parm(message::kPortNbr, "80"); });
             body.characteristic(message::kPort, [&] { body.parm(message::kPortNbr, "81"); });
         });
@@ -424,6 +424,62 @@ struct Rest {
 
     std::set<void *> before = blocks::all();
 };
+
+// How many blocks are left of a body when its context is released.
+template <class Fill>
+size_t leftOf(const Fill &fill)
+{
+    const Rest rest;
+    const size_t before = blocks::live();
+    message::Body body;
+    fill(&body);
+    qvsClientProvCtx *context = decodeMain(message::document(body));
+    EXPECT_NE(context, nullptr);
+    qvsClientProvCtxDelectContext(context);
+    return blocks::live() - before;
+}
+
+TEST_F(DecoderMain, LeavesWhatTheReleasesOfTreeAndContextLeave)
+{
+    using message::Body;
+    using message::Value;
+    const auto ofApplication = [](const char *name) {
+        return leftOf([name](Body *body) {
+            body->characteristic(message::kApplication, [&] { body->parm(Value(name), "v"); });
+        });
+    };
+    for (const char *name : {"XCAP_AUID_DCS", "XCAP_AUID_PMS", "XCAP_AUID_CDMS", "XCAP_IMEI_HEADER",
+                             "XCAP_TID_HEADER"}) {
+        EXPECT_EQ(ofApplication(name), 2U) << name << ": the text and its copy";
+    }
+    EXPECT_EQ(ofApplication("FROM"), 2U) << "the text and its first copy";
+    EXPECT_EQ(ofApplication("OTHER"), 0U);
+    EXPECT_EQ(leftOf([](Body *body) {
+                  body->characteristic(message::kApplication, [&] {
+                      body->characteristic(Value("ROAMING"),
+                                           [&] { body->parm(Value("SYNC-ALLOWED"), "v"); });
+                  });
+              }),
+              4U)
+        << "two records and their texts";
+    EXPECT_EQ(leftOf([](Body *body) {
+                  body->characteristic(message::kVendorConfig, [&] {
+                      body->parm(message::kName, "v").parm(Value("ANY"), "v");
+                  });
+              }),
+              2U)
+        << "name and value";
+    EXPECT_EQ(leftOf([](Body *body) {
+                  body->characteristic(message::kNapDef, [&] { body->parm(Value("INIT")); });
+              }),
+              1U)
+        << "the copy";
+    EXPECT_EQ(leftOf([](Body *body) {
+                  body->characteristic(Value("WI-FI"), [&] { body->parm(Value("NETSSID"), "v"); });
+              }),
+              2U)
+        << "the record and its text";
+}
 
 TEST_F(DecoderMain, TouchesNoByteOutsideOfItsBlocks)
 {

@@ -296,6 +296,68 @@ TEST(Queries, AnswerEveryCombinationOfIndexes)
     EXPECT_EQ(queries, 77);
 }
 
+TEST(Queries, CountTheChainThatIsTheirs)
+{
+    struct Count {
+        const char *native;
+        Indexes path;
+        jint length;
+    };
+    Context context;
+    std::vector<Count> counts;
+    // Makes a chain longer than any before; answers its first record.
+    const auto chain = [&](auto **head, const char *native, const Indexes &path = {}) {
+        counts.push_back({native, path, static_cast<jint>(counts.size()) + 1});
+        for (jint n = 0; n < counts.back().length; ++n) {
+            context.add(head);
+        }
+        return *head;
+    };
+    auto *proxy = chain(&context->ptPxLogical, "qvomacp_GetPxLogicalCount");
+    chain(&proxy->ptDomain, "qvomacp_GetPxDomainCount", {1});
+    chain(&proxy->ptPxAuthInfo, "qvomacp_GetPxAuthInfoCount", {1});
+    auto *port = chain(&proxy->ptPort, "qvomacp_GetPxPortCount", {1});
+    chain(&port->ptService, "qvomacp_GetPxPortServiceCount", {1, 1});
+    auto *physical = chain(&proxy->ptPxPhysical, "qvomacp_GetPxPhysicalCount", {1});
+    chain(&physical->ptDomain, "qvomacp_GetPxPhysicalDomainCount", {1, 1});
+    chain(&physical->ptToNapId, "qvomacp_GetPxPhsicalNapIdCount", {1, 1});
+    port = chain(&physical->ptPort, "qvomacp_GetPxPhysicalPortCount", {1, 1});
+    chain(&port->ptService, "qvomacp_GetPxPhysicalPortServiceCount", {1, 1, 1});
+    auto *napDef = chain(&context->ptNapDef, "qvomacp_GetPxNapDefCount");
+    chain(&napDef->ptDnsAddr, "qvomacp_GetPxDnsAddrCount", {1});
+    chain(&napDef->ptBearer, "qvomacp_GetPxBearerCount", {1});
+    auto *info = chain(&napDef->ptNapAuthInfo, "qvomacp_GetPxNapAuthInfoCount", {1});
+    chain(&info->ptAuthEntity, "qvomacp_GetPxNapAuthEntityCount", {1, 1});
+    chain(&napDef->ptValidity, "qvomacp_GetPxNapValidityCount", {1});
+    auto *bootstrap = chain(&context->ptBootstrap, "qvomacp_GetPxBootstrapCount");
+    chain(&bootstrap->ptProxyId, "qvomacp_GetPxProxyIdCount", {1});
+    chain(&bootstrap->ptNetwork, "qvomacp_GetPxNetworkCount", {1});
+    chain(&context->ptVendorConfig, "qvomacp_GetPxVenderConfigCount");
+    auto *application = chain(&context->ptApplication, "qvomacp_GetPxApplicationCount");
+    chain(&application->ptToProxy, "qvomacp_GetPxToProxyCount", {1});
+    chain(&application->ptToNapId, "qvomacp_GetPxNapIdCount", {1});
+    chain(&application->ptToAddr, "qvomacp_GetPxToAddrCount", {1});
+    auto *address = chain(&application->ptAppAddr, "qvomacp_GetPxAppAddrCount", {1});
+    port = chain(&address->ptPort, "qvomacp_GetPxAppPortCount", {1, 1});
+    chain(&port->ptService, "qvomacp_GetPxServiceCount", {1, 1, 1});
+    chain(&application->ptAppAuth, "qvomacp_GetPxAppAuthCount", {1});
+    chain(&application->ptResource, "qvomacp_GetPxResourceCount", {1});
+    auto *access = chain(&context->ptAccess, "qvomacp_GetPxCtxAccessCount");
+    chain(&access->ptRule, "qvomacp_GetPxRuleCount", {1});
+    chain(&access->ptAppId, "qvomacp_GetPxAppIdCount", {1});
+    chain(&access->ptPortNbr, "qvomacp_GetPxPortNbrCount", {1});
+    chain(&access->ptDomain, "qvomacp_GetPxAccessDomainCount", {1});
+    chain(&access->ptToNapId, "qvomacp_GetPxAccessToNapIdCount", {1});
+    chain(&access->ptToProxy, "qvomacp_GetPxAccessToProxyCount", {1});
+    chain(&context->ptWifi, "qvomacp_GetPxWifiCount");
+    chain(&context->ptVoWifi, "qvomacp_GetPxVoWifiCount");
+    LoadedVm vm;
+    for (const Count &count : counts) {
+        EXPECT_EQ(vm.call(vm.native(count.native), count.path), Answer{.number = count.length})
+            << count.native;
+    }
+}
+
 TEST(Queries, AnswerZeroOrNullWithoutAContext)
 {
     LoadedVm vm;

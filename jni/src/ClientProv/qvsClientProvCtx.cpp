@@ -107,9 +107,7 @@ struct ChainRelease {
 template <class Record>
 consteval ChainRelease releaseOf()
 {
-    static_assert(isComplete<Record>(kRelease<Record>),
-                  "a field is neither released nor left on purpose");
-    return {rowsFor<Record>(kRelease<Record>), kLinkOf<Record>};
+    return {allOf<Record>(kRelease<Record>), kLinkOf<Record>};
 }
 
 // The releases by the numbers of the kinds.

@@ -34,10 +34,8 @@ struct RecordRelease {
     constexpr RecordRelease() = default;
     template <class Record>
     constexpr RecordRelease(uint8_t number, Record *)
-        : rows(rowsFor<Record>(kRelease<Record>)), childList(kChildListOf<Record>), slot(number)
+        : rows(allOf<Record>(kRelease<Record>)), childList(kChildListOf<Record>), slot(number)
     {
-        static_assert(isComplete<Record>(kRelease<Record>),
-                      "a field is neither released nor left on purpose");
     }
 
     Rows<FieldRow> rows;

@@ -94,7 +94,9 @@ consteval KindRows rowsByToken()
         ++row;
         for (uint8_t page = 0; page < 2; ++page) {
             if (kind.pages == kBothPages || kind.pages == page) {
-                rows.of[page][kind.token - attr::kType] = row;
+                uint8_t &known = rows.of[page][kind.token - attr::kType];
+                demand(!known || kind.name); // two kinds with one TYPE do not compile
+                known = row;
             }
         }
     }
@@ -117,10 +119,8 @@ const Kind *findNamedKind(const char *name)
 // The kind of a TYPE token on a code page; null for none.
 const Kind *findKind(uint8_t token, uint8_t page)
 {
-    if (token < attr::kType || token > attr::kTypeAccess) {
-        return nullptr;
-    }
-    const uint8_t row = kRows.of[page == 0 ? 0 : 1][token - attr::kType];
+    const auto at = static_cast<uint8_t>(token - attr::kType);
+    const uint8_t row = at < sizeof kRows.of[0] ? kRows.of[page == 0 ? 0 : 1][at] : 0;
     return row ? &kKinds[row - 1] : nullptr;
 }
 
@@ -247,7 +247,8 @@ qvsResult enter(qvsWbxmlDecoder *decoder, DecodeState *state, Open **innermost)
         return QVS_OK;
     }
     const bool hasAttributes = decoder->nHasAttr;
-    auto *open = static_cast<Open *>(newPiece(state->arena, sizeof(Open), kDecoderModule));
+    constexpr uint32_t kSpare = sizeof(Open) - sizeof(Node);
+    auto *open = static_cast<Open *>(newPiece(state->arena, sizeof(Open), kDecoderModule, kSpare));
     if (!open) {
         return QVS_ERROR_FAILED;
     }
@@ -461,11 +462,10 @@ qvsResult qvsClientProvWbxmlDecoderCharacterAttribute(qvsWbxmlDecoder *decoder,
 {
     DecodeState alone;
     const Kind *kind = nullptr;
-    ScopedText type;
-    if (qvsResult result = readAttributes(decoder, &alone, node, attrId, &kind, &type.text)) {
+    *name = nullptr;
+    if (qvsResult result = readAttributes(decoder, &alone, node, attrId, &kind, name)) {
         return result;
     }
     *codePage = decoder->nCodePage;
-    *name = type.take();
     return QVS_OK;
 }

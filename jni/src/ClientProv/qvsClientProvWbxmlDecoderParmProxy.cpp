@@ -71,8 +71,7 @@ constexpr auto kParms = tableOf<Parm<R>>({
 // kept[pxphysical-domain]: a DOMAIN that cannot be read is traced and the parm goes on.
 qvsResult readDomain(qvsWbxmlDecoder *decoder, DecodeState *state, R *record)
 {
-    static constexpr Parm<R> kDomain = {page0::kDomain, &R::ptDomainList};
-    if (readList(decoder, state, record, kDomain) != QVS_OK) {
+    if (readList(decoder, state, record, {&R::ptDomainList}) != QVS_OK) {
         trace("[ERROR] qvsClientProvWbxmlDecoderParamListString Fail");
     }
     return state->textLimit ? QVS_ERROR_NO_MEMORY : QVS_OK;

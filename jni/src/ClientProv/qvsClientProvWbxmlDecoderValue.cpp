@@ -1,6 +1,7 @@
 // The values of parameters: the value tokens, how their texts join, and the comma join. Tokens are
 // those of the OMA Client Provisioning content.
 #include "qvsClientProvWbxmlDecoder.h"
+#include "qvsFields.h"
 #include "qvsText.h"
 #include "qvsTokens.h"
 #include "qvstrace.h"
@@ -40,24 +41,15 @@ constexpr ValueToken kAddressTypes[] = {
     {0x8A, "SCODE"}, {0x8B, "TETRA-ITSI"}, {0x8C, "MAN"},  {0x93, "DIGEST"},
 };
 
-struct ValueTable {
-    template <size_t N>
-    consteval ValueTable(const ValueToken (&tokens)[N]) : rows(tokens), count(N)
-    {
-    }
-
-    const ValueToken *rows;
-    size_t count;
-};
-
 // In the order in which rows of the same number are compared.
-constexpr ValueTable kTables[] = {kAddressTypes, kAuthTypes, kAuthSchemes, kCallTypes};
+constexpr Rows<ValueToken> kTables[] = {kAddressTypes, kAuthTypes, kAuthSchemes, kCallTypes};
 
 // What a token stands for: a row of a table, counted from 1; row 0 for nothing.
 struct Meaning {
     uint8_t table : 2;
     uint8_t row : 4;
 };
+constexpr uint8_t kMostRows = 15;
 
 // Of the tokens from kFirstValue on; those before it stand for nothing.
 constexpr uint8_t kFirstValue = 0x80;
@@ -71,13 +63,14 @@ struct Meanings {
 consteval Meanings firstHits()
 {
     Meanings meanings = {};
-    for (uint8_t row = 0; row < 9; ++row) {
-        for (uint8_t t = 0; t < 4; ++t) {
+    for (uint8_t row = 0; row < kMostRows; ++row) {
+        for (uint8_t t = 0; t < countOf(kTables); ++t) {
+            demand(kTables[t].count <= kMostRows);
             if (row < kTables[t].count) {
-                Meaning &meaning = meanings.of[kTables[t].rows[row].token - kFirstValue];
+                Meaning &meaning = meanings.of[kTables[t].first[row].token - kFirstValue];
                 if (meaning.row == 0) {
                     meaning.table = t & 3;
-                    meaning.row = (row + 1) & 15;
+                    meaning.row = (row + 1) & kMostRows;
                 }
             }
         }
@@ -92,7 +85,7 @@ constexpr Meanings kMeanings = firstHits();
 const ValueToken *qvs::findValue(uint8_t token)
 {
     const Meaning meaning = token < kFirstValue ? Meaning{} : kMeanings.of[token - kFirstValue];
-    return meaning.row ? kTables[meaning.table].rows + (meaning.row - 1) : nullptr;
+    return meaning.row ? kTables[meaning.table].first + (meaning.row - 1) : nullptr;
 }
 
 qvsResult qvs::commaAdd(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,

@@ -16,6 +16,13 @@ struct qvsCtxStrNode;
 
 namespace [[gnu::visibility("hidden")]] qvs {
 
+// What is made while compiling does not compile where this is given false.
+consteval bool demand(bool condition)
+{
+    constexpr bool kMet[] = {true};
+    return kMet[condition ? 0 : 1];
+}
+
 template <class Record>
 constexpr uint8_t kFieldsOf = sizeof(Record) / sizeof(void *);
 
@@ -41,11 +48,6 @@ template <class Record>
 constexpr uint8_t kRowsOf = kFieldsOf<Record> -
                             (kLinkOf<Record> == kNoField && kChildListOf<Record> == kNoField ? 0
                                                                                              : 1);
-
-// The lists of a record are its last fields. Their places are counted from the end; a list further
-// from it does not compile.
-constexpr uint8_t kMostLists = 6;
-constexpr uint8_t kListPlaces[kMostLists] = {0, 1, 2, 3, 4, 5};
 
 // ---- What a record says itself: the numbers of its fields, counted from 0, and their types
 
@@ -102,6 +104,22 @@ constexpr uint8_t numberOf(Pointee *Record::*field)
 {
     return static_cast<uint8_t>(kMarked<Record>.*field - kMarks<Pointee>);
 }
+
+constexpr uint8_t kMostLists = 6;
+
+// A list of texts of a record. The lists are its last fields; their places are counted from the
+// end, where the one of what nests is.
+template <class Record>
+struct ListOf {
+    consteval ListOf(qvsList *Record::*list)
+        : field(numberOf(list)), place(static_cast<uint8_t>(kFieldsOf<Record> - 1 - field))
+    {
+        demand(place < kMostLists && field != kChildListOf<Record>);
+    }
+
+    uint8_t field;
+    uint8_t place;
+};
 
 // ---- Tables
 
@@ -213,47 +231,11 @@ consteval FieldSet<Record> setOf(Pointees *Record::*...fields)
     return set;
 }
 
-// The fields that stay allocated on purpose when a record is released: none, where nothing is said.
-template <class Record>
-inline constexpr FieldSet<Record> kLeft = {};
-
-// The rows of a table: the fields in their order but for those that are left.
-template <class Row, class Record>
-consteval auto inOrder()
-{
-    constexpr FieldSet<Record> kStay = kLeft<Record>;
-    Row all[kFieldsOf<Record>];
-    (void)marked<Record>(all);
-    Table<Record, Row, kRowsOf<Record> - kStay.count> table;
-    size_t row = 0;
-    for (uint8_t field = 0; field < kRowsOf<Record>; ++field) {
-        if (!kStay.has[field]) {
-            table.rows[row++] = all[field];
-        }
-    }
-    return table;
-}
-
-// The same where the order is another one.
+// The rows of a table about these fields.
 template <class Row, class Record, class... Pointees>
 consteval Table<Record, Row, sizeof...(Pointees)> rowsOf(Pointees *Record::*...fields)
 {
     return {{Row(numberOf(fields), static_cast<Pointees *>(nullptr))...}};
-}
-
-// Whether a table has each field once, but for those that are left.
-template <class Record, class Row, size_t N>
-consteval bool isComplete(const Table<Record, Row, N> &table)
-{
-    FieldSet<Record> seen = kLeft<Record>;
-    for (const Row &row : table.rows) {
-        if (row.field >= kRowsOf<Record> || seen.has[row.field]) {
-            return false;
-        }
-        seen.has[row.field] = true;
-        ++seen.count;
-    }
-    return seen.count == kRowsOf<Record>;
 }
 
 // A table of rows that are typed by their record.

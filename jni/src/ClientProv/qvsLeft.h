@@ -9,6 +9,10 @@
 
 namespace [[gnu::visibility("hidden")]] qvs {
 
+// The fields that stay allocated on purpose when a record is released: none, where nothing is said.
+template <class Record>
+inline constexpr FieldSet<Record> kLeft = {};
+
 // ---- The tree
 
 // kept[tree-application-left]: these six stay allocated when the tree is gone.
@@ -48,6 +52,40 @@ inline constexpr auto kLeft<qvsCtxNapDef> = setOf(&qvsCtxNapDef::pszInit);
 // allocated too.
 template <>
 inline constexpr auto kLeft<qvsClientProvCtx> = setOf(&qvsClientProvCtx::ptWifi);
+
+// ---- What is released
+
+// The rows of a table: the fields in their order but for those that are left.
+template <class Row, class Record>
+consteval auto inOrder()
+{
+    constexpr FieldSet<Record> kStay = kLeft<Record>;
+    Row all[kFieldsOf<Record>];
+    (void)marked<Record>(all);
+    Table<Record, Row, kRowsOf<Record> - kStay.count> table;
+    size_t row = 0;
+    for (uint8_t field = 0; field < kRowsOf<Record>; ++field) {
+        if (!kStay.has[field]) {
+            table.rows[row++] = all[field];
+        }
+    }
+    return table;
+}
+
+// The rows of a table. One that has a field twice, or lacks one that is not left on purpose, does
+// not compile.
+template <class Record, class Row, size_t N>
+consteval Rows<Row> allOf(const Table<Record, Row, N> &table)
+{
+    FieldSet<Record> seen = kLeft<Record>;
+    for (const Row &row : table.rows) {
+        demand(row.field < kRowsOf<Record> && !seen.has[row.field]);
+        seen.has[row.field] = true;
+        ++seen.count;
+    }
+    demand(seen.count == kRowsOf<Record>);
+    return table.rows;
+}
 
 } // namespace qvs
 

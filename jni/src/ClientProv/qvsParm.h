@@ -34,11 +34,7 @@ struct Parm {
     using Row = ParmRow;
 
     consteval Parm(uint8_t t, char *Record::*text) : row{t, ParmType::kText, numberOf(text), 0} {}
-    consteval Parm(uint8_t t, qvsList *Record::*list)
-        : row{t, ParmType::kList, numberOf(list),
-              kListPlaces[kFieldsOf<Record> - 1 - numberOf(list)]}
-    {
-    }
+    consteval Parm(uint8_t t, ListOf<Record> l) : row{t, ParmType::kList, l.field, l.place} {}
     consteval Parm(uint8_t t, ParmType by) : row{t, by, kNoField, 0} {}
 
     ParmRow row;
@@ -163,12 +159,25 @@ struct ParmsOf {
                       ParmReader<Record> reader = {})
         : table{style, rowsFor<Record>(rows), nullptr, reader.read}
     {
+        demand(has(rows, kByReader) == (reader.read != nullptr) && !has(rows, kByName));
     }
     template <size_t N>
     consteval ParmsOf(const ParmStyle &style, const Table<Record, ParmRow, N> &rows,
                       const NamedOf<Record> &named)
         : table{style, rowsFor<Record>(rows), &named.parms, nullptr}
     {
+        demand(has(rows, kByName) && !has(rows, kByReader));
+    }
+
+    // Whether rows are read by what the table has to be given for them.
+    template <size_t N>
+    static consteval bool has(const Table<Record, ParmRow, N> &rows, ParmType by)
+    {
+        bool found = false;
+        for (const ParmRow &row : rows.rows) {
+            found |= row.type == by;
+        }
+        return found;
     }
 
     ParmTable table;
@@ -216,9 +225,9 @@ qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, u
                    uint8_t place);
 template <class Record>
 qvsResult readList(qvsWbxmlDecoder *decoder, DecodeState *state, Record *record,
-                   const Parm<Record> &list)
+                   ListOf<Record> list)
 {
-    return readList(decoder, state, record, list.row.field, list.row.place);
+    return readList(decoder, state, record, list.field, list.place);
 }
 
 // ---- Parameters whose name is given as text

@@ -160,6 +160,17 @@ bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
     return true;
 }
 
+uint32_t qvs::lengthBehind(const smlBuffer *buffer, const uint8_t *at, uint32_t left)
+{
+    // hardened: behind the data nothing is read but the storage, which the buffer has to tell.
+    const auto capacity = static_cast<size_t>(buffer->pEnd - buffer->pStorage);
+    if (capacity != buffer->nCapacity || at + left > buffer->pEnd) {
+        return left;
+    }
+    const void *nul = memchr(at, '\0', static_cast<size_t>(buffer->pEnd - at));
+    return static_cast<uint32_t>((nul ? static_cast<const uint8_t *>(nul) : buffer->pEnd) - at);
+}
+
 bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
     Rest rest(decoder);
@@ -168,7 +179,7 @@ bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
         const uint8_t token = *rest.at++;
         Piece piece;
         if (token == wbxml::kStrI) {
-            inlinePiece(&rest.at, rest.end, &piece);
+            inlinePiece(decoder->ptBuffer, &rest.at, rest.end, &piece);
         } else {
             more = token == wbxml::kStrT ? tablePiece(decoder, &rest.at, rest.end, &piece)
                                          : tokenPiece(token, &piece);
@@ -186,7 +197,7 @@ qvsResult qvs::dropInlineString(qvsWbxmlDecoder *decoder, DecodeState *state)
 {
     uint8_t *at = decoder->ptBuffer->pHead;
     Piece piece;
-    inlinePiece(&at, at + bytesLeft(decoder), &piece);
+    inlinePiece(decoder->ptBuffer, &at, at + bytesLeft(decoder), &piece);
     if (!countText(state, piece.length)) {
         return QVS_ERROR_NO_MEMORY;
     }

@@ -50,8 +50,8 @@ struct Piece {
 // A text that grows at its end, piece by piece. Owns its block until take().
 struct Text {
     Text() = default;
-    // Goes on with a text that already is a block of its own. `known` may tell its length and
-    // capacity, so that a text joined again and again is not measured again and again.
+    // Goes on with a text that is a block of its own, in which there is no room. `known` may tell
+    // its length and capacity, so that one joined again and again is not measured each time.
     explicit Text(char *block, const JoinedText *known = nullptr) : data(block)
     {
         if (block && known && known->text == block) {
@@ -59,7 +59,7 @@ struct Text {
             capacity = known->capacity;
         } else if (block) {
             length = qvsStrlen(block);
-            capacity = length + 1;
+            capacity = length;
         }
     }
     Text(const Text &) = delete;
@@ -270,13 +270,16 @@ inline bool takeUint32(qvsWbxmlDecoder *decoder, uint32_t *value)
 
 // ---- Pieces, read from `*at` on, which moves behind them; `end` is the end of the data.
 
-// An inline string. One that the data ends in is taken as it stands.
-inline void inlinePiece(uint8_t **at, const uint8_t *end, Piece *piece)
+// The length of an inline string that has no NUL in the `left` bytes of data from `at` on.
+[[gnu::cold]] uint32_t lengthBehind(const smlBuffer *buffer, const uint8_t *at, uint32_t left);
+
+// An inline string, up to a NUL in the data or behind it.
+inline void inlinePiece(const smlBuffer *buffer, uint8_t **at, const uint8_t *end, Piece *piece)
 {
     const auto left = static_cast<uint32_t>(end - *at);
     const void *nul = left ? memchr(*at, '\0', left) : nullptr;
-    const uint32_t length =
-        nul ? static_cast<uint32_t>(static_cast<const uint8_t *>(nul) - *at) : left;
+    const uint32_t length = nul ? static_cast<uint32_t>(static_cast<const uint8_t *>(nul) - *at)
+                                : lengthBehind(buffer, *at, left);
     *piece = {reinterpret_cast<const char *>(*at), length, Join::kDirect, *at};
     *at += length + 1;
 }
