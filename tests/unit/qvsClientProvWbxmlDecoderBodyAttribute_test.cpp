@@ -111,6 +111,18 @@ TEST_F(CharacteristicAttribute, MakesTheRecordOfANameBeforeItReturnsItsFailure)
     EXPECT_EQ(read.result, 4103U);
     EXPECT_TRUE(read.node->ptWifi);
     EXPECT_EQ(read.node->ptPort, nullptr);
+    EXPECT_STREQ(read.name, "WI-FI");
+}
+
+TEST_F(CharacteristicAttribute, HandsTheNameOutInFrontOfAFailure)
+{
+    const Attributes unknown({0x50, 0xC3, 0x03, 'a', 'n', 'y', 0x5C});
+    EXPECT_EQ(unknown.result, 4101U);
+    EXPECT_STREQ(unknown.name, "any");
+
+    const Attributes second({0x50, 0xC3, 0x03, 'a', 'n', 'y', 0x50});
+    EXPECT_EQ(second.result, 4103U);
+    EXPECT_EQ(second.name, nullptr) << "nothing was read of the second one";
 }
 
 TEST_F(CharacteristicAttribute, FailsWhereTheDataEnds)

@@ -2,6 +2,7 @@
 #include "qvsDecoding.h"
 
 #include "kinds.h"
+#include "memcheck.h"
 
 using namespace parms;
 using kinds::Character;
@@ -393,6 +394,21 @@ TEST_F(Characteristic, FailsWithoutMemoryForTheRecordOfItsName)
         (void)qvsClientProvWbxmlDeleteCharacter(node);
     }
     EXPECT_EQ(failures, 3) << "the element and its record, and none";
+}
+
+TEST_F(Characteristic, IsRecordedWithTheSizesOfItsNodeAndItsRecord)
+{
+    for (const Kind &kind : kinds::all()) {
+        qvsWapCharacter *node = nullptr;
+        decoding::Decoder decoder(characteristic(kind.type));
+        const auto blocks = memcheck::reportedBy(
+            [&] { EXPECT_EQ(qvsClientProvWbxmlDecoderCharacter(decoder, &node), QVS_OK); });
+        ASSERT_EQ(blocks.size(), 2U) << kind.name;
+        EXPECT_EQ(blocks[0].size, static_cast<int>(sizeof(qvsWapCharacter)));
+        EXPECT_EQ(blocks[1].size, static_cast<int>(kind.fields * sizeof(void *))) << kind.name;
+        kinds::releaseKept(node);
+        (void)qvsClientProvWbxmlDeleteCharacter(node);
+    }
 }
 
 TEST_F(Characteristic, EndsAtAStringThatPassesTheLimitOfAllTexts)

@@ -1,5 +1,6 @@
 // The parameters of applications: APPLICATION, APPADDR, APPAUTH, RESOURCE.
 #include "parms.h"
+#include "qvsParm.h"
 
 #include <cstring>
 
@@ -246,6 +247,20 @@ TEST_F(ApplicationParm, DropsAValueThatCarriesNothing)
     EXPECT_EQ(run.read(), 0U);
     EXPECT_EQ(run.left(), 0U);
     EXPECT_EQ(fieldsSet(run.record.get()), records::Numbers{});
+}
+
+TEST_F(ApplicationParm, DropsAValueOfSeveralPiecesWithoutABlock)
+{
+    for (const size_t left : {10U, 9U, 5U}) {
+        Reading<Application> run(parm(join({{0x05, 0x03, 'x', 0x00, 0x06, 0x03, 'a', 'b', 0x00},
+                                            {0x03, 'c', 'd', 'e', 0x00, 0x86, 0x01}})));
+        qvs::DecodeState state = {.textLeft = left};
+        blocks::startCounting();
+        EXPECT_EQ(qvs::readParms(run.decoder, &state, run.record, qvs::kApplicationParms.table),
+                  left < 10 ? 4111U : 0U);
+        EXPECT_EQ(state.textLeft, 0U);
+        EXPECT_EQ(blocks::allocations() == 0, left == 10);
+    }
 }
 
 TEST_F(ApplicationParm, ReadsTheNextParameterBehindANameWithoutAValue)

@@ -193,6 +193,21 @@ TEST_F(WifiParm, ReadsTheElementsThatFollowInADecode)
     EXPECT_STREQ(run.record->pszPriority, "1");
 }
 
+TEST_F(WifiParm, ReadsOnAcrossInlineStringsInADecodeUntilTheTextsPassTheirLimit)
+{
+    const Bytes gap = {0x03, '\r', '\n', 0};
+    for (const size_t left : {26U, 25U, 16U, 13U}) {
+        Reading<Wifi> run(
+            join({named("NETSSID", "home"), gap, gap, named("PRIORITY", "1"), {0x01}}));
+        qvs::DecodeState state = {.textLeft = left};
+        EXPECT_EQ(qvs::readParms(run.decoder, &state, run.record, qvs::kWifiParms.table),
+                  left < 26 ? 4111U : 0U);
+        EXPECT_EQ(run.record->pszPriority != nullptr, left >= 26);
+        EXPECT_STREQ(run.record->pszNetSsid, "home");
+        EXPECT_EQ(run.left() == 1, left >= 26);
+    }
+}
+
 TEST(Kept, named_refusal)
 {
     blocks::BlockCheck check;

@@ -261,7 +261,8 @@ TEST_F(PxPhysicalParm, FailsBehindAReferenceWithoutMemoryForItsText)
 TEST_F(PxPhysicalParm, EndsAtADomainThatPassesTheLimitOfAllTexts)
 {
     Reading<PxPhysical> run(parm(0x17, "one more"));
-    qvs::DecodeState state = {.textLeft = 0};
+    qvs::OpenRecord open = {};
+    qvs::DecodeState state = {.textLeft = 0, .open = &open};
     Traces traces;
     EXPECT_EQ(qvs::readParms(run.decoder, &state, run.record, qvs::kPxPhysicalParms.table), 4111U);
     EXPECT_EQ(run.record->ptDomainList, nullptr);

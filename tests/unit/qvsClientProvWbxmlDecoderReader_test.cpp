@@ -200,6 +200,43 @@ TEST_F(StringReader, NeverReadsOutsideAStorageWithoutASpareByte)
     qvsMemFree_debug(storage);
 }
 
+TEST_F(StringReader, ReadsOnBehindTheDataAsFarAsTheStorageGoes)
+{
+    Decoder decoder({'a', 'b', 'c', 'd', 0, 'e'});
+    decoder->ptBuffer->nSize = 2;
+    OwnText text;
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(decoder, &text), 1U);
+    EXPECT_EQ(text.str(), "abcd");
+    EXPECT_EQ(decoder.position(), 5U);
+    uint8_t byte = 0;
+    EXPECT_EQ(qvsClientProvWbxmlDecoderBufferReadByte(decoder, &byte), 0U);
+    // From behind the data too.
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(decoder, &text), 1U);
+    EXPECT_EQ(text.str(), "abcde");
+    EXPECT_EQ(decoder.position(), 7U);
+}
+
+TEST_F(StringReader, ReadsByTheHeadTheStorageAndTheSizeOfABufferAlone)
+{
+    Decoder decoder({'a', 0, 0, 'b'});
+    const smlBuffer whole = *decoder->ptBuffer;
+    uint8_t elsewhere = 0;
+    decoder->ptBuffer->pTail = nullptr;
+    decoder->ptBuffer->nCapacity = 0xFFFFFFF0;
+    decoder->ptBuffer->bOutside = 1;
+    for (uint8_t *end : {static_cast<uint8_t *>(nullptr), &elsewhere}) {
+        decoder->ptBuffer->pHead = whole.pHead;
+        decoder->ptBuffer->pEnd = end;
+        OwnText text;
+        for (const uint32_t position : {2U, 3U, 5U}) {
+            EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(decoder, &text), 1U);
+            EXPECT_EQ(decoder.position(), position);
+        }
+        EXPECT_EQ(text.str(), "ab");
+    }
+    *decoder->ptBuffer = whole;
+}
+
 TEST_F(StringReader, AdvancesByTheTerminatorAtTheVeryEnd)
 {
     Decoder decoder({'a', 'b'});
@@ -227,6 +264,28 @@ TEST_F(StringReader, AppendsToATextThatIsThereInANewBlock)
     OwnText text("a");
     EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(decoder, &text), 1U);
     EXPECT_EQ(text.str(), "abc");
+}
+
+TEST_F(StringReader, AppendsAnEmptyTextToAHostsBlockInANewOne)
+{
+    // The host's block ends with the terminator; behind it there is nothing.
+    const auto hostText = [] {
+        const blocks::Fence fence;
+        return static_cast<char *>(qvsMemDup_debug("1234567", 8, "host", __LINE__));
+    };
+    OwnText text;
+    text.text = hostText();
+    Decoder decoder({0x00});
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStr(decoder, &text), 1U);
+    EXPECT_EQ(text.str(), "1234567");
+
+    OwnText opaque;
+    opaque.text = hostText();
+    uint32_t length = 1;
+    Decoder empty({0x00});
+    EXPECT_EQ(qvsClientProvWbxmlDecoderGetStrExtension(empty, 0xC3, &opaque, &length), 1U);
+    EXPECT_EQ(opaque.str(), "1234567");
+    EXPECT_EQ(length, 0U);
 }
 
 TEST_F(StringReader, WithoutMemoryKeepsTheTextThatWasThere)

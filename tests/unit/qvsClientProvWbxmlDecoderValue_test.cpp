@@ -7,6 +7,7 @@
 #include "traces.h"
 
 #include <cstring>
+#include <functional>
 #include <map>
 #include <optional>
 #include <string>
@@ -635,24 +636,95 @@ TEST_F(CommaAdd, GoesOnWithALengthItAlreadyKnows)
     EXPECT_EQ(known.length, 12U);
 }
 
-// Four pieces at a time: their block is as long as they are, and doubled for the next ones.
-TEST_F(ParamString, MakesOneBlockForTheFirstPieces)
+std::string blocksFor(const Bytes &bytes,
+                      const std::function<qvsResult(Decoder &, OwnText &)> &read)
 {
-    const auto blocksFor = [](const Bytes &bytes) {
-        Decoder decoder(bytes);
-        OwnText text;
-        blocks::startCounting();
-        EXPECT_EQ(qvsClientProvWbxmlDecoderParamString(decoder, &text, 0x15), QVS_OK);
-        return std::to_string(blocks::allocations()) + " for " + text.str();
-    };
-    EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x01}), "1 for a");
-    EXPECT_EQ(blocksFor({0x15, 0x06, 0x03, 'a', 0, 0x03, 'b', 0, 0x01}), "1 for ab");
-    Bytes many = {0x15, 0x06};
-    for (char letter = 'a'; letter < 'n'; ++letter) {
-        many.insert(many.end(), {0x03, static_cast<uint8_t>(letter), 0});
+    Decoder decoder(bytes);
+    OwnText text;
+    blocks::startCounting();
+    EXPECT_EQ(read(decoder, text), QVS_OK);
+    return std::to_string(blocks::allocations()) + " for " + text.str();
+}
+
+Bytes valueOf(const std::string &letters)
+{
+    Bytes bytes = {0x15, 0x06};
+    for (const char letter : letters) {
+        bytes.insert(bytes.end(), {0x03, static_cast<uint8_t>(letter), 0});
     }
-    many.push_back(0x01);
-    EXPECT_EQ(blocksFor(many), "3 for abcdefghijklm");
+    bytes.push_back(0x01);
+    return bytes;
+}
+
+TEST_F(ParamString, DoublesTheBlockThatPiecesDoNotFitIn)
+{
+    const auto read = [](Decoder &decoder, OwnText &text) {
+        return qvsClientProvWbxmlDecoderParamString(decoder, &text, 0x15);
+    };
+    EXPECT_EQ(blocksFor(valueOf("a"), read), "1 for a");
+    EXPECT_EQ(blocksFor(valueOf("ab"), read), "2 for ab");
+    EXPECT_EQ(blocksFor(valueOf("abcdefghijklm"), read), "4 for abcdefghijklm");
+}
+
+TEST_F(ParamString, MakesOneBlockForThePiecesOfAParm)
+{
+    const auto read = [](Decoder &decoder, OwnText &text) {
+        qvsWapPxLogical record = {};
+        const qvsResult result = qvsClientProvWbxmlDecoderParamPxlogical(decoder, &record);
+        text.text = record.pszProxyId;
+        return result;
+    };
+    for (const char *letters : {"a", "ab", "abcdefghijklm"}) {
+        Bytes parm = {0x87};
+        const Bytes value = valueOf(letters);
+        parm.insert(parm.end(), value.begin(), value.end());
+        EXPECT_EQ(blocksFor(parm, read), std::string("1 for ") + letters);
+    }
+}
+
+// The value of a parm, or what became of it.
+std::string valueInParm(const Bytes &value, size_t left = SIZE_MAX, bool lacksMemory = false)
+{
+    Bytes parm = {0x87, 0x15, 0x06};
+    parm.insert(parm.end(), value.begin(), value.end());
+    parm.push_back(0x01);
+    Decoder decoder(parm);
+    qvsWapPxLogical record = {};
+    qvs::DecodeState state = {.textLeft = left};
+    if (lacksMemory) {
+        blocks::failAt = 0;
+    }
+    const qvsResult result = qvs::readParms(decoder, &state, &record, qvs::kPxLogicalParms.table);
+    OwnText text;
+    text.text = record.pszProxyId;
+    return (result ? std::to_string(result) + " at " + std::to_string(decoder.position())
+                   : text.str()) +
+           (state.textLimit ? ", too much" : "");
+}
+
+TEST_F(ParamString, JoinsThePiecesOfAParmAsTheirTokensSay)
+{
+    EXPECT_EQ(valueInParm({0x03, 'a', 0, 0x86, 0x03, 'b', 0}), "aIPV6b");
+    EXPECT_EQ(valueInParm({0x03, 'a', 0, 0x9A, 0x03, 'b', 0}), "a,PAPb");
+    EXPECT_EQ(valueInParm({0x03, 'a', 0, 0x94, 0x03, 'b', 0}), "ab");
+    EXPECT_EQ(valueInParm({0x03, 0, 0x03, 0}), "");
+    EXPECT_EQ(valueInParm({0x03, 'a', 0, 0x02}), "4103 at 7");
+    EXPECT_EQ(valueInParm({0x03, 'a', 0, 0x83, 0x09}), "4103 at 8");
+}
+
+TEST_F(ParamString, CountsThePiecesOfAParmTogether)
+{
+    const Bytes value = {0x03, 'a', 'b', 0, 0x03, 'c', 0};
+    EXPECT_EQ(valueInParm(value, 3), "abc");
+    EXPECT_EQ(valueInParm(value, 2), "4111 at 8, too much");
+    EXPECT_EQ(valueInParm(value, 1), "4111 at 4, too much");
+}
+
+TEST_F(ParamString, OfAParmInPiecesWithoutMemoryIs4103AtTheFirst)
+{
+    for (const Bytes &value : {Bytes{0x03, 'a', 0}, Bytes{0x03, 'a', 0, 0x03, 'b', 0}}) {
+        EXPECT_EQ(valueInParm(value, SIZE_MAX, true), "4103 at 4");
+    }
 }
 
 // A table of one megabyte, and references to it until the texts pass their limit.

@@ -332,7 +332,7 @@ Bytes manyProxies()
     for (int i = 0; i < 20; ++i) {
         body.characteristic(message::kPxLogical, [&] {
             body.parm(message::kProxyId, "p1").parm(message::kDomain, "d1");
-            body.parm(message::kDomain, "d2").parm(message::kStartPage, "s1");
+            body.parm(message::kDomain, message::token(0x9A)).parm(message::kStartPage, "s1");
             body.characteristic(message::kPort, [&] { body.parm(message::kPortNbr, "80"); });
             body.characteristic(message::kPort, [&] { body.parm(message::kPortNbr, "81"); });
         });

@@ -31,10 +31,10 @@ bool addBlock(qvsArena *arena)
     return true;
 }
 
-void *newPiece(qvsArena *arena, uint32_t size, const char *module, int line)
+void *newPiece(qvsArena *arena, uint32_t size, const char *module, uint32_t spare, int line)
 {
     if (!arena) {
-        return qvsMemAllocSetZero_debug(size, module, line);
+        return newCleared(size - spare, spare, module, line);
     }
     char *piece = takeRoom(arena, size);
     return piece ? memset(piece, 0, size) : nullptr;

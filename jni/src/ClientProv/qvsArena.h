@@ -22,9 +22,10 @@ constexpr uint32_t kLargestPiece = 512;
 bool addBlock(qvsArena *arena);
 
 // A cleared piece of `size` bytes: a multiple of the size of a pointer, kLargestPiece at most. One
-// that is a block of its own is tracked under the module and the line that asked for it. Null
-// without memory.
-void *newPiece(qvsArena *arena, uint32_t size, const char *module, int line = __builtin_LINE());
+// that is a block of its own is tracked under the module and the line that asked for it, without
+// the `spare` bytes at its end. Null without memory.
+void *newPiece(qvsArena *arena, uint32_t size, const char *module, uint32_t spare = 0,
+               int line = __builtin_LINE());
 
 // Room for a piece of an arena, not cleared.
 inline char *takeRoom(qvsArena *arena, uint32_t size)

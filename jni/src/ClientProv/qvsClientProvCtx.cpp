@@ -144,8 +144,7 @@ void releaseRows(void *record, const ChainRelease &kind)
     }
 }
 
-// Releases the records of a chain with what they own.
-// Strips every record from the first to the last, then releases the records from the
+// Releases what the records of a chain own, from the first to the last, then the records from the
 // last to the first. The links, turned round on the way there, lead the way back.
 void releaseKind(void *first, uint8_t number)
 {

@@ -247,7 +247,8 @@ qvsResult enter(qvsWbxmlDecoder *decoder, DecodeState *state, Open **innermost)
         return QVS_OK;
     }
     const bool hasAttributes = decoder->nHasAttr;
-    auto *open = static_cast<Open *>(newPiece(state->arena, sizeof(Open), kDecoderModule));
+    constexpr uint32_t kSpare = sizeof(Open) - sizeof(Node);
+    auto *open = static_cast<Open *>(newPiece(state->arena, sizeof(Open), kDecoderModule, kSpare));
     if (!open) {
         return QVS_ERROR_FAILED;
     }
@@ -461,11 +462,10 @@ qvsResult qvsClientProvWbxmlDecoderCharacterAttribute(qvsWbxmlDecoder *decoder,
 {
     DecodeState alone;
     const Kind *kind = nullptr;
-    ScopedText type;
-    if (qvsResult result = readAttributes(decoder, &alone, node, attrId, &kind, &type.text)) {
+    *name = nullptr;
+    if (qvsResult result = readAttributes(decoder, &alone, node, attrId, &kind, name)) {
         return result;
     }
     *codePage = decoder->nCodePage;
-    *name = type.take();
     return QVS_OK;
 }

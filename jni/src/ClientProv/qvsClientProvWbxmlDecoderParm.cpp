@@ -9,6 +9,38 @@ namespace {
 
 // ---- Values
 
+// readNext() of a value whose first piece, of `length` bytes, is followed by more, from `at` on.
+// Their length is known before a block is made, and they are looked at again to be written.
+[[gnu::noinline]] qvsResult readPieces(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
+                                       uint8_t *at, uint32_t length)
+{
+    smlBuffer *const buffer = decoder->ptBuffer;
+    uint8_t *const value = buffer->pHead + 1;
+    const uint8_t *const end = endOf(buffer);
+    const size_t most = state->textLeft < kLongest ? state->textLeft : kLongest - 1;
+    Piece piece;
+    while (!endsRun(*at)) {
+        if (tracking || !nextPiece(decoder, &at, end, &piece) || piece.join != Join::kDirect ||
+            piece.length > most - length) {
+            return readValue(decoder, state, text);
+        }
+        length += piece.length;
+    }
+    state->textLeft -= length;
+    buffer->pHead = at;
+    char *block = newText(length + 1, kDecoderModule);
+    if (!block) [[unlikely]] {
+        return lackValue(decoder, state, value);
+    }
+    *text = block;
+    for (at = value; !endsRun(*at) && nextPiece(decoder, &at, end, &piece);) {
+        memcpy(block, piece.bytes, piece.length);
+        block += piece.length;
+    }
+    memset(block, 0, 1 + kSpareZeros);
+    return QVS_OK;
+}
+
 // readValue() of a VALUE that was seen, while nobody takes traces: most are one piece.
 [[gnu::noinline]] qvsResult readNext(qvsWbxmlDecoder *decoder, DecodeState *state, char **text)
 {
@@ -17,13 +49,17 @@ namespace {
     const uint8_t *const end = endOf(buffer);
     uint8_t *at = value;
     Piece piece;
-    if (at == end || !onlyPiece(decoder, &at, end, &piece) || piece.length > state->textLeft) {
+    if (at == end || !nextPiece(decoder, &at, end, &piece) || piece.length > state->textLeft ||
+        piece.length >= kLongest) {
         return readValue(decoder, state, text);
     }
     const uint32_t length = piece.length;
+    if (!endsRun(*at) && wbxml::isString(*value)) {
+        return readPieces(decoder, state, text, at, length);
+    }
     state->textLeft -= length;
     buffer->pHead = at;
-    char *block = length < kLongest ? newText(length + 1, kDecoderModule) : nullptr;
+    char *block = newText(length + 1, kDecoderModule);
     if (!block) [[unlikely]] {
         return lackValue(decoder, state, value);
     }
@@ -151,22 +187,47 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
 
 // ---- Names given as text
 
+// leaveUnknown() of a VALUE that was seen, while nobody takes traces.
+[[gnu::noinline]] qvsResult leaveNext(qvsWbxmlDecoder *decoder, DecodeState *state,
+                                      const NamedParms &parms)
+{
+    smlBuffer *const buffer = decoder->ptBuffer;
+    const uint8_t *const value = buffer->pHead + 1;
+    const uint8_t *const end = endOf(buffer);
+    uint8_t *at = buffer->pHead + 1;
+    size_t left = state->textLeft;
+    Piece piece;
+    do {
+        if (!parms.dropsUnknown || at == end || !nextPiece(decoder, &at, end, &piece) ||
+            piece.length > left || (piece.join != Join::kDirect && wbxml::isString(*value))) {
+            return leaveUnknown(decoder, state, parms);
+        }
+        left -= piece.length;
+    } while (!endsRun(*at) && wbxml::isString(*value) && !tracking);
+    if (!endsRun(*at) && wbxml::isString(*value)) {
+        return leaveUnknown(decoder, state, parms);
+    }
+    state->textLeft = left;
+    buffer->pHead = at;
+    return QVS_OK;
+}
+
 // readNamed() where a name of one piece and a VALUE are next.
-[[gnu::noinline]] qvsResult readNamedNext(qvsWbxmlDecoder *decoder, DecodeState *state,
-                                          void *record, const NamedParms &parms)
+inline qvsResult readNamedNext(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                               const NamedParms &parms)
 {
     smlBuffer *const buffer = decoder->ptBuffer;
     const uint8_t *const end = endOf(buffer);
     uint8_t *at = buffer->pHead;
     Piece name;
-    if (traceSink || *at++ != attr::kName || at == end || !onlyPiece(decoder, &at, end, &name) ||
+    if (traceSink || *at++ != attr::kName || at == end || !nextPiece(decoder, &at, end, &name) ||
         *at != attr::kValue || name.length == 0 || name.length > state->textLeft) {
         return readNamed(decoder, state, record, attr::kName, parms);
     }
     state->textLeft -= name.length;
     buffer->pHead = at;
     char **field = findNamed(record, parms.names, name.bytes, name.length);
-    return field ? readNext(decoder, state, field) : leaveUnknown(decoder, state, parms);
+    return field ? readNext(decoder, state, field) : leaveNext(decoder, state, parms);
 }
 
 // ---- The loop
@@ -275,14 +336,10 @@ qvsResult readParm(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
     }
 }
 
-// Reads a parm element, of which a byte was seen, into `record`.
-[[gnu::noinline]] qvsResult readElement(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
-                                        const ParmTable &table)
+// Reads the parm element at the read position into `record`, its attributes up to END.
+inline qvsResult readElement(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
+                             const ParmTable &table)
 {
-    traceEntry(table);
-    if (!record) {
-        return QVS_ERROR_BAD_ARGUMENT;
-    }
     if (qvsResult result = takeStart(decoder)) {
         return result;
     }
@@ -338,9 +395,7 @@ qvsResult qvsClientProvWbxmlDecoderParamListString(qvsWbxmlDecoder *decoder, qvs
 qvsResult qvs::readList(qvsWbxmlDecoder *decoder, DecodeState *state, void *record, uint8_t field,
                         uint8_t place)
 {
-    qvsListNode *unknown = nullptr;
-    qvsListNode **last = state->open ? state->open->last + place : &unknown;
-    return readOnto(decoder, state, listAt(record, field), last);
+    return readOnto(decoder, state, listAt(record, field), state->open->last + place);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable &table)
@@ -351,17 +406,27 @@ qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, void *record, const ParmTable
     }
     OpenRecord open = {};
     DecodeState alone = {.open = &open};
-    return readElement(decoder, &alone, record, table);
+    return readParms(decoder, &alone, record, table, false);
 }
 
 qvsResult qvs::readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
-                         const ParmTable &table)
+                         const ParmTable &table, bool all)
 {
+    traceEntry(table);
+    if (!record) {
+        return QVS_ERROR_BAD_ARGUMENT;
+    }
+    const smlBuffer *const buffer = decoder->ptBuffer;
     for (;;) {
-        const qvsResult result = readElement(decoder, state, record, table);
-        const smlBuffer *const buffer = decoder->ptBuffer;
-        if (result != QVS_OK || traceSink || buffer->pHead >= endOf(buffer) ||
-            *buffer->pHead != kParmStart) {
+        qvsResult result = readElement(decoder, state, record, table);
+        if (!all || traceSink) {
+            return result;
+        }
+        while (result == QVS_OK && buffer->pHead < endOf(buffer) &&
+               *buffer->pHead == wbxml::kStrI) {
+            result = dropInlineString(decoder, state);
+        }
+        if (result != QVS_OK || buffer->pHead >= endOf(buffer) || *buffer->pHead != kParmStart) {
             return result;
         }
     }

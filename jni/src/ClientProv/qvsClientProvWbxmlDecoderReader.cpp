@@ -68,12 +68,12 @@ uint32_t qvsClientProvWbxmlDecoderGetStr(qvsWbxmlDecoder *decoder, char **text)
         return 0;
     }
     Piece piece;
-    inlinePiece(&rest.at, rest.end, &piece);
+    inlinePiece(decoder->ptBuffer, &rest.at, rest.end, &piece);
     if (!appendOne(text, piece)) {
         return 0;
     }
     // hardened: a read position behind the storage goes no further.
-    if (decoder->ptBuffer->pHead <= decoder->ptBuffer->pEnd) {
+    if (decoder->ptBuffer->pHead != rest.end || rest.end <= decoder->ptBuffer->pEnd) {
         decoder->ptBuffer->pHead = rest.at;
     }
     return 1;

@@ -211,10 +211,10 @@ qvsResult readParms(qvsWbxmlDecoder *decoder, Record *record, const ParmsOf<Reco
     return readParms(decoder, record, parms.table);
 }
 
-// The same as a step of a decode that has seen a byte of it; parm elements that follow it are read
-// too, while nobody takes traces.
+// The same where a byte of it was seen; with `all` parm elements that follow it are read too, and
+// inline strings between them, while nobody takes traces.
 qvsResult readParms(qvsWbxmlDecoder *decoder, DecodeState *state, void *record,
-                    const ParmTable &table);
+                    const ParmTable &table, bool all = true);
 
 // Reads the parameter that the NAME attribute `token` announces into `*text`.
 qvsResult readText(qvsWbxmlDecoder *decoder, DecodeState *state, char **text, uint8_t token);

@@ -1,23 +1,13 @@
-// The text that strings and value tokens are appended to, and the one reader of all their runs.
+// The text that strings and value tokens are appended to, and the reader of their runs.
 #include "qvsText.h"
 
 using namespace qvs;
 
 namespace {
 
-// Pieces of a run that are looked at before they are appended.
-constexpr uint32_t kMostPieces = 4;
-
-// Bytes in front of a piece that joins a text.
-inline uint32_t separatorOf(const Piece &piece)
-{
-    return piece.join == Join::kComma || piece.join == Join::kHidden ? 1 : 0;
-}
-
 // Makes room for `added` bytes behind a text and a terminator, `spare` bytes more. False without
 // memory, or once the texts of the message passed their limit.
-[[gnu::always_inline]] inline bool reserve(DecodeState *state, Text *text, uint64_t added,
-                                           uint32_t spare)
+bool reserve(DecodeState *state, Text *text, uint64_t added, uint32_t spare)
 {
     if (!countText(state, text->data ? added : text->length + added)) [[unlikely]] {
         return false;
@@ -51,64 +41,23 @@ inline uint32_t separatorOf(const Piece &piece)
     return true;
 }
 
-// Writes a piece behind the text; answers the end of its bytes.
-[[gnu::always_inline]] inline char *write(Text *text, const Piece &piece, bool joins)
+// Traces that there is no memory for a piece; true for a token's, which counts as read.
+[[gnu::noinline, gnu::cold]] bool lackBlock(const Piece &piece)
 {
-    char *at = text->data + text->length;
-    const uint32_t separator = joins ? separatorOf(piece) : 0;
-    if (separator) {
-        *at++ = piece.join == Join::kComma ? ',' : '\0';
-    }
-    memcpy(at, piece.bytes, piece.length);
-    if (piece.join == Join::kOpaque) [[unlikely]] {
-        const void *nul = memchr(at, '\0', piece.length);
-        text->length +=
-            nul ? static_cast<uint32_t>(static_cast<const char *>(nul) - at) : piece.length;
-    } else if (!joins || piece.join != Join::kHidden) {
-        text->length += separator + piece.length;
-    }
-    return at + piece.length;
-}
-
-// What there is of pieces without memory: up to the first string.
-[[gnu::noinline, gnu::cold]] const Piece *appendNone(const Piece *piece, const Piece *end)
-{
-    for (; piece != end && !piece->unread; ++piece) {
-        // kept[lookup-without-memory]: the text stays as it was and the token counts as read.
-        traceException("[Error] [qvsClientProvWbxmlDecoderGetParamTokenVal] pszData NULL",
-                       kDecoderModule, __LINE__);
-    }
-    if (piece != end) {
+    if (piece.unread) {
         trace("[Error] [qvsClientProvWbxmlDecoderGetStr] pszData NULL");
+        return false;
     }
-    return piece;
-}
-
-// Appends pieces that add so many bytes, in one block. Answers the first one that is not appended.
-const Piece *appendAll(DecodeState *state, Text *text, const Piece *first, const Piece *end,
-                       uint64_t added)
-{
-    const Piece *piece = first;
-    bool joins = text->str() != nullptr;
-    if (!reserve(state, text, added, piece->join == Join::kOpaque ? 1 : 0)) [[unlikely]] {
-        return appendNone(piece, end);
-    }
-    char *last = nullptr;
-    do {
-        last = write(text, *piece, joins);
-        joins = true;
-    } while (++piece != end);
-    // Nobody sees what lies behind the terminator of a text in the tree of a session, and the
-    // context takes it over with its zeros.
-    memset(state->arena ? text->data + text->length : last, 0, 1 + kSpareZeros);
-    return piece;
+    // kept[lookup-without-memory]: the text stays as it was and the token counts as read.
+    traceException("[Error] [qvsClientProvWbxmlDecoderGetParamTokenVal] pszData NULL",
+                   kDecoderModule, __LINE__);
+    return true;
 }
 
 // The result where a piece that has been taken is not appended.
 [[gnu::noinline, gnu::cold]] qvsResult lackPiece(qvsWbxmlDecoder *decoder, uint8_t *unread)
 {
-    const Piece piece = {nullptr, 0, Join::kDirect, unread};
-    if (appendNone(&piece, &piece + 1) != &piece) {
+    if (lackBlock({nullptr, 0, Join::kDirect, unread})) {
         return QVS_OK;
     }
     decoder->ptBuffer->pHead = unread;
@@ -173,21 +122,6 @@ inline qvsResult endOfContent(const DecodeState *state, qvsResult result)
     return left ? QVS_OK : QVS_ERROR_WBXML_NO_DATA;
 }
 
-// Appends the pieces of a run, which may be none. Answers the first one that is not appended: where
-// the texts of the message come near their limit, what is in front of the piece that passes it is.
-const Piece *appendRun(DecodeState *state, Text *text, const Piece *first, const Piece *end,
-                       uint64_t added)
-{
-    if (added + text->length <= state->textLeft) [[likely]] {
-        return first != end ? appendAll(state, text, first, end, added) : end;
-    }
-    const Piece *piece = first;
-    while (piece != end && append(state, text, *piece)) {
-        ++piece;
-    }
-    return piece;
-}
-
 } // namespace
 
 DecodeState qvs::wholeDecode(const qvsWbxmlDecoder *decoder, qvsArena *arena)
@@ -200,59 +134,71 @@ DecodeState qvs::wholeDecode(const qvsWbxmlDecoder *decoder, qvsArena *arena)
 
 bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
 {
-    const uint32_t separator = text->str() ? separatorOf(piece) : 0;
-    const uint64_t added = uint64_t{piece.length} + separator;
-    return appendAll(state, text, &piece, &piece + 1, added) != &piece;
+    const bool joins = text->str() != nullptr;
+    const bool separated = piece.join == Join::kComma || piece.join == Join::kHidden;
+    const uint32_t separator = joins && separated ? 1 : 0;
+    const bool opaque = piece.join == Join::kOpaque;
+    if (!reserve(state, text, uint64_t{piece.length} + separator, opaque ? 1 : 0)) [[unlikely]] {
+        return lackBlock(piece);
+    }
+    char *at = text->data + text->length;
+    if (separator) {
+        *at++ = piece.join == Join::kComma ? ',' : '\0';
+    }
+    memcpy(at, piece.bytes, piece.length);
+    char *const last = at + piece.length;
+    if (opaque) {
+        const void *nul = memchr(at, '\0', piece.length);
+        text->length +=
+            nul ? static_cast<uint32_t>(static_cast<const char *>(nul) - at) : piece.length;
+    } else if (!joins || piece.join != Join::kHidden) {
+        text->length += separator + piece.length;
+    }
+    // Nobody sees what lies behind the terminator of a text in the tree of a session, and the
+    // context takes it over with its zeros.
+    memset(state->arena ? text->data + text->length : last, 0, 1 + kSpareZeros);
+    return true;
 }
 
-// All pieces are looked at before a block is made for them; of many, so many at a time, and while
-// blocks are tracked each by itself.
+uint32_t qvs::lengthBehind(const smlBuffer *buffer, const uint8_t *at, uint32_t left)
+{
+    // hardened: behind the data nothing is read but the storage, which the buffer has to tell.
+    const size_t from = static_cast<size_t>(at - buffer->pStorage);
+    const size_t capacity = static_cast<size_t>(buffer->pEnd - buffer->pStorage);
+    if (from + left > capacity || capacity != buffer->nCapacity) {
+        return left;
+    }
+    const void *nul = memchr(at, '\0', capacity - from);
+    return static_cast<uint32_t>((nul ? static_cast<const uint8_t *>(nul) : buffer->pEnd) - at);
+}
+
 bool qvs::readRun(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
-    Piece pieces[kMostPieces];
-    const Piece *const most = pieces + (tracking ? 1 : kMostPieces);
-    uint8_t *at = decoder->ptBuffer->pHead;
-    const uint8_t *const end = at + bytesLeft(decoder);
-    bool joins = text->str() != nullptr;
-    bool complete = false;
-    for (bool more = at != end; more;) {
-        Piece *piece = pieces;
-        uint64_t added = 0;
-        while (more && piece != most) {
-            const uint8_t token = *at++;
-            bool found = true;
-            if (token == wbxml::kStrI) {
-                inlinePiece(&at, end, piece);
-            } else if (token == wbxml::kStrT) {
-                found = tablePiece(decoder, &at, end, piece);
-            } else if (endsRun(token)) {
-                --at;
-                complete = true;
-                found = false;
-            } else if (tokenPiece(token, piece)) {
-                added += joins ? separatorOf(*piece) : 0;
-            } else {
-                found = false;
-            }
-            more = found && at < end;
-            added += found ? piece++->length : 0;
-            joins = true;
+    Rest rest(decoder);
+    bool more = true;
+    while (more && rest.at < rest.end && !endsRun(*rest.at)) {
+        const uint8_t token = *rest.at++;
+        Piece piece;
+        if (token == wbxml::kStrI) {
+            inlinePiece(decoder->ptBuffer, &rest.at, rest.end, &piece);
+        } else {
+            more = token == wbxml::kStrT ? tablePiece(decoder, &rest.at, rest.end, &piece)
+                                         : tokenPiece(token, &piece);
         }
-        const Piece *const left = appendRun(state, text, pieces, piece, added);
-        if (left != piece) [[unlikely]] {
-            decoder->ptBuffer->pHead = left->unread;
-            return false;
+        if (more && !append(state, text, piece)) {
+            rest.at = piece.unread;
+            more = false;
         }
     }
-    decoder->ptBuffer->pHead = at;
-    return complete;
+    decoder->ptBuffer->pHead = rest.at;
+    return more && rest.at < rest.end;
 }
 
 qvsResult qvs::dropInlineString(qvsWbxmlDecoder *decoder, DecodeState *state)
 {
     uint8_t *at = decoder->ptBuffer->pHead;
     Piece piece;
-    inlinePiece(&at, at + bytesLeft(decoder), &piece);
+    inlinePiece(decoder->ptBuffer, &at, at + bytesLeft(decoder), &piece);
     if (!countText(state, piece.length)) {
         return QVS_ERROR_NO_MEMORY;
     }
@@ -270,8 +216,8 @@ qvsResult qvs::lookAt(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
     smlBuffer *const buffer = decoder->ptBuffer;
     uint8_t *at = buffer->pHead;
     Piece piece;
-    if (bytesLeft(decoder) == 0 || !onlyPiece(decoder, &at, endOf(buffer), &piece) ||
-        piece.length > state->textLeft) {
+    if (bytesLeft(decoder) == 0 || !nextPiece(decoder, &at, endOf(buffer), &piece) ||
+        (!endsRun(*at) && wbxml::isString(*buffer->pHead)) || piece.length > state->textLeft) {
         return content(decoder, state, text);
     }
     state->textLeft -= piece.length;

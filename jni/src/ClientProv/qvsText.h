@@ -47,12 +47,12 @@ struct Piece {
     uint8_t *unread = nullptr; // the read position when a string cannot be had; null for a token's
 };
 
-// A text that grows at its end, by as many pieces at a time as are known. Owns its block until
-// take().
+// A text that grows at its end, piece by piece. Owns its block until take().
 struct Text {
     Text() = default;
-    // Goes on with a text that already is a block of its own. `known` may tell its length and
-    // capacity, so that a text joined again and again is not measured again and again.
+    // Goes on with a text that already is a block of its own, in which there is no room. `known`
+    // may tell its length and capacity, so that a text joined again and again is not measured each
+    // time.
     explicit Text(char *block, const JoinedText *known = nullptr) : data(block)
     {
         if (block && known && known->text == block) {
@@ -60,7 +60,7 @@ struct Text {
             capacity = known->capacity;
         } else if (block) {
             length = qvsStrlen(block);
-            capacity = length + 1;
+            capacity = length;
         }
     }
     Text(const Text &) = delete;
@@ -271,13 +271,16 @@ inline bool takeUint32(qvsWbxmlDecoder *decoder, uint32_t *value)
 
 // ---- Pieces, read from `*at` on, which moves behind them; `end` is the end of the data.
 
-// An inline string. One that the data ends in is taken as it stands.
-inline void inlinePiece(uint8_t **at, const uint8_t *end, Piece *piece)
+// The length of an inline string that has no NUL in the `left` bytes of data from `at` on.
+[[gnu::cold]] uint32_t lengthBehind(const smlBuffer *buffer, const uint8_t *at, uint32_t left);
+
+// An inline string, up to a NUL in the data or behind it.
+inline void inlinePiece(const smlBuffer *buffer, uint8_t **at, const uint8_t *end, Piece *piece)
 {
     const auto left = static_cast<uint32_t>(end - *at);
     const void *nul = left ? memchr(*at, '\0', left) : nullptr;
-    const uint32_t length =
-        nul ? static_cast<uint32_t>(static_cast<const uint8_t *>(nul) - *at) : left;
+    const uint32_t length = nul ? static_cast<uint32_t>(static_cast<const uint8_t *>(nul) - *at)
+                                : lengthBehind(buffer, *at, left);
     *piece = {reinterpret_cast<const char *>(*at), length, Join::kDirect, *at};
     *at += length + 1;
 }
@@ -348,9 +351,9 @@ constexpr bool endsRun(uint8_t token)
     return token == wbxml::kEnd || token == attr::kValue;
 }
 
-// The only piece of a value, as most have. False for any other, and for one that the data ends
-// with. Inline, with nothing that a function outside writes to, since nothing is called as often.
-[[gnu::always_inline]] inline bool onlyPiece(const qvsWbxmlDecoder *decoder, uint8_t **at,
+// The next piece of a value. False for anything else, and for one that the data ends with. Inline,
+// with nothing that a function outside writes to, since nothing is called as often.
+[[gnu::always_inline]] inline bool nextPiece(const qvsWbxmlDecoder *decoder, uint8_t **at,
                                              const uint8_t *end, Piece *piece)
 {
     const uint8_t token = *(*at)++;
@@ -361,12 +364,11 @@ constexpr bool endsRun(uint8_t token)
         }
         *piece = {reinterpret_cast<const char *>(*at), static_cast<uint32_t>(nul - *at)};
         *at = nul + 1;
-    } else if (token != wbxml::kStrT) {
-        return tokenPiece(token, piece) && *at < end;
-    } else if (!tablePiece(decoder, at, end, piece)) {
+    } else if (token == wbxml::kStrT ? !tablePiece(decoder, at, end, piece)
+                                     : !tokenPiece(token, piece)) {
         return false;
     }
-    return *at < end && endsRun(**at);
+    return *at < end;
 }
 
 // The end of the data, where the read position is in front of it.

@@ -121,9 +121,10 @@ void *qvsMemAlloc_debug(uint32_t size, const char *file, int line)
     return qvs::tracking ? remembered(block, size, file, line) : block;
 }
 
-void *qvs::newTrackedText(uint32_t size, const char *module, int line)
+void *qvs::newCleared(uint32_t size, uint32_t spare, const char *module, int line)
 {
-    return remembered(requested(size + kSpareZeros), size, module, line);
+    void *block = cleared(size + spare);
+    return tracking ? remembered(block, size, module, line) : block;
 }
 
 void *qvsMemAllocSetZero_debug(uint32_t size, const char *file, int line)

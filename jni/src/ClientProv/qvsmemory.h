@@ -97,12 +97,13 @@ inline void *newBlock(uint32_t size, const char *module, int line = __builtin_LI
     return tracking ? qvsMemAlloc_debug(size, module, line) : requested(size);
 }
 
-// A block for a text of `size` bytes with its terminator, and kSpareZeros more, which its tracked
-// size leaves out.
-void *newTrackedText(uint32_t size, const char *module, int line);
+// A zero-filled block with `spare` bytes more, which its tracked size leaves out.
+void *newCleared(uint32_t size, uint32_t spare, const char *module, int line);
+
+// A block for a text of `size` bytes with its terminator, and kSpareZeros more.
 inline char *newText(uint32_t size, const char *module, int line = __builtin_LINE())
 {
-    return static_cast<char *>(tracking ? newTrackedText(size, module, line)
+    return static_cast<char *>(tracking ? newCleared(size, kSpareZeros, module, line)
                                         : requested(size + kSpareZeros));
 }
 

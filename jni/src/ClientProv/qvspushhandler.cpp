@@ -137,13 +137,13 @@ bool readSecurity(Rest rest, smlpushHdlrInfo *info)
 // Copies the body, with a zero byte behind it.
 bool copyBody(const Rest &body, smlpushHdlrInfo *info)
 {
-    info->pBody =
-        static_cast<uint8_t *>(qvsMemAlloc_debug(body.length + 1, kModule, __builtin_LINE()));
+    info->pBody = static_cast<uint8_t *>(qvsMemAlloc_debug(body.length + 1, kModule, __LINE__));
     // hardened: without memory for the body there is no record.
     if (!info->pBody) {
         return false;
     }
-    qvsMemCpy(info->pBody, body.at, body.length); // no loop in place, as memcpy is in small code
+    // A call: code compiled for size has a loop of its own for memcpy.
+    qvsMemCpy(info->pBody, body.at, body.length);
     info->pBody[body.length] = 0;
     info->nBodyLen = body.length;
     return true;
