@@ -326,7 +326,6 @@ private:
 
 // ---- Calls that lack what they need
 
-using qvs::ScopedText;
 using Call = qvsResult (*)(qvsWbxmlDecoder *decoder);
 
 template <auto Read>
@@ -352,9 +351,10 @@ constexpr Call kCalls[] = {
     },
     [](qvsWbxmlDecoder *decoder) { return qvsClientProvWbxmlDecoderCheckElement(decoder, 0); },
     [](qvsWbxmlDecoder *decoder) {
-        ScopedText text;
-        return qvsClientProvWbxmlDecoderGetStr(decoder, &text.text) ? qvsResult{QVS_OK}
-                                                                    : qvsResult{QVS_ERROR_FAILED};
+        char *text = nullptr;
+        const bool read = qvsClientProvWbxmlDecoderGetStr(decoder, &text) != 0;
+        qvsMemFree_debug(text);
+        return read ? qvsResult{QVS_OK} : qvsResult{QVS_ERROR_FAILED};
     },
     [](qvsWbxmlDecoder *decoder) { return qvsClientProvWbxmlDecoderSkipAttribute(decoder); },
     [](qvsWbxmlDecoder *decoder) { return qvsClientProvWbxmlDecoderSkipElement(decoder); },

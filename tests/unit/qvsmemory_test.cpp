@@ -464,22 +464,6 @@ TEST_F(Memory, ARecordIsZeroedAndTrackedUnderItsLine)
     qvsMemFree_debug(record);
 }
 
-TEST_F(Memory, AScopedTextIsReleasedUnlessItIsTaken)
-{
-    char *taken = nullptr;
-    {
-        qvs::ScopedText kept;
-        qvs::ScopedText released;
-        const qvs::ScopedText none;
-        kept.text = qvsStrdup_debug("abc", kFile, 1);
-        released.text = qvsStrdup_debug("def", kFile, 1);
-        taken = kept.take();
-        EXPECT_EQ(kept.text, nullptr);
-    }
-    EXPECT_STREQ(taken, "abc");
-    qvsMemFree_debug(taken);
-}
-
 TEST(Kept, memcheck_unit_count)
 {
     const blocks::BlockCheck check;

@@ -246,8 +246,7 @@ QVS_NODISCARD QVS_API qvsResult qvsClientProvWbxmlDecoderCharacter(qvsWbxmlDecod
 
 // qvsClientProvWbxmlDecoderCharacterAttribute reads the attributes of a characteristic and makes
 // the records that they name in the node's slots. *attrId is the last token before END, *codePage
-// the page in force behind it, *name the last type given as text, which the caller owns, on failure
-// too.
+// the page in force behind it, *name the last type given as text, the caller's on failure too.
 QVS_NODISCARD QVS_API qvsResult
 qvsClientProvWbxmlDecoderCharacterAttribute(qvsWbxmlDecoder *decoder, qvsWapCharacter *node,
                                             uint8_t *attrId, uint8_t *codePage, char **name);

@@ -203,10 +203,7 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
             return leaveUnknown(decoder, state, parms);
         }
         left -= piece.length;
-    } while (!endsRun(*at) && wbxml::isString(*value) && !tracking);
-    if (!endsRun(*at) && wbxml::isString(*value)) {
-        return leaveUnknown(decoder, state, parms);
-    }
+    } while (!endsRun(*at) && wbxml::isString(*value));
     state->textLeft = left;
     buffer->pHead = at;
     return QVS_OK;

@@ -163,12 +163,11 @@ bool qvs::append(DecodeState *state, Text *text, const Piece &piece)
 uint32_t qvs::lengthBehind(const smlBuffer *buffer, const uint8_t *at, uint32_t left)
 {
     // hardened: behind the data nothing is read but the storage, which the buffer has to tell.
-    const size_t from = static_cast<size_t>(at - buffer->pStorage);
-    const size_t capacity = static_cast<size_t>(buffer->pEnd - buffer->pStorage);
-    if (from + left > capacity || capacity != buffer->nCapacity) {
+    const auto capacity = static_cast<size_t>(buffer->pEnd - buffer->pStorage);
+    if (capacity != buffer->nCapacity || at + left > buffer->pEnd) {
         return left;
     }
-    const void *nul = memchr(at, '\0', capacity - from);
+    const void *nul = memchr(at, '\0', static_cast<size_t>(buffer->pEnd - at));
     return static_cast<uint32_t>((nul ? static_cast<const uint8_t *>(nul) : buffer->pEnd) - at);
 }
 

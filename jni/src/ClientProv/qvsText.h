@@ -50,9 +50,8 @@ struct Piece {
 // A text that grows at its end, piece by piece. Owns its block until take().
 struct Text {
     Text() = default;
-    // Goes on with a text that already is a block of its own, in which there is no room. `known`
-    // may tell its length and capacity, so that a text joined again and again is not measured each
-    // time.
+    // Goes on with a text that is a block of its own, in which there is no room. `known` may tell
+    // its length and capacity, so that one joined again and again is not measured each time.
     explicit Text(char *block, const JoinedText *known = nullptr) : data(block)
     {
         if (block && known && known->text == block) {

@@ -124,28 +124,6 @@ Record *newRecord(const char *module, uint32_t spare = 0, int line = __builtin_L
     return static_cast<Record *>(qvsMemAllocSetZero_debug(sizeof(Record) + spare, module, line));
 }
 
-// A text that belongs to this scope until take() hands it on.
-struct ScopedText {
-    ScopedText() = default;
-    ScopedText(const ScopedText &) = delete;
-    ScopedText &operator=(const ScopedText &) = delete;
-    ~ScopedText()
-    {
-        if (text) {
-            qvsMemFree_debug(text);
-        }
-    }
-
-    char *take()
-    {
-        char *taken = text;
-        text = nullptr;
-        return taken;
-    }
-
-    char *text = nullptr;
-};
-
 } // namespace qvs
 #endif
 

@@ -43,12 +43,16 @@ uint32_t written(int length, uint32_t size)
 }
 
 // Zeros for one message.
-struct Block : qvs::ScopedText {
-    explicit Block(uint32_t bytes, int from = __builtin_LINE()) : size(bytes)
+struct Block {
+    explicit Block(uint32_t bytes, int from = __builtin_LINE())
+        : text(static_cast<char *>(qvsMemAllocSetZero_debug(bytes, kModule, from))), size(bytes)
     {
-        text = static_cast<char *>(qvsMemAllocSetZero_debug(bytes, kModule, from));
     }
+    Block(const Block &) = delete;
+    Block &operator=(const Block &) = delete;
+    ~Block() { qvsMemFree_debug(text); }
 
+    char *text;
     uint32_t size;
 };
 
