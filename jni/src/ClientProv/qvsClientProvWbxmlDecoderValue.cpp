@@ -64,7 +64,7 @@ consteval Meanings firstHits()
 {
     Meanings meanings = {};
     for (uint8_t row = 0; row < kMostRows; ++row) {
-        for (uint8_t t = 0; t < countOf(kTables); ++t) {
+        for (size_t t = 0; t < countOf(kTables); ++t) {
             demand(kTables[t].count <= kMostRows);
             if (row < kTables[t].count) {
                 Meaning &meaning = meanings.of[kTables[t].first[row].token - kFirstValue];
