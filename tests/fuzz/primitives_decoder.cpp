@@ -334,6 +334,31 @@ qvsResult withoutRecord(qvsWbxmlDecoder *decoder)
     return Read(decoder, nullptr);
 }
 
+// With a text, whose reader answers 1 for one that was read.
+template <auto Read>
+qvsResult withText(qvsWbxmlDecoder *decoder)
+{
+    char *text = nullptr;
+    const uint32_t read = Read(decoder, &text);
+    qvsMemFree_debug(text);
+    return read ? qvsResult{QVS_OK} : qvsResult{QVS_ERROR_FAILED};
+}
+
+template <class Record, auto Read>
+qvsResult withName(qvsWbxmlDecoder *decoder)
+{
+    Record record = {};
+    Record *there = &record;
+    return Read(decoder, &there, 0x05);
+}
+
+template <class Made, auto Read>
+qvsResult withPlace(qvsWbxmlDecoder *decoder)
+{
+    Made *made = nullptr;
+    return Read(decoder, &made);
+}
+
 // Each refuses a decoder that has nothing to read.
 constexpr Call kCalls[] = {
     [](qvsWbxmlDecoder *decoder) {
@@ -341,21 +366,10 @@ constexpr Call kCalls[] = {
         return qvsClinetProvWbxmlDecoderMain(data, 0) ? qvsResult{QVS_OK}
                                                       : qvsResult{QVS_ERROR_FAILED};
     },
-    [](qvsWbxmlDecoder *decoder) {
-        qvsWapDoc *document = nullptr;
-        return qvsClientProvWbxmlDecoder(decoder, &document);
-    },
-    [](qvsWbxmlDecoder *decoder) {
-        qvsWapDoc *document = nullptr;
-        return qvsClientProvWbxmlDecoderWbxmlBody(decoder, &document);
-    },
+    withPlace<qvsWapDoc, qvsClientProvWbxmlDecoder>,
+    withPlace<qvsWapDoc, qvsClientProvWbxmlDecoderWbxmlBody>,
     [](qvsWbxmlDecoder *decoder) { return qvsClientProvWbxmlDecoderCheckElement(decoder, 0); },
-    [](qvsWbxmlDecoder *decoder) {
-        char *text = nullptr;
-        const bool read = qvsClientProvWbxmlDecoderGetStr(decoder, &text) != 0;
-        qvsMemFree_debug(text);
-        return read ? qvsResult{QVS_OK} : qvsResult{QVS_ERROR_FAILED};
-    },
+    withText<qvsClientProvWbxmlDecoderGetStr>,
     [](qvsWbxmlDecoder *decoder) { return qvsClientProvWbxmlDecoderSkipAttribute(decoder); },
     [](qvsWbxmlDecoder *decoder) { return qvsClientProvWbxmlDecoderSkipElement(decoder); },
     withoutRecord<qvsClientProvWbxmlDecoderParamPxlogical>,
@@ -376,6 +390,27 @@ constexpr Call kCalls[] = {
     withoutRecord<qvsClientProvWbxmlDecoderParamRoaming>,
     withoutRecord<qvsClientProvWbxmlDecoderParamWifi>,
     withoutRecord<qvsClientProvWbxmlDecoderParamVoWifi>,
+    withText<qvsClientProvWbxmlDecoderGetString>,
+    withPlace<char, qvsClientProvWbxmlDecoderContent>,
+    [](qvsWbxmlDecoder *decoder) {
+        char *text = nullptr;
+        uint32_t length = 0;
+        return qvsClientProvWbxmlDecoderGetStrExtension(decoder, 0xC3, &text, &length)
+                   ? qvsResult{QVS_OK}
+                   : qvsResult{QVS_ERROR_FAILED};
+    },
+    withPlace<qvsList, qvsClientProvWbxmlDecoderCharacterList>,
+    withPlace<qvsWapCharacter, qvsClientProvWbxmlDecoderCharacter>,
+    withName<qvsWapNapDef, qvsClientProvWbxmlDecoderParamNapNameString>,
+    withName<qvsWapApplication, qvsClientProvWbxmlDecoderParamAppNameString>,
+    withName<qvsWapRoaming, qvsClientProvWbxmlDecoderParamRoamingNameString>,
+    withName<qvsWapWifi, qvsClientProvWbxmlDecoderParamWifiNameString>,
+    withName<qvsWapVoWifi, qvsClientProvWbxmlDecoderParamVoWifiNameString>,
+    [](qvsWbxmlDecoder *decoder) {
+        char *name = nullptr;
+        char *value = nullptr;
+        return qvsClientProvWbxmlDecoderParamVendorNameString(decoder, &name, &value, 0x05);
+    },
 };
 
 // Without a decoder, with one that has no buffer, and with one whose buffer is at its end.
