@@ -117,6 +117,7 @@ TEST_F(Memory, CountsTheBlocksThatCouldNotBeHad)
         [](void *from) { return qvsMemReAlloc_debug(from, 4, kFile, 1); },
         [](void *) { return qvs::newBlock(8, kFile); },
         [](void *) -> void * { return qvs::newText(8, kFile); },
+        [](void *) -> void * { return qvs::newText(4096, kFile); },
     };
     for (const bool tracked : {false, true}) {
         if (tracked) {
@@ -135,6 +136,18 @@ TEST_F(Memory, CountsTheBlocksThatCouldNotBeHad)
     qvsMemFree_debug(qvsMemAlloc_debug(8, kFile, 1));
     EXPECT_EQ(qvsStrdup_debug(nullptr, kFile, 1), nullptr);
     EXPECT_EQ(qvs::refusals, before);
+}
+
+TEST_F(Memory, ATextIsTrackedWithoutItsSpareZerosHoweverLong)
+{
+    for (const uint32_t size : {2U, 4096U}) {
+        char *text = nullptr;
+        const int line = __LINE__ + 1;
+        const std::string report = reportOf([&] { text = qvs::newText(size, kFile); });
+        ASSERT_NE(text, nullptr);
+        EXPECT_EQ(report, reported(kFile, line, size));
+        qvsMemFree_debug(text);
+    }
 }
 
 TEST_F(Memory, StrdupCopiesATextAndItsTerminator)

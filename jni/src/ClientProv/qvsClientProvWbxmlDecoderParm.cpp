@@ -9,22 +9,40 @@ namespace {
 
 // ---- Values
 
-// readNext() of a value whose first piece, of `length` bytes, is followed by more, from `at` on.
-// Their length is known before a block is made, and they are looked at again to be written.
-[[gnu::noinline]] qvsResult readPieces(qvsWbxmlDecoder *decoder, DecodeState *state, char **text,
-                                       uint8_t *at, uint32_t length)
+// The longest text that may still be read, in bytes.
+inline size_t mostText(const DecodeState *state)
+{
+    return state->textLeft < kLongest ? state->textLeft : kLongest - 1;
+}
+
+// Looks at a value, a run of strings and tokens or a token alone, and tells its length and what is
+// behind it. False for one that is read piece by piece.
+[[gnu::noinline]] bool measure(const qvsWbxmlDecoder *decoder, const DecodeState *state,
+                               uint8_t **at, uint32_t *length)
+{
+    const uint8_t *const end = endOf(decoder->ptBuffer);
+    const bool run = *at != end && wbxml::isString(**at);
+    Piece piece;
+    *length = 0;
+    do {
+        if (*at == end || !nextPiece(decoder, at, end, &piece) ||
+            (run && piece.join != Join::kDirect) || piece.length > mostText(state) - *length) {
+            return false;
+        }
+        *length += piece.length;
+    } while (run && !endsRun(**at));
+    return true;
+}
+
+// readNext() of a value of several pieces: one block is made for them.
+[[gnu::noinline]] qvsResult readPieces(qvsWbxmlDecoder *decoder, DecodeState *state, char **text)
 {
     smlBuffer *const buffer = decoder->ptBuffer;
     uint8_t *const value = buffer->pHead + 1;
-    const uint8_t *const end = endOf(buffer);
-    const size_t most = state->textLeft < kLongest ? state->textLeft : kLongest - 1;
-    Piece piece;
-    while (!endsRun(*at)) {
-        if (tracking || !nextPiece(decoder, &at, end, &piece) || piece.join != Join::kDirect ||
-            piece.length > most - length) {
-            return readValue(decoder, state, text);
-        }
-        length += piece.length;
+    uint8_t *at = value;
+    uint32_t length = 0;
+    if (tracking || !measure(decoder, state, &at, &length)) {
+        return readValue(decoder, state, text);
     }
     state->textLeft -= length;
     buffer->pHead = at;
@@ -33,7 +51,9 @@ namespace {
         return lackValue(decoder, state, value);
     }
     *text = block;
-    for (at = value; !endsRun(*at) && nextPiece(decoder, &at, end, &piece);) {
+    Piece piece = {};
+    for (at = value; !endsRun(*at);) {
+        (void)nextPiece(decoder, &at, endOf(buffer), &piece);
         memcpy(block, piece.bytes, piece.length);
         block += piece.length;
     }
@@ -49,13 +69,12 @@ namespace {
     const uint8_t *const end = endOf(buffer);
     uint8_t *at = value;
     Piece piece;
-    if (at == end || !nextPiece(decoder, &at, end, &piece) || piece.length > state->textLeft ||
-        piece.length >= kLongest) {
+    if (at == end || !nextPiece(decoder, &at, end, &piece) || piece.length > mostText(state)) {
         return readValue(decoder, state, text);
     }
     const uint32_t length = piece.length;
     if (!endsRun(*at) && wbxml::isString(*value)) {
-        return readPieces(decoder, state, text, at, length);
+        return readPieces(decoder, state, text);
     }
     state->textLeft -= length;
     buffer->pHead = at;
@@ -191,21 +210,13 @@ qvsResult readOnto(qvsWbxmlDecoder *decoder, DecodeState *state, qvsList **list,
 [[gnu::noinline]] qvsResult leaveNext(qvsWbxmlDecoder *decoder, DecodeState *state,
                                       const NamedParms &parms)
 {
-    smlBuffer *const buffer = decoder->ptBuffer;
-    const uint8_t *const value = buffer->pHead + 1;
-    const uint8_t *const end = endOf(buffer);
-    uint8_t *at = buffer->pHead + 1;
-    size_t left = state->textLeft;
-    Piece piece;
-    do {
-        if (!parms.dropsUnknown || at == end || !nextPiece(decoder, &at, end, &piece) ||
-            piece.length > left || (piece.join != Join::kDirect && wbxml::isString(*value))) {
-            return leaveUnknown(decoder, state, parms);
-        }
-        left -= piece.length;
-    } while (!endsRun(*at) && wbxml::isString(*value));
-    state->textLeft = left;
-    buffer->pHead = at;
+    uint8_t *at = decoder->ptBuffer->pHead + 1;
+    uint32_t length = 0;
+    if (!parms.dropsUnknown || !measure(decoder, state, &at, &length)) {
+        return leaveUnknown(decoder, state, parms);
+    }
+    state->textLeft -= length;
+    decoder->ptBuffer->pHead = at;
     return QVS_OK;
 }
 

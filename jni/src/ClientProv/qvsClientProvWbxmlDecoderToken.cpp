@@ -17,7 +17,7 @@ uint8_t byteBefore(const qvsWbxmlDecoder *decoder)
 }
 
 // Skips to the END that closes the nesting.
-qvsResult skipElement(qvsWbxmlDecoder *decoder, DecodeState *state)
+[[gnu::cold]] qvsResult skipElement(qvsWbxmlDecoder *decoder, DecodeState *state)
 {
     // kept[skip-counts-tokens]: every token that is no string and no END counts as one level, tags,
     // attribute starts and value tokens alike; an END outside them counts below zero.

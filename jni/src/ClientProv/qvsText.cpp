@@ -65,7 +65,7 @@ bool reserve(DecodeState *state, Text *text, uint64_t added, uint32_t spare)
 }
 
 // Reads a run, a value token, opaque data, or a token that stands for no text.
-qvsResult readAny(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
+[[gnu::cold]] qvsResult readAny(qvsWbxmlDecoder *decoder, DecodeState *state, Text *text)
 {
     uint8_t token = 0;
     if (!peekByte(decoder->ptBuffer, &token)) {
