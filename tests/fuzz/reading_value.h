@@ -184,11 +184,8 @@ protected:
     bool tableString(Text *text)
     {
         uint32_t index = 0;
-        if (!number(&index) || !table) {
-            return false;
-        }
-        const bool whole = tableSize != 0 && tableSize != kUnreadTable;
-        if (index >= (whole ? tableSize : table->size())) {
+        if (!number(&index) || !table || tableSize == kUnreadTable ||
+            index >= (tableSize ? tableSize : table->size())) {
             return false;
         }
         return append(text, table->c_str() + index);
