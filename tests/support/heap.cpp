@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <cstdint>
 #include <cstdlib>
+#include <cstring>
 
 #ifdef OMACP_HEAP_OF_THE_PROCESS
 #define HERE(function) function
@@ -34,6 +35,7 @@ bool counting = true;
 #endif
 long failAt = -1;
 bool failFromThenOn = false;
+bool dirty = false;
 std::function<void(const void *block)> onRelease;
 
 namespace {
@@ -327,7 +329,9 @@ void *HERE(malloc)(std::size_t size)
     if (blocks::fails()) {
         return nullptr;
     }
-    return blocks::fencing ? blocks::fencedBlock(size) : blocks::added(REAL(malloc)(size), size);
+    void *block =
+        blocks::fencing ? blocks::fencedBlock(size) : blocks::added(REAL(malloc)(size), size);
+    return block && blocks::dirty ? memset(block, 0xEE, size) : block;
 }
 
 void *HERE(calloc)(std::size_t count, std::size_t size)

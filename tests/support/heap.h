@@ -23,6 +23,9 @@ extern long failAt;
 // or reset() is called.
 extern bool failFromThenOn;
 
+// Whether blocks come full of other bytes than zeros, but for those of calloc.
+extern bool dirty;
+
 // Lets every allocation succeed again.
 void reset();
 

@@ -244,7 +244,9 @@ TEST_F(ApplicationParm, TracesNoValueThatCannotBeRead)
 TEST_F(ApplicationParm, DropsAValueThatCarriesNothing)
 {
     Reading<Application> run(parm(join({{0x05}, message::Value("from").bytes, {0x06}})));
+    Traces traces;
     EXPECT_EQ(run.read(), 0U);
+    EXPECT_TRUE(traces.has("[qvsClientProvWbxmlDecoderParamNameString] pszValue []\n"));
     EXPECT_EQ(run.left(), 0U);
     EXPECT_EQ(fieldsSet(run.record.get()), records::Numbers{});
 }

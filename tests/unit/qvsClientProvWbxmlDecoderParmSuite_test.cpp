@@ -30,6 +30,18 @@ TEST_P(ParmLoop, RefusesEveryOtherToken)
     }
 }
 
+TEST_P(ParmLoop, LeavesTheFlagsOfAnElementThatItRefuses)
+{
+    for (const uint8_t flags : {0x80, 0xC0}) {
+        AnyReading run(GetParam(), {static_cast<uint8_t>(0x07 | flags), 0x7F, 0x01});
+        run.decoder->nHasContent = 9;
+        run.decoder->nHasAttr = 9;
+        EXPECT_EQ(run.read(), 4101U);
+        EXPECT_EQ(run.decoder->nHasContent, flags == 0xC0 ? 1U : 0U);
+        EXPECT_EQ(run.decoder->nHasAttr, 1U);
+    }
+}
+
 TEST_P(ParmLoop, EndsAtTheEndOfTheAttributes)
 {
     for (const uint8_t flags : {0x40, 0xC0}) {

@@ -201,6 +201,9 @@ TEST_F(DecoderMain, MakesAContextAndReleasesAllElse)
     ASSERT_NE(context->ptNapDef, nullptr);
     EXPECT_STREQ(context->ptNapDef->pszNapId, "n1");
     EXPECT_TRUE(traces.has("Success\n"));
+    for (const std::string &text : traces.texts) {
+        EXPECT_NE(text.rfind("ERROR", 0), 0U) << text;
+    }
     qvsClientProvCtxDelectContext(context);
 }
 
@@ -315,7 +318,9 @@ TEST_F(DecoderMain, EndsEveryTextOfTheContextWithSpareZeros)
         body.characteristic(message::kNapDef, [&] {
             body.parm(message::kNapAddress, text).parm(message::kBearer, text);
         });
+        blocks::dirty = true;
         qvsClientProvCtx *context = decodeMain(message::document(body));
+        blocks::dirty = false;
         ASSERT_NE(context, nullptr);
         for (const char *shown :
              {context->ptNapDef->pszNapAddress, context->ptNapDef->ptBearer->pszValue}) {
