@@ -40,6 +40,10 @@ TEST_P(ParmLoop, LeavesTheFlagsOfAnElementThatItRefuses)
         EXPECT_EQ(run.decoder->nHasContent, flags == 0xC0 ? 1U : 0U);
         EXPECT_EQ(run.decoder->nHasAttr, 1U);
     }
+    AnyReading run(GetParam(), {0xC7, 0x00, 0x01, 0x7F, 0x01});
+    EXPECT_EQ(run.read(), 4101U);
+    EXPECT_EQ(run.decoder->nHasContent, 0U) << "those of the page, as it is read like an element";
+    EXPECT_EQ(run.decoder->nHasAttr, 0U);
 }
 
 TEST_P(ParmLoop, EndsAtTheEndOfTheAttributes)
