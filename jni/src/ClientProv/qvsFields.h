@@ -16,11 +16,14 @@ struct qvsCtxStrNode;
 
 namespace [[gnu::visibility("hidden")]] qvs {
 
-// What is made while compiling does not compile where this is given false.
-consteval bool demand(bool condition)
+// What is made while compiling does not compile where this is given false: what it calls then can
+// only be called when it runs.
+void demandNotMet();
+consteval void demand(bool condition)
 {
-    constexpr bool kMet[] = {true};
-    return kMet[condition ? 0 : 1];
+    if (!condition) {
+        demandNotMet();
+    }
 }
 
 template <class Record>
