@@ -304,12 +304,12 @@ inline bool tablePiece(const qvsWbxmlDecoder *decoder, uint8_t **at, const uint8
     uint32_t index = 0;
     // hardened: a table that was cut off, whose length is not known, is referred to in vain.
     if (!takeUint32(at, end, &index) || !decoder->pStringTable ||
-        decoder->nStrSize == kUnreadTable || index > decoder->nStrSize - 1) {
+        decoder->nStrSize == kUnreadTable) {
         return false;
     }
-    // kept[empty-table-index]: every index passes the check of an empty table; its block of two
-    // zero bytes answers 0 and 1 with the empty text. hardened: an index behind that block fails.
-    if (decoder->nStrSize == 0 && index > 1) {
+    // kept[empty-table-index]: every index is one of an empty table; its block of two zero bytes
+    // answers 0 and 1 with the empty text. hardened: an index behind that block fails.
+    if (index >= (decoder->nStrSize ? decoder->nStrSize : 2)) {
         return false;
     }
     const char *entry = decoder->pStringTable + index;
